@@ -1,0 +1,59 @@
+/**
+ * @file
+ * The listener interface of the navigator.
+ *
+ * @code
+ * class UserInterface : public bdmv::INavigatorListener { ... every callback ... };
+ *
+ * UserInterface userInterface;
+ * navigatorListeners.AddListener(&userInterface);
+ * ...
+ * navigatorListeners.RemoveListener(&userInterface); // no callback runs from here on
+ * @endcode
+ *
+ * A client that wants a few callbacks derives from NavigatorListenerAdapter instead.
+ */
+#ifndef BDMVNAVIGATOR_INAVIGATORLISTENER_H
+#define BDMVNAVIGATOR_INAVIGATORLISTENER_H
+
+#include "bdmvnavigator/inavbuttonlistener.h"
+#include "bdmvnavigator/inavcontrollistener.h"
+#include "bdmvnavigator/inavinteractivelistener.h"
+#include "bdmvnavigator/inavsettingslistener.h"
+
+namespace bdmv
+{
+
+/**
+ * Everything the navigator tells its clients.
+ *
+ * Threads. Every callback runs on the thread that dispatches the event, once for every registered
+ * listener, in order of registration, while the lock of the list is held: it returns promptly. The
+ * playback context is not locked meanwhile.
+ *
+ * Re-entrancy. A callback does not touch the list that is calling it, nor dispatch an event to it;
+ * bd::EventListenerList tells what happens then, and what to do instead.
+ *
+ * Exceptions. What a callback throws leaves INavigatorEvent::Dispatch(): the listeners behind it
+ * miss this callback, and all miss what the event would have done after it.
+ *
+ * Lifetime. What a reference argument refers to lives for the duration of the call. Copy what is
+ * needed later.
+ *
+ * The order of the bases is part of the binary interface.
+ */
+class INavigatorListener : public INavControlListener,
+                           public INavSettingsListener,
+                           public INavButtonListener,
+                           public INavInteractiveListener
+{
+public:
+    INavigatorListener() = default;
+    ~INavigatorListener() override = default;
+    INavigatorListener(const INavigatorListener&) = default;
+    INavigatorListener& operator=(const INavigatorListener&) = default;
+};
+
+} // namespace bdmv
+
+#endif

@@ -1,0 +1,195 @@
+/**
+ * @file
+ * What events read of the playback in progress.
+ */
+#ifndef BDMVNAVIGATOR_IPLAYBACKCONTEXT_H
+#define BDMVNAVIGATOR_IPLAYBACKCONTEXT_H
+
+#include "bd/types.h"
+#include "bdmvnavigator/inaverror.h"
+#include "bdstreaming/types.h"
+#include "database/iprogramdata.h"
+#include "database/uomasktable.h"
+
+namespace bdmv
+{
+
+/**
+ * The navigator's record of the playback in progress, as far as events read it.
+ *
+ * Events call these operations on the dispatching thread while they are dispatched, never while the
+ * lock of a listener list is held and without any lock of their own. A context that another thread
+ * changes meanwhile makes each single query consistent; events do not try to read several values at
+ * once. Queries are taken to succeed.
+ *
+ * An operation with output parameters writes all of them. Whatever it leaves keeps the value that
+ * the event preset: 0, false, empty, or no information, unless the operation says otherwise.
+ *
+ * The order of the operations is part of the binary interface.
+ */
+class IPlaybackContext : public INavError
+{
+public:
+    typedef INavError::ErrCode ErrCode;
+    typedef IProgramData::RefPtr RefPtr;
+
+    IPlaybackContext() = default;
+    ~IPlaybackContext() override = default;
+    IPlaybackContext(const IPlaybackContext&) = default;
+    IPlaybackContext& operator=(const IPlaybackContext&) = default;
+
+    /**
+     * The block prepared for a system suspend.
+     *
+     * @return valid until CleanupSystemResumeData()
+     */
+    virtual const bd::DataBlockDef& GetSystemResumeData() = 0;
+
+    /** Discards the system resume data. Called after the listeners were told, also when there is
+     * none. */
+    virtual void CleanupSystemResumeData() = 0;
+
+    /** Whether playback runs after the system resume. */
+    virtual bool IsPlayingAfterSystemResume() = 0;
+
+    /** The play list in playback. */
+    virtual bd::PlayListIdDef GetPlayListId() = 0;
+
+    /** The play item in playback. */
+    virtual bd::PlayItemIdDef GetPlayItemId() = 0;
+
+    /**
+     * The play mode that is set, the requested one.
+     *
+     * @return valid until the event has copied or read it
+     */
+    virtual const bd::PlayMode& GetPlayMode() = 0;
+
+    /** The trigger that is set. */
+    virtual bd::Trigger GetTrigger() = 0;
+
+    /** The time at which the trigger was reached. */
+    virtual bd::TimePosition GetTriggerReachedTime() = 0;
+
+    /** The A-B repeat state in force. */
+    virtual bd::TriggerType GetCurrentABRepeatState() = 0;
+
+    /** The chapter or title repeat state in force. */
+    virtual bd::TriggerType GetCurrentChpTitleRepeatState() = 0;
+
+    /** The kind of trigger that lies at @p time. */
+    virtual bd::TriggerType GetTriggerTypeByTime(bd::TimePosition time) = 0;
+
+    /** The current chapter. */
+    virtual bd::ChapterNumberDef GetCurrentChapter() = 0;
+
+    /**
+     * The current play list mark.
+     *
+     * @param[in,out] time receives the time of the mark; preset to bd::TimePositionNone
+     */
+    virtual bd::PlayListMarkIdDef GetCurrentPLMarkId(bd::TimePosition& time) = 0;
+
+    /** The current primary video stream and how many there are. */
+    virtual void GetVideoInfo(bd::StreamNumberDef* number, bd::UInt8* count) = 0;
+
+    /** Video format and aspect ratio of the primary video. */
+    virtual void GetVideoAttributes(bd::VideoFormatType& format,
+                                    bd::VideoAspectRatioType& aspectRatio) = 0;
+
+    /** The current primary audio stream and how many there are. */
+    virtual void GetAudioInfo(bd::StreamNumberDef* number, bd::UInt8* count) = 0;
+
+    /** The current interactive graphics stream and how many there are. */
+    virtual void GetIgInfo(bd::StreamNumberDef* number, bd::UInt8* count) = 0;
+
+    /**
+     * As GetPgTextStInfo(), with a result.
+     *
+     * @return INavError::ErrNotAllowed keeps the event from being sent
+     */
+    virtual ErrCode rGetPgTextStInfo(bd::StreamNumberDef* number, bd::UInt8* count) = 0;
+
+    /** The current presentation graphics or text subtitle stream and how many there are. */
+    virtual void GetPgTextStInfo(bd::StreamNumberDef* number, bd::UInt8* count) = 0;
+
+    /** The current secondary video stream, how many there are, and whether it plays asynchronously.
+     */
+    virtual void GetSecondaryVideoInfo(bd::StreamNumberDef* number, bd::UInt8* count,
+                                       bool* async) = 0;
+
+    /** The current secondary audio stream and how many there are. */
+    virtual void GetSecondaryAudioInfo(bd::StreamNumberDef* number, bd::UInt8* count) = 0;
+
+    /** The current picture-in-picture subtitle stream and how many there are. */
+    virtual void GetPipPgTextStInfo(bd::StreamNumberDef* number, bd::UInt8* count) = 0;
+
+    /** The current angle and how many there are. */
+    virtual void GetAngleInfo(bd::AngleNumberDef* number, bd::UInt8* count) = 0;
+
+    /** Whether presentation graphics and text subtitles are shown. */
+    virtual bool GetPgTextStDisplay() = 0;
+
+    /** Whether the secondary video is shown. */
+    virtual bool GetSecondaryVideoDisplay() = 0;
+
+    /** Whether the secondary audio is output. */
+    virtual bool GetSecondaryAudioDisplay() = 0;
+
+    /** Whether the subtitle stream is taken from the picture-in-picture selection. */
+    virtual bool GetPipPgTextStSelect() = 0;
+
+    /**
+     * The user-operation mask now in force.
+     *
+     * @param[in,out] mask preset to nothing forbidden
+     */
+    virtual void GetUOMask(UOMaskTable& mask) = 0;
+
+    /**
+     * The play mode that playback currently runs in; may differ from GetPlayMode().
+     *
+     * @return valid until the event has copied or read it
+     */
+    virtual const bd::PlayMode& GetCurrentPlayMode() = 0;
+
+    /** The current playback position. */
+    virtual bd::TimePosition GetCurrentTimePosition() = 0;
+
+    /**
+     * The pending button execution.
+     *
+     * @param[in,out] program  receives a counted reference; preset to empty
+     * @param[in,out] ticket   preset to 0
+     * @param[in,out] buttonId preset to 0
+     */
+    virtual void GetExecuteButtonData(RefPtr& program, bd::UInt32& ticket,
+                                      bd::ButtonId& buttonId) = 0;
+
+    /** The text subtitle user style in use. */
+    virtual bd::UserStyleNumber GetCurrentTextSubtitleStyleNumber() = 0;
+
+    /** How many text subtitle user styles there are. */
+    virtual bd::UInt8 GetNumberOfTextSubtitleStyles() = 0;
+
+    /** Why playback finished. */
+    virtual bdstreaming::FinishedReason GetFinishedReason() = 0;
+
+    /** The zoom parameters in force. */
+    virtual void GetZoomScaleInfo(bd::ZOOM_PARAM_Def& zoom) = 0;
+
+    /**
+     * Which secondary streams play asynchronously. All flags are preset to false.
+     *
+     * @param[in,out] fg2ndVid     the current play item has an asynchronous secondary video
+     * @param[in,out] fg2ndAud     the current play item has an asynchronous secondary audio
+     * @param[in,out] fgPrev2ndVid the previous play item had a secondary video
+     * @param[in,out] fgPrev2ndAud the previous play item had a secondary audio
+     */
+    virtual void IsAsyncPipInCurrentPlayItem(bool& fg2ndVid, bool& fg2ndAud, bool& fgPrev2ndVid,
+                                             bool& fgPrev2ndAud) = 0;
+};
+
+} // namespace bdmv
+
+#endif

@@ -1,0 +1,26 @@
+# How every target of this project is compiled.
+#
+# bdmvnavigator_target_options(TARGET [CXX_STANDARD N])
+#
+# N is 17 unless given: only the library itself is held to C++11, because player toolchains lag.
+function(bdmvnavigator_target_options target)
+  cmake_parse_arguments(arg "" "CXX_STANDARD" "" ${ARGN})
+  if(NOT arg_CXX_STANDARD)
+    set(arg_CXX_STANDARD 17)
+  endif()
+  set_target_properties(${target} PROPERTIES
+    CXX_STANDARD ${arg_CXX_STANDARD}
+    CXX_STANDARD_REQUIRED ON
+    CXX_EXTENSIONS OFF
+    C_STANDARD 99
+    C_EXTENSIONS OFF)
+  target_compile_options(${target} PRIVATE
+    -Wall -Wextra -Wpedantic -Wconversion -Wshadow -Wformat=2
+    $<$<COMPILE_LANGUAGE:CXX>:-Wnon-virtual-dtor>
+    $<$<COMPILE_LANGUAGE:CXX>:-Woverloaded-virtual>
+    # Assertions name their file; it must not depend on where somebody checked out or built.
+    -fmacro-prefix-map=${PROJECT_SOURCE_DIR}/=)
+  if(BDMVNAVIGATOR_WARNINGS_AS_ERRORS)
+    target_compile_options(${target} PRIVATE -Werror)
+  endif()
+endfunction()

@@ -1,0 +1,18 @@
+/**
+ * @file
+ * Values of the navigation model that stand for "none".
+ */
+#ifndef BD_CONSTANTS_H
+#define BD_CONSTANTS_H
+
+#include "bd/types.h"
+
+namespace bd
+{
+
+/** The time position that means none: all ones. */
+constexpr TimePosition TimePositionNone = 0xFFFFFFFFFFFFFFFFULL;
+
+} // namespace bd
+
+#endif

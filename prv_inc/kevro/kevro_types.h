@@ -1,0 +1,26 @@
+/**
+ * @file
+ * Base integer types of the platform layer. Plain C (C99) and C++.
+ *
+ * Every width here is exact on every target. The layers above build their identifiers and their
+ * binary layouts on them, so a port changes none of these definitions.
+ */
+#ifndef KEVRO_KEVRO_TYPES_H
+#define KEVRO_KEVRO_TYPES_H
+
+#include <stdint.h>
+
+/** A truth value in C: 0 is false, anything else is true. */
+typedef int32_t KEVRO_Bool;
+
+typedef uint8_t KEVRO_UInt8;
+typedef uint16_t KEVRO_UInt16;
+typedef uint32_t KEVRO_UInt32;
+typedef uint64_t KEVRO_UInt64;
+typedef int32_t KEVRO_Int32;
+typedef int64_t KEVRO_Int64;
+
+/** A time of the platform's clock. */
+typedef KEVRO_Int64 KEVRO_TimeCode;
+
+#endif
