@@ -1,0 +1,285 @@
+#include <gtest/gtest.h>
+
+#include <cstddef>
+#include <cstdint>
+#include <type_traits>
+
+#include "bd/constants.h"
+#include "bd/types.h"
+#include "kevro/kevro_types.h"
+
+namespace
+{
+
+template <typename Type, typename Expected> constexpr bool Is = std::is_same_v<Type, Expected>;
+
+bd::AudioInfoType SomeAudioInfo()
+{
+    bd::AudioInfoType info;
+    info.format = bd::AudioFormatEac3;
+    info.sampleRate = bd::AudioSampleRate_48000;
+    info.bitsPerSampling = bd::AudioBitsPerSamplingType24;
+    info.channels = bd::AudioChannelType5_1;
+    info.pid = 0x1100;
+    info.u4AudChannelLayout = 0x0000003F;
+    return info;
+}
+
+void ExpectSomeAudioInfo(const bd::AudioInfoType& info)
+{
+    EXPECT_EQ(bd::AudioFormatEac3, info.format);
+    EXPECT_EQ(bd::AudioSampleRate_48000, info.sampleRate);
+    EXPECT_EQ(bd::AudioBitsPerSamplingType24, info.bitsPerSampling);
+    EXPECT_EQ(bd::AudioChannelType5_1, info.channels);
+    EXPECT_EQ(0x1100, info.pid);
+    EXPECT_EQ(0x0000003Fu, info.u4AudChannelLayout);
+}
+
+} // namespace
+
+TEST(PlatformTypes, HaveTheirExactWidths)
+{
+    EXPECT_TRUE((Is<KEVRO_Bool, std::int32_t>));
+    EXPECT_TRUE((Is<KEVRO_UInt8, std::uint8_t>));
+    EXPECT_TRUE((Is<KEVRO_UInt16, std::uint16_t>));
+    EXPECT_TRUE((Is<KEVRO_UInt32, std::uint32_t>));
+    EXPECT_TRUE((Is<KEVRO_UInt64, std::uint64_t>));
+    EXPECT_TRUE((Is<KEVRO_Int32, std::int32_t>));
+    EXPECT_TRUE((Is<KEVRO_Int64, std::int64_t>));
+    EXPECT_TRUE((Is<KEVRO_TimeCode, std::int64_t>));
+}
+
+TEST(BaseTypes, AreThePlatformsTypes)
+{
+    EXPECT_TRUE((Is<bd::UInt8, KEVRO_UInt8>));
+    EXPECT_TRUE((Is<bd::UInt16, KEVRO_UInt16>));
+    EXPECT_TRUE((Is<bd::UInt32, KEVRO_UInt32>));
+    EXPECT_TRUE((Is<bd::UInt64, KEVRO_UInt64>));
+    EXPECT_TRUE((Is<bd::Int32, KEVRO_Int32>));
+    EXPECT_TRUE((Is<bd::Int64, KEVRO_Int64>));
+}
+
+TEST(Identifiers, OfEightBits)
+{
+    EXPECT_TRUE((Is<bd::SubPlayItemIdDef, bd::UInt8>));
+    EXPECT_TRUE((Is<bd::AngleNumberDef, bd::UInt8>));
+    EXPECT_TRUE((Is<bd::AngleIdDef, bd::UInt8>));
+    EXPECT_TRUE((Is<bd::PageId, bd::UInt8>));
+    EXPECT_TRUE((Is<bd::UserStyleNumber, bd::UInt8>));
+    EXPECT_TRUE((Is<bd::SoundIdDef, bd::UInt8>));
+}
+
+TEST(Identifiers, OfSixteenBits)
+{
+    EXPECT_TRUE((Is<bd::PlayItemIdDef, bd::UInt16>));
+    EXPECT_TRUE((Is<bd::SubPathIdDef, bd::UInt16>));
+    EXPECT_TRUE((Is<bd::PlayListMarkIdDef, bd::UInt16>));
+    EXPECT_TRUE((Is<bd::ChapterNumberDef, bd::UInt16>));
+    EXPECT_TRUE((Is<bd::TitleNumberDef, bd::UInt16>));
+    EXPECT_TRUE((Is<bd::MovieObjectIdDef, bd::UInt16>));
+    EXPECT_TRUE((Is<bd::StreamNumberDef, bd::UInt16>));
+    EXPECT_TRUE((Is<bd::ButtonId, bd::UInt16>));
+    EXPECT_TRUE((Is<bd::ButtonNumber, bd::UInt16>));
+    EXPECT_TRUE((Is<bd::Pid, bd::UInt16>));
+}
+
+TEST(Identifiers, OfThirtyTwoBits)
+{
+    EXPECT_TRUE((Is<bd::Pts, bd::UInt32>));
+    EXPECT_TRUE((Is<bd::Spn, bd::UInt32>));
+    EXPECT_TRUE((Is<bd::PlayListIdDef, bd::UInt32>));
+    EXPECT_TRUE((Is<bd::ClipInfoIdDef, bd::UInt32>));
+    EXPECT_TRUE((Is<bd::ServiceRequestId, bd::UInt32>));
+}
+
+TEST(Identifiers, OfSixtyFourBits)
+{
+    EXPECT_TRUE((Is<bd::TimePosition, bd::UInt64>));
+}
+
+TEST(Constants, NoTimePositionIsAllOnes)
+{
+    EXPECT_TRUE((Is<decltype(bd::TimePositionNone), const bd::TimePosition>));
+    EXPECT_EQ(UINT64_MAX, bd::TimePositionNone);
+}
+
+TEST(AudioInfoType, IsAllZeroByDefault)
+{
+    alignas(bd::AudioInfoType) unsigned char dirty[sizeof(bd::AudioInfoType)];
+    for (unsigned char& byte : dirty) {
+        byte = 0xA5;
+    }
+    const bd::AudioInfoType* const info = new (dirty) bd::AudioInfoType;
+
+    EXPECT_EQ(bd::AudioFormatUnknown, info->format);
+    EXPECT_EQ(bd::AudioSampleRateUnknown, info->sampleRate);
+    EXPECT_EQ(bd::AudioBitsPerSamplingTypeInvalid, info->bitsPerSampling);
+    EXPECT_EQ(bd::AudioChannelTypeUnknown, info->channels);
+    EXPECT_EQ(0, info->pid);
+    EXPECT_EQ(0u, info->u4AudChannelLayout);
+}
+
+TEST(AudioInfoType, HasItsFieldsInOrder)
+{
+    EXPECT_TRUE((Is<decltype(bd::AudioInfoType::format), bd::AudioFormatType>));
+    EXPECT_TRUE((Is<decltype(bd::AudioInfoType::sampleRate), bd::AudioSampleRateType>));
+    EXPECT_TRUE((Is<decltype(bd::AudioInfoType::bitsPerSampling), bd::AudioBitsPerSamplingType>));
+    EXPECT_TRUE((Is<decltype(bd::AudioInfoType::channels), bd::AudioChannelType>));
+    EXPECT_TRUE((Is<decltype(bd::AudioInfoType::pid), bd::Pid>));
+    EXPECT_TRUE((Is<decltype(bd::AudioInfoType::u4AudChannelLayout), bd::UInt32>));
+
+    EXPECT_EQ(0u, offsetof(bd::AudioInfoType, format));
+    EXPECT_EQ(4u, offsetof(bd::AudioInfoType, sampleRate));
+    EXPECT_EQ(8u, offsetof(bd::AudioInfoType, bitsPerSampling));
+    EXPECT_EQ(12u, offsetof(bd::AudioInfoType, channels));
+    EXPECT_EQ(16u, offsetof(bd::AudioInfoType, pid));
+    EXPECT_EQ(20u, offsetof(bd::AudioInfoType, u4AudChannelLayout));
+    EXPECT_EQ(24u, sizeof(bd::AudioInfoType));
+}
+
+TEST(AudioInfoType, CopiesFieldForField)
+{
+    const bd::AudioInfoType info = SomeAudioInfo();
+
+    ExpectSomeAudioInfo(bd::AudioInfoType(info));
+}
+
+TEST(AudioInfoType, CopyIsUnaffectedByLaterChangesToTheSource)
+{
+    bd::AudioInfoType info = SomeAudioInfo();
+    const bd::AudioInfoType copy = info;
+    info = bd::AudioInfoType();
+
+    ExpectSomeAudioInfo(copy);
+}
+
+TEST(ZoomRectangleDef, HasItsFieldsInOrder)
+{
+    EXPECT_TRUE((Is<decltype(bd::ZoomRectangleDef::X), bd::UInt16>));
+    EXPECT_TRUE((Is<decltype(bd::ZoomRectangleDef::Y), bd::UInt16>));
+    EXPECT_TRUE((Is<decltype(bd::ZoomRectangleDef::Width), bd::UInt16>));
+    EXPECT_TRUE((Is<decltype(bd::ZoomRectangleDef::Height), bd::UInt16>));
+
+    EXPECT_EQ(0u, offsetof(bd::ZoomRectangleDef, X));
+    EXPECT_EQ(2u, offsetof(bd::ZoomRectangleDef, Y));
+    EXPECT_EQ(4u, offsetof(bd::ZoomRectangleDef, Width));
+    EXPECT_EQ(6u, offsetof(bd::ZoomRectangleDef, Height));
+    EXPECT_EQ(8u, sizeof(bd::ZoomRectangleDef));
+}
+
+TEST(ZoomParam, HasItsFieldsInOrder)
+{
+    EXPECT_TRUE((Is<decltype(bd::ZOOM_PARAM_Def::rClipRectangle), bd::ZoomRectangleDef>));
+    EXPECT_TRUE((Is<decltype(bd::ZOOM_PARAM_Def::rDestRectangle), bd::ZoomRectangleDef>));
+    EXPECT_TRUE((Is<decltype(bd::ZOOM_PARAM_Def::u4Delay), bd::UInt32>));
+
+    EXPECT_EQ(0u, offsetof(bd::ZOOM_PARAM_Def, rClipRectangle));
+    EXPECT_EQ(8u, offsetof(bd::ZOOM_PARAM_Def, rDestRectangle));
+    EXPECT_EQ(16u, offsetof(bd::ZOOM_PARAM_Def, u4Delay));
+    EXPECT_EQ(20u, sizeof(bd::ZOOM_PARAM_Def));
+}
+
+TEST(ZoomParam, CopyIsUnaffectedByLaterChangesToTheSource)
+{
+    bd::ZOOM_PARAM_Def zoom = {{1, 2, 3, 4}, {5, 6, 7, 8}, 9};
+    const bd::ZOOM_PARAM_Def copy = zoom;
+    zoom = bd::ZOOM_PARAM_Def();
+
+    EXPECT_EQ(1, copy.rClipRectangle.X);
+    EXPECT_EQ(2, copy.rClipRectangle.Y);
+    EXPECT_EQ(3, copy.rClipRectangle.Width);
+    EXPECT_EQ(4, copy.rClipRectangle.Height);
+    EXPECT_EQ(5, copy.rDestRectangle.X);
+    EXPECT_EQ(6, copy.rDestRectangle.Y);
+    EXPECT_EQ(7, copy.rDestRectangle.Width);
+    EXPECT_EQ(8, copy.rDestRectangle.Height);
+    EXPECT_EQ(9u, copy.u4Delay);
+}
+
+TEST(Trigger, IsOneTriggerType)
+{
+    EXPECT_TRUE((Is<decltype(bd::Trigger::triggerType), bd::TriggerType>));
+    EXPECT_EQ(4u, sizeof(bd::Trigger));
+}
+
+TEST(BDMarkDef, HasItsFieldsInOrder)
+{
+    EXPECT_TRUE((Is<decltype(bd::BDMarkDef::time), bd::TimePosition>));
+    EXPECT_TRUE((Is<decltype(bd::BDMarkDef::chpNo), bd::UInt16>));
+
+    EXPECT_EQ(0u, offsetof(bd::BDMarkDef, time));
+    EXPECT_EQ(8u, offsetof(bd::BDMarkDef, chpNo));
+    // The padding behind the chapter depends on how the target aligns 64-bit members.
+    EXPECT_EQ(8u + alignof(bd::BDMarkDef), sizeof(bd::BDMarkDef));
+}
+
+TEST(DataBlockDef, HasItsFieldsInOrder)
+{
+    EXPECT_TRUE((Is<decltype(bd::DataBlockDef::pData), bd::UInt8*>));
+    EXPECT_TRUE((Is<decltype(bd::DataBlockDef::size), bd::UInt32>));
+
+    EXPECT_EQ(0u, offsetof(bd::DataBlockDef, pData));
+    EXPECT_EQ(sizeof(void*), offsetof(bd::DataBlockDef, size));
+    EXPECT_EQ(2 * sizeof(void*), sizeof(bd::DataBlockDef));
+}
+
+TEST(ValueStructures, AreCopiedAsBytes)
+{
+    EXPECT_TRUE(std::is_trivially_copyable_v<bd::AudioInfoType>);
+    EXPECT_TRUE(std::is_trivially_copyable_v<bd::ZoomRectangleDef>);
+    EXPECT_TRUE(std::is_trivially_copyable_v<bd::ZOOM_PARAM_Def>);
+    EXPECT_TRUE(std::is_trivially_copyable_v<bd::Trigger>);
+    EXPECT_TRUE(std::is_trivially_copyable_v<bd::BDMarkDef>);
+    EXPECT_TRUE(std::is_trivially_copyable_v<bd::DataBlockDef>);
+    EXPECT_TRUE(std::is_trivially_copyable_v<bd::PlayMode>);
+}
+
+TEST(PlayMode, IsForwardAtNormalSpeedByDefault)
+{
+    const bd::PlayMode mode;
+
+    EXPECT_EQ(bd::PlayDirectionForward, mode.Direction());
+    EXPECT_EQ(bd::PlaySpeedNormal, mode.Speed());
+}
+
+TEST(PlayMode, HoldsTheDirectionAndTheSpeedItIsMadeOf)
+{
+    const bd::PlayMode mode(bd::PlayDirectionBackward, bd::PlaySpeedFast3);
+
+    EXPECT_EQ(bd::PlayDirectionBackward, mode.Direction());
+    EXPECT_EQ(bd::PlaySpeedFast3, mode.Speed());
+}
+
+TEST(PlayMode, CopyHoldsTheSame)
+{
+    bd::PlayMode mode(bd::PlayDirectionBackward, bd::PlaySpeedSlow2);
+    const bd::PlayMode copy(mode);
+    mode = bd::PlayMode();
+
+    EXPECT_EQ(bd::PlayDirectionBackward, copy.Direction());
+    EXPECT_EQ(bd::PlaySpeedSlow2, copy.Speed());
+}
+
+TEST(PlayMode, IsEqualWhenDirectionAndSpeedAre)
+{
+    const bd::PlayMode mode(bd::PlayDirectionBackward, bd::PlaySpeedFast1);
+
+    EXPECT_TRUE(mode == bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedFast1));
+    EXPECT_FALSE(mode != bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedFast1));
+}
+
+TEST(PlayMode, DiffersByDirectionAlone)
+{
+    const bd::PlayMode mode(bd::PlayDirectionBackward, bd::PlaySpeedFast1);
+
+    EXPECT_FALSE(mode == bd::PlayMode(bd::PlayDirectionForward, bd::PlaySpeedFast1));
+    EXPECT_TRUE(mode != bd::PlayMode(bd::PlayDirectionForward, bd::PlaySpeedFast1));
+}
+
+TEST(PlayMode, DiffersBySpeedAlone)
+{
+    const bd::PlayMode mode(bd::PlayDirectionBackward, bd::PlaySpeedFast1);
+
+    EXPECT_FALSE(mode == bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedFast2));
+    EXPECT_TRUE(mode != bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedFast2));
+}

@@ -1,0 +1,57 @@
+/**
+ * @file
+ * Values and calls as they stand in a journal.
+ */
+#ifndef SUPPORT_DESCRIBE_H
+#define SUPPORT_DESCRIBE_H
+
+#include <string>
+
+#include "bd/types.h"
+#include "database/iprogramdata.h"
+#include "database/uomasktable.h"
+
+namespace bdmvtest
+{
+
+/** Integers and enumerations in decimal. */
+template <typename Number> std::string Describe(Number value)
+{
+    return std::to_string(+value);
+}
+
+std::string Describe(bool value);
+std::string Describe(const bd::PlayMode& mode);
+std::string Describe(const bd::Trigger& trigger);
+std::string Describe(const bd::ZoomRectangleDef& rectangle);
+std::string Describe(const bd::ZOOM_PARAM_Def& zoom);
+std::string Describe(const bd::AudioInfoType& info);
+std::string Describe(const bd::DataBlockDef& block);
+
+/** The mask as it is reported. */
+std::string Describe(const bdmv::UOMaskTable& mask);
+
+/** Whether there is a program, and how many RefPtr objects share it. */
+std::string Describe(const bdmv::IProgramData::RefPtr& program);
+
+/** The bytes of a block and their number, in decimal. */
+std::string DescribeBytes(const void* data, bd::UInt32 size);
+
+/** The values, separated by commas. */
+template <typename... Values> std::string DescribeAll(const Values&... values)
+{
+    std::string text;
+    ((text += (text.empty() ? "" : ", ") + Describe(values)), ...);
+    return text;
+}
+
+/** A call: its name and its arguments. */
+template <typename... Arguments>
+std::string DescribeCall(const std::string& name, const Arguments&... arguments)
+{
+    return name + "(" + DescribeAll(arguments...) + ")";
+}
+
+} // namespace bdmvtest
+
+#endif

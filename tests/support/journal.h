@@ -1,0 +1,48 @@
+/**
+ * @file
+ * What happened, in order.
+ *
+ * The fake platform, the scriptable context and the recording listeners of a test write one shared
+ * journal, so that the test states the whole interleaving and not fragments of it:
+ *
+ * @code
+ * bdmvtest::Journal journal;
+ * bdmvtest::FakePlatform platform(&journal);
+ * bdmvtest::ScriptablePlaybackContext context(journal);
+ * bdmvtest::RecordingListener a(journal, "A");
+ * context.currentTimePosition = 900000;
+ * ...
+ * journal.Take() ==
+ *     "context.GetCurrentTimePosition() -> 900000\n"
+ *     "context.GetPlayMode() -> (1, 7)\n"
+ *     "log? 57 5 0 -> on\n"
+ *     "log 57 5 0: Sending Stepped - position: 900000,dir=1\n"
+ *     "A.Stepped(900000, 1)\n"
+ * @endcode
+ */
+#ifndef SUPPORT_JOURNAL_H
+#define SUPPORT_JOURNAL_H
+
+#include <mutex>
+#include <string>
+
+namespace bdmvtest
+{
+
+/** A text of one line an entry. May be written by several threads at once. */
+class Journal
+{
+public:
+    void Add(const std::string& entry);
+
+    /** The entries since the last call, each ended by a line end. */
+    std::string Take();
+
+private:
+    std::mutex m_Mutex;
+    std::string m_Text;
+};
+
+} // namespace bdmvtest
+
+#endif
