@@ -1,0 +1,62 @@
+/**
+ * @file
+ * The names of components and levels, as they stand in log lines and configuration texts.
+ */
+#ifndef KEVRO_NAMES_H
+#define KEVRO_NAMES_H
+
+#include <cstddef>
+#include <cstring>
+#include <string_view>
+
+#include "kevro/kevro_log.h"
+
+namespace kevro
+{
+
+/** A list of names and what they stand for. */
+class Names
+{
+public:
+    struct Entry {
+        KEVRO_UInt32 number;
+        const char* name;
+    };
+
+    template <std::size_t Count>
+    constexpr explicit Names(const Entry (&entries)[Count]) : m_pEntries(entries), m_Count(Count)
+    {
+    }
+
+    const Entry* begin() const { return m_pEntries; }
+    const Entry* end() const { return m_pEntries + m_Count; }
+
+    /** The entry with this number, or null. */
+    const Entry* Find(KEVRO_UInt32 number) const;
+
+    /** The entry with this name, or null. */
+    const Entry* Find(std::string_view name) const;
+
+    /** The entry somebody may have meant who wrote @p word, or null. */
+    const Entry* FindSimilar(std::string_view word) const;
+
+private:
+    const Entry* m_pEntries;
+    std::size_t m_Count;
+};
+
+extern const Names Components;
+extern const Names Levels;
+
+/** The number of a level. A caller in C may pass any, so it is not looked at as an enumerator. */
+inline KEVRO_UInt32 LevelNumber(const KEVRO_Log_Level& level)
+{
+    KEVRO_UInt32 number;
+    static_assert(sizeof(number) == sizeof(level), "a level is passed as 32 bits");
+    std::memcpy(&number, &level, sizeof(number));
+    return number;
+}
+
+} // namespace kevro
+
+#endif
