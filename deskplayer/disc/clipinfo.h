@@ -1,0 +1,77 @@
+/**
+ * @file
+ * CLIPINF/nnnnn.clpi: what a clip holds.
+ */
+#ifndef DESKPLAYER_DISC_CLIPINFO_H
+#define DESKPLAYER_DISC_CLIPINFO_H
+
+#include <cstdint>
+#include <optional>
+#include <string>
+#include <vector>
+
+#include "disc/bytereader.h"
+#include "disc/streamattributes.h"
+
+namespace deskplayer
+{
+
+/** A stretch of the clip with one unbroken time line. Times are in ticks of 45 kHz. */
+struct StcSequence {
+    std::uint16_t pcrPid = 0; ///< PID of the clock reference
+    std::uint32_t firstPacket = 0;
+    std::uint32_t presentationStart = 0;
+    std::uint32_t presentationEnd = 0; ///< end of the last picture
+};
+
+struct AtcSequence {
+    std::uint32_t firstPacket = 0;
+    std::uint8_t firstStcSequence = 0; ///< number within the clip of the first STC sequence
+    std::vector<StcSequence> stcSequences;
+};
+
+/** A stream of a program. */
+struct ProgramStream {
+    std::uint16_t pid = 0;
+    StreamAttributes attributes;
+    std::uint8_t aspectRatio = 0; ///< video
+    bool captionFlag = false;     ///< video
+};
+
+struct Program {
+    std::uint32_t firstPacket = 0;
+    std::uint16_t programMapPid = 0;
+    std::vector<ProgramStream> streams;
+};
+
+struct ClipInfo {
+    std::string version;
+    std::uint8_t clipStreamType = 0;
+    std::uint8_t applicationType = 0;   ///< 1: main path of a movie
+    bool arrivalTimeOffsets = false;    ///< there is an arrival time offset table
+    std::uint32_t greatestDataRate = 0; ///< bytes per second
+    std::uint32_t packets = 0;          ///< packets of 192 bytes in the clip file
+    std::vector<AtcSequence> atcSequences;
+    std::vector<Program> programs;
+};
+
+/**
+ * Reads clip information. Characteristic points, clip marks and extension data are passed over.
+ *
+ * @param fileName for messages
+ * @throw FormatError wrong type or version, an address outside of the file or in its header, a
+ *        structure that is longer than what holds it or shorter than its own content, or an STC
+ *        sequence that ends before it starts. Reserved codes and anything behind the known content
+ *        of a structure are no error.
+ */
+ClipInfo ParseClipInfo(const Bytes& bytes, const std::string& fileName);
+
+/** How long the clip plays, over all its STC sequences, in ticks. */
+std::uint64_t Duration(const ClipInfo& clipInfo);
+
+/** Aspect ratio of the video stream with @p pid; nothing if the clip has no such video stream. */
+std::optional<std::uint8_t> FindAspectRatio(const ClipInfo& clipInfo, std::uint16_t pid);
+
+} // namespace deskplayer
+
+#endif

@@ -1,0 +1,170 @@
+#include "disc/disc.h"
+
+#include <algorithm>
+#include <cerrno>
+#include <fstream>
+#include <system_error>
+#include <utility>
+
+#include "disc/timeline.h"
+
+namespace deskplayer
+{
+
+namespace
+{
+
+namespace fs = std::filesystem;
+
+bool IsFolder(const fs::path& path)
+{
+    std::error_code error;
+    return fs::is_directory(path, error);
+}
+
+fs::path FindBdmv(const fs::path& folder)
+{
+    if (IsFolder(folder / "BDMV")) {
+        return folder / "BDMV";
+    }
+    if (IsFolder(folder / "PLAYLIST")) {
+        return folder;
+    }
+    throw FileError(folder.string(), "no disc, expected a folder that holds BDMV or is it");
+}
+
+Bytes ReadFile(const fs::path& path)
+{
+    std::error_code error;
+    const fs::file_status status = fs::status(path, error);
+    if (error) {
+        throw FileError(path.string(), error.message() + ", expected a file");
+    }
+    if (!fs::is_regular_file(status)) {
+        throw FileError(path.string(), "not a regular file, expected one");
+    }
+    const std::uintmax_t size = fs::file_size(path, error); // if that fails, the greatest there is
+    if (size > LargestFile) {
+        throw FileError(path.string(), "has " + std::to_string(size) + " bytes, expected at most " +
+                                           std::to_string(LargestFile));
+    }
+
+    Bytes bytes(static_cast<std::size_t>(size));
+    errno = 0;
+    std::ifstream stream(path, std::ios::binary);
+    stream.read(reinterpret_cast<char*>(bytes.data()), static_cast<std::streamsize>(size));
+    if (!stream) {
+        throw FileError(path.string(), "cannot be read: " + std::generic_category().message(errno) +
+                                           ", expected " + std::to_string(size) + " bytes");
+    }
+    return bytes;
+}
+
+/** The number that a play list file name stands for; nothing if it is not such a name. */
+std::optional<std::uint32_t> NumberOfPlayList(const std::string& fileName)
+{
+    if (fileName.size() != 10 || fileName.substr(5) != ".mpls" ||
+        fileName.find_first_not_of("0123456789") != 5) {
+        return std::nullopt;
+    }
+    return static_cast<std::uint32_t>(std::stoul(fileName.substr(0, 5)));
+}
+
+std::string PlayListFileName(std::uint32_t number)
+{
+    std::string digits = std::to_string(number);
+    digits.insert(0, 5 - std::min<std::size_t>(5, digits.size()), '0');
+    return "PLAYLIST/" + digits + ".mpls";
+}
+
+std::string ClipInfoFileName(const std::string& clip)
+{
+    return "CLIPINF/" + clip + ".clpi";
+}
+
+} // namespace
+
+Disc::Disc(const fs::path& folder) : m_Bdmv(FindBdmv(folder)) {}
+
+std::vector<std::uint32_t> Disc::PlayListNumbers() const
+{
+    const fs::path folder = m_Bdmv / "PLAYLIST";
+    std::vector<std::uint32_t> numbers;
+    std::error_code error;
+    for (fs::directory_iterator entry(folder, error), end; !error && entry != end;
+         entry.increment(error)) {
+        if (const auto number = NumberOfPlayList(entry->path().filename().string())) {
+            numbers.push_back(*number);
+        }
+    }
+    if (error) {
+        throw FileError(folder.string(), error.message() + ", expected a folder of play lists");
+    }
+    std::sort(numbers.begin(), numbers.end());
+    return numbers;
+}
+
+template <typename Value>
+Value Disc::Read(const std::string& name, Value (*parse)(const Bytes&, const std::string&)) const
+{
+    return parse(ReadFile(m_Bdmv / name), "BDMV/" + name);
+}
+
+PlayList Disc::ReadPlayList(std::uint32_t number) const
+{
+    return Read(PlayListFileName(number), ParsePlayList);
+}
+
+ClipInfo Disc::ReadClipInfo(const std::string& clip) const
+{
+    return Read(ClipInfoFileName(clip), ParseClipInfo);
+}
+
+Index Disc::ReadIndex() const
+{
+    return Read("index.bdmv", ParseIndex);
+}
+
+MovieObjects Disc::ReadMovieObjects() const
+{
+    return Read("MovieObject.bdmv", ParseMovieObjects);
+}
+
+std::optional<std::uint8_t> Disc::AspectRatio(const PlayList& playList, std::size_t playItem,
+                                              const Stream& stream) const
+{
+    const std::optional<std::string> clip = ClipOfStream(playList, playItem, stream);
+    std::error_code error;
+    if (!clip || !fs::exists(m_Bdmv / ClipInfoFileName(*clip), error)) {
+        return std::nullopt;
+    }
+    return FindAspectRatio(ReadClipInfo(*clip), stream.pid);
+}
+
+LongestPlayList Disc::FindLongestPlayList() const
+{
+    std::optional<LongestPlayList> longest;
+    std::uint64_t greatestDuration = 0;
+    std::vector<std::string> unreadable;
+    for (const std::uint32_t number : PlayListNumbers()) {
+        try {
+            PlayList playList = ReadPlayList(number);
+            const std::uint64_t duration = BuildTimeLine(playList).duration;
+            if (!longest || duration > greatestDuration) {
+                longest = LongestPlayList{number, std::move(playList), {}};
+                greatestDuration = duration;
+            }
+        } catch (const DiscError& error) {
+            unreadable.emplace_back(error.what());
+        }
+    }
+    if (!longest) {
+        throw FileError((m_Bdmv / "PLAYLIST").string(),
+                        unreadable.empty() ? "no play list, expected files like 00000.mpls"
+                                           : "no play list can be read: " + unreadable.front());
+    }
+    longest->unreadable = std::move(unreadable);
+    return *longest;
+}
+
+} // namespace deskplayer

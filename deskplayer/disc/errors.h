@@ -1,0 +1,63 @@
+/**
+ * @file
+ * What the disc reader throws.
+ */
+#ifndef DESKPLAYER_DISC_ERRORS_H
+#define DESKPLAYER_DISC_ERRORS_H
+
+#include <cstddef>
+#include <stdexcept>
+#include <string>
+
+namespace deskplayer
+{
+
+/** Anything that keeps a disc from being read. what() is one line without control characters. */
+class DiscError : public std::runtime_error
+{
+public:
+    using std::runtime_error::runtime_error;
+};
+
+/** A file or folder is not there, or is not one that can be read. */
+class FileError : public DiscError
+{
+public:
+    /**
+     * @param path as it is named in the message
+     * @param problem what was found at @p path, and what was expected
+     */
+    FileError(const std::string& path, const std::string& problem);
+};
+
+/** The bytes of a file contradict the format or each other. */
+class FormatError : public DiscError
+{
+public:
+    /**
+     * @param fileName as it is named in the message
+     * @param offset of the field that is wrong, in bytes from the start of the file
+     * @param found says what is there, "play item 0 has length 65535"
+     * @param expected says what could have been there, "at most 120"
+     */
+    FormatError(const std::string& fileName, std::size_t offset, const std::string& found,
+                const std::string& expected);
+
+    const std::string& FileName() const { return m_FileName; }
+    std::size_t Offset() const { return m_Offset; }
+    const std::string& Found() const { return m_Found; }
+    const std::string& Expected() const { return m_Expected; }
+
+private:
+    std::string m_FileName;
+    std::size_t m_Offset;
+    std::string m_Found;
+    std::string m_Expected;
+};
+
+/** @p text with everything but printable ASCII, and the backslash, as \\xNN: safe to print. */
+std::string Printable(const std::string& text);
+
+} // namespace deskplayer
+
+#endif

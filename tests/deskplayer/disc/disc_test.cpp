@@ -1,0 +1,272 @@
+#include <fstream>
+
+#include <gtest/gtest.h>
+#include <sys/resource.h>
+#include <unistd.h>
+
+#include "bytewriter.h"
+#include "disc/disc.h"
+#include "expectederror.h"
+#include "testdiscs.h"
+
+namespace deskplayer
+{
+
+namespace
+{
+
+namespace fs = std::filesystem;
+
+/** A folder of its own for each test, with an empty disc in it. */
+class DiscTest : public testing::Test
+{
+protected:
+    DiscTest()
+    {
+        std::string pattern = (fs::temp_directory_path() / "disc_test_XXXXXX").string();
+        m_Folder = mkdtemp(pattern.data());
+        fs::create_directories(m_Folder / "BDMV" / "PLAYLIST");
+        fs::create_directories(m_Folder / "BDMV" / "CLIPINF");
+    }
+
+    ~DiscTest() override { fs::remove_all(m_Folder); }
+
+    fs::path PathOf(const std::string& name) const { return m_Folder / "BDMV" / name; }
+
+    void Write(const std::string& name, const Bytes& bytes) const
+    {
+        std::ofstream(PathOf(name), std::ios::binary)
+            .write(reinterpret_cast<const char*>(bytes.data()), std::streamsize(bytes.size()));
+    }
+
+    /** A play list of one item of @p duration ticks. */
+    void WritePlayList(const std::string& name, std::uint32_t duration) const
+    {
+        PlayItemBytes item;
+        item.inTime = 5;
+        item.outTime = 5 + duration;
+        Write("PLAYLIST/" + name + ".mpls", WithItem(item).Make());
+    }
+
+    Disc MakeDisc() const { return Disc(m_Folder); }
+
+    fs::path m_Folder;
+};
+
+TEST_F(DiscTest, IsFoundFromTheFolderThatHoldsBdmvAndFromBdmvItself)
+{
+    EXPECT_EQ(Disc(TestDisc("titles")).PlayListNumbers().size(), 5u);
+    EXPECT_EQ(Disc(TestDisc("titles") / "BDMV").PlayListNumbers().size(), 5u);
+    EXPECT_EQ(Disc(TestDisc("titles") / "BDMV" / "").PlayListNumbers().size(), 5u);
+}
+
+TEST_F(DiscTest, IsNotFoundInAFolderWithoutBdmv)
+{
+    const fs::path folder = m_Folder / "else\nwhere";
+    EXPECT_EQ(FileErrorOf([&] { Disc disc(folder); }),
+              (m_Folder / "else").string() +
+                  "\\x0Awhere: no disc, expected a folder that holds BDMV or is it");
+}
+
+TEST_F(DiscTest, ListsPlayListsOfFiveDigitsInOrder)
+{
+    for (const char* const name : {"00800.mpls", "00001.mpls", "99999.mpls", "00000.mpls",
+                                   "0001.mpls", "000010.mpls", "0000a.mpls", "00002.MPLS",
+                                   "00003.mpls~", "00004.clpi", ".mpls", "00005", "1.mplsmpls"}) {
+        Write(std::string("PLAYLIST/") + name, {});
+    }
+    EXPECT_EQ(MakeDisc().PlayListNumbers(), (std::vector<std::uint32_t>{0, 1, 800, 99999}));
+}
+
+TEST_F(DiscTest, ReportsAMissingPlayListFolder)
+{
+    fs::remove(PathOf("PLAYLIST"));
+    EXPECT_EQ(FileErrorOf([&] { MakeDisc().PlayListNumbers(); }),
+              PathOf("PLAYLIST").string() +
+                  ": No such file or directory, expected a folder of play lists");
+}
+
+TEST_F(DiscTest, ReportsAMissingFile)
+{
+    EXPECT_EQ(FileErrorOf([&] { MakeDisc().ReadPlayList(7); }),
+              PathOf("PLAYLIST/00007.mpls").string() +
+                  ": No such file or directory, expected a file");
+    EXPECT_EQ(FileErrorOf([&] { MakeDisc().ReadPlayList(1234567); }),
+              PathOf("PLAYLIST/1234567.mpls").string() +
+                  ": No such file or directory, expected a file");
+}
+
+TEST_F(DiscTest, ReportsWhatIsNotARegularFile)
+{
+    fs::create_directory(PathOf("index.bdmv"));
+    EXPECT_EQ(FileErrorOf([&] { MakeDisc().ReadIndex(); }),
+              PathOf("index.bdmv").string() + ": not a regular file, expected one");
+    fs::create_symlink("/dev/zero", PathOf("MovieObject.bdmv"));
+    EXPECT_EQ(FileErrorOf([&] { MakeDisc().ReadMovieObjects(); }),
+              PathOf("MovieObject.bdmv").string() + ": not a regular file, expected one");
+}
+
+TEST_F(DiscTest, RefusesAFileThatIsTooLarge)
+{
+    Write("index.bdmv", {});
+    fs::resize_file(PathOf("index.bdmv"), LargestFile + 1);
+    EXPECT_EQ(FileErrorOf([&] { MakeDisc().ReadIndex(); }),
+              PathOf("index.bdmv").string() + ": has 4194305 bytes, expected at most 4194304");
+}
+
+TEST_F(DiscTest, ReadsAFileOfTheGreatestSize)
+{
+    Write("PLAYLIST/00000.mpls", WithItem(PlayItemBytes()).Make());
+    fs::resize_file(PathOf("PLAYLIST/00000.mpls"), LargestFile);
+    EXPECT_EQ(MakeDisc().ReadPlayList(0).playItems.size(), 1u);
+}
+
+TEST_F(DiscTest, ReportsAFileThatCannotBeOpened)
+{
+    WritePlayList("00000", 1);
+    const Disc disc = MakeDisc();
+    rlimit files = {};
+    ASSERT_EQ(getrlimit(RLIMIT_NOFILE, &files), 0);
+    rlimit none = files;
+    none.rlim_cur = 0;
+    ASSERT_EQ(setrlimit(RLIMIT_NOFILE, &none), 0);
+    const std::string error = FileErrorOf([&] { disc.ReadPlayList(0); });
+    ASSERT_EQ(setrlimit(RLIMIT_NOFILE, &files), 0);
+    EXPECT_EQ(error, PathOf("PLAYLIST/00000.mpls").string() +
+                         ": cannot be read: Too many open files, expected 122 bytes");
+}
+
+TEST_F(DiscTest, NamesAFileWithinTheDiscWhenItsContentIsWrong)
+{
+    Write("index.bdmv", Ascii("nonsense"));
+    EXPECT_EQ(FormatErrorOf([&] { MakeDisc().ReadIndex(); }),
+              "BDMV/index.bdmv: offset 0: type indicator is \"nons\", but expected \"INDX\"");
+    Write("MovieObject.bdmv", Ascii("nonsense"));
+    EXPECT_EQ(FormatErrorOf([&] { MakeDisc().ReadMovieObjects(); }),
+              "BDMV/MovieObject.bdmv: offset 0: type indicator is \"nons\", but expected \"MOBJ\"");
+    Write("PLAYLIST/00012.mpls", Ascii("nonsense"));
+    EXPECT_EQ(
+        FormatErrorOf([&] { MakeDisc().ReadPlayList(12); }),
+        "BDMV/PLAYLIST/00012.mpls: offset 0: type indicator is \"nons\", but expected \"MPLS\"");
+    Write("CLIPINF/00034.clpi", Ascii("nonsense"));
+    EXPECT_EQ(
+        FormatErrorOf([&] { MakeDisc().ReadClipInfo("00034"); }),
+        "BDMV/CLIPINF/00034.clpi: offset 0: type indicator is \"nons\", but expected \"HDMV\"");
+}
+
+/** Looks up the aspect ratio of the first video stream of the disc "ntsc43", which is 4:3. */
+class AspectRatioTest : public DiscTest
+{
+protected:
+    AspectRatioTest() : m_PlayList(Disc(TestDisc("ntsc43")).ReadPlayList(0))
+    {
+        fs::copy_file(TestDisc("ntsc43") / "BDMV" / "CLIPINF" / "00000.clpi",
+                      PathOf("CLIPINF/00000.clpi"));
+    }
+
+    Stream& Video() { return m_PlayList.playItems.at(0).streams.primaryVideo.at(0); }
+
+    std::optional<std::uint8_t> AspectRatio()
+    {
+        return MakeDisc().AspectRatio(m_PlayList, 0, Video());
+    }
+
+    PlayList m_PlayList;
+};
+
+TEST_F(AspectRatioTest, ComesFromTheClipInformation)
+{
+    EXPECT_EQ(AspectRatio(), 2);
+}
+
+TEST_F(AspectRatioTest, ComesFromTheClipThatTheSubPathNames)
+{
+    SubPlayItem subItem;
+    subItem.clip.name = "00000";
+    m_PlayList.subPaths = {{5, false, {subItem}}};
+    m_PlayList.playItems.at(0).clip.name = "00001";
+    Video().entryType = EntryTypeSubPath;
+    EXPECT_EQ(AspectRatio(), 2);
+}
+
+TEST_F(AspectRatioTest, IsNotKnownWithoutClipInformation)
+{
+    fs::remove(PathOf("CLIPINF/00000.clpi"));
+    EXPECT_EQ(AspectRatio(), std::nullopt);
+}
+
+TEST_F(AspectRatioTest, IsNotKnownIfTheClipHasNoSuchStream)
+{
+    Video().pid = 1;
+    EXPECT_EQ(AspectRatio(), std::nullopt);
+}
+
+TEST_F(AspectRatioTest, IsNotKnownIfNoClipIsNamed)
+{
+    Video().entryType = EntryTypeSubPath;
+    EXPECT_EQ(AspectRatio(), std::nullopt);
+}
+
+TEST_F(AspectRatioTest, IsAnErrorIfTheClipInformationIsDamaged)
+{
+    fs::resize_file(PathOf("CLIPINF/00000.clpi"), 50);
+    EXPECT_THROW(AspectRatio(), FormatError);
+}
+
+TEST_F(DiscTest, FindsThePlayListThatPlaysLongest)
+{
+    WritePlayList("00000", 10);
+    WritePlayList("00001", 30);
+    WritePlayList("00002", 20);
+    const LongestPlayList longest = MakeDisc().FindLongestPlayList();
+    EXPECT_EQ(longest.number, 1u);
+    EXPECT_EQ(longest.playList.playItems.at(0).outTime, 35u);
+    EXPECT_TRUE(longest.unreadable.empty());
+}
+
+TEST_F(DiscTest, FindsTheLowestOfThePlayListsThatPlayLongest)
+{
+    WritePlayList("00002", 20);
+    WritePlayList("00001", 20);
+    WritePlayList("00000", 10);
+    EXPECT_EQ(MakeDisc().FindLongestPlayList().number, 1u);
+}
+
+TEST_F(DiscTest, FindsAPlayListThatPlaysNothingIfThereIsNoOther)
+{
+    Write("PLAYLIST/00003.mpls", PlayListBytes().Make());
+    EXPECT_EQ(MakeDisc().FindLongestPlayList().number, 3u);
+}
+
+TEST_F(DiscTest, SaysWhichPlayListsWereLeftOutOfTheSearch)
+{
+    Write("PLAYLIST/00000.mpls", Ascii("damaged"));
+    WritePlayList("00001", 10);
+    fs::create_directory(PathOf("PLAYLIST/00002.mpls"));
+    const LongestPlayList longest = MakeDisc().FindLongestPlayList();
+    EXPECT_EQ(longest.number, 1u);
+    EXPECT_EQ(longest.unreadable,
+              (std::vector<std::string>{
+                  "BDMV/PLAYLIST/00000.mpls: offset 0: type indicator is \"dama\", but expected "
+                  "\"MPLS\"",
+                  PathOf("PLAYLIST/00002.mpls").string() + ": not a regular file, expected one"}));
+}
+
+TEST_F(DiscTest, ReportsThatThereIsNoPlayList)
+{
+    EXPECT_EQ(FileErrorOf([&] { MakeDisc().FindLongestPlayList(); }),
+              PathOf("PLAYLIST").string() + ": no play list, expected files like 00000.mpls");
+}
+
+TEST_F(DiscTest, ReportsThatNoPlayListCanBeRead)
+{
+    Write("PLAYLIST/00000.mpls", {});
+    EXPECT_EQ(FileErrorOf([&] { MakeDisc().FindLongestPlayList(); }),
+              PathOf("PLAYLIST").string() +
+                  ": no play list can be read: BDMV/PLAYLIST/00000.mpls: offset 0: file has 0 "
+                  "bytes left, but expected 4 bytes of type indicator");
+}
+
+} // namespace
+
+} // namespace deskplayer
