@@ -1,0 +1,20 @@
+#include "output/timetext.h"
+
+#include <array>
+#include <cinttypes>
+#include <cstdio>
+
+namespace deskplayer
+{
+
+std::string TimeText(std::uint64_t ticks)
+{
+    const std::uint64_t milliseconds = ticks / 45;
+    const std::uint64_t seconds = milliseconds / 1000;
+    std::array<char, 32> text{};
+    std::snprintf(text.data(), text.size(), "%02" PRIu64 ":%02" PRIu64 ":%02" PRIu64 ".%03" PRIu64,
+                  seconds / 3600, seconds / 60 % 60, seconds % 60, milliseconds % 1000);
+    return text.data();
+}
+
+} // namespace deskplayer

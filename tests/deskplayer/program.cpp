@@ -1,0 +1,52 @@
+#include "program.h"
+
+#include <sys/wait.h>
+
+#include <cstdio>
+#include <cstdlib>
+#include <filesystem>
+#include <fstream>
+#include <sstream>
+
+#include <unistd.h>
+
+namespace
+{
+
+std::string ReadWhole(const std::filesystem::path& path)
+{
+    std::ostringstream content;
+    content << std::ifstream(path, std::ios::binary).rdbuf();
+    return content.str();
+}
+
+std::string Quoted(const std::string& word)
+{
+    std::string quoted = "'";
+    for (const char character : word) {
+        quoted += character == '\'' ? std::string("'\\''") : std::string(1, character);
+    }
+    return quoted + "'";
+}
+
+} // namespace
+
+ProgramResult RunDeskPlayer(const std::vector<std::string>& arguments)
+{
+    const std::filesystem::path folder =
+        std::filesystem::temp_directory_path() / ("deskplayer-" + std::to_string(getpid()));
+    std::filesystem::create_directories(folder);
+    std::string command = Quoted(BDMVNAVIGATOR_DESKPLAYER);
+    for (const std::string& argument : arguments) {
+        command += ' ' + Quoted(argument);
+    }
+    command += " <&- >" + Quoted(folder / "output") + " 2>" + Quoted(folder / "errors");
+    const int status = std::system(command.c_str());
+
+    ProgramResult result;
+    result.status = WIFEXITED(status) ? WEXITSTATUS(status) : -1;
+    result.output = ReadWhole(folder / "output");
+    result.errors = ReadWhole(folder / "errors");
+    std::filesystem::remove_all(folder);
+    return result;
+}

@@ -1,0 +1,21 @@
+/**
+ * @file
+ * Running a program and catching what it prints.
+ */
+#ifndef DESKPLAYER_PROGRAM_H
+#define DESKPLAYER_PROGRAM_H
+
+#include <string>
+#include <vector>
+
+/** What a program left behind. */
+struct ProgramResult {
+    int status = -1; ///< exit status; -1 when a signal ended it
+    std::string output;
+    std::string errors;
+};
+
+/** Runs the desk player with these arguments and nothing to read, and waits for its end. */
+ProgramResult RunDeskPlayer(const std::vector<std::string>& arguments);
+
+#endif
