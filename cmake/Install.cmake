@@ -1,0 +1,36 @@
+# The installed package: find_package(bdmvnavigator) gives bdmvnavigator::bdmvnavigator and, where
+# the port was built and its own dependency is found, bdmvnavigator::kevro.
+include(CMakePackageConfigHelpers)
+
+set(package_dir ${CMAKE_INSTALL_LIBDIR}/cmake/bdmvnavigator)
+set(header_dir ${CMAKE_INSTALL_INCLUDEDIR}/bdmvnavigator)
+
+foreach(root inc bdmv/inc prv_inc)
+  install(DIRECTORY ${root}/ DESTINATION ${header_dir} FILES_MATCHING PATTERN "*.h")
+endforeach()
+install(DIRECTORY bdmv/bdmvnavigator DESTINATION ${header_dir} FILES_MATCHING PATTERN "*.h")
+
+install(TARGETS bdmvnavigator EXPORT bdmvnavigator-targets
+  ARCHIVE DESTINATION ${CMAKE_INSTALL_LIBDIR})
+install(EXPORT bdmvnavigator-targets NAMESPACE bdmvnavigator:: DESTINATION ${package_dir})
+
+if(BDMVNAVIGATOR_BUILD_PORT)
+  install(FILES ports/linux/kevro_linux.h DESTINATION ${header_dir})
+  install(TARGETS kevro EXPORT bdmvnavigator-kevro-targets
+    ARCHIVE DESTINATION ${CMAKE_INSTALL_LIBDIR})
+  install(EXPORT bdmvnavigator-kevro-targets NAMESPACE bdmvnavigator:: DESTINATION ${package_dir})
+endif()
+
+if(BDMVNAVIGATOR_BUILD_DESKPLAYER)
+  install(TARGETS bdmv-deskplayer RUNTIME DESTINATION ${CMAKE_INSTALL_BINDIR})
+endif()
+
+configure_package_config_file(cmake/bdmvnavigator-config.cmake.in
+  ${PROJECT_BINARY_DIR}/bdmvnavigator-config.cmake
+  INSTALL_DESTINATION ${package_dir})
+write_basic_package_version_file(${PROJECT_BINARY_DIR}/bdmvnavigator-config-version.cmake
+  COMPATIBILITY SameMajorVersion)
+install(FILES
+  ${PROJECT_BINARY_DIR}/bdmvnavigator-config.cmake
+  ${PROJECT_BINARY_DIR}/bdmvnavigator-config-version.cmake
+  DESTINATION ${package_dir})

@@ -1,0 +1,14 @@
+# Installs into a prefix that is empty before.
+file(REMOVE_RECURSE ${PREFIX})
+execute_process(
+  COMMAND ${CMAKE_COMMAND} --install ${BUILD} --prefix ${PREFIX}
+  RESULT_VARIABLE result)
+if(result)
+  message(FATAL_ERROR "the installation failed")
+endif()
+
+# All headers stand under one root.
+file(GLOB roots RELATIVE ${PREFIX}/include ${PREFIX}/include/*)
+if(NOT roots STREQUAL "bdmvnavigator")
+  message(FATAL_ERROR "include/ holds ${roots}, not bdmvnavigator alone")
+endif()
