@@ -26,6 +26,7 @@
 
 #include "bdmvnavigator/inavigatorevent.h"
 #include "bdmvnavigator/iplaybackcontext.h"
+#include "database/iplaylistmark.h"
 
 namespace bdmv
 {
@@ -115,6 +116,250 @@ public:
 };
 
 /**
+ * Playback reached the time of a trigger. Which kind the listeners hear about is decided by the
+ * kind that lies at that time and by the repeat states.
+ */
+class TriggerReachedEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~TriggerReachedEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/** A trigger was set. */
+class TriggerSetEvent : public NavigatorEvent
+{
+public:
+    /**
+     * @param type       the trigger that was set
+     * @param resultInfo the result of setting it
+     */
+    TriggerSetEvent(IPlaybackContext& thePlaybackContext, bd::TriggerType type, bool resultInfo)
+        : NavigatorEvent(thePlaybackContext), m_Type(type), m_ResultInfo(resultInfo)
+    {
+    }
+
+    ~TriggerSetEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+
+private:
+    bd::TriggerType m_Type;
+    bool m_ResultInfo;
+};
+
+/** A zoom was set. */
+class ZoomModeSetEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~ZoomModeSetEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/** A play list is in playback. */
+class PlaylistEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~PlaylistEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/**
+ * A play item is in playback. After the play item itself, and from the asynchronous streams of this
+ * item and what the previous one had, it tells whether picture-in-picture and secondary audio are
+ * available.
+ */
+class PlayItemEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~PlayItemEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/** The user operations that are forbidden changed. */
+class UOMaskEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~UOMaskEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/** A chapter began. */
+class ChapterEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~ChapterEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/** Playback passed a play list mark: the current one of the context, whatever its type. */
+class MarkInfoEvent : public NavigatorEvent
+{
+public:
+    /** @param markType stored, and not read by anything: all marks are reported alike */
+    MarkInfoEvent(IPlaybackContext& thePlaybackContext, IPlayListMark::MarkType markType)
+        : NavigatorEvent(thePlaybackContext), m_MarkType(markType)
+    {
+    }
+
+    ~MarkInfoEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+
+private:
+    IPlayListMark::MarkType m_MarkType;
+};
+
+/**
+ * The play mode that playback runs in changed. After the play mode itself it tells that the
+ * asynchronous streams of the play item are available at normal speed and unavailable at any other.
+ */
+class PlayModeEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~PlayModeEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/** The primary audio stream is selected. */
+class AudioInfoEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~AudioInfoEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/** The primary video stream is selected. */
+class VideoInfoEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~VideoInfoEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/** The interactive graphics stream is selected. */
+class InteractiveGraphicsInfoEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~InteractiveGraphicsInfoEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/**
+ * The presentation graphics or text subtitle stream is selected. Says nothing at all when the
+ * context does not allow the query.
+ */
+class PresentationGraphicsInfoEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~PresentationGraphicsInfoEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/** The secondary audio stream is selected; then, whether it is output. */
+class SecondaryAudioInfoEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~SecondaryAudioInfoEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/** The secondary video stream is selected; then, whether it is shown. */
+class SecondaryVideoInfoEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~SecondaryVideoInfoEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/**
+ * The subtitle stream of the picture-in-picture window is selected. It is available while subtitles
+ * are shown, the window offers more of them than the primary picture, and the selected one is among
+ * them.
+ */
+class PipPgTextStInfoEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~PipPgTextStInfoEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/** The angle is selected. */
+class AngleInfoEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~AngleInfoEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/** Presentation graphics and text subtitles were switched on or off. */
+class PresentationGraphicsDisplayEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~PresentationGraphicsDisplayEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/** The secondary video was switched on or off. */
+class SecondaryVideoDisplayEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~SecondaryVideoDisplayEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/** The secondary audio was switched on or off. */
+class SecondaryAudioDisplayEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~SecondaryAudioDisplayEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/** The picture-in-picture subtitle was picked or not. */
+class PipPgTextSelectEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~PipPgTextSelectEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/** The text subtitle user style is selected. */
+class TextSubtitleStyleInfoEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~TextSubtitleStyleInfoEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/** Text subtitle user styles are available. */
+class TextSubtitleStylesAvailableEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~TextSubtitleStylesAvailableEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/**
  * Playback reached its end, or starved. A reason that the streaming layer does not know is reported
  * through Assert() and sent as the end of the media.
  */
@@ -171,6 +416,133 @@ public:
     void Dispatch(Listeners& listeners) override;
 };
 
+/**
+ * The system goes into standby: hands the resume data to the listeners, then has the context
+ * discard it.
+ */
+class SystemSuspendedEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~SystemSuspendedEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/** The system came back from standby. Has the context discard its resume data afterwards. */
+class SystemResumedEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~SystemResumedEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/**
+ * The system came back from standby, and playback could not be restored. Has the context discard
+ * its resume data afterwards.
+ */
+class SystemResumeFailedEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~SystemResumeFailedEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/** The menu became visible. */
+class InteractiveGraphicsVisibleEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~InteractiveGraphicsVisibleEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/** The menu became invisible. */
+class InteractiveGraphicsInvisibleEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~InteractiveGraphicsInvisibleEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/** A pop-up menu became available. */
+class PopUpMenuAvailableEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~PopUpMenuAvailableEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/** A pop-up menu became unavailable. */
+class PopUpMenuUnavailableEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~PopUpMenuUnavailableEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/** The attributes of an audio stream changed. */
+class AudioInfoChangedEvent : public NavigatorEvent
+{
+public:
+    /**
+     * @param isPrimary whether the change concerns the primary audio rather than the secondary
+     * @param info      the new attributes
+     */
+    AudioInfoChangedEvent(IPlaybackContext& thePlaybackContext, bool isPrimary,
+                          bd::AudioInfoType info)
+        : NavigatorEvent(thePlaybackContext), m_IsPrimary(isPrimary), m_Info(info)
+    {
+    }
+
+    ~AudioInfoChangedEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+
+private:
+    bool m_IsPrimary;
+    bd::AudioInfoType m_Info;
+};
+
+/** The activation of a button is under way. */
+class ButtonActivationBusyEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~ButtonActivationBusyEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/** The activation of a button is done. */
+class ButtonActivationDoneEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~ButtonActivationDoneEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/** The menu became active. */
+class InteractiveGraphicsActiveEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~InteractiveGraphicsActiveEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/** The menu became inactive. */
+class InteractiveGraphicsInactiveEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~InteractiveGraphicsInactiveEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
 /** Playback jumped to another position. */
 class JumpOccurredEvent : public NavigatorEvent
 {
@@ -186,6 +558,69 @@ class PreloadFailedEvent : public NavigatorEvent
 public:
     using NavigatorEvent::NavigatorEvent;
     ~PreloadFailedEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/** The current time position. Its log line is the one high-frequency line of the events. */
+class CurrentTimePositionEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~CurrentTimePositionEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/**
+ * A button was activated: its navigation program is to be executed. Holds one counted reference to
+ * the program while it is dispatched.
+ */
+class ExecuteButtonEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~ExecuteButtonEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/** Picture-in-picture became available. */
+class PipAvailableEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~PipAvailableEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/**
+ * Picture-in-picture became unavailable. Only logged while the play item has an asynchronous
+ * secondary video.
+ */
+class PipUnavailableEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~PipUnavailableEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/** Secondary audio became available. */
+class SecondaryAudioAvailableEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~SecondaryAudioAvailableEvent() override = default;
+    void Dispatch(Listeners& listeners) override;
+};
+
+/**
+ * Secondary audio became unavailable. Only logged while the play item has an asynchronous secondary
+ * audio.
+ */
+class SecondaryAudioUnavailableEvent : public NavigatorEvent
+{
+public:
+    using NavigatorEvent::NavigatorEvent;
+    ~SecondaryAudioUnavailableEvent() override = default;
     void Dispatch(Listeners& listeners) override;
 };
 
