@@ -1,4 +1,5 @@
 // Where lines go: the sinks, the queue, and the account of what was lost.
+#include <atomic>
 #include <filesystem>
 #include <fstream>
 #include <future>
@@ -339,6 +340,41 @@ TEST_F(LogSink, LetsWritersGoOnAndKeepsItsCountWhileTheSinkBeforeIsStillWriting)
     }
     terminal.CloseWriteEnd();
     EXPECT_EQ(KEVRO_Log_GetDroppedLines(), before + Received(reading.get()).lost);
+}
+
+TEST_F(LogSink, DoesNotEndAFlushBeforeTheSinkBeforeHasWritten)
+{
+    StoppedPipe terminal;
+    std::future<std::vector<std::string>> reading;
+    {
+        const StderrRedirection redirection(terminal.WriteEnd());
+        ConfigureSink("stderr,queue=10");
+        EventLogger().Log("a line for the terminal");
+        std::thread configurer([this] { ConfigureSink("file:" + m_LogFile); });
+        while (ReadLines(m_LogFile).empty()) {
+            EventLogger().Log("is the file in force yet?");
+        }
+
+        std::atomic<bool> flushed{false};
+        porttesting::StartLine line(2);
+        std::thread flusher([&] {
+            line.Wait();
+            KEVRO_Log_Flush();
+            flushed = true;
+        });
+        line.Wait();
+        for (int i = 0; i < 1000; ++i) {
+            EventLogger().Log("time in which a flush that did not wait would have ended");
+            std::this_thread::yield();
+        }
+        EXPECT_FALSE(flushed);
+
+        reading = terminal.StartReading();
+        flusher.join();
+        configurer.join();
+    }
+    terminal.CloseWriteEnd();
+    EXPECT_FALSE(reading.get().empty());
 }
 
 TEST_F(LogSink, CountsLinesThatTheSinkDoesNotTake)

@@ -101,8 +101,16 @@ TEST(ParseClipInfo, RefusesAnStcSequenceThatEndsBeforeItStarts)
 
 TEST(ParseClipInfo, RefusesMoreSequencesThanThereAre)
 {
-    EXPECT_THROW(WithSequences(Join({U8(2), Zeros(11)})), FormatError);
-    EXPECT_THROW(WithSequences(Join({U8(1), U32(0), U8(1), U8(0), Zeros(13)})), FormatError);
+    EXPECT_EQ(FormatErrorOf([] {
+                  WithSequences(Join({U8(2), Zeros(11)}));
+              }),
+              "BDMV/CLIPINF/00001.clpi: offset 193: number of ATC sequences is 2, but expected at "
+              "most 1 in the 11 bytes left in sequence info");
+    EXPECT_EQ(FormatErrorOf([] {
+                  WithSequences(Join({U8(1), U32(0), U8(2), U8(0), Zeros(26)}));
+              }),
+              "BDMV/CLIPINF/00001.clpi: offset 198: number of STC sequences is 2, but expected at "
+              "most 1 in the 27 bytes left in sequence info");
 }
 
 TEST(ParseClipInfo, ReadsSeveralPrograms)
@@ -119,12 +127,20 @@ TEST(ParseClipInfo, ReadsSeveralPrograms)
 
 TEST(ParseClipInfo, RefusesMoreProgramsThanThereAre)
 {
-    EXPECT_THROW(WithPrograms(Join({U8(2), Zeros(15)})), FormatError);
+    EXPECT_EQ(FormatErrorOf([] {
+                  WithPrograms(Join({U8(2), Zeros(15)}));
+              }),
+              "BDMV/CLIPINF/00001.clpi: offset 199: number of programs is 2, but expected at most "
+              "1 in the 15 bytes left in program info");
 }
 
 TEST(ParseClipInfo, RefusesMoreStreamsThanThereAre)
 {
-    EXPECT_THROW(WithPrograms(Join({U8(1), Zeros(6), U8(2), Zeros(8)})), FormatError);
+    EXPECT_EQ(FormatErrorOf([] {
+                  WithPrograms(Join({U8(1), Zeros(6), U8(2), Zeros(7)}));
+              }),
+              "BDMV/CLIPINF/00001.clpi: offset 206: number of streams is 2, but expected at most 1 "
+              "in the 7 bytes left in program info");
 }
 
 TEST(ParseClipInfo, RefusesCodingInfoThatLacksTheAspectRatio)

@@ -371,10 +371,11 @@ TEST(ParsePlayList, RefusesMoreStreamsThanThereAre)
 {
     for (std::size_t kind = 0; kind < 8; ++kind) {
         Bytes counts = Zeros(8);
-        counts[kind] = 5;
+        counts[kind] = 8; // as many bytes are left, but not as many streams
         PlayListBytes bytes = WithStreams(counts, AudioStream(1));
         bytes.version = "0300";
-        EXPECT_THROW(Parse(bytes), FormatError) << kind;
+        EXPECT_NE(ErrorOf(bytes).find("streams is 8, but expected at most"), std::string::npos)
+            << kind;
     }
 }
 
