@@ -137,7 +137,8 @@ KEVRO_Bool KEVRO_Log_IsEnabled(KEVRO_UInt32 component, KEVRO_Log_Level level, KE
     }
     const kevro::LevelSet levels =
         kevro::g_Switch[kevro::Place(component)].levels.load(std::memory_order_relaxed);
-    return (levels >> (hiFreq != 0 ? number + kevro::HiFreqShift : number)) & 1;
+    return static_cast<KEVRO_Bool>(
+        (levels >> (hiFreq != 0 ? number + kevro::HiFreqShift : number)) & 1);
 }
 
 bool KEVRO_Log_Configure(const char* text, char* message, size_t messageSize)

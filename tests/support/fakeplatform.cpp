@@ -41,9 +41,12 @@ struct FakePlatformAccess {
     }
 
     static void Write(const FakePlatform& platform, KEVRO_UInt32 component, KEVRO_Log_Level level,
-                      KEVRO_Bool hiFreq, const char* text)
+                      KEVRO_Bool hiFreq, const char* format, const char* text)
     {
         if (platform.m_pJournal != nullptr) {
+            if (platform.m_RecordsFormats) {
+                platform.m_pJournal->Add(std::string("format: ") + format);
+            }
             platform.m_pJournal->Add("log " + DescribeTag(component, level, hiFreq) + ": " + text);
         }
     }
@@ -95,6 +98,11 @@ void FakePlatform::DisableLog()
     SetLogSwitch([](KEVRO_UInt32, KEVRO_Log_Level, KEVRO_Bool) -> KEVRO_Bool { return 0; });
 }
 
+void FakePlatform::RecordFormats()
+{
+    m_RecordsFormats = true;
+}
+
 void FakePlatform::RecordAtomicAdds()
 {
     m_RecordsAtomicAdds = true;
@@ -118,7 +126,7 @@ void KEVRO_Log_VWrite(KEVRO_UInt32 component, KEVRO_Log_Level level, KEVRO_Bool 
     std::array<char, 1024> text;
     std::vsnprintf(text.data(), text.size(), format, args);
     if (const bdmvtest::FakePlatform* const platform = installed) {
-        FakePlatformAccess::Write(*platform, component, level, hiFreq, text.data());
+        FakePlatformAccess::Write(*platform, component, level, hiFreq, format, text.data());
     }
 }
 

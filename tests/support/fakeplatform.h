@@ -5,6 +5,7 @@
  * Entries in the journal:
  *
  *     log? 57 5 0 -> on                         KEVRO_Log_IsEnabled
+ *     format: Sending PlayStarted               the format of the line below, when asked for
  *     log 57 5 0: Sending PlayStarted           KEVRO_Log_VWrite
  *     atomic add -1 -> 0                        KEVRO_Osa_TaskAtomicAdd, when asked for
  *     assert: false, some/file.cpp:885          Assert
@@ -56,6 +57,9 @@ public:
     /** Switches everything off. */
     void DisableLog();
 
+    /** Has the format of every line stand in the journal before the line. */
+    void RecordFormats();
+
     /** Has atomic additions stand in the journal as well, other than those that only read. */
     void RecordAtomicAdds();
 
@@ -67,6 +71,7 @@ private:
 
     Journal* m_pJournal;
     LogSwitch m_LogSwitch;
+    bool m_RecordsFormats = false;
     bool m_RecordsAtomicAdds = false;
 };
 
