@@ -11,15 +11,28 @@ namespace
 
 const int rounds = 200;
 
-/** Counts without a lock or an atomic: the list must not let two threads in at once. */
+/**
+ * The list must not let two threads in at once: it counts without a lock, and the one atomic orders
+ * nothing, so that a thread checker sees every missing lock.
+ */
 class CountingListener : public bdmv::NavigatorListenerAdapter
 {
 public:
-    void Paused() override { ++pauses; }
+    void Paused() override
+    {
+        overlaps += m_IsInside.exchange(true, std::memory_order_relaxed) ? 1 : 0;
+        std::this_thread::yield();
+        m_IsInside.store(false, std::memory_order_relaxed);
+        ++pauses;
+    }
     void CurrentTimePosition(const bd::TimePosition&) override { ++positions; }
 
     int pauses = 0;
     int positions = 0;
+    int overlaps = 0;
+
+private:
+    std::atomic<bool> m_IsInside{false};
 };
 
 /** Must not be called while it is not in a list. */
@@ -70,6 +83,7 @@ TEST(ConcurrentDispatchTest, DeliversEveryEventOnceWhileListenersComeAndGo)
 
     EXPECT_EQ(permanent.pauses, 2 * rounds);
     EXPECT_EQ(permanent.positions, 2 * rounds);
+    EXPECT_EQ(permanent.overlaps, 0);
     EXPECT_EQ(visitors[0].callsWhileAbsent + visitors[1].callsWhileAbsent, 0);
 }
 
