@@ -1,21 +1,46 @@
 #include "navigator/loadedplaylist.h"
 
-#include <utility>
+#include <algorithm>
+
+#include "output/timetext.h"
 
 namespace deskplayer
 {
 
-LoadedPlayList LoadPlayList(const Disc& disc, std::uint32_t number, PlayList playList)
+LoadedPlayList LayOut(std::uint32_t number, PlayList playList)
 {
     LoadedPlayList loaded;
     loaded.number = number;
-    loaded.timeLine = BuildTimeLine(playList);
-    for (std::size_t item = 0; item < playList.playItems.size(); ++item) {
-        const std::vector<Stream>& videos = playList.playItems[item].streams.primaryVideo;
-        loaded.aspectRatios.push_back(
-            videos.empty() ? std::nullopt : disc.AspectRatio(playList, item, videos.front()));
-    }
     loaded.playList = std::move(playList);
+    loaded.timeLine = BuildTimeLine(loaded.playList);
+    for (std::size_t mark = 0; mark < loaded.timeLine.markPositions.size(); ++mark) {
+        if (const auto position = loaded.timeLine.markPositions[mark]) {
+            loaded.marksByPosition.emplace_back(*position, mark);
+        }
+    }
+    std::sort(loaded.marksByPosition.begin(), loaded.marksByPosition.end());
+    loaded.chaptersByStart = loaded.timeLine.chapters;
+    std::stable_sort(
+        loaded.chaptersByStart.begin(), loaded.chaptersByStart.end(),
+        [](const Chapter& left, const Chapter& right) { return left.start < right.start; });
+    loaded.aspectRatios.resize(loaded.playList.playItems.size());
+    return loaded;
+}
+
+LoadedPlayList LoadPlayList(const Disc& disc, std::uint32_t number, PlayList playList)
+{
+    LoadedPlayList loaded = LayOut(number, std::move(playList));
+    if (loaded.timeLine.duration > LongestDuration) {
+        throw FileError("play list " + std::to_string(number),
+                        "lasts " + TimeText(loaded.timeLine.duration) + ", expected at most " +
+                            TimeText(LongestDuration));
+    }
+    for (std::size_t item = 0; item < loaded.playList.playItems.size(); ++item) {
+        const std::vector<Stream>& videos = loaded.playList.playItems[item].streams.primaryVideo;
+        if (!videos.empty()) {
+            loaded.aspectRatios[item] = disc.AspectRatio(loaded.playList, item, videos.front());
+        }
+    }
     return loaded;
 }
 

@@ -1,6 +1,8 @@
 #include "navigator/playbackcontext.h"
 
 #include <algorithm>
+#include <iterator>
+#include <tuple>
 #include <utility>
 
 #include "bd/constants.h"
@@ -22,29 +24,18 @@ bool IsTextSubtitle(const Stream& stream)
     return KindOfStream(stream.attributes.codingType) == StreamKind::StreamKindTextSubtitle;
 }
 
-/** Writes how many streams there are, and the wanted one of them, or the last when it is not there.
- */
-void Select(const std::vector<Stream>& streams, bd::StreamNumberDef wanted,
-            bd::StreamNumberDef* number, bd::UInt8* count)
-{
-    *count = static_cast<bd::UInt8>(streams.size());
-    *number = std::min<bd::StreamNumberDef>(wanted, *count);
-}
-
 } // namespace
 
 PlaybackContext::PlaybackContext(LoadedPlayList playList) : m_PlayList(std::move(playList)) {}
 
 const bd::DataBlockDef& PlaybackContext::GetSystemResumeData()
 {
-    m_SystemResumeBlock.pData = m_SystemResumeData.data();
-    m_SystemResumeBlock.size = static_cast<bd::UInt32>(m_SystemResumeData.size());
     return m_SystemResumeBlock;
 }
 
 void PlaybackContext::CleanupSystemResumeData()
 {
-    m_SystemResumeData.clear();
+    StoreSystemResumeData({});
 }
 
 bool PlaybackContext::IsPlayingAfterSystemResume()
@@ -79,7 +70,10 @@ bd::TimePosition PlaybackContext::GetTriggerReachedTime()
 
 bd::TriggerType PlaybackContext::GetCurrentABRepeatState()
 {
-    return m_State.abRepeat;
+    if (m_State.pointB) {
+        return bd::TRIGGER_B;
+    }
+    return m_State.pointA ? bd::TRIGGER_A : bd::TRIGGER_AB_NONE;
 }
 
 bd::TriggerType PlaybackContext::GetCurrentChpTitleRepeatState()
@@ -89,18 +83,17 @@ bd::TriggerType PlaybackContext::GetCurrentChpTitleRepeatState()
 
 bd::TriggerType PlaybackContext::GetTriggerTypeByTime(bd::TimePosition time)
 {
-    return time == m_State.triggerReachedTime ? m_State.trigger : bd::TRIGGER_INVALID;
+    if (time == m_State.pointB) {
+        return bd::TRIGGER_B;
+    }
+    // The end of a chapter or title is no point of its own: the repeat state tells.
+    return time == m_State.notifyAt ? bd::TRIGGER_NOTIFY_FROM_CURPOS : bd::TRIGGER_INVALID;
 }
 
 bd::ChapterNumberDef PlaybackContext::GetCurrentChapter()
 {
-    bd::ChapterNumberDef number = 0;
-    for (const Chapter& chapter : m_PlayList.timeLine.chapters) {
-        if (chapter.start <= m_State.position) {
-            number = static_cast<bd::ChapterNumberDef>(chapter.number);
-        }
-    }
-    return number;
+    const Chapter* const chapter = CurrentChapter();
+    return chapter == nullptr ? 0 : static_cast<bd::ChapterNumberDef>(chapter->number);
 }
 
 bd::PlayListMarkIdDef PlaybackContext::GetCurrentPLMarkId(bd::TimePosition& time)
@@ -114,7 +107,8 @@ bd::PlayListMarkIdDef PlaybackContext::GetCurrentPLMarkId(bd::TimePosition& time
 
 void PlaybackContext::GetVideoInfo(bd::StreamNumberDef* number, bd::UInt8* count)
 {
-    Select(CurrentStreams().primaryVideo, m_State.video, number, count);
+    std::tie(*number, *count) =
+        Choose(m_State.selection.video, CurrentStreams().primaryVideo.size());
 }
 
 void PlaybackContext::GetVideoAttributes(bd::VideoFormatType& format,
@@ -134,69 +128,73 @@ void PlaybackContext::GetVideoAttributes(bd::VideoFormatType& format,
 
 void PlaybackContext::GetAudioInfo(bd::StreamNumberDef* number, bd::UInt8* count)
 {
-    Select(CurrentStreams().primaryAudio, m_State.audio, number, count);
+    std::tie(*number, *count) =
+        Choose(m_State.selection.audio, CurrentStreams().primaryAudio.size());
 }
 
 void PlaybackContext::GetIgInfo(bd::StreamNumberDef* number, bd::UInt8* count)
 {
-    Select(CurrentStreams().ig, m_State.ig, number, count);
+    std::tie(*number, *count) = Choose(m_State.selection.ig, CurrentStreams().ig.size());
 }
 
 bdmv::IPlaybackContext::ErrCode PlaybackContext::rGetPgTextStInfo(bd::StreamNumberDef* number,
                                                                   bd::UInt8* count)
 {
-    Select(CurrentStreams().pg, m_State.pg, number, count);
-    return *count == 0 ? ErrNotAllowed : ErrOk;
+    std::tie(*number, *count) = Choose(m_State.selection.pg, CurrentStreams().pg.size());
+    return CurrentItem() == nullptr ? ErrNotAllowed : ErrOk;
 }
 
 void PlaybackContext::GetPgTextStInfo(bd::StreamNumberDef* number, bd::UInt8* count)
 {
-    Select(CurrentStreams().pg, m_State.pg, number, count);
+    std::tie(*number, *count) = Choose(m_State.selection.pg, CurrentStreams().pg.size());
 }
 
 void PlaybackContext::GetSecondaryVideoInfo(bd::StreamNumberDef* number, bd::UInt8* count,
                                             bool* async)
 {
     const std::vector<Stream>& streams = CurrentStreams().secondaryVideo;
-    Select(streams, m_State.secondaryVideo, number, count);
+    std::tie(*number, *count) = Choose(m_State.selection.secondaryVideo, streams.size());
     *async = *number != 0 && IsAsync(streams[*number - 1U]);
 }
 
 void PlaybackContext::GetSecondaryAudioInfo(bd::StreamNumberDef* number, bd::UInt8* count)
 {
-    Select(CurrentStreams().secondaryAudio, m_State.secondaryAudio, number, count);
+    std::tie(*number, *count) =
+        Choose(m_State.selection.secondaryAudio, CurrentStreams().secondaryAudio.size());
 }
 
 void PlaybackContext::GetPipPgTextStInfo(bd::StreamNumberDef* number, bd::UInt8* count)
 {
-    Select(CurrentStreams().pipPg, m_State.pipPg, number, count);
+    std::tie(*number, *count) = Choose(m_State.selection.pipPg, CurrentStreams().pipPg.size());
 }
 
 void PlaybackContext::GetAngleInfo(bd::AngleNumberDef* number, bd::UInt8* count)
 {
     const PlayItem* const item = CurrentItem();
-    *count = item == nullptr ? 0 : static_cast<bd::UInt8>(1 + item->furtherAngles.size());
-    *number = m_State.angle <= *count ? m_State.angle : *count;
+    const std::size_t angles = item == nullptr ? 0 : 1 + item->furtherAngles.size();
+    bd::StreamNumberDef angle = 0;
+    std::tie(angle, *count) = Choose(m_State.selection.angle, angles);
+    *number = static_cast<bd::AngleNumberDef>(angle);
 }
 
 bool PlaybackContext::GetPgTextStDisplay()
 {
-    return m_State.pgShown;
+    return m_State.selection.pgShown;
 }
 
 bool PlaybackContext::GetSecondaryVideoDisplay()
 {
-    return m_State.secondaryVideoShown;
+    return m_State.selection.secondaryVideoShown;
 }
 
 bool PlaybackContext::GetSecondaryAudioDisplay()
 {
-    return m_State.secondaryAudioShown;
+    return m_State.selection.secondaryAudioShown;
 }
 
 bool PlaybackContext::GetPipPgTextStSelect()
 {
-    return m_State.pipPgPicked;
+    return m_State.selection.pipPgPicked;
 }
 
 void PlaybackContext::GetUOMask(bdmv::UOMaskTable& mask)
@@ -217,15 +215,17 @@ bd::TimePosition PlaybackContext::GetCurrentTimePosition()
     return m_State.position;
 }
 
-void PlaybackContext::GetExecuteButtonData(RefPtr& /*program*/, bd::UInt32& /*ticket*/,
-                                           bd::ButtonId& /*buttonId*/)
+void PlaybackContext::GetExecuteButtonData(RefPtr& program, bd::UInt32& ticket,
+                                           bd::ButtonId& buttonId)
 {
-    // No button is waiting to be executed: what the event preset says so.
+    program = m_State.button.program;
+    ticket = m_State.button.ticket;
+    buttonId = m_State.button.id;
 }
 
 bd::UserStyleNumber PlaybackContext::GetCurrentTextSubtitleStyleNumber()
 {
-    return m_State.style;
+    return m_State.selection.style;
 }
 
 bd::UInt8 PlaybackContext::GetNumberOfTextSubtitleStyles()
@@ -270,10 +270,33 @@ const PlayItem* PlaybackContext::CurrentItem() const
     return m_State.item < items.size() ? &items[m_State.item] : nullptr;
 }
 
+const Chapter* PlaybackContext::CurrentChapter() const
+{
+    const std::vector<Chapter>& chapters = m_PlayList.chaptersByStart;
+    const auto behind = std::upper_bound(
+        chapters.begin(), chapters.end(), m_State.position,
+        [](std::uint64_t position, const Chapter& chapter) { return position < chapter.start; });
+    return behind == chapters.begin() ? nullptr : &*std::prev(behind);
+}
+
 const StreamTable& PlaybackContext::CurrentStreams() const
 {
     const PlayItem* const item = CurrentItem();
     return item == nullptr ? NoStreams : item->streams;
+}
+
+std::pair<bd::StreamNumberDef, bd::UInt8> PlaybackContext::Choose(bd::StreamNumberDef wanted,
+                                                                  std::size_t count)
+{
+    const auto all = static_cast<bd::UInt8>(count);
+    return {std::min<bd::StreamNumberDef>(wanted, all), all};
+}
+
+void PlaybackContext::StoreSystemResumeData(std::vector<bd::UInt8> block)
+{
+    m_SystemResumeData = std::move(block);
+    m_SystemResumeBlock = {m_SystemResumeData.data(),
+                           static_cast<bd::UInt32>(m_SystemResumeData.size())};
 }
 
 /** A stream runs on its own when the sub path that brings it is not in step with the play item. */

@@ -7,50 +7,15 @@
 
 #include <cstddef>
 #include <optional>
+#include <utility>
 #include <vector>
 
 #include "bdmvnavigator/iplaybackcontext.h"
 #include "navigator/loadedplaylist.h"
+#include "navigator/playbackstate.h"
 
 namespace deskplayer
 {
-
-/** What changes while a play list plays. Stream, angle and style numbers count from 1; 0 is none.
- */
-struct PlaybackState {
-    std::uint64_t position = 0; ///< on the time line of the play list, in ticks of 45 kHz
-    std::size_t item = 0;       ///< the play item in playback
-    std::optional<std::size_t> previousItem; ///< the one that was in playback before
-
-    bd::PlayMode playMode;        ///< what was asked for
-    bd::PlayMode currentPlayMode; ///< what playback does
-
-    bd::StreamNumberDef video = 1;
-    bd::StreamNumberDef audio = 1;
-    bd::StreamNumberDef ig = 1;
-    bd::StreamNumberDef pg = 1;
-    bd::StreamNumberDef secondaryVideo = 1;
-    bd::StreamNumberDef secondaryAudio = 1;
-    bd::StreamNumberDef pipPg = 1;
-    bd::AngleNumberDef angle = 1;
-    bd::UserStyleNumber style = 1;
-
-    bool pgShown = true;
-    bool secondaryVideoShown = false;
-    bool secondaryAudioShown = false;
-    bool pipPgPicked = false;
-
-    std::optional<std::size_t> mark; ///< index of the mark passed last
-
-    bd::TriggerType trigger = bd::TRIGGER_NONE;
-    bd::TimePosition triggerReachedTime = 0;
-    bd::TriggerType abRepeat = bd::TRIGGER_AB_NONE;
-    bd::TriggerType chapterTitleRepeat = bd::TRIGGER_NONE;
-
-    bd::ZOOM_PARAM_Def zoom = {};
-    bdstreaming::FinishedReason finishedReason = bdstreaming::FinishedReasonEndOfMedia;
-    bool playingAfterSystemResume = false;
-};
 
 /**
  * Answers every query from the play list and from the state of playback.
@@ -114,19 +79,32 @@ protected:
     /** The play item in playback; null while there is none. */
     const PlayItem* CurrentItem() const;
 
+    /** The chapter in playback; null before the first, or when there is none. */
+    const Chapter* CurrentChapter() const;
+
     /** The streams of the play item in playback; none while there is none. */
     const StreamTable& CurrentStreams() const;
 
     PlaybackState& State() { return m_State; }
     const PlaybackState& State() const { return m_State; }
 
-    std::vector<bd::UInt8> m_SystemResumeData;
+    /**
+     * The stream that is selected where there are @p count, and that count: the wanted one, or the
+     * last when it is not there.
+     */
+    static std::pair<bd::StreamNumberDef, bd::UInt8> Choose(bd::StreamNumberDef wanted,
+                                                            std::size_t count);
 
-private:
+    /** Stores the block that GetSystemResumeData() gives, until it is cleaned up. */
+    void StoreSystemResumeData(std::vector<bd::UInt8> block);
+
+    /** Whether a stream is not in step with the play item. */
     bool IsAsync(const Stream& stream) const;
 
+private:
     const LoadedPlayList m_PlayList;
     PlaybackState m_State;
+    std::vector<bd::UInt8> m_SystemResumeData;
     bd::DataBlockDef m_SystemResumeBlock = {nullptr, 0};
 };
 

@@ -77,6 +77,7 @@ public:
      * Lets go of the current object, then shares what @p other holds. Changes nothing when both
      * share the same object already. @p other may lie within the object that is let go.
      */
+    // NOLINTNEXTLINE(bugprone-unhandled-self-assignment): equal counters cover it
     RefPtr& operator=(const RefPtr& other)
     {
         if (m_Counter != other.m_Counter) {

@@ -1,0 +1,36 @@
+/**
+ * @file
+ * What became of a user operation.
+ */
+#ifndef DESKPLAYER_NAVIGATOR_OUTCOME_H
+#define DESKPLAYER_NAVIGATOR_OUTCOME_H
+
+#include <string>
+#include <utility>
+
+namespace deskplayer
+{
+
+/** Carried out, or refused: then no event was sent and nothing has changed. */
+class Outcome
+{
+public:
+    static Outcome Done() { return Outcome(std::string()); }
+
+    /** @param reason why, as a sentence without a full stop; not empty */
+    static Outcome Refused(std::string reason) { return Outcome(std::move(reason)); }
+
+    bool IsDone() const { return m_Reason.empty(); }
+
+    /** Why the operation was refused; empty when it was carried out. */
+    const std::string& Reason() const { return m_Reason; }
+
+private:
+    explicit Outcome(std::string reason) : m_Reason(std::move(reason)) {}
+
+    std::string m_Reason;
+};
+
+} // namespace deskplayer
+
+#endif
