@@ -17,134 +17,126 @@ std::uint64_t CountCommands(const bdmv::IProgramData::RefPtr& program)
 
 void CallbackListener::PlayStarted()
 {
-    OnCallback({ListenerInterface::Control, "PlayStarted", {}});
+    OnCallback({CallbackId::PlayStarted, {}});
 }
 
 void CallbackListener::FirstPictureDelivered()
 {
-    OnCallback({ListenerInterface::Control, "FirstPictureDelivered", {}});
+    OnCallback({CallbackId::FirstPictureDelivered, {}});
 }
 
 void CallbackListener::PlayFailed()
 {
-    OnCallback({ListenerInterface::Control, "PlayFailed", {}});
+    OnCallback({CallbackId::PlayFailed, {}});
 }
 
 void CallbackListener::Paused()
 {
-    OnCallback({ListenerInterface::Control, "Paused", {}});
+    OnCallback({CallbackId::Paused, {}});
 }
 
 void CallbackListener::Continued(bd::PlayDirectionDef direction, bd::PlaySpeedDef speed)
 {
-    OnCallback({ListenerInterface::Control,
-                "Continued",
-                {{"direction", NameOf(direction)}, {"speed", NameOf(speed)}}});
+    OnCallback(
+        {CallbackId::Continued, {{"direction", NameOf(direction)}, {"speed", NameOf(speed)}}});
 }
 
 void CallbackListener::Stepped(const bd::TimePosition& position, bd::PlayDirectionDef direction)
 {
-    OnCallback({ListenerInterface::Control,
-                "Stepped",
+    OnCallback({CallbackId::Stepped,
                 {{"position", Position{position}}, {"direction", NameOf(direction)}}});
 }
 
 void CallbackListener::TriggerTimeReached(bd::TriggerType type, const bd::TimePosition& time)
 {
-    OnCallback({ListenerInterface::Control,
-                "TriggerTimeReached",
-                {{"type", NameOf(type)}, {"time", Position{time}}}});
+    OnCallback(
+        {CallbackId::TriggerTimeReached, {{"type", NameOf(type)}, {"time", Position{time}}}});
 }
 
 void CallbackListener::TriggerSet(bd::TriggerType type, bool result)
 {
-    OnCallback(
-        {ListenerInterface::Control, "TriggerSet", {{"type", NameOf(type)}, {"result", result}}});
+    OnCallback({CallbackId::TriggerSet, {{"type", NameOf(type)}, {"result", result}}});
 }
 
 void CallbackListener::ZoomModeSet(bd::ZOOM_PARAM_Def zoom)
 {
-    OnCallback({ListenerInterface::Control,
-                "ZoomModeSet",
-                {{"clip", NameOf(zoom.rClipRectangle)},
-                 {"destination", NameOf(zoom.rDestRectangle)},
+    OnCallback({CallbackId::ZoomModeSet,
+                {{"clip", zoom.rClipRectangle},
+                 {"destination", zoom.rDestRectangle},
                  {"delay", std::uint64_t{zoom.u4Delay}}}});
 }
 
 void CallbackListener::Stopped()
 {
-    OnCallback({ListenerInterface::Control, "Stopped", {}});
+    OnCallback({CallbackId::Stopped, {}});
 }
 
 void CallbackListener::Finished(FinishedReason reason)
 {
-    OnCallback({ListenerInterface::Control, "Finished", {{"reason", NameOf(reason)}}});
+    OnCallback({CallbackId::Finished, {{"reason", NameOf(reason)}}});
 }
 
 void CallbackListener::StillOn()
 {
-    OnCallback({ListenerInterface::Control, "StillOn", {}});
+    OnCallback({CallbackId::StillOn, {}});
 }
 
 void CallbackListener::StillOff()
 {
-    OnCallback({ListenerInterface::Control, "StillOff", {}});
+    OnCallback({CallbackId::StillOff, {}});
 }
 
 void CallbackListener::Suspended()
 {
-    OnCallback({ListenerInterface::Control, "Suspended", {}});
+    OnCallback({CallbackId::Suspended, {}});
 }
 
 void CallbackListener::Resumed()
 {
-    OnCallback({ListenerInterface::Control, "Resumed", {}});
+    OnCallback({CallbackId::Resumed, {}});
 }
 
 void CallbackListener::ResumeFailed()
 {
-    OnCallback({ListenerInterface::Control, "ResumeFailed", {}});
+    OnCallback({CallbackId::ResumeFailed, {}});
 }
 
 void CallbackListener::SystemSuspended(const void* data, bd::UInt32 size)
 {
-    OnCallback({ListenerInterface::Control,
-                "SystemSuspended",
+    OnCallback({CallbackId::SystemSuspended,
                 {{"data", HexOf(data, size)}, {"size", std::uint64_t{size}}}});
 }
 
 void CallbackListener::SystemResumed(bool playing)
 {
-    OnCallback({ListenerInterface::Control, "SystemResumed", {{"playing", playing}}});
+    OnCallback({CallbackId::SystemResumed, {{"playing", playing}}});
 }
 
 void CallbackListener::SystemResumeFailed()
 {
-    OnCallback({ListenerInterface::Control, "SystemResumeFailed", {}});
+    OnCallback({CallbackId::SystemResumeFailed, {}});
 }
 
 void CallbackListener::JumpOccurred()
 {
-    OnCallback({ListenerInterface::Control, "JumpOccurred", {}});
+    OnCallback({CallbackId::JumpOccurred, {}});
 }
 
 void CallbackListener::PreloadFailed()
 {
-    OnCallback({ListenerInterface::Control, "PreloadFailed", {}});
+    OnCallback({CallbackId::PreloadFailed, {}});
 }
 
 void CallbackListener::Playlist(bd::PlayListIdDef playListId)
 {
-    OnCallback(
-        {ListenerInterface::Settings, "Playlist", {{"playListId", std::uint64_t{playListId}}}});
+    OnCallback({CallbackId::Playlist, {{"playListId", std::uint64_t{playListId}}}});
 }
 
 void CallbackListener::PlayItem(bd::PlayListIdDef playListId, bd::PlayItemIdDef playItemId,
                                 bd::VideoFormatType videoFormat,
                                 bd::VideoAspectRatioType aspectRatio)
 {
-    OnCallback({ListenerInterface::Settings,
-                "PlayItem",
+    OnCallback({CallbackId::PlayItem,
                 {{"playListId", std::uint64_t{playListId}},
                  {"playItemId", std::uint64_t{playItemId}},
                  {"videoFormat", NameOf(videoFormat)},
@@ -153,63 +145,55 @@ void CallbackListener::PlayItem(bd::PlayListIdDef playListId, bd::PlayItemIdDef 
 
 void CallbackListener::PlayMode(bd::PlayDirectionDef direction, bd::PlaySpeedDef speed)
 {
-    OnCallback({ListenerInterface::Settings,
-                "PlayMode",
-                {{"direction", NameOf(direction)}, {"speed", NameOf(speed)}}});
+    OnCallback(
+        {CallbackId::PlayMode, {{"direction", NameOf(direction)}, {"speed", NameOf(speed)}}});
 }
 
 void CallbackListener::AudioInfo(bd::StreamNumberDef number)
 {
-    OnCallback({ListenerInterface::Settings, "AudioInfo", {{"number", std::uint64_t{number}}}});
+    OnCallback({CallbackId::AudioInfo, {{"number", std::uint64_t{number}}}});
 }
 
 void CallbackListener::VideoInfo(bd::StreamNumberDef number)
 {
-    OnCallback({ListenerInterface::Settings, "VideoInfo", {{"number", std::uint64_t{number}}}});
+    OnCallback({CallbackId::VideoInfo, {{"number", std::uint64_t{number}}}});
 }
 
 void CallbackListener::AngleInfo(bd::AngleNumberDef number)
 {
-    OnCallback({ListenerInterface::Settings, "AngleInfo", {{"number", std::uint64_t{number}}}});
+    OnCallback({CallbackId::AngleInfo, {{"number", std::uint64_t{number}}}});
 }
 
 void CallbackListener::InteractiveGraphicsInfo(bd::StreamNumberDef number)
 {
-    OnCallback({ListenerInterface::Settings,
-                "InteractiveGraphicsInfo",
-                {{"number", std::uint64_t{number}}}});
+    OnCallback({CallbackId::InteractiveGraphicsInfo, {{"number", std::uint64_t{number}}}});
 }
 
 void CallbackListener::PresentationGraphicsInfo(bd::StreamNumberDef number, bool available)
 {
-    OnCallback({ListenerInterface::Settings,
-                "PresentationGraphicsInfo",
+    OnCallback({CallbackId::PresentationGraphicsInfo,
                 {{"number", std::uint64_t{number}}, {"available", available}}});
 }
 
 void CallbackListener::SecondaryAudioInfo(bd::StreamNumberDef number)
 {
-    OnCallback(
-        {ListenerInterface::Settings, "SecondaryAudioInfo", {{"number", std::uint64_t{number}}}});
+    OnCallback({CallbackId::SecondaryAudioInfo, {{"number", std::uint64_t{number}}}});
 }
 
 void CallbackListener::SecondaryVideoInfo(bd::StreamNumberDef number)
 {
-    OnCallback(
-        {ListenerInterface::Settings, "SecondaryVideoInfo", {{"number", std::uint64_t{number}}}});
+    OnCallback({CallbackId::SecondaryVideoInfo, {{"number", std::uint64_t{number}}}});
 }
 
 void CallbackListener::PipPgTextStInfo(bd::StreamNumberDef number, bool available)
 {
-    OnCallback({ListenerInterface::Settings,
-                "PipPgTextStInfo",
+    OnCallback({CallbackId::PipPgTextStInfo,
                 {{"number", std::uint64_t{number}}, {"available", available}}});
 }
 
 void CallbackListener::AudioInfoChanged(bool isPrimary, bd::AudioInfoType info)
 {
-    OnCallback({ListenerInterface::Settings,
-                "AudioInfoChanged",
+    OnCallback({CallbackId::AudioInfoChanged,
                 {{"isPrimary", isPrimary},
                  {"format", NameOf(info.format)},
                  {"sampleRate", NameOf(info.sampleRate)},
@@ -221,34 +205,29 @@ void CallbackListener::AudioInfoChanged(bool isPrimary, bd::AudioInfoType info)
 
 void CallbackListener::TextSubtitleStyleInfo(bd::UserStyleNumber styleNumber)
 {
-    OnCallback({ListenerInterface::Settings,
-                "TextSubtitleStyleInfo",
-                {{"styleNumber", std::uint64_t{styleNumber}}}});
+    OnCallback({CallbackId::TextSubtitleStyleInfo, {{"styleNumber", std::uint64_t{styleNumber}}}});
 }
 
 void CallbackListener::TextSubtitleStylesAvailable(bd::UInt8 numberOfStyles)
 {
-    OnCallback({ListenerInterface::Settings,
-                "TextSubtitleStylesAvailable",
+    OnCallback({CallbackId::TextSubtitleStylesAvailable,
                 {{"numberOfStyles", std::uint64_t{numberOfStyles}}}});
 }
 
 void CallbackListener::UOMask(const bdmv::UOMaskTable& mask)
 {
-    OnCallback({ListenerInterface::Settings, "UOMask", {{"forbidden", NameOf(mask)}}});
+    OnCallback({CallbackId::UOMask, {{"forbidden", NamesOf(mask)}}});
 }
 
 void CallbackListener::ChapterNumber(const bd::ChapterNumberDef& chapter)
 {
-    OnCallback(
-        {ListenerInterface::Settings, "ChapterNumber", {{"chapter", std::uint64_t{chapter}}}});
+    OnCallback({CallbackId::ChapterNumber, {{"chapter", std::uint64_t{chapter}}}});
 }
 
 void CallbackListener::MarkInfo(bd::PlayListIdDef playListId, const bd::PlayListMarkIdDef& markId,
                                 const bd::TimePosition& time)
 {
-    OnCallback({ListenerInterface::Settings,
-                "MarkInfo",
+    OnCallback({CallbackId::MarkInfo,
                 {{"playListId", std::uint64_t{playListId}},
                  {"markId", std::uint64_t{markId}},
                  {"time", Position{time}}}});
@@ -256,59 +235,55 @@ void CallbackListener::MarkInfo(bd::PlayListIdDef playListId, const bd::PlayList
 
 void CallbackListener::CurrentTimePosition(const bd::TimePosition& position)
 {
-    OnCallback(
-        {ListenerInterface::Settings, "CurrentTimePosition", {{"position", Position{position}}}});
+    OnCallback({CallbackId::CurrentTimePosition, {{"position", Position{position}}}});
 }
 
 void CallbackListener::PictureInPictureAvailable()
 {
-    OnCallback({ListenerInterface::Settings, "PictureInPictureAvailable", {}});
+    OnCallback({CallbackId::PictureInPictureAvailable, {}});
 }
 
 void CallbackListener::PictureInPictureUnavailable()
 {
-    OnCallback({ListenerInterface::Settings, "PictureInPictureUnavailable", {}});
+    OnCallback({CallbackId::PictureInPictureUnavailable, {}});
 }
 
 void CallbackListener::SecondaryAudioAvailable()
 {
-    OnCallback({ListenerInterface::Settings, "SecondaryAudioAvailable", {}});
+    OnCallback({CallbackId::SecondaryAudioAvailable, {}});
 }
 
 void CallbackListener::SecondaryAudioUnavailable()
 {
-    OnCallback({ListenerInterface::Settings, "SecondaryAudioUnavailable", {}});
+    OnCallback({CallbackId::SecondaryAudioUnavailable, {}});
 }
 
 void CallbackListener::PresentationGraphicsDisplay(bool shown)
 {
-    OnCallback({ListenerInterface::Settings, "PresentationGraphicsDisplay", {{"shown", shown}}});
+    OnCallback({CallbackId::PresentationGraphicsDisplay, {{"shown", shown}}});
 }
 
 void CallbackListener::SecondaryVideoDisplay(bd::StreamNumberDef number, bool shown)
 {
-    OnCallback({ListenerInterface::Settings,
-                "SecondaryVideoDisplay",
-                {{"number", std::uint64_t{number}}, {"shown", shown}}});
+    OnCallback(
+        {CallbackId::SecondaryVideoDisplay, {{"number", std::uint64_t{number}}, {"shown", shown}}});
 }
 
 void CallbackListener::SecondaryAudioDisplay(bd::StreamNumberDef number, bool shown)
 {
-    OnCallback({ListenerInterface::Settings,
-                "SecondaryAudioDisplay",
-                {{"number", std::uint64_t{number}}, {"shown", shown}}});
+    OnCallback(
+        {CallbackId::SecondaryAudioDisplay, {{"number", std::uint64_t{number}}, {"shown", shown}}});
 }
 
 void CallbackListener::PipPgTextSelect(bool pick)
 {
-    OnCallback({ListenerInterface::Settings, "PipPgTextSelect", {{"pick", pick}}});
+    OnCallback({CallbackId::PipPgTextSelect, {{"pick", pick}}});
 }
 
 void CallbackListener::ExecuteButton(bd::UInt32 ticket, bd::ButtonId buttonId,
                                      bdmv::IProgramData::RefPtr& program)
 {
-    OnCallback({ListenerInterface::Button,
-                "ExecuteButton",
+    OnCallback({CallbackId::ExecuteButton,
                 {{"ticket", std::uint64_t{ticket}},
                  {"buttonId", std::uint64_t{buttonId}},
                  {"commands", CountCommands(program)}}});
@@ -316,42 +291,42 @@ void CallbackListener::ExecuteButton(bd::UInt32 ticket, bd::ButtonId buttonId,
 
 void CallbackListener::InteractiveGraphicsVisible()
 {
-    OnCallback({ListenerInterface::Interactive, "InteractiveGraphicsVisible", {}});
+    OnCallback({CallbackId::InteractiveGraphicsVisible, {}});
 }
 
 void CallbackListener::InteractiveGraphicsInvisible()
 {
-    OnCallback({ListenerInterface::Interactive, "InteractiveGraphicsInvisible", {}});
+    OnCallback({CallbackId::InteractiveGraphicsInvisible, {}});
 }
 
 void CallbackListener::PopUpMenuAvailable()
 {
-    OnCallback({ListenerInterface::Interactive, "PopUpMenuAvailable", {}});
+    OnCallback({CallbackId::PopUpMenuAvailable, {}});
 }
 
 void CallbackListener::PopUpMenuUnavailable()
 {
-    OnCallback({ListenerInterface::Interactive, "PopUpMenuUnavailable", {}});
+    OnCallback({CallbackId::PopUpMenuUnavailable, {}});
 }
 
 void CallbackListener::ButtonActivationBusy()
 {
-    OnCallback({ListenerInterface::Interactive, "ButtonActivationBusy", {}});
+    OnCallback({CallbackId::ButtonActivationBusy, {}});
 }
 
 void CallbackListener::ButtonActivationDone()
 {
-    OnCallback({ListenerInterface::Interactive, "ButtonActivationDone", {}});
+    OnCallback({CallbackId::ButtonActivationDone, {}});
 }
 
 void CallbackListener::InteractiveGraphicsActive()
 {
-    OnCallback({ListenerInterface::Interactive, "InteractiveGraphicsActive", {}});
+    OnCallback({CallbackId::InteractiveGraphicsActive, {}});
 }
 
 void CallbackListener::InteractiveGraphicsInactive()
 {
-    OnCallback({ListenerInterface::Interactive, "InteractiveGraphicsInactive", {}});
+    OnCallback({CallbackId::InteractiveGraphicsInactive, {}});
 }
 
 } // namespace deskplayer

@@ -11,28 +11,29 @@
 #include <vector>
 
 #include "bdmvnavigator/inavigatorlistener.h"
+#include "output/callbacks.h"
 
 namespace deskplayer
 {
 
-/** The interface that declares a callback. */
-enum class ListenerInterface { Control, Settings, Button, Interactive };
-
-/** A position on the time line of the play list, in ticks of 45 kHz. */
+/** A position on the time line of the play list, in ticks of 45 kHz; or bd::TimePositionNone. */
 struct Position {
     bd::TimePosition ticks;
 };
 
-/** An argument of a callback, by its name. Enumerations and masks travel as their names. */
+/** A value of an argument. Enumerations, sets of them, and bytes travel as their names. */
+using ArgumentValue = std::variant<bool, std::uint64_t, Position, std::string,
+                                   std::vector<std::string>, bd::ZoomRectangleDef>;
+
+/** An argument of a callback, by its name. */
 struct Argument {
     const char* name;
-    std::variant<bool, std::uint64_t, Position, std::string> value;
+    ArgumentValue value;
 };
 
 /** A callback and its arguments. */
 struct Callback {
-    ListenerInterface interface;
-    const char* name;
+    CallbackId id;
     std::vector<Argument> arguments;
 };
 
@@ -107,7 +108,7 @@ public:
     void InteractiveGraphicsActive() final;
     void InteractiveGraphicsInactive() final;
 
-protected:
+private:
     /** Called for every callback, on the delivering thread. */
     virtual void OnCallback(const Callback& callback) = 0;
 };

@@ -404,22 +404,16 @@ std::string NameOf(bdmv::INavControlListener::FinishedReason value)
     return std::to_string(value);
 }
 
-std::string NameOf(const bd::ZoomRectangleDef& rectangle)
+std::vector<std::string> NamesOf(const bdmv::UOMaskTable& mask)
 {
-    return std::to_string(rectangle.Width) + "x" + std::to_string(rectangle.Height) + "+" +
-           std::to_string(rectangle.X) + "+" + std::to_string(rectangle.Y);
-}
-
-std::string NameOf(const bdmv::UOMaskTable& mask)
-{
-    std::string names;
+    std::vector<std::string> names;
     for (int bit = 0; bit < 8 * bdmv::UOMaskTable::UO_MASK_TABLE_SIZE; ++bit) {
         const auto operation = static_cast<bd::UserOperationMaskDef>(bit);
         if (mask.IsSet(operation)) {
-            names += (names.empty() ? "" : ",") + NameOf(operation);
+            names.push_back(NameOf(operation));
         }
     }
-    return names.empty() ? "nothing" : names;
+    return names;
 }
 
 std::string HexOf(const void* data, bd::UInt32 size)

@@ -6,6 +6,7 @@
 #define DESKPLAYER_OUTPUT_NAMES_H
 
 #include <string>
+#include <vector>
 
 #include "bd/types.h"
 #include "bdmvnavigator/inavcontrollistener.h"
@@ -26,11 +27,8 @@ std::string NameOf(bd::AudioChannelType value);
 std::string NameOf(bd::UserOperationMaskDef value);
 std::string NameOf(bdmv::INavControlListener::FinishedReason value);
 
-/** Width x height, then the offsets from the left and from the top. */
-std::string NameOf(const bd::ZoomRectangleDef& rectangle);
-
 /** The operations that are forbidden. */
-std::string NameOf(const bdmv::UOMaskTable& mask);
+std::vector<std::string> NamesOf(const bdmv::UOMaskTable& mask);
 
 /** Two hexadecimal digits a byte. */
 std::string HexOf(const void* data, bd::UInt32 size);

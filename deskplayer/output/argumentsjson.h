@@ -1,0 +1,23 @@
+/**
+ * @file
+ * The arguments of a callback in JSON.
+ */
+#ifndef DESKPLAYER_OUTPUT_ARGUMENTSJSON_H
+#define DESKPLAYER_OUTPUT_ARGUMENTSJSON_H
+
+#include <nlohmann/json.hpp>
+
+#include "output/callbacklistener.h"
+
+namespace deskplayer
+{
+
+/**
+ * An object with a member for every argument, in their order. Positions are numbers of ticks of
+ * 45 kHz, or null; rectangles are objects.
+ */
+nlohmann::ordered_json ArgumentsJson(const Callback& callback);
+
+} // namespace deskplayer
+
+#endif

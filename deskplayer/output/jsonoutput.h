@@ -1,0 +1,29 @@
+/**
+ * @file
+ * Callbacks for programs, one JSON object a line.
+ */
+#ifndef DESKPLAYER_OUTPUT_JSONOUTPUT_H
+#define DESKPLAYER_OUTPUT_JSONOUTPUT_H
+
+#include "output/output.h"
+
+namespace deskplayer
+{
+
+/**
+ * Writes one JSON object a callback, each on a line of its own. docs/outputs.md tells the members.
+ *
+ *     {"ticks":900000,"time":"00:00:20.000","interface":"control","callback":"Paused","arguments":{}}
+ */
+class JsonOutput : public Output
+{
+public:
+    using Output::Output;
+
+private:
+    void Write(const Callback& callback) override;
+};
+
+} // namespace deskplayer
+
+#endif

@@ -1,0 +1,65 @@
+/**
+ * @file
+ * Callbacks on a stream.
+ */
+#ifndef DESKPLAYER_OUTPUT_OUTPUT_H
+#define DESKPLAYER_OUTPUT_OUTPUT_H
+
+#include <cstdint>
+#include <ostream>
+
+#include "navigator/virtualclock.h"
+#include "output/callbacklistener.h"
+#include "output/outputfilter.h"
+
+namespace deskplayer
+{
+
+/**
+ * Writes the callbacks that a filter lets through, with the time of the session.
+ *
+ * It writes on the delivering thread and never flushes. What it has written is complete once it is
+ * destroyed; whether it reached its destination is for the stream to tell.
+ */
+class Output : public CallbackListener
+{
+public:
+    /** @param stream does not throw; it and @p clock must outlive the output */
+    Output(std::ostream& stream, const VirtualClock& clock, const OutputFilter& filter)
+        : m_rStream(stream), m_rClock(clock), m_Filter(filter)
+    {
+    }
+
+    ~Output() override = default;
+    Output(const Output&) = delete;
+    Output& operator=(const Output&) = delete;
+
+protected:
+    std::ostream& Stream() { return m_rStream; }
+
+    /** The time of the session in ticks of 45 kHz. */
+    std::uint64_t Now() const { return m_rClock.Now(); }
+
+private:
+    /** Called for every callback, for outputs that must know what the filter hides. */
+    virtual void Follow(const Callback& /*callback*/) {}
+
+    /** Called for every callback that the filter lets through, after Follow(). */
+    virtual void Write(const Callback& callback) = 0;
+
+    void OnCallback(const Callback& callback) final
+    {
+        Follow(callback);
+        if (m_Filter.Passes(callback.id)) {
+            Write(callback);
+        }
+    }
+
+    std::ostream& m_rStream;
+    const VirtualClock& m_rClock;
+    OutputFilter m_Filter;
+};
+
+} // namespace deskplayer
+
+#endif

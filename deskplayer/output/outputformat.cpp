@@ -1,0 +1,31 @@
+#include "output/outputformat.h"
+
+#include "output/choice.h"
+#include "output/jsonoutput.h"
+#include "output/textoutput.h"
+#include "output/traceoutput.h"
+
+namespace deskplayer
+{
+
+OutputFormat ParseOutputFormat(std::string_view name)
+{
+    return static_cast<OutputFormat>(
+        FindChoice(name, "output format", {OutputFormatNames.begin(), OutputFormatNames.end()}));
+}
+
+std::unique_ptr<Output> MakeOutput(const OutputOptions& options, std::ostream& stream,
+                                   const VirtualClock& clock)
+{
+    switch (options.format) {
+    case OutputFormat::Json:
+        return std::make_unique<JsonOutput>(stream, clock, options.filter);
+    case OutputFormat::Trace:
+        return std::make_unique<TraceOutput>(stream, clock, options.filter);
+    case OutputFormat::Text:
+        break;
+    }
+    return std::make_unique<TextOutput>(stream, clock, options.filter, options.coloured);
+}
+
+} // namespace deskplayer

@@ -1,0 +1,46 @@
+/**
+ * @file
+ * The formats in which callbacks can be written.
+ */
+#ifndef DESKPLAYER_OUTPUT_OUTPUTFORMAT_H
+#define DESKPLAYER_OUTPUT_OUTPUTFORMAT_H
+
+#include <array>
+#include <memory>
+#include <ostream>
+#include <string_view>
+
+#include "output/output.h"
+
+namespace deskplayer
+{
+
+enum class OutputFormat {
+    Text, ///< TextOutput
+    Json, ///< JsonOutput
+    Trace ///< TraceOutput
+};
+
+/** By the value of OutputFormat. */
+inline constexpr std::array<std::string_view, 3> OutputFormatNames{"text", "json", "trace"};
+
+/**
+ * @param name one of OutputFormatNames
+ * @throw std::invalid_argument names the word that is none and all that there are
+ */
+OutputFormat ParseOutputFormat(std::string_view name);
+
+/** What to write, and how. */
+struct OutputOptions {
+    OutputFormat format = OutputFormat::Text;
+    OutputFilter filter;
+    bool coloured = false; ///< counts for text only
+};
+
+/** @param stream does not throw; it and @p clock must outlive the output */
+std::unique_ptr<Output> MakeOutput(const OutputOptions& options, std::ostream& stream,
+                                   const VirtualClock& clock);
+
+} // namespace deskplayer
+
+#endif

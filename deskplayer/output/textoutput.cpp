@@ -1,0 +1,116 @@
+#include "output/textoutput.h"
+
+#include <unistd.h>
+
+#include "bd/constants.h"
+#include "output/timetext.h"
+
+namespace deskplayer
+{
+
+namespace
+{
+
+/** Of the longest callback with arguments, PresentationGraphicsDisplay; others stand alone. */
+constexpr std::size_t NameWidth = 27;
+
+// Control sequences of a terminal.
+constexpr const char* Reset = "\033[0m";
+constexpr const char* Dim = "\033[2m";
+constexpr const char* Green = "\033[32m";
+constexpr const char* Yellow = "\033[33m";
+constexpr const char* Magenta = "\033[35m";
+constexpr const char* Cyan = "\033[36m";
+
+const char* ColourOf(ListenerInterface interface)
+{
+    switch (interface) {
+    case ListenerInterface::Control:
+        return Green;
+    case ListenerInterface::Settings:
+        return Cyan;
+    case ListenerInterface::Button:
+        return Yellow;
+    case ListenerInterface::Interactive:
+        return Magenta;
+    }
+    return Reset;
+}
+
+std::string ValueText(bool value)
+{
+    return value ? "true" : "false";
+}
+
+std::string ValueText(std::uint64_t value)
+{
+    return std::to_string(value);
+}
+
+std::string ValueText(Position position)
+{
+    return position.ticks == bd::TimePositionNone ? "none" : TimeText(position.ticks);
+}
+
+std::string ValueText(const std::string& value)
+{
+    return value;
+}
+
+std::string ValueText(const std::vector<std::string>& names)
+{
+    std::string text;
+    for (const std::string& name : names) {
+        text += (text.empty() ? "" : ",") + name;
+    }
+    return text.empty() ? "nothing" : text;
+}
+
+std::string ValueText(const bd::ZoomRectangleDef& rectangle)
+{
+    return std::to_string(rectangle.Width) + "x" + std::to_string(rectangle.Height) + "+" +
+           std::to_string(rectangle.X) + "+" + std::to_string(rectangle.Y);
+}
+
+} // namespace
+
+TextOutput::TextOutput(std::ostream& stream, const VirtualClock& clock, const OutputFilter& filter,
+                       bool coloured)
+    : Output(stream, clock, filter), m_Coloured(coloured)
+{
+}
+
+void TextOutput::Write(const Callback& callback)
+{
+    const CallbackInfo& info = InfoOf(callback.id);
+
+    Paint(TimeText(Now()), Dim);
+    Stream() << "  ";
+    Paint(info.name, ColourOf(info.interface));
+    if (!callback.arguments.empty()) {
+        Stream() << std::string(NameWidth - info.name.size(), ' ');
+    }
+    for (const Argument& argument : callback.arguments) {
+        Stream() << ' ';
+        Paint(std::string(argument.name) + "=", Dim);
+        Stream() << std::visit([](const auto& value) { return ValueText(value); }, argument.value);
+    }
+    Stream() << '\n';
+}
+
+void TextOutput::Paint(std::string_view text, const char* colour)
+{
+    if (m_Coloured) {
+        Stream() << colour << text << Reset;
+    } else {
+        Stream() << text;
+    }
+}
+
+bool WantsColours(int fileDescriptor, const char* noColor)
+{
+    const bool forbidden = noColor != nullptr && *noColor != '\0';
+    return !forbidden && isatty(fileDescriptor) == 1;
+}
+
+} // namespace deskplayer

@@ -1,0 +1,51 @@
+/**
+ * @file
+ * Callbacks as a person reads them.
+ */
+#ifndef DESKPLAYER_OUTPUT_TEXTOUTPUT_H
+#define DESKPLAYER_OUTPUT_TEXTOUTPUT_H
+
+#include <string_view>
+
+#include "output/output.h"
+
+namespace deskplayer
+{
+
+/**
+ * Writes one line a callback: the time of the session, the callback, and its arguments by name.
+ *
+ *     00:00:20.000  Stepped                     position=00:00:20.041 direction=Forward
+ *
+ * Colours make out the callback, one for each interface; times and names of arguments are dim.
+ */
+class TextOutput : public Output
+{
+public:
+    /**
+     * @param stream   does not throw; it and @p clock must outlive the output
+     * @param coloured whether to write the terminal's control sequences for colours
+     */
+    TextOutput(std::ostream& stream, const VirtualClock& clock, const OutputFilter& filter,
+               bool coloured);
+
+private:
+    void Write(const Callback& callback) override;
+    void Paint(std::string_view text, const char* colour);
+
+    bool m_Coloured;
+};
+
+/**
+ * Whether a user wants colours on an open file: it is a terminal, and the user's environment does
+ * not forbid them.
+ *
+ * @param fileDescriptor of the file
+ * @param noColor        value of the environment variable NO_COLOR, which forbids colours when it
+ *                       is not empty; null when it is not set
+ */
+bool WantsColours(int fileDescriptor, const char* noColor);
+
+} // namespace deskplayer
+
+#endif

@@ -1,0 +1,255 @@
+#include "output/traceoutput.h"
+
+#include <algorithm>
+#include <array>
+
+#include "output/argumentsjson.h"
+
+namespace deskplayer
+{
+
+using nlohmann::ordered_json;
+
+/** From top to bottom. */
+enum class TraceOutput::Track : std::size_t {
+    Playback,
+    PlayMode,
+    PlayList,
+    PlayItem,
+    Chapter,
+    Video,
+    Audio,
+    Subtitles,
+    Angle,
+    InteractiveGraphics,
+    SecondaryVideo,
+    SecondaryAudio,
+    PipSubtitles,
+    Menu,
+    FirstInterface ///< of one for the callbacks of every ListenerInterface
+};
+
+namespace
+{
+
+/** By the value of TraceOutput::Track. */
+constexpr std::array<std::string_view, 18> TrackNames{"playback",
+                                                      "play mode",
+                                                      "play list",
+                                                      "play item",
+                                                      "chapter",
+                                                      "video",
+                                                      "audio",
+                                                      "subtitles",
+                                                      "angle",
+                                                      "interactive graphics",
+                                                      "secondary video",
+                                                      "secondary audio",
+                                                      "picture-in-picture subtitles",
+                                                      "menu",
+                                                      NameOf(ListenerInterface::Control),
+                                                      NameOf(ListenerInterface::Settings),
+                                                      NameOf(ListenerInterface::Button),
+                                                      NameOf(ListenerInterface::Interactive)};
+
+constexpr int Process = 1;
+
+/** What a viewer is to know of the process or of one of its threads, which are the tracks. */
+template <typename Value>
+ordered_json Metadata(const char* name, std::size_t thread, const char* member, const Value& value)
+{
+    return {{"ph", "M"},
+            {"pid", Process},
+            {"tid", thread},
+            {"name", name},
+            {"args", {{member, value}}}};
+}
+
+/** Whole microseconds, which are enough to tell ticks of 45 kHz apart. */
+std::uint64_t Microseconds(std::uint64_t ticks)
+{
+    return (ticks * 200 + 4) / 9;
+}
+
+/** @param name of an argument that the callback has */
+template <typename Value> const Value& ValueOf(std::string_view name, const Callback& callback)
+{
+    const auto argument =
+        std::find_if(callback.arguments.begin(), callback.arguments.end(),
+                     [name](const Argument& candidate) { return candidate.name == name; });
+    return std::get<Value>(argument->value);
+}
+
+} // namespace
+
+TraceOutput::TraceOutput(std::ostream& stream, const VirtualClock& clock,
+                         const OutputFilter& filter)
+    : Output(stream, clock, filter)
+{
+    for (const std::string_view name : TrackNames) {
+        m_Tracks.push_back({std::string(name), false, ""});
+    }
+    Append(Metadata("process_name", 0, "name", "session"));
+}
+
+TraceOutput::~TraceOutput()
+{
+    for (std::size_t track = 0; track < m_Tracks.size(); ++track) {
+        End(static_cast<Track>(track));
+    }
+    Stream() << "\n]\n";
+}
+
+void TraceOutput::Follow(const Callback& callback)
+{
+    switch (callback.id) {
+    case CallbackId::PlayStarted:
+    case CallbackId::Continued:
+    case CallbackId::Resumed:
+        Begin(Track::Playback, "Playing", callback);
+        break;
+    case CallbackId::Paused:
+        Begin(Track::Playback, "Paused", callback);
+        break;
+    case CallbackId::StillOn:
+        Begin(Track::Playback, "Still", callback);
+        break;
+    case CallbackId::StillOff:
+        if (StateOf(Track::Playback).slice == "Still") {
+            Begin(Track::Playback, "Playing", callback);
+        }
+        break;
+    case CallbackId::Suspended:
+        Begin(Track::Playback, "Suspended", callback);
+        break;
+    case CallbackId::SystemSuspended:
+        Begin(Track::Playback, "Standby", callback);
+        break;
+    case CallbackId::SystemResumed:
+        if (ValueOf<bool>("playing", callback)) {
+            Begin(Track::Playback, "Playing", callback);
+        } else {
+            EndPlayback();
+        }
+        break;
+    case CallbackId::PlayFailed:
+    case CallbackId::Stopped:
+    case CallbackId::Finished:
+    case CallbackId::ResumeFailed:
+    case CallbackId::SystemResumeFailed:
+        EndPlayback();
+        break;
+
+    case CallbackId::PlayMode:
+        Begin(Track::PlayMode,
+              ValueOf<std::string>("direction", callback) + " " +
+                  ValueOf<std::string>("speed", callback),
+              callback);
+        break;
+    case CallbackId::Playlist:
+        BeginNumbered(Track::PlayList, "playListId", callback);
+        break;
+    case CallbackId::PlayItem:
+        BeginNumbered(Track::PlayItem, "playItemId", callback);
+        break;
+    case CallbackId::ChapterNumber:
+        BeginNumbered(Track::Chapter, "chapter", callback);
+        break;
+
+    case CallbackId::VideoInfo:
+        BeginNumbered(Track::Video, "number", callback);
+        break;
+    case CallbackId::AudioInfo:
+        BeginNumbered(Track::Audio, "number", callback);
+        break;
+    case CallbackId::PresentationGraphicsInfo:
+        BeginNumbered(Track::Subtitles, "number", callback);
+        break;
+    case CallbackId::AngleInfo:
+        BeginNumbered(Track::Angle, "number", callback);
+        break;
+    case CallbackId::InteractiveGraphicsInfo:
+        BeginNumbered(Track::InteractiveGraphics, "number", callback);
+        break;
+    case CallbackId::SecondaryVideoInfo:
+        BeginNumbered(Track::SecondaryVideo, "number", callback);
+        break;
+    case CallbackId::SecondaryAudioInfo:
+        BeginNumbered(Track::SecondaryAudio, "number", callback);
+        break;
+    case CallbackId::PipPgTextStInfo:
+        BeginNumbered(Track::PipSubtitles, "number", callback);
+        break;
+
+    case CallbackId::InteractiveGraphicsVisible:
+        Begin(Track::Menu, "Visible", callback);
+        break;
+    case CallbackId::InteractiveGraphicsInvisible:
+        End(Track::Menu);
+        break;
+
+    default:
+        break;
+    }
+}
+
+void TraceOutput::Write(const Callback& callback)
+{
+    const CallbackInfo& info = InfoOf(callback.id);
+    const auto track =
+        static_cast<std::size_t>(Track::FirstInterface) + static_cast<std::size_t>(info.interface);
+    AppendEvent(static_cast<Track>(track), "i",
+                {{"s", "t"}, {"name", info.name}, {"args", ArgumentsJson(callback)}});
+}
+
+void TraceOutput::Begin(Track track, const std::string& slice, const Callback& callback)
+{
+    End(track);
+    AppendEvent(track, "B", {{"name", slice}, {"args", ArgumentsJson(callback)}});
+    StateOf(track).slice = slice;
+}
+
+void TraceOutput::BeginNumbered(Track track, std::string_view number, const Callback& callback)
+{
+    Begin(track,
+          StateOf(track).name + " " + std::to_string(ValueOf<std::uint64_t>(number, callback)),
+          callback);
+}
+
+void TraceOutput::End(Track track)
+{
+    if (!StateOf(track).slice.empty()) {
+        AppendEvent(track, "E", ordered_json::object());
+        StateOf(track).slice.clear();
+    }
+}
+
+void TraceOutput::EndPlayback()
+{
+    for (const Track track :
+         {Track::Playback, Track::PlayMode, Track::PlayList, Track::PlayItem, Track::Chapter}) {
+        End(track);
+    }
+}
+
+void TraceOutput::AppendEvent(Track track, const char* phase, const ordered_json& members)
+{
+    const auto thread = static_cast<std::size_t>(track) + 1;
+    if (!StateOf(track).named) {
+        Append(Metadata("thread_name", thread, "name", StateOf(track).name));
+        Append(Metadata("thread_sort_index", thread, "sort_index", thread));
+        StateOf(track).named = true;
+    }
+    ordered_json event = {
+        {"ph", phase}, {"ts", Microseconds(Now())}, {"pid", Process}, {"tid", thread}};
+    event.update(members);
+    Append(event);
+}
+
+void TraceOutput::Append(const ordered_json& event)
+{
+    Stream() << m_Separator << event.dump();
+    m_Separator = ",\n";
+}
+
+} // namespace deskplayer

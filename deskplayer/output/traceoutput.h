@@ -1,0 +1,66 @@
+/**
+ * @file
+ * Callbacks for viewers of traces.
+ */
+#ifndef DESKPLAYER_OUTPUT_TRACEOUTPUT_H
+#define DESKPLAYER_OUTPUT_TRACEOUTPUT_H
+
+#include <cstddef>
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include <nlohmann/json_fwd.hpp>
+
+#include "output/output.h"
+
+namespace deskplayer
+{
+
+/**
+ * Writes a trace in the JSON array form of the trace-event format: what lasts as slices on tracks
+ * of its own, and every callback that the filter lets through as an instant on the track of its
+ * interface.
+ *
+ * The filter does not reach the slices: they would tell of states that had long ended.
+ *
+ * A slice lasts from the callback that tells of it until another one on its track; those of
+ * playback itself end with playback. What is still open ends when the output is destroyed, which
+ * completes the trace. Memory does not grow with the session.
+ */
+class TraceOutput : public Output
+{
+public:
+    /** @copydoc Output::Output */
+    TraceOutput(std::ostream& stream, const VirtualClock& clock, const OutputFilter& filter);
+
+    /** Completes the trace, at the time at which the clock then stands. */
+    ~TraceOutput() override;
+
+private:
+    enum class Track : std::size_t;
+
+    struct TrackState {
+        std::string name;
+        bool named = false; ///< in the trace: only tracks with something on them are
+        std::string slice;  ///< the open one; empty when there is none
+    };
+
+    void Follow(const Callback& callback) override;
+    void Write(const Callback& callback) override;
+
+    void Begin(Track track, const std::string& slice, const Callback& callback);
+    void BeginNumbered(Track track, std::string_view number, const Callback& callback);
+    void End(Track track);
+    void EndPlayback();
+    void AppendEvent(Track track, const char* phase, const nlohmann::ordered_json& members);
+    void Append(const nlohmann::ordered_json& event);
+    TrackState& StateOf(Track track) { return m_Tracks[static_cast<std::size_t>(track)]; }
+
+    std::vector<TrackState> m_Tracks; ///< by the value of Track
+    const char* m_Separator = "[\n";  ///< before the next event
+};
+
+} // namespace deskplayer
+
+#endif

@@ -1,0 +1,105 @@
+// What docs/outputs.md shows is what is written.
+
+#include <gtest/gtest.h>
+
+#include <algorithm>
+#include <fstream>
+#include <sstream>
+
+#include "everycallback.h"
+#include "output/outputformat.h"
+
+namespace deskplayer
+{
+namespace
+{
+
+std::string Documentation()
+{
+    std::ostringstream text;
+    text << std::ifstream(BDMVNAVIGATOR_DOCS "/outputs.md").rdbuf();
+    return text.str();
+}
+
+/** The session of the documentation's examples. */
+std::string Example(OutputFormat format)
+{
+    OutputOptions options;
+    options.format = format;
+    std::ostringstream stream;
+    VirtualClock clock;
+    {
+        const std::unique_ptr<Output> output = MakeOutput(options, stream, clock);
+        output->PlayStarted();
+        output->PlayItem(800, 0, bd::VideoFormatType1080p, bd::VideoAspectRatioType16x9);
+        clock.Advance(45000 * 58);
+        output->Paused();
+        clock.Advance(45000 * 2);
+        output->Stepped(45000 * 58 + 1877, bd::PlayDirectionForward);
+        output->Finished(bdmv::INavControlListener::EndOfMedia);
+    }
+    return stream.str();
+}
+
+std::string KindOf(bool /*value*/)
+{
+    return "boolean";
+}
+
+std::string KindOf(std::uint64_t /*value*/)
+{
+    return "number";
+}
+
+std::string KindOf(Position /*value*/)
+{
+    return "position";
+}
+
+std::string KindOf(const std::string& /*value*/)
+{
+    return "text";
+}
+
+std::string KindOf(const std::vector<std::string>& /*value*/)
+{
+    return "names";
+}
+
+std::string KindOf(const bd::ZoomRectangleDef& /*value*/)
+{
+    return "rectangle";
+}
+
+TEST(Documentation, ShowsTrueExamples)
+{
+    const std::string documentation = Documentation();
+    for (const OutputFormat format :
+         {OutputFormat::Text, OutputFormat::Json, OutputFormat::Trace}) {
+        const std::string example = Example(format);
+        EXPECT_NE(documentation.find("\n" + example + "```\n"), std::string::npos) << example;
+    }
+}
+
+TEST(Documentation, ListsEveryCallbackWithItsArguments)
+{
+    const std::string documentation = Documentation();
+    CollectingListener listener;
+    CallEveryCallback(listener);
+
+    for (const Callback& callback : listener.callbacks) {
+        const CallbackInfo& info = InfoOf(callback.id);
+        std::string row = "| `";
+        row.append(info.name).append("` | ").append(NameOf(info.interface)).append(" |");
+        const char* separator = " ";
+        for (const Argument& argument : callback.arguments) {
+            row.append(separator).append("`").append(argument.name).append("` ");
+            row += std::visit([](const auto& value) { return KindOf(value); }, argument.value);
+            separator = ", ";
+        }
+        EXPECT_NE(documentation.find("\n" + row + " |\n"), std::string::npos) << row << " |";
+    }
+}
+
+} // namespace
+} // namespace deskplayer

@@ -1,0 +1,125 @@
+#include "output/outputfilter.h"
+
+#include <gtest/gtest.h>
+
+#include <stdexcept>
+#include <string>
+
+namespace deskplayer
+{
+namespace
+{
+
+std::size_t CountPassing(const OutputFilter& filter)
+{
+    std::size_t count = 0;
+    for (std::size_t id = 0; id < AllCallbacks.size(); ++id) {
+        count += filter.Passes(static_cast<CallbackId>(id)) ? 1 : 0;
+    }
+    return count;
+}
+
+template <typename Operation> std::string MessageOf(Operation operation)
+{
+    try {
+        operation();
+    } catch (const std::invalid_argument& error) {
+        return error.what();
+    }
+    return "no error";
+}
+
+TEST(OutputFilter, PassesEverythingAtFirst)
+{
+    EXPECT_EQ(CountPassing(OutputFilter()), AllCallbacks.size());
+}
+
+TEST(OutputFilter, KeepsTheCallbacksOfInterfaces)
+{
+    OutputFilter filter;
+    filter.KeepInterfaces("interactive,button");
+
+    EXPECT_EQ(CountPassing(filter), 9U);
+    EXPECT_TRUE(filter.Passes(CallbackId::ExecuteButton));
+    EXPECT_TRUE(filter.Passes(CallbackId::InteractiveGraphicsInactive));
+    EXPECT_FALSE(filter.Passes(CallbackId::PlayStarted));
+    EXPECT_FALSE(filter.Passes(CallbackId::AudioInfo));
+}
+
+TEST(OutputFilter, KeepsCallbacksByName)
+{
+    OutputFilter filter;
+    filter.KeepCallbacks("PlayItem,AudioInfo");
+
+    EXPECT_EQ(CountPassing(filter), 2U);
+    EXPECT_TRUE(filter.Passes(CallbackId::PlayItem));
+    EXPECT_TRUE(filter.Passes(CallbackId::AudioInfo));
+}
+
+TEST(OutputFilter, KeepsWhatIsNamedTwiceOnce)
+{
+    OutputFilter filter;
+    filter.KeepCallbacks("PlayItem,PlayItem");
+
+    EXPECT_EQ(CountPassing(filter), 1U);
+}
+
+TEST(OutputFilter, NarrowsWithEveryOperation)
+{
+    OutputFilter filter;
+    filter.KeepInterfaces("control");
+    filter.KeepCallbacks("Paused,PlayItem");
+
+    EXPECT_EQ(CountPassing(filter), 1U);
+    EXPECT_TRUE(filter.Passes(CallbackId::Paused));
+
+    filter.KeepInterfaces("settings");
+    EXPECT_EQ(CountPassing(filter), 0U);
+}
+
+TEST(OutputFilter, NamesAnUnknownInterfaceAndThoseThereAre)
+{
+    OutputFilter filter;
+
+    EXPECT_EQ(MessageOf([&] { filter.KeepInterfaces("control,buttons"); }),
+              "'buttons' is no listener interface; expected control, settings, button or "
+              "interactive");
+}
+
+TEST(OutputFilter, NamesAnUnknownCallbackAndThoseThereAre)
+{
+    OutputFilter filter;
+    const std::string message = MessageOf([&] { filter.KeepCallbacks("PlayItem,playitem"); });
+
+    EXPECT_EQ(message.rfind("'playitem' is no callback; expected PlayStarted, ", 0), 0U) << message;
+    for (const CallbackInfo& info : AllCallbacks) {
+        EXPECT_NE(message.find(' ' + std::string(info.name)), std::string::npos) << info.name;
+    }
+}
+
+TEST(OutputFilter, RefusesEmptyWords)
+{
+    for (const char* list : {"", ",control", "control,", "control,,button"}) {
+        OutputFilter filter;
+        EXPECT_EQ(MessageOf([&] { filter.KeepInterfaces(list); }).rfind("'' is no", 0), 0U) << list;
+    }
+}
+
+TEST(OutputFilter, StaysAsItIsWhenAWordIsWrong)
+{
+    OutputFilter filter;
+    EXPECT_THROW(filter.KeepCallbacks("Paused,?"), std::invalid_argument);
+
+    EXPECT_EQ(CountPassing(filter), AllCallbacks.size());
+}
+
+TEST(OutputFilter, MakesWordsInMessagesPrintable)
+{
+    OutputFilter filter;
+
+    EXPECT_EQ(MessageOf([&] { filter.KeepInterfaces("\033[31m"); }).rfind("'\\x1B[31m' is no", 0),
+              0U);
+}
+
+} // namespace
+} // namespace deskplayer

@@ -1,0 +1,68 @@
+#include "output/outputformat.h"
+
+#include <gtest/gtest.h>
+
+#include <sstream>
+#include <stdexcept>
+
+namespace deskplayer
+{
+namespace
+{
+
+/** The beginning of a session that is paused. */
+std::string Written(const OutputOptions& options)
+{
+    std::ostringstream stream;
+    VirtualClock clock;
+    const std::unique_ptr<Output> output = MakeOutput(options, stream, clock);
+    output->Paused();
+    return stream.str();
+}
+
+TEST(OutputFormat, IsParsedByItsName)
+{
+    EXPECT_EQ(ParseOutputFormat("text"), OutputFormat::Text);
+    EXPECT_EQ(ParseOutputFormat("json"), OutputFormat::Json);
+    EXPECT_EQ(ParseOutputFormat("trace"), OutputFormat::Trace);
+}
+
+TEST(OutputFormat, NamesAnUnknownNameAndThoseThereAre)
+{
+    try {
+        ParseOutputFormat("xml");
+        FAIL() << "no error";
+    } catch (const std::invalid_argument& error) {
+        EXPECT_STREQ(error.what(), "'xml' is no output format; expected text, json or trace");
+    }
+}
+
+TEST(OutputFormat, DecidesWhatIsMade)
+{
+    OutputOptions options;
+    EXPECT_EQ(Written(options).substr(0, 12), "00:00:00.000");
+
+    options.format = OutputFormat::Json;
+    EXPECT_EQ(Written(options).front(), '{');
+
+    options.format = OutputFormat::Trace;
+    EXPECT_EQ(Written(options).front(), '[');
+}
+
+TEST(OutputFormat, IsFollowedByTheOtherOptions)
+{
+    OutputOptions options;
+    options.coloured = true;
+    EXPECT_NE(Written(options).find('\033'), std::string::npos);
+
+    for (const OutputFormat format : {OutputFormat::Text, OutputFormat::Json}) {
+        options.format = format;
+        options.filter.KeepCallbacks("Stopped");
+        EXPECT_EQ(Written(options), "");
+    }
+    options.format = OutputFormat::Trace;
+    EXPECT_EQ(Written(options).find("\"ph\":\"i\""), std::string::npos);
+}
+
+} // namespace
+} // namespace deskplayer

@@ -1,0 +1,391 @@
+#include "output/traceoutput.h"
+
+#include <gtest/gtest.h>
+
+#include <functional>
+#include <map>
+#include <optional>
+#include <sstream>
+
+#include <nlohmann/json.hpp>
+
+#include "everycallback.h"
+
+namespace deskplayer
+{
+namespace
+{
+
+using nlohmann::json;
+
+/** An event of a trace that has a time. */
+struct TimedEvent {
+    std::string phase;
+    std::string track;
+    std::uint64_t microseconds;
+    std::string name; ///< empty for the end of a slice
+    json arguments;
+};
+
+/** A trace as a viewer reads it. */
+struct ReadTrace {
+    std::vector<TimedEvent> events;
+    std::map<int, std::string> tracks; ///< by their place
+
+    /** Fails the test when a track is not named and placed before its first event. */
+    explicit ReadTrace(const json& trace)
+    {
+        std::map<int, std::string> names;
+        std::map<int, int> places;
+        for (const json& event : trace) {
+            const std::string phase = event.at("ph");
+            const std::string name = event.value("name", "");
+            const json arguments = event.value("args", json());
+            const int thread = event.at("tid");
+            EXPECT_EQ(event.at("pid"), 1) << event;
+            if (name == "thread_name") {
+                EXPECT_TRUE(names.emplace(thread, arguments.at("name")).second) << event;
+            } else if (name == "thread_sort_index") {
+                EXPECT_TRUE(places.emplace(thread, arguments.at("sort_index")).second) << event;
+                tracks[arguments.at("sort_index")] = names.at(thread);
+            } else if (phase != "M") {
+                EXPECT_EQ(places.count(thread), 1U) << event;
+                events.push_back({phase, names.at(thread), event.at("ts"), name, arguments});
+            }
+        }
+    }
+};
+
+/** A session that is traced. */
+class TracedSession
+{
+public:
+    explicit TracedSession(const OutputFilter& filter = OutputFilter())
+    {
+        m_Output.emplace(m_Stream, m_Clock, filter);
+    }
+
+    bdmv::INavigatorListener* operator->() { return &*m_Output; }
+
+    void Pass(std::uint64_t ticks) { m_Clock.Advance(ticks); }
+    void PassSecond() { Pass(45000); }
+
+    /** Ends the session. */
+    json Trace()
+    {
+        m_Output.reset();
+        return json::parse(m_Stream.str());
+    }
+
+    /**
+     * Ends the session and tells the slices of a track, with times in milliseconds:
+     *
+     *     "Playing 0-1000, Paused 1000-2000"
+     */
+    std::string Slices(const std::string& track)
+    {
+        std::string slices;
+        for (const TimedEvent& event : ReadTrace(Trace()).events) {
+            const std::string time = std::to_string(event.microseconds / 1000);
+            if (event.track == track && event.phase == "B") {
+                slices += (slices.empty() ? "" : ", ") + event.name + " " + time + "-";
+            } else if (event.track == track && event.phase == "E") {
+                slices += time;
+            }
+        }
+        return slices;
+    }
+
+private:
+    std::ostringstream m_Stream;
+    VirtualClock m_Clock;
+    std::optional<TraceOutput> m_Output;
+};
+
+TEST(TraceOutput, IsValidWhenNothingHappened)
+{
+    const json trace = TracedSession().Trace();
+
+    ASSERT_EQ(trace.size(), 1U);
+    EXPECT_EQ(trace[0].at("name"), "process_name");
+}
+
+TEST(TraceOutput, HasAnInstantForEveryCallbackOnTheTrackOfItsInterface)
+{
+    TracedSession session;
+    CallEveryCallback(*session.operator->());
+
+    std::size_t instants = 0;
+    for (const TimedEvent& event : ReadTrace(session.Trace()).events) {
+        if (event.phase == "i") {
+            ASSERT_LT(instants, AllCallbacks.size());
+            const CallbackInfo& info = AllCallbacks[instants++];
+            EXPECT_EQ(event.name, info.name);
+            EXPECT_EQ(event.track, NameOf(info.interface)) << info.name;
+        }
+    }
+    EXPECT_EQ(instants, AllCallbacks.size());
+}
+
+TEST(TraceOutput, LimitsInstantsToTheirTrack)
+{
+    TracedSession session;
+    session->JumpOccurred();
+
+    EXPECT_EQ(session.Trace().back().at("s"), "t");
+}
+
+TEST(TraceOutput, GivesTheArgumentsOfACallback)
+{
+    TracedSession session;
+    session->AngleInfo(3);
+
+    const ReadTrace trace(session.Trace());
+    ASSERT_EQ(trace.events.size(), 3U); // begin of the slice, instant, end of the slice
+    EXPECT_EQ(trace.events[0].arguments, json({{"number", 3}}));
+    EXPECT_EQ(trace.events[1].arguments, json({{"number", 3}}));
+}
+
+TEST(TraceOutput, BeginsAndEndsInTurnOnEveryTrack)
+{
+    TracedSession session;
+    for (int round = 0; round < 3; ++round) {
+        CallEveryCallback(*session.operator->());
+        session.PassSecond();
+    }
+
+    std::map<std::string, int> open;
+    for (const TimedEvent& event : ReadTrace(session.Trace()).events) {
+        if (event.phase == "B") {
+            EXPECT_EQ(++open[event.track], 1) << event.track << ' ' << event.name;
+        } else if (event.phase == "E") {
+            EXPECT_EQ(--open[event.track], 0) << event.track;
+        }
+    }
+    EXPECT_EQ(open.size(), 14U);
+    for (const auto& [track, count] : open) {
+        EXPECT_EQ(count, 0) << track;
+    }
+}
+
+TEST(TraceOutput, HasTimesThatNeverDecrease)
+{
+    TracedSession session;
+    for (int round = 0; round < 3; ++round) {
+        CallEveryCallback(*session.operator->());
+        session.PassSecond();
+    }
+
+    std::uint64_t last = 0;
+    for (const TimedEvent& event : ReadTrace(session.Trace()).events) {
+        EXPECT_GE(event.microseconds, last) << event.track << ' ' << event.name;
+        last = event.microseconds;
+    }
+    EXPECT_EQ(last, 3000000U);
+}
+
+TEST(TraceOutput, NamesAndPlacesEveryTrack)
+{
+    TracedSession session;
+    CallEveryCallback(*session.operator->());
+
+    std::string tracks;
+    for (const auto& [place, name] : ReadTrace(session.Trace()).tracks) {
+        tracks += (tracks.empty() ? "" : ", ") + name;
+    }
+    EXPECT_EQ(tracks, "playback, play mode, play list, play item, chapter, video, audio, "
+                      "subtitles, angle, interactive graphics, secondary video, secondary audio, "
+                      "picture-in-picture subtitles, menu, control, settings, button, interactive");
+}
+
+TEST(TraceOutput, HasOnlyTracksWithSomethingOnThem)
+{
+    TracedSession session;
+    session->JumpOccurred();
+
+    const std::map<int, std::string> tracks = ReadTrace(session.Trace()).tracks;
+    ASSERT_EQ(tracks.size(), 1U);
+    EXPECT_EQ(tracks.begin()->second, "control");
+}
+
+TEST(TraceOutput, GivesTimesInMicrosecondsRoundedToTheNearest)
+{
+    TracedSession session;
+    session.Pass(2); // 44.44 microseconds
+    session->JumpOccurred();
+    session.Pass(2); // 88.89 microseconds
+    session->JumpOccurred();
+
+    const ReadTrace trace(session.Trace());
+    ASSERT_EQ(trace.events.size(), 2U);
+    EXPECT_EQ(trace.events[0].microseconds, 44U);
+    EXPECT_EQ(trace.events[1].microseconds, 89U);
+}
+
+TEST(TraceOutput, ShowsPlayingPausedAndStill)
+{
+    TracedSession session;
+    session->PlayStarted();
+    session.PassSecond();
+    session->Paused();
+    session.PassSecond();
+    session->Continued(bd::PlayDirectionForward, bd::PlaySpeedNormal);
+    session.PassSecond();
+    session->StillOn();
+    session.PassSecond();
+    session->StillOff();
+    session.PassSecond();
+    session->Stopped();
+
+    EXPECT_EQ(session.Slices("playback"),
+              "Playing 0-1000, Paused 1000-2000, Playing 2000-3000, Still 3000-4000, "
+              "Playing 4000-5000");
+}
+
+TEST(TraceOutput, ShowsSuspendedAndStandby)
+{
+    TracedSession session;
+    session->PlayStarted();
+    session.PassSecond();
+    session->Suspended();
+    session.PassSecond();
+    session->Resumed();
+    session.PassSecond();
+    session->SystemSuspended(nullptr, 0);
+    session.PassSecond();
+    session->SystemResumed(true);
+    session.PassSecond();
+    session->Stopped();
+
+    EXPECT_EQ(session.Slices("playback"),
+              "Playing 0-1000, Suspended 1000-2000, Playing 2000-3000, Standby 3000-4000, "
+              "Playing 4000-5000");
+}
+
+TEST(TraceOutput, DoesNotPlayWhenAStillEndsThatPlaybackHasLeft)
+{
+    TracedSession session;
+    session->StillOn();
+    session.PassSecond();
+    session->Stopped();
+    session->StillOff();
+    session.PassSecond();
+
+    EXPECT_EQ(session.Slices("playback"), "Still 0-1000");
+}
+
+TEST(TraceOutput, EndsPlaybackWithEveryCallbackThatSaysSo)
+{
+    const std::map<std::string, std::function<void(TracedSession&)>> ends = {
+        {"PlayFailed", [](TracedSession& session) { session->PlayFailed(); }},
+        {"Stopped", [](TracedSession& session) { session->Stopped(); }},
+        {"Finished",
+         [](TracedSession& session) { session->Finished(bdmv::INavControlListener::EndOfMedia); }},
+        {"ResumeFailed", [](TracedSession& session) { session->ResumeFailed(); }},
+        {"SystemResumed", [](TracedSession& session) { session->SystemResumed(false); }},
+        {"SystemResumeFailed", [](TracedSession& session) { session->SystemResumeFailed(); }}};
+    for (const auto& [name, end] : ends) {
+        TracedSession session;
+        session->PlayStarted();
+        session.PassSecond();
+        end(session);
+        session.PassSecond();
+
+        EXPECT_EQ(session.Slices("playback"), "Playing 0-1000") << name;
+    }
+}
+
+TEST(TraceOutput, EndsWithPlaybackWhatIsInPlayback)
+{
+    for (const char* track : {"playback", "play mode", "play list", "play item", "chapter"}) {
+        TracedSession session;
+        CallEveryCallback(*session.operator->());
+        session->PlayStarted();
+        session.PassSecond();
+        session->Stopped();
+        session.PassSecond();
+
+        const std::string slices = session.Slices(track);
+        EXPECT_EQ(slices.substr(slices.rfind('-')), "-1000") << track;
+    }
+}
+
+TEST(TraceOutput, KeepsSelectedStreamsWhenPlaybackEnds)
+{
+    TracedSession session;
+    session->AudioInfo(2);
+    session.PassSecond();
+    session->Stopped();
+    session.PassSecond();
+
+    EXPECT_EQ(session.Slices("audio"), "audio 2 0-2000");
+}
+
+TEST(TraceOutput, ShowsEveryStateByItsNumberOrName)
+{
+    const std::map<std::string, std::string> expected = {
+        {"play mode", "Forward Slow1 0-1000"},
+        {"play list", "play list 800 0-1000"},
+        {"play item", "play item 2 0-1000"},
+        {"chapter", "chapter 21 0-1000"},
+        {"audio", "audio 11 0-1000"},
+        {"video", "video 12 0-1000"},
+        {"angle", "angle 13 0-1000"},
+        {"interactive graphics", "interactive graphics 14 0-1000"},
+        {"subtitles", "subtitles 15 0-1000"},
+        {"secondary audio", "secondary audio 16 0-1000"},
+        {"secondary video", "secondary video 17 0-1000"},
+        {"picture-in-picture subtitles", "picture-in-picture subtitles 18 0-1000"}};
+    for (const auto& [track, slices] : expected) {
+        TracedSession session;
+        CallEveryCallback(*session.operator->());
+        session.PassSecond();
+
+        EXPECT_EQ(session.Slices(track), slices);
+    }
+}
+
+TEST(TraceOutput, BeginsASliceWithEveryCallbackOfItsTrack)
+{
+    TracedSession session;
+    session->ChapterNumber(1);
+    session.PassSecond();
+    session->ChapterNumber(2);
+    session.PassSecond();
+    session->ChapterNumber(2);
+    session.PassSecond();
+
+    EXPECT_EQ(session.Slices("chapter"),
+              "chapter 1 0-1000, chapter 2 1000-2000, chapter 2 2000-3000");
+}
+
+TEST(TraceOutput, ShowsTheMenuWhileItIsVisible)
+{
+    TracedSession session;
+    session->InteractiveGraphicsVisible();
+    session.PassSecond();
+    session->InteractiveGraphicsInvisible();
+    session.PassSecond();
+
+    EXPECT_EQ(session.Slices("menu"), "Visible 0-1000");
+}
+
+TEST(TraceOutput, HidesInstantsButNoSlicesByTheFilter)
+{
+    OutputFilter filter;
+    filter.KeepCallbacks("Stepped");
+    TracedSession session(filter);
+    session->PlayStarted();
+    session.PassSecond();
+    session->Paused();
+    session->Stepped(45000, bd::PlayDirectionForward);
+
+    std::string events;
+    for (const TimedEvent& event : ReadTrace(session.Trace()).events) {
+        events += event.phase + " " + event.name + ", ";
+    }
+    EXPECT_EQ(events, "B Playing, E , B Paused, i Stepped, E , ");
+}
+
+} // namespace
+} // namespace deskplayer
