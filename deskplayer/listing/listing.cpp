@@ -1,0 +1,260 @@
+#include "listing/listing.h"
+
+#include <algorithm>
+#include <cinttypes>
+#include <cstdio>
+#include <functional>
+#include <string>
+#include <vector>
+
+#include "disc/codes.h"
+#include "disc/timeline.h"
+#include "listing/aspectratios.h"
+#include "output/timetext.h"
+
+namespace deskplayer
+{
+
+namespace
+{
+
+using Lines = std::vector<std::string>;
+
+/** What is to be said about the aspect ratio of a video stream. */
+using AspectText = std::function<std::string(const Stream&)>;
+
+constexpr std::size_t WidthOfFirstColumns = 47; ///< all columns but the streams
+constexpr std::size_t WidthOfStreams = 53;
+
+std::string ObjectText(const IndexObject& object)
+{
+    std::string text;
+    std::uint8_t movie = 0; // the playback type that means a movie; the next one is interactive
+    switch (object.objectType) {
+    case ObjectTypeMovieObject:
+        text = "movie object " + std::to_string(object.movieObject);
+        break;
+    case ObjectTypeJavaObject:
+        text = "Java object " + Printable(object.javaObject);
+        movie = 2;
+        break;
+    default:
+        text = "reserved object type " + std::to_string(object.objectType);
+    }
+    if (object.playbackType == movie) {
+        return text + ", movie";
+    }
+    if (object.playbackType == movie + 1) {
+        return text + ", interactive";
+    }
+    return text + ", reserved playback type " + std::to_string(object.playbackType);
+}
+
+std::string AccessText(std::uint8_t accessType)
+{
+    switch (accessType) {
+    case 0:
+        return "title search permitted";
+    case 1:
+        return "title search forbidden";
+    default:
+        return "title search forbidden (access type " + std::to_string(accessType) + ")";
+    }
+}
+
+std::string IndexText(const Index& index)
+{
+    std::string text = "version " + index.version;
+    if (index.videoFormat != 0) {
+        text += ", " + VideoFormatName(index.videoFormat);
+    }
+    if (index.frameRate != 0) {
+        text += ", " + FrameRateName(index.frameRate);
+    }
+    if (index.stereoscopicContent) {
+        text += ", stereoscopic content";
+    }
+    if (index.stereoscopicOutputPreferred) {
+        text += ", stereoscopic output preferred";
+    }
+    const std::size_t titles = index.titles.size();
+    return text + ", " + std::to_string(titles) + (titles == 1 ? " title" : " titles");
+}
+
+void ListTitles(std::ostream& output, const Disc& disc)
+{
+    Index index;
+    try {
+        index = disc.ReadIndex();
+    } catch (const DiscError& error) {
+        output << "Index           " << error.what() << '\n';
+        return;
+    }
+    output << "Index           " << IndexText(index) << '\n'
+           << "First playback  " << ObjectText(index.firstPlayback) << '\n'
+           << "Top menu        " << ObjectText(index.topMenu) << '\n';
+    std::size_t number = 0;
+    for (const IndexObject& title : index.titles) {
+        std::string label = "Title " + std::to_string(++number);
+        label.resize(std::max<std::size_t>(label.size(), 14), ' ');
+        output << label << "  " << ObjectText(title) << ", " << AccessText(title.accessType)
+               << '\n';
+    }
+}
+
+std::string StreamText(const StreamAttributes& attributes)
+{
+    const std::string coding = CodingTypeName(attributes.codingType);
+    switch (KindOfStream(attributes.codingType)) {
+    case StreamKindVideo: {
+        const std::string text = coding + ", " + VideoFormatName(attributes.videoFormat) + ", " +
+                                 FrameRateName(attributes.frameRate);
+        return attributes.codingType == CodingTypeH265
+                   ? text + ", " + DynamicRangeName(attributes.dynamicRange) + " dynamic range"
+                   : text;
+    }
+    case StreamKindAudio:
+        return LanguageName(attributes.language) + ": " + coding + ", " +
+               AudioPresentationName(attributes.audioPresentation) + ", " +
+               SampleRateName(attributes.sampleRate);
+    case StreamKindGraphics:
+    case StreamKindTextSubtitle:
+        return LanguageName(attributes.language);
+    default:
+        return coding;
+    }
+}
+
+/** One line a stream. */
+void AddStreams(Lines& lines, const std::string& label, const std::vector<Stream>& streams,
+                const AspectText& aspectText)
+{
+    for (const Stream& stream : streams) {
+        const bool video = KindOfStream(stream.attributes.codingType) == StreamKindVideo;
+        lines.push_back(label + StreamText(stream.attributes) + (video ? aspectText(stream) : ""));
+    }
+}
+
+/** Streams of which there are many, and of which the language is enough: as many as fit a line. */
+void AddLanguages(Lines& lines, const std::string& label, const std::vector<Stream>& streams)
+{
+    std::string line = label;
+    for (std::size_t number = 0; number < streams.size(); ++number) {
+        const bool last = number + 1 == streams.size();
+        const std::string word = StreamText(streams[number].attributes) + (last ? "" : ",");
+        if (number > 0 && line.size() + 1 + word.size() > WidthOfStreams) {
+            lines.push_back(line);
+            line.assign(label.size() - 1, ' ');
+        }
+        line += (number > 0 ? " " : "") + word;
+    }
+    if (!streams.empty()) {
+        lines.push_back(line);
+    }
+}
+
+Lines StreamLines(const StreamTable& streams, const AspectText& aspectText)
+{
+    Lines lines;
+    AddStreams(lines, "video: ", streams.primaryVideo, aspectText);
+    AddStreams(lines, "enhancement video: ", streams.enhancementVideo, aspectText);
+    AddStreams(lines, "audio: ", streams.primaryAudio, aspectText);
+    AddLanguages(lines, "subtitles: ", streams.pg);
+    AddLanguages(lines, "menus: ", streams.ig);
+    AddStreams(lines, "secondary video: ", streams.secondaryVideo, aspectText);
+    AddStreams(lines, "secondary audio: ", streams.secondaryAudio, aspectText);
+    AddLanguages(lines, "secondary subtitles: ", streams.pipPg);
+    return lines;
+}
+
+std::size_t LongestItem(const PlayList& playList)
+{
+    const auto shorter = [](const PlayItem& left, const PlayItem& right) {
+        return left.outTime - left.inTime < right.outTime - right.inTime;
+    };
+    const auto& items = playList.playItems;
+    const auto longest = std::max_element(items.begin(), items.end(), shorter);
+    return static_cast<std::size_t>(longest - items.begin());
+}
+
+/** The streams of the longest play item, and whether they are those of all of them. */
+Lines StreamLines(const PlayList& playList, AspectRatios& aspectRatios)
+{
+    if (playList.playItems.empty()) {
+        return {};
+    }
+    const std::size_t longest = LongestItem(playList);
+    const StreamTable& shown = playList.playItems[longest].streams;
+    Lines lines = StreamLines(shown, [&](const Stream& stream) {
+        const std::optional<std::uint8_t> code = aspectRatios.Find(playList, longest, stream).code;
+        return code ? ", " + AspectRatioName(*code) : ", aspect ratio not known";
+    });
+
+    // Aspect ratios do not count: looking at them would mean to read the clips of all play items.
+    const AspectText nothing = [](const Stream&) { return ""; };
+    const Lines common = StreamLines(shown, nothing);
+    const auto others = std::count_if(
+        playList.playItems.begin(), playList.playItems.end(),
+        [&](const PlayItem& item) { return StreamLines(item.streams, nothing) != common; });
+    if (others > 0) {
+        lines.push_back("other streams in " + std::to_string(others) + " of " +
+                        std::to_string(playList.playItems.size()) + " play items");
+    }
+    return lines;
+}
+
+std::size_t MostAngles(const PlayList& playList)
+{
+    std::size_t most = 0;
+    for (const PlayItem& item : playList.playItems) {
+        most = std::max(most, item.furtherAngles.size() + 1);
+    }
+    return most;
+}
+
+void ListPlayList(std::ostream& output, const PlayList& playList, AspectRatios& aspectRatios)
+{
+    const TimeLine timeLine = BuildTimeLine(playList);
+    char columns[128];
+    std::snprintf(columns, sizeof columns, "%-12s  %5zu  %8zu  %6zu",
+                  TimeText(timeLine.duration).c_str(), playList.playItems.size(),
+                  timeLine.chapters.size(), MostAngles(playList));
+    output << columns;
+    std::string separator = "  ";
+    for (const std::string& line : StreamLines(playList, aspectRatios)) {
+        output << separator << line;
+        separator = '\n' + std::string(WidthOfFirstColumns, ' ');
+    }
+    output << '\n';
+}
+
+} // namespace
+
+std::size_t ListPlayLists(std::ostream& output, const Disc& disc)
+{
+    const std::vector<std::uint32_t> numbers = disc.PlayListNumbers();
+    ListTitles(output, disc);
+    output << '\n';
+    if (numbers.empty()) {
+        output << "There is no play list.\n";
+        return 0;
+    }
+
+    output << "Number  Duration      Items  Chapters  Angles  Streams\n";
+    AspectRatios aspectRatios(disc);
+    std::size_t unreadable = 0;
+    for (const std::uint32_t number : numbers) {
+        char label[16];
+        std::snprintf(label, sizeof label, "%05" PRIu32 "   ", number);
+        output << label;
+        try {
+            ListPlayList(output, disc.ReadPlayList(number), aspectRatios);
+        } catch (const DiscError& error) {
+            output << error.what() << '\n';
+            ++unreadable;
+        }
+    }
+    return unreadable;
+}
+
+} // namespace deskplayer

@@ -1,0 +1,204 @@
+#!/usr/bin/env bash
+# Tests the bash completion and the manual page of the desk player.
+#
+#   completion_test.bash TEST COMPLETION PAGE PROGRAM SOURCES
+#
+# TEST is one of the functions below that begin with a capital letter.
+set -u
+
+completion=$2
+page=$3
+program=$4
+sources=$5
+
+. "$completion"
+
+folder=$(mktemp -d)
+trap 'rm -rf "$folder"' EXIT
+mkdir -p "$folder/disc/BDMV/PLAYLIST" "$folder/a disc/BDMV/PLAYLIST" "$folder/documents"
+touch "$folder"/disc/BDMV/PLAYLIST/{00000,00008,00080,00800,12345}.mpls \
+    "$folder"/disc/BDMV/PLAYLIST/{1,000001}.mpls "$folder/disc/BDMV/PLAYLIST/00002.txt" \
+    "$folder/a disc/BDMV/PLAYLIST/00007.mpls" \
+    "$folder"/{evening.session,evening.json,notes.txt}
+cd "$folder" || exit 1
+
+# Options of readline belong to a completion that is going on.
+compopt() { readline_options+=("$2"); }
+
+# complete_words WORD...: completes the last of the words behind the program.
+complete_words() {
+    COMP_WORDS=(bdmv-deskplayer "$@")
+    COMP_CWORD=$#
+    readline_options=()
+    _bdmv_deskplayer
+}
+
+# expect OFFERED WORD...: what completing the last of the words offers, in any order.
+expect() {
+    local expected=$1
+    shift
+    complete_words "$@"
+    local offered
+    offered=$(printf '%s\n' "${COMPREPLY[@]}" | LC_ALL=C sort | xargs)
+    [ "$offered" = "$expected" ] && return
+    printf 'bdmv-deskplayer %s\n  offers  %s\n  but not %s\n' "$*" "$offered" "$expected"
+    exit 1
+}
+
+# same WHAT ONE OTHER: two lists of lines.
+same() {
+    [ -n "$2" ] && [ "$2" = "$3" ] && return
+    printf '%s\n' "$1 differ:"
+    diff <(printf '%s\n' "$2") <(printf '%s\n' "$3")
+    exit 1
+}
+
+sorted() { tr -s ' \n' '\n' | LC_ALL=C sort; }
+
+OffersOptions() {
+    expect '--list --listen --log' --l
+    expect '--session' disc --s
+    expect '--remote' --playlist 1 disc --rem
+}
+
+OffersPlayListsOfTheDiscOnTheCommandLine() {
+    expect '0 12345 8 80 800' disc --playlist ''
+    expect '8 80 800' disc --playlist 8
+    expect '0 12345 8 80 800' disc/ --describe ''
+    expect '0 12345 8 80 800' disc/BDMV --describe ''
+    expect '0 12345 8 80 800' --format json disc --describe ''
+    expect '8 80 800' disc --playlist = 8
+    expect '0 12345 8 80 800' --format = json disc --playlist =
+}
+
+OffersPlayListsOfADiscWithBlanksInItsName() {
+    expect '7' 'a\ disc' --playlist ''
+    expect '7' '"a disc"' --playlist ''
+}
+
+OffersPlayListsOfADiscInTheHomeFolder() {
+    HOME=$folder expect '0 12345 8 80 800' '~/disc' --playlist ''
+}
+
+OffersNoPlayListsWithoutADisc() {
+    expect '' --playlist ''
+    expect '' --format disc --playlist ''
+    expect '' documents --playlist ''
+    expect '' missing --playlist ''
+}
+
+RunsNothingThatIsOnTheCommandLine() {
+    for word in '$(touch run)' '`touch run`' '"$(touch run)"' 'a[$(touch run)]'; do
+        for option in --playlist --describe --session --format --output --listen --only --log --l; do
+            complete_words "$word" $option ''
+            complete_words $option "$word"
+            complete_words $option "PlayItem,$word"
+            complete_words $option "$word,PlayItem"
+            complete_words "$word" "$word"
+        done
+    done
+    [ ! -e run ]
+}
+
+OffersFormats() {
+    expect 'json text trace' --format ''
+    expect 'text trace' disc --format t
+    expect 'json' disc --format = j
+}
+
+OffersInterfaces() {
+    expect 'button control interactive settings' --listen ''
+    expect 'control' --listen c
+    expect 'control,button' --listen control,b
+    expect 'control,settings,button control,settings,interactive' --listen control,settings,
+}
+
+OffersCallbacks() {
+    expect 'PlayFailed PlayItem PlayMode PlayStarted Playlist' --only Play
+    expect '' --only 'Play[IMS]'
+}
+
+OffersCallbacksOfAList() {
+    expect 'PlayItem,PlayFailed PlayItem,PlayMode PlayItem,PlayStarted PlayItem,Playlist' \
+        --only PlayItem,Play
+}
+
+OffersEveryCallback() {
+    complete_words --only ''
+    same 'offered and declared callbacks' \
+        "$(printf '%s\n' "${COMPREPLY[@]}" | sorted)" \
+        "$(sed -n 's/^ *virtual void \([A-Za-z]*\)(.*/\1/p' \
+            "$sources"/bdmv/inc/bdmvnavigator/inav*listener.h | sorted)"
+}
+
+OffersSessionsAndFolders() {
+    expect 'a disc disc documents evening.session' --session ''
+    expect 'evening.session' disc --session e
+    [[ ${readline_options[*]} == filenames ]]
+}
+
+OffersAnyFileForTheOutput() {
+    expect 'evening.json evening.session' disc --output e
+}
+
+OffersFoldersForTheDisc() {
+    expect 'disc documents' d
+    expect 'a disc disc documents' --list ''
+    expect 'disc/BDMV' disc/
+    [[ ${readline_options[*]} == filenames ]]
+}
+
+OffersNothingBehindTheDisc() {
+    expect '' disc ''
+    expect '' --playlist 1 disc d
+}
+
+OffersNothingForTheLog() {
+    expect '' --log ''
+    expect '' --log e
+}
+
+StaysInTheWordOfAList() {
+    complete_words --only ''
+    [[ ${readline_options[*]} == nospace ]] || exit 1
+    complete_words --listen control,
+    [[ ${readline_options[*]} == nospace ]]
+}
+
+options_of_help() { "$program" --help | sed -n 's/^  \(-.,\)*--\([a-z]*\) .*/--\2/p' | sorted; }
+
+CompletesTheOptionsOfTheProgram() {
+    same 'options of completion and program' \
+        "$(sorted <<<"$_bdmv_deskplayer_options")" "$(options_of_help)"
+}
+
+PageHasTheOptionsOfTheProgram() {
+    same 'options of page and program' \
+        "$(sed -n 's/^\.It Fl -\([a-z]*\).*/--\1/p' "$page" | sorted)" "$(options_of_help)"
+}
+
+PageHasTheCommandsOfTheProgram() {
+    same 'commands of page and program' \
+        "$(sed -n '/^\.Sh SESSIONS/,/^\.Sh KEYS/s/^\.It Ic //p' "$page" | sed 's/ Ar / /')" \
+        "$("$program" --commands | cut -c -36 | sed 's/ *$//')"
+}
+
+PageHasTheKeysOfTheProgram() {
+    same 'keys of page and program' \
+        "$(sed -n '/^\.Sh KEYS/,/^\.Sh /s/^\.It Ic \(\\&\)*//p' "$page" | sorted)" \
+        "$({
+            sed -n "s/^ *{'\\(.\\)', \".*/\\1/p" "$sources/deskplayer/session/remote.cpp" |
+                sed 's/^ $/space/'
+            echo q
+        } | sorted)"
+}
+
+PageIsWellFormed() {
+    if ! type mandoc >/dev/null 2>&1; then
+        echo 'mandoc is not installed'
+        exit 77
+    fi
+    mandoc -T lint -W warning "$page"
+}
+
+"$1"

@@ -1,0 +1,39 @@
+#include "scratchdisc.h"
+
+#include <unistd.h>
+
+#include <fstream>
+
+#include "../disc/testdiscs.h"
+
+namespace deskplayer
+{
+
+namespace fs = std::filesystem;
+
+ScratchDisc::ScratchDisc(const std::string& original)
+    : m_Folder(fs::temp_directory_path() / ("scratch-disc-" + std::to_string(getpid())))
+{
+    fs::remove_all(m_Folder);
+    fs::copy(TestDisc(original), m_Folder, fs::copy_options::recursive);
+}
+
+ScratchDisc::~ScratchDisc()
+{
+    std::error_code error;
+    fs::remove_all(m_Folder, error);
+}
+
+void ScratchDisc::Write(const std::string& name, const Bytes& content) const
+{
+    std::ofstream file(m_Folder / "BDMV" / name, std::ios::binary);
+    file.write(reinterpret_cast<const char*>(content.data()),
+               static_cast<std::streamsize>(content.size()));
+}
+
+void ScratchDisc::Remove(const std::string& name) const
+{
+    fs::remove(m_Folder / "BDMV" / name);
+}
+
+} // namespace deskplayer
