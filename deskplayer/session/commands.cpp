@@ -1,0 +1,225 @@
+#include "session/commands.h"
+
+#include <algorithm>
+#include <iterator>
+
+namespace deskplayer
+{
+
+namespace
+{
+
+typedef const std::vector<std::uint64_t>& Values;
+
+constexpr std::uint64_t SlowSteps = 5;
+constexpr std::uint64_t FastSteps = 12;
+
+/** @param steps above normal speed; below it when negative */
+bd::PlayMode ModeOf(bd::PlayDirectionDef direction, std::int64_t steps)
+{
+    return bd::PlayMode(direction,
+                        static_cast<bd::PlaySpeedDef>(std::int64_t{bd::PlaySpeedNormal} + steps));
+}
+
+Outcome PlayFast(Desk& desk, bd::PlayDirectionDef direction, std::uint64_t steps)
+{
+    if (steps == 0 || steps > FastSteps) {
+        return Outcome::Refused("fast play has the steps 1 to " + std::to_string(FastSteps));
+    }
+    return desk.navigator.SetPlayMode(ModeOf(direction, static_cast<std::int64_t>(steps)));
+}
+
+Outcome PlaySlowly(Desk& desk, bd::PlayDirectionDef direction, std::uint64_t steps)
+{
+    if (steps == 0 || steps > SlowSteps) {
+        return Outcome::Refused("slow motion has the steps 1 to " + std::to_string(SlowSteps));
+    }
+    return desk.navigator.SetPlayMode(ModeOf(direction, -static_cast<std::int64_t>(steps)));
+}
+
+bd::ZoomRectangleDef RectangleOf(Values values, std::size_t first)
+{
+    return {static_cast<bd::UInt16>(values[first]), static_cast<bd::UInt16>(values[first + 1]),
+            static_cast<bd::UInt16>(values[first + 2]), static_cast<bd::UInt16>(values[first + 3])};
+}
+
+/** The stream behind the selected one, or the first behind the last. */
+template <typename Number>
+std::uint64_t NextOf(Desk& desk, void (PlaybackContext::*get)(Number*, bd::UInt8*))
+{
+    Number number = 0;
+    bd::UInt8 count = 0;
+    (desk.navigator.*get)(&number, &count);
+    return number < count ? number + 1U : 1U;
+}
+
+constexpr bd::ZoomRectangleDef WholePicture = {0, 0, 1920, 1080};
+
+} // namespace
+
+const std::vector<Command>& Commands()
+{
+    static const std::vector<Command> commands = {
+        // Playback
+        {{"play", "start at the beginning of the play list"},
+         [](Desk& d, Values) { return d.navigator.Play(); }},
+        {{"stop", "end playback"}, [](Desk& d, Values) { return d.navigator.Stop(); }},
+        {{"pause", "hold playback"}, [](Desk& d, Values) { return d.navigator.Pause(); }},
+        {{"continue", "go on after a pause"},
+         [](Desk& d, Values) { return d.navigator.Continue(); }},
+        {{"step", "show the next picture, while paused"},
+         [](Desk& d, Values) { return d.navigator.Step(); }},
+        {{"forward", "play forward at normal speed"},
+         [](Desk& d, Values) {
+             return d.navigator.SetPlayMode(ModeOf(bd::PlayDirectionForward, 0));
+         }},
+        {{"forward fast NUMBER", "play fast, steps 1 to 12"},
+         [](Desk& d, Values v) { return PlayFast(d, bd::PlayDirectionForward, v[0]); }},
+        {{"forward slow NUMBER", "play in slow motion, steps 1 to 5"},
+         [](Desk& d, Values v) { return PlaySlowly(d, bd::PlayDirectionForward, v[0]); }},
+        {{"backward", "play backward at normal speed"},
+         [](Desk& d, Values) {
+             return d.navigator.SetPlayMode(ModeOf(bd::PlayDirectionBackward, 0));
+         }},
+        {{"backward fast NUMBER", "play backward fast, steps 1 to 12"},
+         [](Desk& d, Values v) { return PlayFast(d, bd::PlayDirectionBackward, v[0]); }},
+        {{"backward slow NUMBER", "play backward in slow motion, steps 1 to 5"},
+         [](Desk& d, Values v) { return PlaySlowly(d, bd::PlayDirectionBackward, v[0]); }},
+        {{"still off", "leave a still"}, [](Desk& d, Values) { return d.navigator.EndStill(); }},
+        {{"suspend", "hold playback as a title does that calls a menu"},
+         [](Desk& d, Values) { return d.navigator.Suspend(); }},
+        {{"resume", "go on after suspend"}, [](Desk& d, Values) { return d.navigator.Resume(); }},
+
+        // Position
+        {{"seek TIME", "go to a time of the play list"},
+         [](Desk& d, Values v) { return d.navigator.SearchTime(v[0]); }},
+        {{"chapter next", "go to the next chapter"},
+         [](Desk& d, Values) { return d.navigator.SkipToNextChapter(); }},
+        {{"chapter previous", "go to the start of the chapter, or to the one before"},
+         [](Desk& d, Values) { return d.navigator.SkipToPreviousChapter(); }},
+        {{"chapter NUMBER", "go to a chapter"},
+         [](Desk& d, Values v) { return d.navigator.SearchChapter(v[0]); }},
+
+        // Repeat and triggers
+        {{"repeat a", "set the start of an A-B repeat"},
+         [](Desk& d, Values) { return d.navigator.SetPointA(); }},
+        {{"repeat b", "set its end, and repeat from A to here"},
+         [](Desk& d, Values) { return d.navigator.SetPointB(); }},
+        {{"repeat ab off", "end the A-B repeat"},
+         [](Desk& d, Values) { return d.navigator.EndABRepeat(); }},
+        {{"repeat chapter", "repeat this chapter"},
+         [](Desk& d, Values) { return d.navigator.RepeatChapter(); }},
+        {{"repeat title", "repeat the play list"},
+         [](Desk& d, Values) { return d.navigator.RepeatTitle(); }},
+        {{"repeat off", "end the repeat of chapter or play list"},
+         [](Desk& d, Values) { return d.navigator.EndChapterTitleRepeat(); }},
+        {{"trigger TIME", "be told when playback gets to a time of the play list"},
+         [](Desk& d, Values v) { return d.navigator.SetTrigger(v[0]); }},
+
+        // Streams
+        {{"audio NUMBER", "select an audio stream"},
+         [](Desk& d, Values v) { return d.navigator.SelectAudio(v[0]); }},
+        {{"audio next", "select the next audio stream"},
+         [](Desk& d, Values) {
+             return d.navigator.SelectAudio(NextOf(d, &PlaybackContext::GetAudioInfo));
+         }},
+        {{"subtitle on", "show subtitles"},
+         [](Desk& d, Values) { return d.navigator.ShowSubtitles(true); }},
+        {{"subtitle off", "hide subtitles"},
+         [](Desk& d, Values) { return d.navigator.ShowSubtitles(false); }},
+        {{"subtitle next", "select the next subtitle stream"},
+         [](Desk& d, Values) {
+             return d.navigator.SelectSubtitle(NextOf(d, &PlaybackContext::GetPgTextStInfo));
+         }},
+        {{"subtitle style NUMBER", "select the style of text subtitles"},
+         [](Desk& d, Values v) { return d.navigator.SelectStyle(v[0]); }},
+        {{"subtitle NUMBER", "select a subtitle stream"},
+         [](Desk& d, Values v) { return d.navigator.SelectSubtitle(v[0]); }},
+        {{"angle NUMBER", "select an angle"},
+         [](Desk& d, Values v) { return d.navigator.SelectAngle(v[0]); }},
+        {{"angle next", "select the next angle"},
+         [](Desk& d, Values) {
+             return d.navigator.SelectAngle(NextOf(d, &PlaybackContext::GetAngleInfo));
+         }},
+        {{"pip on", "show the secondary video"},
+         [](Desk& d, Values) { return d.navigator.ShowSecondaryVideo(true); }},
+        {{"pip off", "hide the secondary video"},
+         [](Desk& d, Values) { return d.navigator.ShowSecondaryVideo(false); }},
+        {{"pip audio on", "switch the secondary audio on"},
+         [](Desk& d, Values) { return d.navigator.ShowSecondaryAudio(true); }},
+        {{"pip audio off", "switch the secondary audio off"},
+         [](Desk& d, Values) { return d.navigator.ShowSecondaryAudio(false); }},
+        {{"pip audio NUMBER", "select a secondary audio stream"},
+         [](Desk& d, Values v) { return d.navigator.SelectSecondaryAudio(v[0]); }},
+        {{"pip subtitle on", "take subtitles from the picture-in-picture"},
+         [](Desk& d, Values) { return d.navigator.PickPipSubtitle(true); }},
+        {{"pip subtitle off", "take subtitles from the film"},
+         [](Desk& d, Values) { return d.navigator.PickPipSubtitle(false); }},
+        {{"pip subtitle NUMBER", "select a subtitle stream of the picture-in-picture"},
+         [](Desk& d, Values v) { return d.navigator.SelectPipSubtitle(v[0]); }},
+        {{"pip NUMBER", "select a secondary video stream"},
+         [](Desk& d, Values v) { return d.navigator.SelectSecondaryVideo(v[0]); }},
+        {{"zoom off", "show the whole picture"},
+         [](Desk& d, Values) {
+             return d.navigator.Zoom({WholePicture, WholePicture, 0});
+         }},
+        {{"zoom NUMBER NUMBER NUMBER NUMBER",
+          "enlarge a part of the picture: left, top, width, height in pixels"},
+         [](Desk& d, Values v) {
+             return d.navigator.Zoom({RectangleOf(v, 0), WholePicture, 0});
+         }},
+
+        // The menu
+        {{"menu on", "open the pop-up menu"},
+         [](Desk& d, Values) { return d.navigator.OpenPopUpMenu(); }},
+        {{"menu off", "close it"}, [](Desk& d, Values) { return d.navigator.ClosePopUpMenu(); }},
+        {{"button previous", "select the button above"},
+         [](Desk& d, Values) { return d.navigator.SelectPreviousButton(); }},
+        {{"button next", "select the button below"},
+         [](Desk& d, Values) { return d.navigator.SelectNextButton(); }},
+        {{"button activate", "activate the selected button"},
+         [](Desk& d, Values) { return d.navigator.ActivateButton(); }},
+        {{"button activate NUMBER", "select a button and activate it"},
+         [](Desk& d, Values v) { return d.navigator.SelectAndActivateButton(v[0]); }},
+        {{"button NUMBER", "select a button"},
+         [](Desk& d, Values v) { return d.navigator.SelectButton(v[0]); }},
+
+        // The system
+        {{"standby", "send the system to standby"},
+         [](Desk& d, Values) { return d.navigator.GoToStandby(); }},
+        {{"wake", "come back with the resume data that was kept"},
+         [](Desk& d, Values) { return d.navigator.WakeUp(d.keeper.ResumeData()); }},
+        {{"wake without data", "come back without it"},
+         [](Desk& d, Values) { return d.navigator.WakeUp({}); }},
+
+        // Failures
+        {{"fail play", "have the next play fail"},
+         [](Desk& d, Values) {
+             d.navigator.FailNextPlay();
+             return Outcome::Done();
+         }},
+        {{"fail resume", "have the next resume fail"},
+         [](Desk& d, Values) {
+             d.navigator.FailNextResume();
+             return Outcome::Done();
+         }},
+        {{"fail preload", "have preloading fail"},
+         [](Desk& d, Values) { return d.navigator.FailPreload(); }},
+        {{"fail stream", "have the stream run dry"},
+         [](Desk& d, Values) { return d.navigator.Starve(); }},
+    };
+    return commands;
+}
+
+const std::vector<CommandSyntax>& CommandSyntaxes()
+{
+    static const std::vector<CommandSyntax> syntaxes = [] {
+        std::vector<CommandSyntax> all;
+        std::transform(Commands().begin(), Commands().end(), std::back_inserter(all),
+                       [](const Command& command) { return command.syntax; });
+        return all;
+    }();
+    return syntaxes;
+}
+
+} // namespace deskplayer

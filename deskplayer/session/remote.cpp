@@ -1,0 +1,190 @@
+#include "session/remote.h"
+
+#include <poll.h>
+#include <termios.h>
+#include <unistd.h>
+
+#include <algorithm>
+#include <chrono>
+#include <sstream>
+
+#include "disc/codes.h"
+
+namespace deskplayer
+{
+
+namespace
+{
+
+typedef std::chrono::steady_clock Clock;
+
+constexpr char QuitKey = 'q';
+constexpr std::int64_t MillisecondsPerHour = 3600 * 1000;
+
+Outcome PauseOrContinue(Desk& desk)
+{
+    return desk.navigator.CurrentStatus() == SimulatedNavigator::Status::Playing
+               ? desk.navigator.Pause()
+               : desk.navigator.Continue();
+}
+
+Outcome PlayOrStop(Desk& desk)
+{
+    const SimulatedNavigator::Status status = desk.navigator.CurrentStatus();
+    return status == SimulatedNavigator::Status::Stopped ||
+                   status == SimulatedNavigator::Status::Finished
+               ? desk.navigator.Play()
+               : desk.navigator.Stop();
+}
+
+/** One step faster in a direction; the first step from anything else is fast play. */
+Outcome Faster(Desk& desk, bd::PlayDirectionDef direction)
+{
+    const bd::PlayMode& mode = desk.navigator.GetPlayMode();
+    const bool goesOn = mode.Direction() == direction && mode.Speed() >= bd::PlaySpeedNormal;
+    const int speed = goesOn ? std::min<int>(mode.Speed() + 1, bd::PlaySpeedFast12)
+                             : static_cast<int>(bd::PlaySpeedFast1);
+    return desk.navigator.SetPlayMode(
+        bd::PlayMode(direction, static_cast<bd::PlaySpeedDef>(speed)));
+}
+
+Outcome PerformNamed(Desk& desk, std::string_view pattern)
+{
+    const auto found =
+        std::find_if(Commands().begin(), Commands().end(), [pattern](const Command& command) {
+            return command.syntax.pattern == pattern;
+        });
+    return found->perform(desk, {});
+}
+
+/** Has a terminal give single keys without showing them; puts it back as it was. */
+class SingleKeys
+{
+public:
+    explicit SingleKeys(int terminal)
+        : m_Terminal(terminal), m_Changed(tcgetattr(terminal, &m_Before) == 0)
+    {
+        if (m_Changed) {
+            termios single = m_Before;
+            single.c_lflag &= ~static_cast<tcflag_t>(ICANON | ECHO);
+            single.c_cc[VMIN] = 1;
+            single.c_cc[VTIME] = 0;
+            tcsetattr(m_Terminal, TCSANOW, &single);
+        }
+    }
+
+    ~SingleKeys()
+    {
+        if (m_Changed) {
+            tcsetattr(m_Terminal, TCSANOW, &m_Before);
+        }
+    }
+
+    SingleKeys(const SingleKeys&) = delete;
+    SingleKeys& operator=(const SingleKeys&) = delete;
+
+private:
+    int m_Terminal;
+    termios m_Before = {};
+    bool m_Changed;
+};
+
+/** Milliseconds until something happens by itself, for poll(). */
+int TimeoutOf(const SimulatedNavigator& navigator)
+{
+    const std::optional<std::uint64_t> next = navigator.TimeToNextChange();
+    if (!next) {
+        return -1;
+    }
+    const std::uint64_t milliseconds = (*next * 1000 + TicksPerSecond - 1) / TicksPerSecond;
+    return static_cast<int>(std::min<std::uint64_t>(milliseconds, MillisecondsPerHour));
+}
+
+std::uint64_t TicksSince(Clock::time_point start)
+{
+    typedef std::chrono::duration<std::uint64_t, std::ratio<1, TicksPerSecond>> Ticks;
+    return std::chrono::duration_cast<Ticks>(Clock::now() - start).count();
+}
+
+} // namespace
+
+const std::vector<RemoteKey>& RemoteKeys()
+{
+    static const std::vector<RemoteKey> keys = {
+        {' ', "pause, continue", PauseOrContinue},
+        {'x', "stop, play", PlayOrStop},
+        {'.', "step", [](Desk& d) { return PerformNamed(d, "step"); }},
+        {'f', "faster", [](Desk& d) { return Faster(d, bd::PlayDirectionForward); }},
+        {'r', "faster backward", [](Desk& d) { return Faster(d, bd::PlayDirectionBackward); }},
+        {'w', "normal speed", [](Desk& d) { return PerformNamed(d, "forward"); }},
+        {'n', "next chapter", [](Desk& d) { return PerformNamed(d, "chapter next"); }},
+        {'p', "previous chapter", [](Desk& d) { return PerformNamed(d, "chapter previous"); }},
+        {'o', "leave a still", [](Desk& d) { return PerformNamed(d, "still off"); }},
+        {'a', "next audio", [](Desk& d) { return PerformNamed(d, "audio next"); }},
+        {'s', "next subtitle", [](Desk& d) { return PerformNamed(d, "subtitle next"); }},
+        {'g', "next angle", [](Desk& d) { return PerformNamed(d, "angle next"); }},
+        {'m', "menu", [](Desk& d) { return PerformNamed(d, "menu on"); }},
+        {'c', "close menu", [](Desk& d) { return PerformNamed(d, "menu off"); }},
+        {'k', "button above", [](Desk& d) { return PerformNamed(d, "button previous"); }},
+        {'j', "button below", [](Desk& d) { return PerformNamed(d, "button next"); }},
+        {'e', "enter", [](Desk& d) { return PerformNamed(d, "button activate"); }},
+        {'z', "standby", [](Desk& d) { return PerformNamed(d, "standby"); }},
+        {'Z', "wake up", [](Desk& d) { return PerformNamed(d, "wake"); }},
+    };
+    return keys;
+}
+
+std::string RemoteHelp()
+{
+    constexpr std::size_t keysInALine = 4;
+    constexpr std::size_t width = 22;
+
+    std::ostringstream help;
+    std::size_t column = 0;
+    for (const RemoteKey& key : RemoteKeys()) {
+        const std::string name = key.key == ' ' ? "space" : std::string(1, key.key);
+        std::string entry = name + " " + key.help;
+        entry.resize(std::max(entry.size() + 1, width), ' ');
+        help << entry;
+        if (++column % keysInALine == 0) {
+            help << '\n';
+        }
+    }
+    help << QuitKey << " quit\n";
+    return help.str();
+}
+
+void PlayByRemote(Desk& desk, VirtualClock& clock, int keys,
+                  const std::function<void(const std::string& reason)>& onRefused)
+{
+    const SingleKeys singleKeys(keys);
+    const Clock::time_point start = Clock::now();
+    desk.navigator.Play();
+    while (desk.navigator.CurrentStatus() != SimulatedNavigator::Status::Finished) {
+        pollfd input = {keys, POLLIN, 0};
+        const int ready = poll(&input, 1, TimeoutOf(desk.navigator));
+        const std::uint64_t now = TicksSince(start);
+        if (now > clock.Now()) {
+            clock.Advance(desk.navigator.Advance(now - clock.Now()));
+        }
+        if (ready <= 0) {
+            continue;
+        }
+        char key = QuitKey;
+        if (read(keys, &key, 1) <= 0 || key == QuitKey) {
+            return;
+        }
+        const auto found =
+            std::find_if(RemoteKeys().begin(), RemoteKeys().end(),
+                         [key](const RemoteKey& candidate) { return candidate.key == key; });
+        if (found == RemoteKeys().end()) {
+            continue;
+        }
+        const Outcome outcome = found->perform(desk);
+        if (!outcome.IsDone()) {
+            onRefused(outcome.Reason());
+        }
+    }
+}
+
+} // namespace deskplayer

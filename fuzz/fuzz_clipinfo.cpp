@@ -1,0 +1,42 @@
+// Reads any bytes as clip information, adds up its duration, and names its streams.
+
+#include "disc/clipinfo.h"
+#include "disc/codes.h"
+#include "discfile.h"
+
+namespace
+{
+
+using namespace deskplayer;
+
+void UseStream(const ClipInfo& clipInfo, const ProgramStream& stream)
+{
+    const StreamAttributes& attributes = stream.attributes;
+    const auto aspectRatio = FindAspectRatio(clipInfo, stream.pid);
+    fuzz::Expect(aspectRatio || KindOfStream(attributes.codingType) != StreamKindVideo);
+    fuzz::ExpectPrintableLine(AspectRatioName(aspectRatio.value_or(0)));
+    fuzz::ExpectPrintableLine(CodingTypeName(attributes.codingType));
+    fuzz::ExpectPrintableLine(VideoFormatName(attributes.videoFormat));
+    fuzz::ExpectPrintableLine(FrameRateName(attributes.frameRate));
+    fuzz::ExpectPrintableLine(DynamicRangeName(attributes.dynamicRange));
+    fuzz::ExpectPrintableLine(ColourSpaceName(attributes.colourSpace));
+    fuzz::ExpectPrintableLine(AudioPresentationName(attributes.audioPresentation));
+    fuzz::ExpectPrintableLine(SampleRateName(attributes.sampleRate));
+    fuzz::ExpectPrintableLine(CharacterCodeName(attributes.characterCode));
+    fuzz::ExpectPrintableLine(LanguageName(attributes.language));
+}
+
+} // namespace
+
+extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size)
+{
+    return fuzz::OnDiscFile(data, size, [](const Bytes& bytes, const std::string& fileName) {
+        const ClipInfo clipInfo = ParseClipInfo(bytes, fileName);
+        Duration(clipInfo);
+        for (const Program& program : clipInfo.programs) {
+            for (const ProgramStream& stream : program.streams) {
+                UseStream(clipInfo, stream);
+            }
+        }
+    });
+}

@@ -1,0 +1,520 @@
+#include "session/script.h"
+
+#include <gtest/gtest.h>
+
+#include <ctime>
+
+#include "../disc/countingnew.h"
+
+namespace deskplayer
+{
+
+namespace
+{
+
+using Values = std::vector<std::uint64_t>;
+
+constexpr std::uint64_t Millisecond = 45;
+constexpr std::uint64_t Second = 1000 * Millisecond;
+constexpr std::uint64_t Hour = 3600 * Second;
+
+enum Command : std::size_t {
+    CommandPlay,
+    CommandNext,
+    CommandPrevious,
+    CommandChapter,
+    CommandSeek,
+    CommandForward,
+    CommandForwardFast,
+    CommandSubtitleOn,
+    CommandSubtitle,
+    CommandSubtitleStyle,
+    CommandLoop
+};
+
+const std::vector<CommandSyntax> Syntaxes = {
+    {"play", ""},
+    {"chapter next", ""},
+    {"chapter previous", ""},
+    {"chapter NUMBER", ""},
+    {"seek TIME", ""},
+    {"forward", ""},
+    {"forward fast NUMBER", ""},
+    {"subtitle on", ""},
+    {"subtitle NUMBER", ""},
+    {"subtitle style NUMBER", ""},
+    {"loop TIME to TIME times NUMBER", ""},
+};
+
+const std::string TimeHelp = "a TIME (such as 1:02:03.5, 02:03, 3.25, 2s, 500ms, 1.5m or 1h)";
+
+std::vector<ScriptStep> Parse(std::string_view text)
+{
+    return ParseScript(text, "file", Syntaxes);
+}
+
+/** The only step of a script of one line. */
+ScriptStep ParseLine(std::string_view line)
+{
+    const std::vector<ScriptStep> steps = Parse(line);
+    EXPECT_EQ(steps.size(), 1u);
+    return steps.empty() ? ScriptStep() : steps.front();
+}
+
+/** What is said of @p text, without the name of the file. */
+std::string ErrorOf(std::string_view text, const std::vector<CommandSyntax>& syntaxes = Syntaxes)
+{
+    try {
+        ParseScript(text, "file", syntaxes);
+    } catch (const ScriptError& error) {
+        const std::string what = error.what();
+        EXPECT_EQ(what.substr(0, 5), "file:");
+        return what.substr(5);
+    }
+    ADD_FAILURE() << "nothing was thrown";
+    return "";
+}
+
+/** The value of the TIME @p time. */
+std::uint64_t Ticks(const std::string& time)
+{
+    const ScriptStep step = ParseLine("seek " + time);
+    EXPECT_EQ(step.values.size(), 1u);
+    return step.values.empty() ? 0 : step.values.front();
+}
+
+/** What is said of @p time, up to what was expected in its place. */
+std::string TimeErrorOf(const std::string& time)
+{
+    const std::string error = ErrorOf("seek " + time);
+    const std::string expected = "; expected " + TimeHelp;
+    const std::size_t end = error.find(expected);
+    EXPECT_EQ(end + expected.size(), error.size()) << error;
+    return error.substr(0, end);
+}
+
+std::string Repeat(std::size_t times, const std::string& text)
+{
+    std::string repeated;
+    while (times-- > 0) {
+        repeated += text;
+    }
+    return repeated;
+}
+
+TEST(ParseScript, ReadsNothingFromAnEmptyText)
+{
+    EXPECT_TRUE(Parse("").empty());
+}
+
+TEST(ParseScript, ReadsOneCommandALine)
+{
+    const auto steps = Parse("chapter next\nplay\n");
+    ASSERT_EQ(steps.size(), 2u);
+    EXPECT_EQ(steps[0].command, CommandNext);
+    EXPECT_EQ(steps[1].command, CommandPlay);
+}
+
+TEST(ParseScript, KnowsTheLineOfACommand)
+{
+    const auto steps = Parse("\n# about\nplay\n\nplay");
+    ASSERT_EQ(steps.size(), 2u);
+    EXPECT_EQ(steps[0].line, 3u);
+    EXPECT_EQ(steps[1].line, 5u);
+}
+
+TEST(ParseScript, PassesOverCommentsAndBlankLines)
+{
+    EXPECT_TRUE(Parse("\n \t \n# play\n  #play\n#\n").empty());
+}
+
+TEST(ParseScript, EndsALineWhereItsCommentBegins)
+{
+    EXPECT_EQ(ParseLine("chapter next# play").command, CommandNext);
+}
+
+TEST(ParseScript, TakesAnyNumberOfBlanksBetweenWords)
+{
+    EXPECT_EQ(ParseLine(" \tchapter \t  next\t ").command, CommandNext);
+}
+
+TEST(ParseScript, AcceptsCarriageReturnsAtLineEnds)
+{
+    const auto steps = Parse("play\r\n\r\nchapter next\r\n");
+    ASSERT_EQ(steps.size(), 2u);
+    EXPECT_EQ(steps[1].command, CommandNext);
+    EXPECT_EQ(steps[1].line, 3u);
+}
+
+TEST(ParseScript, AcceptsALastLineWithoutItsEnd)
+{
+    EXPECT_EQ(Parse("play\nplay").size(), 2u);
+}
+
+TEST(ParseScript, AcceptsOtherScriptsInComments)
+{
+    EXPECT_EQ(Parse("play # \xC3\xA4\xFF").size(), 1u);
+}
+
+TEST(ParseScript, GivesNoValuesToACommandWithoutPlaceholders)
+{
+    EXPECT_EQ(ParseLine("chapter next").values, Values());
+}
+
+TEST(ParseScript, GivesTheValuesOfPlaceholdersInOrder)
+{
+    const ScriptStep step = ParseLine("loop 1s to 2s times 3");
+    EXPECT_EQ(step.command, CommandLoop);
+    EXPECT_EQ(step.values, (Values{Second, 2 * Second, 3}));
+}
+
+TEST(ParseScript, LeavesTheTimeOfALineOutOfTheValues)
+{
+    EXPECT_EQ(ParseLine("at 5s chapter 7").values, Values{7});
+    EXPECT_EQ(ParseLine("after 5s chapter 7").values, Values{7});
+}
+
+TEST(ParseScript, TellsPatternsApartThatBeginAlike)
+{
+    EXPECT_EQ(ParseLine("subtitle on").command, CommandSubtitleOn);
+    EXPECT_EQ(ParseLine("subtitle 4").command, CommandSubtitle);
+    EXPECT_EQ(ParseLine("subtitle style 4").command, CommandSubtitleStyle);
+}
+
+TEST(ParseScript, TellsAPatternFromOneThatGoesOn)
+{
+    EXPECT_EQ(ParseLine("forward").command, CommandForward);
+    EXPECT_EQ(ParseLine("forward fast 2").command, CommandForwardFast);
+}
+
+TEST(ParseScript, ChoosesTheFirstOfPatternsThatFit)
+{
+    const auto steps = ParseScript("go 5\n", "file", {{"go TIME", ""}, {"go NUMBER", ""}});
+    ASSERT_EQ(steps.size(), 1u);
+    EXPECT_EQ(steps[0].command, 0u);
+    EXPECT_EQ(steps[0].values, Values{5 * Second});
+}
+
+TEST(ParseScript, ReadsNumbersUpToTheGreatest)
+{
+    EXPECT_EQ(ParseLine("chapter 0").values, Values{0});
+    EXPECT_EQ(ParseLine("chapter 007").values, Values{7});
+    EXPECT_EQ(ParseLine("chapter 65535").values, Values{65535});
+}
+
+TEST(ParseScript, StartsAtTheStartOfTheSession)
+{
+    EXPECT_EQ(ParseLine("play").time, 0u);
+}
+
+TEST(ParseScript, CarriesOutALineAtTheTimeItNames)
+{
+    EXPECT_EQ(ParseLine("at 3s play").time, 3 * Second);
+}
+
+TEST(ParseScript, CarriesOutALineTogetherWithTheOneBefore)
+{
+    EXPECT_EQ(Parse("at 3s play\nplay\n")[1].time, 3 * Second);
+}
+
+TEST(ParseScript, CarriesOutALineAWhileAfterTheOneBefore)
+{
+    EXPECT_EQ(Parse("at 3s play\nafter 2s play\nafter 2s play\n")[2].time, 7 * Second);
+}
+
+TEST(ParseScript, CountsFromTheStartBeforeTheFirstLine)
+{
+    EXPECT_EQ(ParseLine("after 2s play").time, 2 * Second);
+}
+
+TEST(ParseScript, AcceptsTheTimeOfTheLineBefore)
+{
+    EXPECT_EQ(Parse("at 3s play\nat 3s play\n")[1].time, 3 * Second);
+}
+
+TEST(ParseScript, ReadsTimesWithColons)
+{
+    EXPECT_EQ(Ticks("1:02:03.5"), Hour + 123 * Second + 500 * Millisecond);
+    EXPECT_EQ(Ticks("00:01:30.500"), 90 * Second + 500 * Millisecond);
+    EXPECT_EQ(Ticks("02:03"), 123 * Second);
+    EXPECT_EQ(Ticks("59:59"), 3599 * Second);
+}
+
+TEST(ParseScript, ReadsSecondsWithoutAUnit)
+{
+    EXPECT_EQ(Ticks("3.25"), 3250 * Millisecond);
+    EXPECT_EQ(Ticks("0"), 0u);
+}
+
+TEST(ParseScript, ReadsTimesWithAUnit)
+{
+    EXPECT_EQ(Ticks("2s"), 2 * Second);
+    EXPECT_EQ(Ticks("500ms"), 500 * Millisecond);
+    EXPECT_EQ(Ticks("1.5m"), 90 * Second);
+    EXPECT_EQ(Ticks("1h"), Hour);
+}
+
+TEST(ParseScript, ReadsUpToThreeDecimals)
+{
+    EXPECT_EQ(Ticks("0.1"), 100 * Millisecond);
+    EXPECT_EQ(Ticks("0.02"), 20 * Millisecond);
+    EXPECT_EQ(Ticks("0.003s"), 3 * Millisecond);
+    EXPECT_EQ(Ticks("0.001h"), 3600 * Millisecond);
+    EXPECT_EQ(Ticks("2.000ms"), 2 * Millisecond);
+}
+
+TEST(ParseScript, LetsTheGreatestUnitOfATimeGoBeyondTheNext)
+{
+    EXPECT_EQ(Ticks("75:00"), 75 * 60 * Second);
+    EXPECT_EQ(Ticks("90"), 90 * Second);
+    EXPECT_EQ(Ticks("90m"), 90 * 60 * Second);
+    EXPECT_EQ(Ticks("100:00:00"), 100 * Hour);
+}
+
+TEST(ParseScript, ReadsTimesUpToTheLongestSession)
+{
+    EXPECT_EQ(Ticks("1000h"), LongestSession);
+    EXPECT_EQ(Ticks("1000:00:00.000"), LongestSession);
+    EXPECT_EQ(Parse("at 999h play\nafter 1h play\n")[1].time, LongestSession);
+}
+
+TEST(ParseScriptRefuses, AWordThatIsNoCommand)
+{
+    EXPECT_EQ(ErrorOf("chapter nxt"),
+              "1:9: 'nxt' is no command here; expected next, previous or a NUMBER");
+}
+
+TEST(ParseScriptRefuses, ALineThatBeginsWrongAndNamesEveryBeginningOnce)
+{
+    EXPECT_EQ(ErrorOf("\n  chaptr next"), "2:3: 'chaptr' is no command here; expected at, after, "
+                                          "play, chapter, seek, forward, subtitle or loop");
+}
+
+TEST(ParseScriptRefuses, ASecondTimeOnALine)
+{
+    const std::string commands =
+        "is no command here; expected play, chapter, seek, forward, subtitle or loop";
+    EXPECT_EQ(ErrorOf("at 2s at 3s play"), "1:7: 'at' " + commands);
+    EXPECT_EQ(ErrorOf("after 2s 3s play"), "1:10: '3s' " + commands);
+}
+
+TEST(ParseScriptRefuses, ALineThatEndsTooEarly)
+{
+    EXPECT_EQ(ErrorOf("chapter  # next\n"),
+              "1:8: the line ends here; expected next, previous or a NUMBER");
+}
+
+TEST(ParseScriptRefuses, WordsBehindACommand)
+{
+    EXPECT_EQ(ErrorOf("play now please"),
+              "1:6: 'now' is no command here; expected the end of the line");
+}
+
+TEST(ParseScriptRefuses, AWordWhereALineCouldEndAsWell)
+{
+    EXPECT_EQ(ErrorOf("forward slowly"),
+              "1:9: 'slowly' is no command here; expected the end of the line or fast");
+}
+
+TEST(ParseScriptRefuses, AWordThatFitsAnotherBeginning)
+{
+    EXPECT_EQ(ErrorOf("subtitle style on"), "1:16: 'on' is no command here; expected a NUMBER");
+}
+
+TEST(ParseScriptRefuses, WordsInOtherLetters)
+{
+    EXPECT_EQ(ErrorOf("chapter NEXT"),
+              "1:9: 'NEXT' is no command here; expected next, previous or a NUMBER");
+}
+
+TEST(ParseScriptRefuses, ThePlaceholderItself)
+{
+    EXPECT_EQ(ErrorOf("subtitle style NUMBER"),
+              "1:16: 'NUMBER' is no command here; expected a NUMBER");
+}
+
+TEST(ParseScriptRefuses, TheFirstOfSeveralWrongLines)
+{
+    EXPECT_EQ(ErrorOf("play\nplay now\nstop\n").substr(0, 4), "2:6:");
+}
+
+TEST(ParseScriptRefuses, AnythingWhenThereAreNoCommands)
+{
+    EXPECT_EQ(ErrorOf("play", {}), "1:1: 'play' is no command here");
+}
+
+TEST(ParseScriptRefuses, CountsColumnsInBytes)
+{
+    EXPECT_EQ(ErrorOf("\tplay \t now").substr(0, 5), "1:9: ");
+    EXPECT_EQ(ErrorOf("chapter \xC3\xA4"),
+              "1:9: '\\xC3\\xA4' is no command here; expected next, previous or a NUMBER");
+}
+
+TEST(ParseScriptRefuses, NumbersBeyondTheGreatest)
+{
+    const std::string expected = " is not between 0 and 65535; expected next, previous or a NUMBER";
+    EXPECT_EQ(ErrorOf("chapter 65536"), "1:9: '65536'" + expected);
+    EXPECT_EQ(ErrorOf("chapter 4294967297"), "1:9: '4294967297'" + expected);
+    EXPECT_EQ(ErrorOf("chapter 18446744073709551617"), "1:9: '18446744073709551617'" + expected);
+}
+
+TEST(ParseScriptRefuses, NumbersBeyondTheGreatestWhereWordsComeBehindThemInTheTable)
+{
+    EXPECT_EQ(ErrorOf("subtitle 65536"),
+              "1:10: '65536' is not between 0 and 65535; expected on, a NUMBER or style");
+}
+
+TEST(ParseScriptRefuses, NumbersWithAnythingBehindTheirDigits)
+{
+    EXPECT_EQ(ErrorOf("subtitle style 1.5"), "1:16: '1.5' is no number; expected a NUMBER");
+    EXPECT_EQ(ErrorOf("subtitle style 0x1"), "1:16: '0x1' is no number; expected a NUMBER");
+}
+
+TEST(ParseScriptRefuses, NumbersWithASign)
+{
+    EXPECT_EQ(ErrorOf("subtitle style -1"), "1:16: '-1' is no command here; expected a NUMBER");
+    EXPECT_EQ(ErrorOf("subtitle style +1"), "1:16: '+1' is no command here; expected a NUMBER");
+}
+
+TEST(ParseScriptRefuses, MalformedTimes)
+{
+    for (const std::string time :
+         {"1x", "1:", "1::2", "1:2:3:4", "1:2s", "1.", "1.s", "1.2.3", "1.5:2", "1:-2", "2S",
+          "2sec", "1h30m", "1:2.", "0.1234", "0.0001ms", "1.99999999999"}) {
+        EXPECT_EQ(TimeErrorOf(time), "1:6: '" + time + "' is no time");
+    }
+}
+
+TEST(ParseScriptRefuses, WordsInPlaceOfATime)
+{
+    for (const std::string time : {"soon", "-1", "+1", ".5", ":30", "s"}) {
+        EXPECT_EQ(TimeErrorOf(time), "1:6: '" + time + "' is no command here");
+    }
+}
+
+TEST(ParseScriptRefuses, MinutesAndSecondsOfSixtyBehindAGreaterUnit)
+{
+    for (const std::string time : {"1:60", "1:60:00", "1:00:60", "0:99999999999"}) {
+        EXPECT_EQ(TimeErrorOf(time), "1:6: '" + time + "' has more than 59 behind a colon");
+    }
+}
+
+TEST(ParseScriptRefuses, TimesFinerThanAMillisecond)
+{
+    EXPECT_EQ(TimeErrorOf("1.5ms"), "1:6: '1.5ms' is finer than a millisecond");
+}
+
+TEST(ParseScriptRefuses, TimesBeyondTheLongestSession)
+{
+    for (const std::string time :
+         {"1000:00:00.001", "60001m", "3600001", "3600000001ms", "4294967295h", "4294967297ms",
+          "4294967295:59:59", "18446744073709551617", "99999999999999999999999999h"}) {
+        EXPECT_EQ(TimeErrorOf(time), "1:6: '" + time + "' is more than 1000 hours");
+    }
+}
+
+TEST(ParseScriptRefuses, ASessionThatGetsTooLong)
+{
+    EXPECT_EQ(ErrorOf("at 999h play\nafter 1:00:00.001 play\n"),
+              "2:7: '1:00:00.001' after 999:00:00.000 is more than 1000 hours");
+}
+
+TEST(ParseScriptRefuses, ToGoBackInTime)
+{
+    EXPECT_EQ(ErrorOf("at 1.5m play\n\nplay\nat 1:29.999 play\n"),
+              "4:4: 00:01:29.999 is before line 3; expected at least 00:01:30.000");
+}
+
+TEST(ParseScriptRefuses, ALineWithoutTheTimeItBeginsWith)
+{
+    EXPECT_EQ(ErrorOf("at"), "1:3: the line ends here; expected " + TimeHelp);
+    EXPECT_EQ(ErrorOf("after play"), "1:7: 'play' is no command here; expected " + TimeHelp);
+}
+
+TEST(ParseScriptRefuses, ATimeWithoutACommand)
+{
+    const std::string commands = "expected play, chapter, seek, forward, subtitle or loop";
+    EXPECT_EQ(ErrorOf("at 3s"), "1:6: the line ends here; " + commands);
+    EXPECT_EQ(ErrorOf("after 3s # play"), "1:9: the line ends here; " + commands);
+}
+
+TEST(ParseScriptRefuses, ControlCharacters)
+{
+    EXPECT_EQ(ErrorOf(std::string_view("pl\0y", 4)),
+              "1:3: '\\x00' is a control character; expected text");
+    EXPECT_EQ(ErrorOf("play\n play \x7F"), "2:7: '\\x7F' is a control character; expected text");
+    EXPECT_EQ(ErrorOf("\x1Fplay"), "1:1: '\\x1F' is a control character; expected text");
+}
+
+TEST(ParseScriptRefuses, ControlCharactersInComments)
+{
+    EXPECT_EQ(ErrorOf("play # \x1B[2J"), "1:8: '\\x1B' is a control character; expected text");
+}
+
+TEST(ParseScriptRefuses, CarriageReturnsThatEndNoLine)
+{
+    EXPECT_EQ(ErrorOf("play\rplay\n"), "1:5: '\\x0D' is a control character; expected text");
+    EXPECT_EQ(ErrorOf("play\r\r\n"), "1:5: '\\x0D' is a control character; expected text");
+}
+
+TEST(ParseScriptRefuses, LongWordsAndQuotesTheirBeginning)
+{
+    const std::string forty(40, 'a');
+    EXPECT_EQ(ErrorOf("subtitle style " + forty).substr(0, 60),
+              "1:16: '" + forty + "' is no comma");
+    EXPECT_EQ(ErrorOf("subtitle style " + forty + "b").substr(0, 60),
+              "1:16: '" + forty + "...' is no co");
+}
+
+TEST(ParseScriptRefuses, ATextThatIsTooLong)
+{
+    std::string text(LongestScript, '\n');
+    EXPECT_TRUE(Parse(text).empty());
+    text += '\n';
+    EXPECT_EQ(ErrorOf(text), "1:1: the script has 1048577 bytes; expected at most 1048576");
+}
+
+TEST(ParseScriptRefuses, WithAnyFileNameOnOneLine)
+{
+    EXPECT_STREQ(ScriptError("a\n\x1B", 1, 2, "problem").what(), "a\\x0A\\x1B:1:2: problem");
+}
+
+/** The longest texts there can be, with as many lines or words as fit. */
+std::vector<std::string> LongestTexts()
+{
+    std::vector<std::string> texts;
+    for (const std::string repeated : {"play\n", "play ", "#\n", "at 0 play\n"}) {
+        texts.push_back(Repeat(LongestScript / repeated.size(), repeated));
+    }
+    return texts;
+}
+
+void ParseOrRefuse(std::string_view text)
+{
+    try {
+        Parse(text);
+    } catch (const ScriptError&) {
+    }
+}
+
+TEST(ParseScript, ReadsTheLongestTextsPromptly)
+{
+    for (const std::string& text : LongestTexts()) {
+        const std::clock_t before = std::clock();
+        ParseOrRefuse(text);
+        EXPECT_LT((std::clock() - before) / CLOCKS_PER_SEC, 20) << text.substr(0, 10);
+    }
+}
+
+TEST(ParseScript, GetsMemoryInProportionToTheText)
+{
+    for (const std::string& text : LongestTexts()) {
+        const std::size_t before = BytesAskedFor();
+        ParseOrRefuse(text);
+        EXPECT_LT(BytesAskedFor() - before, 200 * text.size()) << text.substr(0, 10);
+    }
+}
+
+} // namespace
+
+} // namespace deskplayer
