@@ -1,21 +1,33 @@
-// bdmv-deskplayer: plays a play list of a disc without its streams and prints what a navigator's
+// bdmv-deskplayer: plays a play list of a disc without its streams and writes what a navigator's
 // listeners are told.
 
 #include <CLI/CLI.hpp>
+#include <unistd.h>
 
 #include <array>
-#include <cstdio>
+#include <chrono>
+#include <cstdlib>
+#include <fstream>
+#include <iomanip>
 #include <iostream>
+#include <memory>
 #include <optional>
+#include <stdexcept>
 #include <string>
+#include <thread>
 
 #include "disc/disc.h"
 #include "kevro_linux.h"
+#include "listing/description.h"
+#include "listing/listing.h"
 #include "navigator/eventdelivery.h"
 #include "navigator/simulatednavigator.h"
 #include "navigator/virtualclock.h"
-#include "output/consolelistener.h"
-#include "session/builtinsession.h"
+#include "output/outputformat.h"
+#include "output/textoutput.h"
+#include "output/timetext.h"
+#include "session/remote.h"
+#include "session/session.h"
 
 namespace
 {
@@ -26,9 +38,32 @@ constexpr int ExitOutput = 1;
 constexpr int ExitUsage = 2;
 constexpr int ExitDisc = 3;
 
+/** What was asked for cannot be done as it was asked. */
+class UsageError : public std::runtime_error
+{
+public:
+    using std::runtime_error::runtime_error;
+};
+
+/** What was written did not arrive. */
+class OutputError : public std::runtime_error
+{
+public:
+    using std::runtime_error::runtime_error;
+};
+
 struct Options {
     std::string disc;
     std::optional<std::uint32_t> playList;
+    bool list = false;
+    std::optional<std::uint32_t> describe;
+    std::string session;
+    bool realTime = false;
+    bool remote = false;
+    std::string format = "text";
+    std::string output;
+    std::string listen;
+    std::string only;
     std::optional<std::string> log;
 };
 
@@ -37,9 +72,40 @@ void Complain(const std::string& message)
     std::cerr << "bdmv-deskplayer: " << message << '\n';
 }
 
-deskplayer::LoadedPlayList Load(const Options& options)
+/** Reads no more than it takes to see that a session is too long. */
+std::string ReadSession(const std::string& fileName)
 {
-    const deskplayer::Disc disc(options.disc);
+    std::ifstream file(fileName, std::ios::binary);
+    std::string text(deskplayer::LongestScript + 1, '\0');
+    file.read(text.data(), static_cast<std::streamsize>(text.size()));
+    if (!file.is_open() || file.bad()) {
+        throw UsageError(fileName + ": no session that can be read, expected a text file");
+    }
+    text.resize(static_cast<std::size_t>(file.gcount()));
+    return text;
+}
+
+deskplayer::OutputOptions OutputOptionsOf(const Options& options)
+{
+    deskplayer::OutputOptions output;
+    try {
+        output.format = deskplayer::ParseOutputFormat(options.format);
+        if (!options.listen.empty()) {
+            output.filter.KeepInterfaces(options.listen);
+        }
+        if (!options.only.empty()) {
+            output.filter.KeepCallbacks(options.only);
+        }
+    } catch (const std::invalid_argument& error) {
+        throw UsageError(error.what());
+    }
+    output.coloured =
+        options.output.empty() && deskplayer::WantsColours(STDOUT_FILENO, std::getenv("NO_COLOR"));
+    return output;
+}
+
+deskplayer::LoadedPlayList Load(const deskplayer::Disc& disc, const Options& options)
+{
     if (options.playList) {
         return deskplayer::LoadPlayList(disc, *options.playList,
                                         disc.ReadPlayList(*options.playList));
@@ -51,15 +117,214 @@ deskplayer::LoadedPlayList Load(const Options& options)
     return deskplayer::LoadPlayList(disc, longest.number, std::move(longest.playList));
 }
 
-void Play(deskplayer::LoadedPlayList playList)
+/** Tells on a terminal how far a session has come, once it takes long. */
+class Progress
 {
-    const std::uint64_t duration = playList.timeLine.duration;
+public:
+    explicit Progress(const deskplayer::VirtualClock& clock) : m_rClock(clock) {}
+
+    ~Progress()
+    {
+        if (m_Shown) {
+            std::cerr << '\r' << std::string(Width, ' ') << '\r';
+        }
+    }
+
+    Progress(const Progress&) = delete;
+    Progress& operator=(const Progress&) = delete;
+
+    void Update()
+    {
+        const auto now = std::chrono::steady_clock::now();
+        if (m_Possible && now >= m_Next) {
+            m_Next = now + std::chrono::milliseconds(200);
+            m_Shown = true;
+            std::cerr << "\r" << deskplayer::TimeText(m_rClock.Now()) << std::flush;
+        }
+    }
+
+private:
+    static constexpr std::size_t Width = sizeof "00:00:00.000";
+
+    const deskplayer::VirtualClock& m_rClock;
+    // Beside output on the same terminal it would only be in the way.
+    bool m_Possible = isatty(STDERR_FILENO) != 0 && isatty(STDOUT_FILENO) == 0;
+    bool m_Shown = false;
+    std::chrono::steady_clock::time_point m_Next =
+        std::chrono::steady_clock::now() + std::chrono::seconds(1);
+};
+
+void Play(deskplayer::LoadedPlayList playList, const Options& options, std::ostream& stream)
+{
+    std::vector<deskplayer::ScriptStep> steps;
+    if (!options.session.empty()) {
+        steps = deskplayer::ParseScript(ReadSession(options.session), options.session,
+                                        deskplayer::CommandSyntaxes());
+    }
+
     deskplayer::VirtualClock clock;
-    deskplayer::ConsoleListener console(std::cout, clock);
+    const std::unique_ptr<deskplayer::Output> output =
+        deskplayer::MakeOutput(OutputOptionsOf(options), stream, clock);
+    deskplayer::ResumeDataKeeper keeper;
     deskplayer::EventDelivery delivery;
     deskplayer::SimulatedNavigator navigator(std::move(playList), clock, delivery);
-    delivery.Listeners().AddListener(&console);
-    deskplayer::PlayBuiltInSession(navigator, duration);
+    delivery.Listeners().AddListener(&keeper);
+    delivery.Listeners().AddListener(output.get());
+    deskplayer::Desk desk{navigator, keeper};
+
+    if (options.remote) {
+        std::cerr << deskplayer::RemoteHelp();
+        deskplayer::PlayByRemote(desk, clock, STDIN_FILENO, Complain);
+        return;
+    }
+
+    Progress progress(clock);
+    deskplayer::SessionHooks hooks;
+    const auto start = std::chrono::steady_clock::now();
+    hooks.beforeTimePasses = [&](std::uint64_t ticks) {
+        progress.Update();
+        if (options.realTime) {
+            stream.flush();
+            const std::uint64_t until = clock.Now() + ticks;
+            std::this_thread::sleep_until(start + std::chrono::microseconds(until * 1000 / 45));
+        }
+    };
+    hooks.onRefused = [&options, &clock](std::size_t line, const std::string& reason) {
+        Complain(options.session + ":" + std::to_string(line) + ": refused at " +
+                 deskplayer::TimeText(clock.Now()) + ": " + reason);
+    };
+    if (options.session.empty()) {
+        deskplayer::PlayFromStartToEnd(desk, clock, hooks);
+    } else {
+        deskplayer::PlaySession(steps, desk, clock, hooks);
+    }
+}
+
+/** @return the exit status */
+int Run(const Options& options, std::ostream& stream)
+{
+    const deskplayer::Disc disc(options.disc);
+    int status = ExitOk;
+    if (options.list) {
+        status = deskplayer::ListPlayLists(stream, disc) == 0 ? ExitOk : ExitDisc;
+    } else if (options.describe) {
+        deskplayer::DescribePlayList(stream, disc, *options.describe);
+    } else {
+        Play(Load(disc, options), options, stream);
+    }
+    if (!stream.flush()) {
+        throw OutputError((options.output.empty() ? "standard output" : options.output) +
+                          ": could not be written");
+    }
+    return status;
+}
+
+int Run(const Options& options)
+{
+    if (options.output.empty()) {
+        return Run(options, std::cout);
+    }
+    OutputOptionsOf(options); // what is wrong with the options comes before the file is touched
+    std::ofstream file(options.output, std::ios::binary | std::ios::trunc);
+    if (!file) {
+        throw OutputError(options.output + ": cannot be written");
+    }
+    return Run(options, file);
+}
+
+/** Log lines appear when they are asked for, here or in the environment. */
+void ConfigureLog(const Options& options)
+{
+    if (!options.log && std::getenv("KEVRO_LOG") != nullptr) {
+        return;
+    }
+    std::array<char, 300> message{};
+    if (!KEVRO_Log_Configure(options.log.value_or("").c_str(), message.data(), message.size())) {
+        throw UsageError(std::string("--log: ") + message.data());
+    }
+}
+
+void PrintCommands()
+{
+    for (const deskplayer::CommandSyntax& syntax : deskplayer::CommandSyntaxes()) {
+        std::cout << std::left << std::setw(36) << syntax.pattern << syntax.help << '\n';
+    }
+}
+
+/** Help without the lists of options that exclude each other. */
+class HelpFormatter : public CLI::Formatter
+{
+public:
+    std::string make_option_opts(const CLI::Option* option) const override
+    {
+        const std::string type = option->get_type_name();
+        return type.empty() ? "" : " " + type;
+    }
+};
+
+void AddOptions(CLI::App& app, Options& options)
+{
+    app.formatter(std::make_shared<HelpFormatter>());
+    app.set_version_flag("--version", "bdmv-deskplayer " BDMVNAVIGATOR_VERSION);
+    app.add_flag_callback(
+        "--commands",
+        [] {
+            PrintCommands();
+            throw CLI::Success();
+        },
+        "Print the commands of sessions and exit");
+    app.add_option("DISC", options.disc, "Folder that holds BDMV/, or that folder itself")
+        ->required()
+        ->type_name("");
+
+    auto* const playList = app.add_option("--playlist", options.playList,
+                                          "Play list to play; the longest one unless given")
+                               ->check(CLI::Range(0, 99999).description(""))
+                               ->type_name("N");
+    auto* const list = app.add_flag("--list", options.list, "Print a table of the play lists");
+    auto* const describe =
+        app.add_option("--describe", options.describe, "Print all there is in a play list")
+            ->check(CLI::Range(0, 99999).description(""))
+            ->type_name("N")
+            ->excludes(list);
+    auto* const session =
+        app.add_option("--session", options.session,
+                       "Do what a session file says; from start to end unless given")
+            ->type_name("FILE");
+    auto* const realTime =
+        app.add_flag("--realtime", options.realTime, "Play on the wall clock, not at once");
+    auto* const remote = app.add_flag("--remote", options.remote,
+                                      "Play on the wall clock under single keys, which are shown")
+                             ->excludes(session);
+    for (CLI::Option* const playing : {playList, session, realTime, remote}) {
+        playing->excludes(list)->excludes(describe);
+    }
+
+    app.add_option("--format", options.format,
+                   "How to write callbacks: text, json (one object a line), trace (for trace "
+                   "viewers)")
+        ->type_name("FORMAT");
+    app.add_option("--output", options.output, "Where to write; standard output unless given")
+        ->type_name("FILE");
+    app.add_option("--listen", options.listen,
+                   "Interfaces to listen to: control, settings, button, interactive")
+        ->type_name("NAME,...");
+    app.add_option("--only", options.only, "Callbacks to write: PlayItem, AudioInfo, ...")
+        ->type_name("NAME,...");
+    app.add_option("--log", options.log,
+                   "Log lines to write to standard error: BdmvNavigator=Event for those of the "
+                   "events")
+        ->type_name("TEXT");
+    app.footer(
+        "A session file has one command a line, and times: \"at 00:01:30.500 chapter next\",\n"
+        "\"after 2s pause\". --commands lists the commands.\n\n"
+        "Examples:\n"
+        "  bdmv-deskplayer --list disc\n"
+        "  bdmv-deskplayer disc --session evening.session\n"
+        "  bdmv-deskplayer disc --only PlayItem,ChapterNumber --format json\n"
+        "  bdmv-deskplayer disc --remote\n\n"
+        "Exit status: 0 done, 1 the output could not be written, 2 wrong usage or a session that\n"
+        "cannot be read, 3 the disc cannot be read.");
 }
 
 } // namespace
@@ -67,39 +332,33 @@ void Play(deskplayer::LoadedPlayList playList)
 int main(int argc, char** argv)
 {
     Options options;
-    CLI::App app("Plays a play list of a Blu-ray disc without its streams, on a virtual clock, and "
-                 "prints every callback that a listener of the navigator gets: the time, the "
-                 "callback, its arguments.");
-    app.add_option("DISC", options.disc, "folder that holds BDMV/, or that folder itself")
-        ->required();
-    app.add_option("--playlist", options.playList,
-                   "number of the play list; the longest one when it is not given")
-        ->check(CLI::Range(0, 99999));
-    app.add_option("--log", options.log,
-                   "log lines to write to standard error, such as BdmvNavigator=Event");
-    app.footer(
-        "Exit status: 0 played to the end, 1 the output could not be written, 2 wrong usage,\n"
-        "3 the disc cannot be read.");
+    CLI::App app("Plays a play list of a Blu-ray disc without its streams and writes every "
+                 "callback that a listener of the navigator gets, with its time and arguments.",
+                 "bdmv-deskplayer");
+    AddOptions(app, options);
     try {
         app.parse(argc, argv);
     } catch (const CLI::ParseError& error) {
-        return app.exit(error) == 0 ? ExitOk : ExitUsage;
-    }
-    std::array<char, 300> message{};
-    if (options.log && !KEVRO_Log_Configure(options.log->c_str(), message.data(), message.size())) {
-        Complain(std::string("--log: ") + message.data());
-        return ExitUsage;
+        if (app.exit(error) != 0) {
+            return ExitUsage;
+        }
+        return std::cout.flush() ? ExitOk : ExitOutput;
     }
 
     try {
-        Play(Load(options));
+        ConfigureLog(options);
+        return Run(options);
     } catch (const deskplayer::DiscError& error) {
         Complain(error.what());
         return ExitDisc;
-    }
-    if (!std::cout.flush()) {
-        Complain("standard output could not be written");
+    } catch (const deskplayer::ScriptError& error) {
+        Complain(error.what());
+        return ExitUsage;
+    } catch (const UsageError& error) {
+        Complain(error.what());
+        return ExitUsage;
+    } catch (const OutputError& error) {
+        Complain(error.what());
         return ExitOutput;
     }
-    return ExitOk;
 }

@@ -1,0 +1,222 @@
+#include "testdesk.h"
+
+#include <gtest/gtest.h>
+
+#include <sstream>
+#include <utility>
+
+#include "support/describe.h"
+
+namespace deskplayer
+{
+
+namespace
+{
+
+std::string TimeOf(std::uint64_t ticks)
+{
+    const std::string seconds = std::to_string(ticks / Second);
+    return ticks % Second == 0 ? seconds : seconds + "+" + std::to_string(ticks % Second);
+}
+
+} // namespace
+
+Stream StreamOf(std::uint8_t codingType, std::uint16_t pid)
+{
+    Stream stream;
+    stream.entryType = EntryTypePlayItem;
+    stream.pid = pid;
+    stream.attributes.codingType = codingType;
+    return stream;
+}
+
+Stream StreamOfSubPath(std::uint8_t codingType, std::uint8_t subPath)
+{
+    Stream stream = StreamOf(codingType);
+    stream.entryType = EntryTypeSubPath;
+    stream.subPath = subPath;
+    return stream;
+}
+
+PlayItem ItemOfTicks(std::uint32_t ticks)
+{
+    PlayItem item;
+    item.inTime = 600 * Second;
+    item.outTime = item.inTime + ticks;
+    Stream video = StreamOf(0x1B);
+    video.attributes.videoFormat = bd::VideoFormatType1080p;
+    video.attributes.frameRate = 6;
+    item.streams.primaryVideo = {video};
+    return item;
+}
+
+PlayItem Item(std::uint32_t seconds)
+{
+    return ItemOfTicks(static_cast<std::uint32_t>(seconds * Second));
+}
+
+PlayItem WithTimedStill(PlayItem item, std::uint16_t seconds)
+{
+    item.stillMode = StillModeTimed;
+    item.stillTime = seconds;
+    return item;
+}
+
+PlayItem WithEndlessStill(PlayItem item)
+{
+    item.stillMode = StillModeEndless;
+    return item;
+}
+
+PlayItem Forbidding(PlayItem item, const std::vector<bd::UserOperationMaskDef>& operations)
+{
+    item.uoMask |= MaskOf(operations);
+    return item;
+}
+
+std::uint64_t MaskOf(const std::vector<bd::UserOperationMaskDef>& operations)
+{
+    std::uint64_t mask = 0;
+    for (const bd::UserOperationMaskDef operation : operations) {
+        mask |= std::uint64_t{1} << (63 - operation);
+    }
+    return mask;
+}
+
+PlayItem RichItem(std::uint32_t seconds)
+{
+    PlayItem item = Item(seconds);
+    item.streams.primaryAudio = {StreamOf(CodingAc3, 0x1100), StreamOf(CodingLpcm, 0x1101)};
+    item.streams.pg = {StreamOf(CodingGraphics), StreamOf(CodingTextSubtitle)};
+    item.streams.pipPg = {StreamOf(CodingGraphics), StreamOf(CodingGraphics)};
+    item.streams.ig = {StreamOf(CodingMenu), StreamOf(CodingMenu)};
+    item.streams.secondaryAudio = {StreamOf(CodingEac3Secondary, 0x1A00),
+                                   StreamOf(CodingEac3Secondary, 0x1A01)};
+    item.streams.secondaryVideo = {StreamOf(0x1B), StreamOf(0x1B)};
+    item.furtherAngles.resize(1);
+    return item;
+}
+
+Mark Entry(std::uint16_t item, std::uint64_t ticks)
+{
+    Mark mark;
+    mark.type = MarkTypeEntry;
+    mark.playItem = item;
+    mark.time = static_cast<std::uint32_t>(600 * Second + ticks);
+    return mark;
+}
+
+Mark Link(std::uint16_t item, std::uint64_t ticks)
+{
+    Mark mark = Entry(item, ticks);
+    mark.type = MarkTypeLink;
+    return mark;
+}
+
+PlayList ListOf(std::vector<PlayItem> items, std::vector<Mark> marks)
+{
+    PlayList playList;
+    playList.playItems = std::move(items);
+    playList.marks = std::move(marks);
+    return playList;
+}
+
+TestDesk::TestDesk(PlayList playList) : navigator(LayOut(7, std::move(playList)), clock, delivery)
+{
+    m_Listener.onCallback = [this](const std::string& callback) {
+        m_Heard += TimeOf(clock.Now()) + " " + callback + "\n";
+    };
+    delivery.Listeners().AddListener(&keeper);
+    delivery.Listeners().AddListener(&m_Listener);
+}
+
+std::string TestDesk::Take()
+{
+    return std::exchange(m_Heard, "");
+}
+
+std::string TestDesk::TakeWithoutPositions()
+{
+    std::istringstream heard(Take());
+    std::string others;
+    for (std::string line; std::getline(heard, line);) {
+        if (line.find(" CurrentTimePosition(") == std::string::npos) {
+            others += line + "\n";
+        }
+    }
+    return others;
+}
+
+void TestDesk::Start(std::uint64_t ticks)
+{
+    const Outcome outcome = navigator.Play();
+    navigator.Advance(ticks);
+    Do(outcome);
+}
+
+void TestDesk::Do(const Outcome& outcome)
+{
+    EXPECT_TRUE(outcome.IsDone()) << outcome.Reason();
+    Take();
+}
+
+std::string TestDesk::Snapshot()
+{
+    using bdmvtest::Describe;
+
+    struct Kind {
+        const char* name;
+        void (PlaybackContext::*get)(bd::StreamNumberDef*, bd::UInt8*);
+    };
+    std::ostringstream text;
+    PrintTo(navigator.CurrentStatus(), &text);
+    text << " item " << navigator.GetPlayItemId() << " position "
+         << navigator.GetCurrentTimePosition() << " chapter " << navigator.GetCurrentChapter()
+         << " mode " << Describe(navigator.GetPlayMode()) << " current mode "
+         << Describe(navigator.GetCurrentPlayMode()) << " repeat "
+         << navigator.GetCurrentABRepeatState() << " " << navigator.GetCurrentChpTitleRepeatState()
+         << " " << navigator.IsRepeating() << " trigger "
+         << Describe(navigator.GetTrigger()) << " at "
+         << navigator.TimeToNextChange().value_or(bd::TimePosition(-1));
+    for (const Kind& kind :
+         {Kind{"video", &PlaybackContext::GetVideoInfo},
+          Kind{"audio", &PlaybackContext::GetAudioInfo},
+          Kind{"subtitle", &PlaybackContext::GetPgTextStInfo},
+          Kind{"menu", &PlaybackContext::GetIgInfo},
+          Kind{"secondary audio", &PlaybackContext::GetSecondaryAudioInfo},
+          Kind{"pip subtitle", &PlaybackContext::GetPipPgTextStInfo}}) {
+        bd::StreamNumberDef number = 0;
+        bd::UInt8 count = 0;
+        (navigator.*kind.get)(&number, &count);
+        text << " " << kind.name << " " << number << "/" << +count;
+    }
+    bd::StreamNumberDef number = 0;
+    bd::AngleNumberDef angle = 0;
+    bd::UInt8 count = 0;
+    bool async = false;
+    navigator.GetSecondaryVideoInfo(&number, &count, &async);
+    text << " secondary video " << number << "/" << +count << " " << async;
+    navigator.GetAngleInfo(&angle, &count);
+    text << " angle " << +angle << "/" << +count;
+    bd::ZOOM_PARAM_Def zoom;
+    navigator.GetZoomScaleInfo(zoom);
+    text << " style " << +navigator.GetCurrentTextSubtitleStyleNumber() << " shown "
+         << navigator.GetPgTextStDisplay() << navigator.GetSecondaryVideoDisplay()
+         << navigator.GetSecondaryAudioDisplay() << navigator.GetPipPgTextStSelect() << " zoom "
+         << Describe(zoom);
+    return text.str();
+}
+
+void PrintTo(const Outcome& outcome, std::ostream* stream)
+{
+    *stream << (outcome.IsDone() ? "done" : "refused: " + outcome.Reason());
+}
+
+void PrintTo(SimulatedNavigator::Status status, std::ostream* stream)
+{
+    static const char* const names[] = {"stopped",   "playing", "paused",  "still",
+                                        "suspended", "standby", "finished"};
+    *stream << names[static_cast<int>(status)];
+}
+
+} // namespace deskplayer
