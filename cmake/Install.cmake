@@ -23,6 +23,9 @@ endif()
 
 if(BDMVNAVIGATOR_BUILD_DESKPLAYER)
   install(TARGETS bdmv-deskplayer RUNTIME DESTINATION ${CMAKE_INSTALL_BINDIR})
+  install(FILES deskplayer/bdmv-deskplayer.1 DESTINATION ${CMAKE_INSTALL_MANDIR}/man1)
+  install(FILES deskplayer/completion/bdmv-deskplayer
+    DESTINATION ${CMAKE_INSTALL_DATADIR}/bash-completion/completions)
 endif()
 
 configure_package_config_file(cmake/bdmvnavigator-config.cmake.in

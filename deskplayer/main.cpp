@@ -82,6 +82,10 @@ std::string ReadSession(const std::string& fileName)
         throw UsageError(fileName + ": no session that can be read, expected a text file");
     }
     text.resize(static_cast<std::size_t>(file.gcount()));
+    if (text.size() > deskplayer::LongestScript) {
+        throw UsageError(fileName + ": has more than " + std::to_string(deskplayer::LongestScript) +
+                         " bytes, expected a session");
+    }
     return text;
 }
 

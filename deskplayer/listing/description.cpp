@@ -2,6 +2,8 @@
 
 #include <cinttypes>
 #include <cstdio>
+#include <optional>
+#include <string>
 #include <utility>
 #include <vector>
 
@@ -21,7 +23,7 @@ namespace
 struct Field {
     std::string name;
     std::string value;
-    std::string meaning = "";
+    std::string meaning = {};
 };
 
 using Fields = std::vector<Field>;

@@ -4,6 +4,7 @@
 #include <cinttypes>
 #include <cstdio>
 #include <functional>
+#include <optional>
 #include <string>
 #include <vector>
 

@@ -28,7 +28,8 @@ public:
     Guard(const Guard&) = delete;
     Guard& operator=(const Guard&) = delete;
 
-    /** Takes the lock again after Release(). If that throws, the guard holds what it held before. */
+    /** Takes the lock again after Release(). If that throws, the guard holds what it held before.
+     */
     void Acquire()
     {
         m_rLock.Acquire();

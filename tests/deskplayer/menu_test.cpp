@@ -191,7 +191,8 @@ TEST(Menu, GivesEveryActivationATicketOfItsOwn)
 
 TEST(Menu, HandsOutAProgramThatClosesTheMenuAndPlaysTheMarkOfTheChapter)
 {
-    TestDesk desk(ThreeChapters());
+    TestDesk desk(
+        ListOf({RichItem(10)}, {Entry(0, 0), Link(0, 1), Link(0, 2), Entry(0, 3 * Second)}));
     ProgramKeeper keeper;
     desk.delivery.Listeners().AddListener(&keeper);
     desk.Start();
@@ -213,7 +214,7 @@ TEST(Menu, HandsOutAProgramThatClosesTheMenuAndPlaysTheMarkOfTheChapter)
     EXPECT_TRUE(isImmediate1);
     EXPECT_EQ(playList, 7);
     EXPECT_TRUE(isImmediate2);
-    EXPECT_EQ(mark, 2);
+    EXPECT_EQ(mark, 3);
     desk.delivery.Listeners().RemoveListener(&keeper);
 }
 
@@ -248,8 +249,7 @@ TEST(Menu, HasNoButtonsWhereThereAreNoChapters)
     desk.Start();
     desk.Do(desk.navigator.OpenPopUpMenu());
 
-    EXPECT_EQ(desk.navigator.ActivateButton().Reason(),
-              "there is no button 1, there is none here");
+    EXPECT_EQ(desk.navigator.ActivateButton().Reason(), "there is no button 1, there is none here");
     EXPECT_EQ(desk.navigator.SelectNextButton().Reason(),
               "there is no button 2, there is none here");
     EXPECT_EQ(desk.Take(), "");
@@ -261,8 +261,7 @@ TEST(Menu, WaitsWhilePlaybackIsSuspended)
     desk.Start();
     desk.Do(desk.navigator.OpenPopUpMenu());
     desk.Do(desk.navigator.Suspend());
-    const std::string suspended =
-        "playback is suspended, not playing or paused or in a still";
+    const std::string suspended = "playback is suspended, not playing or paused or in a still";
 
     EXPECT_EQ(desk.navigator.ClosePopUpMenu().Reason(), suspended);
     EXPECT_EQ(desk.navigator.SelectPreviousButton().Reason(), suspended);

@@ -175,8 +175,7 @@ TEST(Playback, StartsAtNormalSpeedAndWithoutRepeatButWithTheStreamsThatWereChose
     desk.Do(desk.navigator.SelectAudio(2));
     desk.Do(desk.navigator.RepeatTitle());
     desk.Do(desk.navigator.Zoom({{1, 2, 3, 4}, {5, 6, 7, 8}, 9}));
-    desk.Do(desk.navigator.SetPlayMode(
-        bd::PlayMode(bd::PlayDirectionForward, bd::PlaySpeedFast3)));
+    desk.Do(desk.navigator.SetPlayMode(bd::PlayMode(bd::PlayDirectionForward, bd::PlaySpeedFast3)));
     desk.Do(desk.navigator.Stop());
 
     desk.Start();
@@ -294,8 +293,8 @@ TEST(Playback, RefusesToStepOutOfAnItem)
     EXPECT_EQ(desk.Take(), "");
     EXPECT_EQ(desk.Snapshot(), before);
 
-    desk.Do(desk.navigator.SetPlayMode(
-        bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedNormal)));
+    desk.Do(
+        desk.navigator.SetPlayMode(bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedNormal)));
     desk.Do(desk.navigator.SearchTime(Second + 899));
     EXPECT_EQ(desk.navigator.Step().Reason(),
               "the play item has no further picture in this direction");
@@ -321,8 +320,7 @@ TEST(Playback, CountsATimedStillInTimeOfTheSessionAtAnySpeed)
 {
     TestDesk desk(ListOf({WithTimedStill(Item(4), 5)}));
     desk.Start();
-    desk.Do(desk.navigator.SetPlayMode(
-        bd::PlayMode(bd::PlayDirectionForward, bd::PlaySpeedFast2)));
+    desk.Do(desk.navigator.SetPlayMode(bd::PlayMode(bd::PlayDirectionForward, bd::PlaySpeedFast2)));
 
     desk.navigator.Advance(Second);
     EXPECT_EQ(desk.navigator.TimeToNextChange(), 5 * Second);
@@ -366,8 +364,8 @@ TEST(Playback, EndsATimedStillEarly)
 
 TEST(Playback, LeavesAStillByProgramEvenWhereTheViewerMayNot)
 {
-    TestDesk desk(ListOf(
-        {Forbidding(WithEndlessStill(Item(1)), {bd::UserOperationStillOff}), Item(1)}));
+    TestDesk desk(
+        ListOf({Forbidding(WithEndlessStill(Item(1)), {bd::UserOperationStillOff}), Item(1)}));
     desk.Start(Second);
 
     desk.navigator.LeaveStill();

@@ -72,8 +72,7 @@ TEST(Position, ForgetsTheFractionOfATickWhenItJumps)
 {
     TestDesk desk(ListOf({Item(10)}));
     desk.Start();
-    desk.Do(desk.navigator.SetPlayMode(
-        bd::PlayMode(bd::PlayDirectionForward, bd::PlaySpeedSlow5)));
+    desk.Do(desk.navigator.SetPlayMode(bd::PlayMode(bd::PlayDirectionForward, bd::PlaySpeedSlow5)));
     desk.navigator.Advance(31);
 
     desk.Do(desk.navigator.SearchTime(0));

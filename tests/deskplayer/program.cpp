@@ -31,7 +31,7 @@ std::string Quoted(const std::string& word)
 
 } // namespace
 
-ProgramResult RunDeskPlayer(const std::vector<std::string>& arguments)
+ProgramResult RunDeskPlayer(const std::vector<std::string>& arguments, const std::string& output)
 {
     const std::filesystem::path folder =
         std::filesystem::temp_directory_path() / ("deskplayer-" + std::to_string(getpid()));
@@ -40,12 +40,13 @@ ProgramResult RunDeskPlayer(const std::vector<std::string>& arguments)
     for (const std::string& argument : arguments) {
         command += ' ' + Quoted(argument);
     }
-    command += " <&- >" + Quoted(folder / "output") + " 2>" + Quoted(folder / "errors");
+    command += " <&- >" + Quoted(output.empty() ? (folder / "output").string() : output) + " 2>" +
+               Quoted(folder / "errors");
     const int status = std::system(command.c_str());
 
     ProgramResult result;
     result.status = WIFEXITED(status) ? WEXITSTATUS(status) : -1;
-    result.output = ReadWhole(folder / "output");
+    result.output = output.empty() ? ReadWhole(folder / "output") : "";
     result.errors = ReadWhole(folder / "errors");
     std::filesystem::remove_all(folder);
     return result;

@@ -15,7 +15,12 @@ struct ProgramResult {
     std::string errors;
 };
 
-/** Runs the desk player with these arguments and nothing to read, and waits for its end. */
-ProgramResult RunDeskPlayer(const std::vector<std::string>& arguments);
+/**
+ * Runs the desk player with these arguments and nothing to read, and waits for its end.
+ *
+ * @param output where its standard output goes; into the result unless given
+ */
+ProgramResult RunDeskPlayer(const std::vector<std::string>& arguments,
+                            const std::string& output = {});
 
 #endif

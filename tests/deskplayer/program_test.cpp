@@ -4,108 +4,186 @@
 #include <unistd.h>
 
 #include <algorithm>
+#include <chrono>
 #include <cstdlib>
 #include <filesystem>
 #include <fstream>
+#include <iterator>
+#include <nlohmann/json.hpp>
 #include <regex>
+#include <set>
+#include <sstream>
+
+#include "output/callbacks.h"
 
 namespace
 {
 
 namespace fs = std::filesystem;
 
-/** A disc of its own for every test, a copy of the sample disc, to be spoilt. */
-class SpoiltDisc : public testing::Test
+const std::string SampleDisc = BDMVNAVIGATOR_SAMPLE_DISC;
+const std::string AllEvents = BDMVNAVIGATOR_SESSIONS "/all-events.session";
+const std::string Evening = BDMVNAVIGATOR_SESSIONS "/evening.session";
+
+std::vector<std::string> LinesOf(const std::string& text)
+{
+    std::vector<std::string> lines;
+    std::istringstream stream(text);
+    for (std::string line; std::getline(stream, line);) {
+        lines.push_back(line);
+    }
+    return lines;
+}
+
+std::string LastLine(const std::string& text)
+{
+    const std::vector<std::string> lines = LinesOf(text);
+    return lines.empty() ? "" : lines.back();
+}
+
+/** The lines of @p text that @p pattern is not in. */
+std::string Without(const std::string& pattern, const std::string& text)
+{
+    std::string rest;
+    for (const std::string& line : LinesOf(text)) {
+        if (line.find(pattern) == std::string::npos) {
+            rest += line + "\n";
+        }
+    }
+    return rest;
+}
+
+/** Wrong usage is explained in one line, nothing is played, and the exit status is 2. */
+void ExpectUsageError(const std::vector<std::string>& arguments, const std::string& message)
+{
+    const ProgramResult result = RunDeskPlayer(arguments);
+    EXPECT_EQ(result.status, 2);
+    EXPECT_EQ(result.output, "");
+    EXPECT_EQ(result.errors, "bdmv-deskplayer: " + message + "\n");
+}
+
+/** A folder for the files of a test. */
+class ScratchFolder : public testing::Test
 {
 protected:
-    SpoiltDisc()
+    ScratchFolder()
     {
         fs::remove_all(folder);
-        fs::copy(BDMVNAVIGATOR_SAMPLE_DISC, folder, fs::copy_options::recursive);
-        fs::remove(folder / "BDMV/PLAYLIST/00002.mpls");
+        fs::create_directories(folder);
     }
 
-    ~SpoiltDisc() override { fs::remove_all(folder); }
+    ~ScratchFolder() override { fs::remove_all(folder); }
 
-    void Write(std::streamoff offset, const std::string& bytes) const
+    /** @return its path */
+    std::string WriteFile(const std::string& name, const std::string& content) const
+    {
+        std::ofstream(folder / name, std::ios::binary) << content;
+        return folder / name;
+    }
+
+    const fs::path folder =
+        fs::temp_directory_path() / ("program-test-" + std::to_string(getpid()));
+};
+
+/** A disc of its own for every test, a copy of the sample disc, to be changed. */
+class ScratchDisc : public ScratchFolder
+{
+protected:
+    ScratchDisc()
+    {
+        fs::copy(SampleDisc, disc, fs::copy_options::recursive);
+        fs::remove(disc / "BDMV/PLAYLIST/00002.mpls");
+    }
+
+    /** Writes over bytes of the play list. */
+    void Patch(std::streamoff offset, const std::string& bytes) const
     {
         std::fstream file(playList, std::ios::binary | std::ios::in | std::ios::out);
         file.seekp(offset);
         file << bytes;
     }
 
-    /** The desk player says in one line what is wrong, plays nothing, and exits with status 3. */
-    void ExpectRefused(const std::string& message) const
+    /** Puts the trailer in the place of the film, and has it last so many ticks of 45 kHz. */
+    void MakeShort(std::uint32_t ticks) const
     {
-        const ProgramResult result = RunDeskPlayer({folder});
+        const std::streamoff inTimeOfTheFirstItem = 0x52;
+        fs::copy_file(fs::path(SampleDisc) / "BDMV/PLAYLIST/00002.mpls", playList,
+                      fs::copy_options::overwrite_existing);
+        std::fstream file(playList, std::ios::binary | std::ios::in | std::ios::out);
+        file.seekg(inTimeOfTheFirstItem);
+        std::uint32_t time = ticks;
+        for (int shift = 24; shift >= 0; shift -= 8) {
+            time += static_cast<std::uint32_t>(file.get()) << shift;
+        }
+        file.seekp(inTimeOfTheFirstItem + 4);
+        for (int shift = 24; shift >= 0; shift -= 8) {
+            file.put(static_cast<char>(time >> shift));
+        }
+    }
+
+    /** The desk player says in one line what is wrong, plays nothing, and exits with status 3. */
+    void ExpectRefused(const std::string& message,
+                       const std::vector<std::string>& furtherArguments = {}) const
+    {
+        std::vector<std::string> arguments = {disc};
+        arguments.insert(arguments.end(), furtherArguments.begin(), furtherArguments.end());
+        const ProgramResult result = RunDeskPlayer(arguments);
         EXPECT_EQ(result.status, 3);
         EXPECT_EQ(result.output, "");
         EXPECT_EQ(std::count(result.errors.begin(), result.errors.end(), '\n'), 1);
         EXPECT_TRUE(std::regex_search(result.errors, std::regex(message))) << result.errors;
     }
 
-    const fs::path folder = fs::temp_directory_path() / ("spoilt-disc-" + std::to_string(getpid()));
-    const fs::path playList = folder / "BDMV/PLAYLIST/00001.mpls";
+    const fs::path disc = folder / "disc";
+    const fs::path playList = disc / "BDMV/PLAYLIST/00001.mpls";
 };
 
-std::string LastLine(const std::string& text)
-{
-    const std::size_t end = text.find_last_not_of('\n');
-    const std::size_t begin = text.find_last_of('\n', end);
-    return text.substr(begin + 1, end - begin);
-}
+// ---------------------------------------------------------------------------------------------
+// From start to end
 
-TEST(DeskPlayer, PlaysTheLongestPlayListOfADiscToItsEnd)
+TEST(DeskPlayer, PlaysThePlayListThatIsNamedFromStartToEnd)
 {
-    const ProgramResult result = RunDeskPlayer({BDMVNAVIGATOR_SAMPLE_DISC});
+    const ProgramResult result = RunDeskPlayer({SampleDisc, "--playlist", "2"});
 
     EXPECT_EQ(result.status, 0);
     EXPECT_EQ(result.errors, "");
-    EXPECT_EQ(result.output,
+    EXPECT_EQ(Without("CurrentTimePosition", result.output),
               "00:00:00.000  PlayStarted\n"
+              "00:00:00.000  Playlist                    playListId=2\n"
+              "00:00:00.000  PlayItem                    playListId=2 playItemId=0 "
+              "videoFormat=480i aspectRatio=4:3\n"
+              "00:00:00.000  VideoInfo                   number=1\n"
+              "00:00:00.000  AudioInfo                   number=1\n"
+              "00:00:00.000  AngleInfo                   number=1\n"
+              "00:00:00.000  AudioInfoChanged            isPrimary=true format=Ac3 "
+              "sampleRate=48000 bitsPerSample=Invalid channels=Stereo pid=4352 channelLayout=0\n"
+              "00:00:00.000  UOMask                      forbidden=nothing\n"
               "00:00:00.000  FirstPictureDelivered\n"
-              "00:00:58.000  Paused\n"
-              "00:01:00.000  Stepped                     "
-              "position=00:00:58.041 direction=Forward\n"
-              "00:01:00.000  Continued                   direction=Forward speed=Normal\n"
-              "00:02:54.958  StillOn\n"
-              "00:02:59.958  StillOff\n"
-              "00:03:00.958  StillOn\n"
-              "00:03:03.958  StillOff\n"
-              "00:03:03.958  Finished                    reason=EndOfMedia\n");
+              "00:00:00.000  MarkInfo                    playListId=2 markId=0 "
+              "time=00:00:00.000\n"
+              "00:00:00.000  ChapterNumber               chapter=1\n"
+              "00:00:20.000  Finished                    reason=EndOfMedia\n");
+    EXPECT_EQ(LinesOf(result.output).size(), 12U + 21U) << "and the position of every second";
 }
 
-TEST(DeskPlayer, PlaysThePlayListThatIsNamed)
+TEST(DeskPlayer, PlaysTheLongestPlayListAndLeavesAnEndlessStillByItself)
 {
-    const ProgramResult result = RunDeskPlayer({BDMVNAVIGATOR_SAMPLE_DISC, "--playlist", "2"});
+    const ProgramResult result =
+        RunDeskPlayer({SampleDisc, "--only", "Playlist,StillOn,StillOff,Finished"});
 
     EXPECT_EQ(result.status, 0);
-    EXPECT_EQ(LastLine(result.output),
-              "00:00:21.966  Finished                    reason=EndOfMedia");
+    EXPECT_EQ(result.errors, "");
+    EXPECT_EQ(result.output, "00:00:00.000  Playlist                    playListId=1\n"
+                             "00:02:53.000  StillOn\n"
+                             "00:02:58.000  StillOff\n"
+                             "00:02:59.000  StillOn\n"
+                             "00:03:02.000  StillOff\n"
+                             "00:03:02.000  Finished                    reason=EndOfMedia\n");
 }
 
 TEST(DeskPlayer, TakesTheBdmvFolderItselfForADisc)
 {
-    EXPECT_EQ(RunDeskPlayer({std::string(BDMVNAVIGATOR_SAMPLE_DISC) + "/BDMV"}).output,
-              RunDeskPlayer({BDMVNAVIGATOR_SAMPLE_DISC}).output);
-}
-
-TEST(DeskPlayer, WritesTheLogLinesThatAreAskedForToStandardError)
-{
-    const ProgramResult result = RunDeskPlayer(
-        {BDMVNAVIGATOR_SAMPLE_DISC, "--playlist", "2", "--log", "BdmvNavigator=Event"});
-
-    const std::string time = "....-..-.. ..:..:..\\.......";
-    const std::string tag = time + " BdmvNavigator Event: ";
-    EXPECT_TRUE(std::regex_match(result.errors,
-                                 std::regex(tag + "Sending PlayStarted\n" + tag +
-                                            "Sending FirstPictureDeliveredEvent\n" + tag +
-                                            "Sending Paused\n" + tag +
-                                            "Sending Stepped - position: 301502,dir=0\n" + tag +
-                                            "Sending Continued with playmode: dir 0, speed 5 "
-                                            "\\(currentplaymode: dir 0, speed 5\\)\n" +
-                                            tag + "Sending Finished - reason: 0\n")))
-        << result.errors;
+    EXPECT_EQ(RunDeskPlayer({SampleDisc + "/BDMV"}).output, RunDeskPlayer({SampleDisc}).output);
 }
 
 TEST(DeskPlayer, PlaysEveryDiscToTheEndOfItsMedia)
@@ -132,6 +210,466 @@ TEST(DeskPlayer, PlaysEveryDiscToTheEndOfItsMedia)
     EXPECT_GE(discs, 15);
 }
 
+TEST_F(ScratchDisc, OfLessThanASecondPlaysAsLongInRealTime)
+{
+    MakeShort(45 * 250);
+    const auto start = std::chrono::steady_clock::now();
+
+    const ProgramResult result =
+        RunDeskPlayer({disc, "--realtime", "--only", "PlayStarted,Finished"});
+
+    EXPECT_GE(std::chrono::steady_clock::now() - start, std::chrono::milliseconds(250));
+    EXPECT_EQ(result.status, 0);
+    EXPECT_EQ(result.output, "00:00:00.000  PlayStarted\n"
+                             "00:00:00.250  Finished                    reason=EndOfMedia\n");
+}
+
+TEST_F(ScratchDisc, OfTwoHoursPlaysSecondBySecond)
+{
+    MakeShort(2 * 3600 * 45000);
+
+    const ProgramResult result = RunDeskPlayer({disc, "--only", "CurrentTimePosition,Finished"});
+
+    EXPECT_EQ(result.status, 0);
+    EXPECT_EQ(LinesOf(result.output).size(), 7202U);
+    EXPECT_EQ(LastLine(result.output),
+              "02:00:00.000  Finished                    reason=EndOfMedia");
+}
+
+TEST_F(ScratchDisc, PlaysWhatCanBeReadAndNamesWhatCannot)
+{
+    fs::copy_file(disc / "BDMV/index.bdmv", disc / "BDMV/PLAYLIST/00003.mpls");
+
+    const ProgramResult result = RunDeskPlayer({disc});
+
+    EXPECT_EQ(result.status, 0);
+    EXPECT_TRUE(
+        std::regex_search(result.errors, std::regex("left out: .*00003\\.mpls: offset 0: .*INDX")))
+        << result.errors;
+    EXPECT_EQ(LastLine(result.output),
+              "00:03:02.000  Finished                    reason=EndOfMedia");
+}
+
+// ---------------------------------------------------------------------------------------------
+// Sessions
+
+TEST(DeskPlayerSession, OfAllEventsCallsEveryCallback)
+{
+    const ProgramResult result = RunDeskPlayer({SampleDisc, "--session", AllEvents});
+
+    EXPECT_EQ(result.status, 0);
+    EXPECT_EQ(result.errors, "bdmv-deskplayer: " + AllEvents +
+                                 ":8: refused at 00:00:02.000: SkipToNextPoint is forbidden by "
+                                 "play item 0\n");
+    std::set<std::string> called;
+    for (const std::string& line : LinesOf(result.output)) {
+        const std::string callback = line.substr(sizeof "hh:mm:ss.mmm ");
+        called.insert(callback.substr(0, callback.find(' ')));
+    }
+    std::set<std::string> all;
+    for (const deskplayer::CallbackInfo& info : deskplayer::AllCallbacks) {
+        all.emplace(info.name);
+    }
+    EXPECT_EQ(all.size(), 56U);
+    EXPECT_EQ(called, all);
+}
+
+/** The line of every event, with its values made alike. */
+const std::set<std::string> LinesOfEvents = {
+    "Sending AngleInfo - angleNr: #",
+    "Sending AudioChannelsChanged",
+    "Sending AudioInfo - audioNr: #",
+    "Sending ButtonActivationBusy",
+    "Sending ButtonActivationDone",
+    "Sending Chapter - chapterNumber: #",
+    "Sending Continued with playmode: dir #, speed # (currentplaymode: dir #, speed #)",
+    "Sending CurrentTimePosition - position: #",
+    "Sending ExecuteButton - ticket: #, buttonId: #",
+    "Sending Finished - reason: #",
+    "Sending FirstPictureDeliveredEvent",
+    "Sending InteractiveGraphicsActive",
+    "Sending InteractiveGraphicsInactive",
+    "Sending InteractiveGraphicsInfo - igNr: #",
+    "Sending InteractiveGraphicsInvisible",
+    "Sending InteractiveGraphicsVisible",
+    "Sending JumpOccurred",
+    "Sending MarkInfo - markId: #, time: #",
+    "Sending Paused",
+    "Sending PictureInPictureAvailable",
+    "Sending PictureInPictureUnavailable",
+    "Sending PipPgTextSelectEvent - pip pick?: #",
+    "Sending PipPgTextStInfo - pgTextStNr: #, avaliable #",
+    "Sending PlayFailed",
+    "Sending PlayItem - playListId: #, playItemId: #, videoFormat #, aspectRatio #",
+    "Sending PlayMode - direction: #, speedIndex: #",
+    "Sending PlayStarted",
+    "Sending Playlist - playListId: #",
+    "Sending PopUpMenuAvailable",
+    "Sending PopUpMenuUnavailable",
+    "Sending PreloadFailed",
+    "Sending PresentationGraphicsDisplay - shown: #",
+    "Sending PresentationGraphicsInfo - pgTextStNr: #, available: #",
+    "Sending ResumeFailed",
+    "Sending Resumed",
+    "Sending SecondaryAudioAvailable",
+    "Sending SecondaryAudioDisplay - audioNr #, numOfAudios #, shown: #",
+    "Sending SecondaryAudioInfo - audioNr: #",
+    "Sending SecondaryAudioUnavailable",
+    "Sending SecondaryVideoDisplay - video Nr #, numofVideos #, async #, shown: #",
+    "Sending SecondaryVideoInfo - videoNr: #",
+    "Sending Stepped - position: #,dir=#",
+    "Sending StillOff",
+    "Sending StillOn",
+    "Sending Stopped",
+    "Sending Suspended",
+    "Sending SystemResumeFailed",
+    "Sending SystemResumed - playing: #",
+    "Sending SystemSuspended - dataSize: #",
+    "Sending TextSubtitleStyleInfo - styleNumber: #",
+    "Sending TextSubtitleStylesAvailable - numberOfStyles: #",
+    "Sending Trigger Reached",
+    "Sending Trigger Set",
+    "Sending UOMask - uoMask: #",
+    "Sending VideoInfo - videoNr: #",
+    "Sending ZoomModeSetEvent callback"};
+
+TEST(DeskPlayerSession, OfAllEventsLogsEveryEvent)
+{
+    const ProgramResult result = RunDeskPlayer(
+        {SampleDisc, "--session", AllEvents, "--log", "BdmvNavigator=Event+hifreq|Warning"});
+
+    const std::regex eventLine(".{26} BdmvNavigator Event: (Sending [^(].*)");
+    const std::regex value("[0-9]+|TRUE|FALSE");
+    std::set<std::string> logged;
+    for (const std::string& line : LinesOf(result.errors)) {
+        std::smatch match;
+        if (std::regex_match(line, match, eventLine)) {
+            logged.insert(std::regex_replace(match[1].str(), value, "#"));
+        }
+    }
+    EXPECT_EQ(LinesOfEvents.size(), 56U);
+    EXPECT_EQ(logged, LinesOfEvents);
+    EXPECT_NE(result.errors.find(" BdmvNavigator Warning: TriggerRead time type="),
+              std::string::npos);
+}
+
+TEST(DeskPlayerSession, OfAnEveningPlaysToTheEnd)
+{
+    const ProgramResult result = RunDeskPlayer({SampleDisc, "--session", Evening});
+
+    EXPECT_EQ(result.status, 0);
+    EXPECT_EQ(result.errors, "bdmv-deskplayer: " + Evening +
+                                 ":4: refused at 00:00:02.000: SkipToNextPoint is forbidden by "
+                                 "play item 0\n");
+    EXPECT_EQ(LastLine(result.output),
+              "08:03:35.000  Finished                    reason=EndOfMedia");
+}
+
+TEST(DeskPlayerSession, IsTheSameByteForByteEveryTime)
+{
+    for (const char* const format : {"text", "json", "trace"}) {
+        const std::vector<std::string> arguments = {SampleDisc, "--session", AllEvents, "--format",
+                                                    format};
+        const ProgramResult first = RunDeskPlayer(arguments);
+        const ProgramResult second = RunDeskPlayer(arguments);
+        EXPECT_NE(first.output, "");
+        EXPECT_EQ(first.output, second.output);
+        EXPECT_EQ(first.errors, second.errors);
+    }
+}
+
+TEST_F(ScratchFolder, HasASessionThatCannotBeRead)
+{
+    const std::string wrong = WriteFile("wrong.session", "play\n  nxt 3\n");
+    const ProgramResult result = RunDeskPlayer({SampleDisc, "--session", wrong});
+    EXPECT_EQ(result.status, 2);
+    EXPECT_EQ(result.output, "");
+    EXPECT_EQ(result.errors.rfind("bdmv-deskplayer: " + wrong +
+                                      ":2:3: 'nxt' is no command here; expected at, after, play, ",
+                                  0),
+              0U)
+        << result.errors;
+    EXPECT_EQ(LinesOf(result.errors).size(), 1U);
+
+    const std::string noTextFile = ": no session that can be read, expected a text file";
+    ExpectUsageError({SampleDisc, "--session", "no.session"}, "no.session" + noTextFile);
+    ExpectUsageError({SampleDisc, "--session", folder}, folder.string() + noTextFile);
+
+    const std::string tooLong = ": has more than 1048576 bytes, expected a session";
+    const std::string longFile = WriteFile("long.session", std::string(1024 * 1024 + 1, '\n'));
+    ExpectUsageError({SampleDisc, "--session", longFile}, longFile + tooLong);
+    ExpectUsageError({SampleDisc, "--session", "/dev/zero"}, "/dev/zero" + tooLong);
+}
+
+TEST_F(ScratchFolder, HasTheLongestSessionThereCanBe)
+{
+    const std::string script = WriteFile("a.session", std::string(1024 * 1024 - 4, '\n') + "play");
+
+    const ProgramResult result =
+        RunDeskPlayer({SampleDisc, "--session", script, "--only", "PlayStarted"});
+
+    EXPECT_EQ(result.status, 0);
+    EXPECT_EQ(result.output, "00:00:00.000  PlayStarted\n");
+}
+
+TEST_F(ScratchFolder, HasASessionOfTwoHours)
+{
+    const std::string script =
+        WriteFile("a.session", "play\nrepeat title\nafter 2h repeat off\nafter 1s stop\n");
+
+    const ProgramResult result = RunDeskPlayer(
+        {SampleDisc, "--playlist", "2", "--session", script, "--only", "JumpOccurred,Stopped"});
+
+    EXPECT_EQ(result.status, 0);
+    EXPECT_EQ(LinesOf(result.output).size(), 360U + 1U);
+    EXPECT_EQ(LastLine(result.output), "02:00:01.000  Stopped");
+}
+
+// ---------------------------------------------------------------------------------------------
+// Output
+
+TEST(DeskPlayerOutput, IsOneJsonObjectALine)
+{
+    const ProgramResult text = RunDeskPlayer({SampleDisc, "--session", AllEvents});
+    const ProgramResult json =
+        RunDeskPlayer({SampleDisc, "--session", AllEvents, "--format", "json"});
+
+    EXPECT_EQ(json.status, 0);
+    const std::vector<std::string> lines = LinesOf(text.output);
+    const std::vector<std::string> objects = LinesOf(json.output);
+    ASSERT_EQ(objects.size(), lines.size());
+    for (std::size_t i = 0; i < lines.size(); ++i) {
+        const nlohmann::json object = nlohmann::json::parse(objects[i]);
+        const std::string start =
+            object.at("time").get<std::string>() + "  " + object.at("callback").get<std::string>();
+        EXPECT_EQ((lines[i] + " ").rfind(start + " ", 0), 0U) << lines[i];
+    }
+}
+
+TEST(DeskPlayerOutput, IsATraceInOneJsonArray)
+{
+    const ProgramResult result =
+        RunDeskPlayer({SampleDisc, "--session", Evening, "--format", "trace"});
+
+    EXPECT_EQ(result.status, 0);
+    const nlohmann::json trace = nlohmann::json::parse(result.output);
+    ASSERT_TRUE(trace.is_array());
+    EXPECT_GT(trace.size(), 100U);
+}
+
+TEST_F(ScratchFolder, GetsTheOutputThatIsSentToAFile)
+{
+    const std::string file = folder / "out.txt";
+
+    const ProgramResult result = RunDeskPlayer({SampleDisc, "--output", file});
+
+    EXPECT_EQ(result.status, 0);
+    EXPECT_EQ(result.output, "");
+    std::ifstream written(file, std::ios::binary);
+    EXPECT_EQ(std::string(std::istreambuf_iterator<char>(written), {}),
+              RunDeskPlayer({SampleDisc}).output);
+}
+
+TEST_F(ScratchFolder, KeepsItsFilesWhenTheUsageIsWrong)
+{
+    const std::string file = WriteFile("precious.txt", "precious");
+
+    ExpectUsageError({SampleDisc, "--output", file, "--format", "x"},
+                     "'x' is no output format; expected text, json or trace");
+
+    std::ifstream kept(file);
+    EXPECT_EQ(std::string(std::istreambuf_iterator<char>(kept), {}), "precious");
+}
+
+TEST(DeskPlayerOutput, HoldsTheInterfacesAndCallbacksThatAreAskedFor)
+{
+    EXPECT_EQ(RunDeskPlayer({SampleDisc, "--listen", "control,interactive"}).output,
+              "00:00:00.000  PlayStarted\n"
+              "00:00:00.000  FirstPictureDelivered\n"
+              "00:00:06.000  PopUpMenuAvailable\n"
+              "00:02:51.000  PopUpMenuUnavailable\n"
+              "00:02:53.000  StillOn\n"
+              "00:02:58.000  StillOff\n"
+              "00:02:59.000  StillOn\n"
+              "00:03:02.000  StillOff\n"
+              "00:03:02.000  Finished                    reason=EndOfMedia\n");
+    EXPECT_EQ(RunDeskPlayer({SampleDisc, "--only", "PlayStarted,PopUpMenuAvailable,ChapterNumber",
+                             "--listen", "control,interactive"})
+                  .output,
+              "00:00:00.000  PlayStarted\n"
+              "00:00:06.000  PopUpMenuAvailable\n");
+}
+
+TEST(DeskPlayerOutput, IsRefusedInWordsThatMeanNothing)
+{
+    ExpectUsageError({SampleDisc, "--format", "xml"},
+                     "'xml' is no output format; expected text, json or trace");
+    ExpectUsageError({SampleDisc, "--listen", "control,x"},
+                     "'x' is no listener interface; expected control, settings, button or "
+                     "interactive");
+    const ProgramResult result = RunDeskPlayer({SampleDisc, "--only", "PlayItem,Foo"});
+    EXPECT_EQ(result.status, 2);
+    EXPECT_EQ(result.output, "");
+    EXPECT_EQ(
+        result.errors.rfind("bdmv-deskplayer: 'Foo' is no callback; expected PlayStarted, ", 0), 0U)
+        << result.errors;
+}
+
+TEST(DeskPlayerOutput, ThatCannotBeWrittenEndsWithStatus1)
+{
+    for (const std::vector<std::string>& arguments : std::vector<std::vector<std::string>>{
+             {SampleDisc}, {SampleDisc, "--list"}, {SampleDisc, "--describe", "1"}}) {
+        const ProgramResult result = RunDeskPlayer(arguments, "/dev/full");
+        EXPECT_EQ(result.status, 1);
+        EXPECT_EQ(result.errors, "bdmv-deskplayer: standard output: could not be written\n");
+    }
+    EXPECT_EQ(RunDeskPlayer({"--commands"}, "/dev/full").status, 1);
+    EXPECT_EQ(RunDeskPlayer({"--help"}, "/dev/full").status, 1);
+
+    const ProgramResult full = RunDeskPlayer({SampleDisc, "--output", "/dev/full"});
+    EXPECT_EQ(full.status, 1);
+    EXPECT_EQ(full.errors, "bdmv-deskplayer: /dev/full: could not be written\n");
+    const ProgramResult nowhere = RunDeskPlayer({SampleDisc, "--output", "no/such/folder/out"});
+    EXPECT_EQ(nowhere.status, 1);
+    EXPECT_EQ(nowhere.errors, "bdmv-deskplayer: no/such/folder/out: cannot be written\n");
+}
+
+TEST(DeskPlayerOutput, OfLogLinesGoesToStandardError)
+{
+    const ProgramResult result =
+        RunDeskPlayer({SampleDisc, "--playlist", "2", "--log", "BdmvNavigator=Event"});
+
+    const std::vector<std::string> lines = LinesOf(result.errors);
+    ASSERT_EQ(lines.size(), 12U);
+    const std::string tag = "....-..-.. ..:..:..\\....... BdmvNavigator Event: ";
+    EXPECT_TRUE(std::regex_match(lines.front(), std::regex(tag + "Sending PlayStarted")));
+    EXPECT_TRUE(std::regex_match(lines.back(), std::regex(tag + "Sending Finished - reason: 0")));
+}
+
+// ---------------------------------------------------------------------------------------------
+// Usage
+
+TEST(DeskPlayer, ListsThePlayListsOfADisc)
+{
+    const ProgramResult result = RunDeskPlayer({SampleDisc, "--list"});
+
+    EXPECT_EQ(result.status, 0);
+    EXPECT_EQ(result.errors, "");
+    EXPECT_NE(result.output.find("\n00001   00:02:54.000      6         7       3  "),
+              std::string::npos)
+        << result.output;
+    EXPECT_NE(result.output.find("\n00002   00:00:20.000      1         1       1  "),
+              std::string::npos);
+}
+
+TEST(DeskPlayer, DescribesAPlayList)
+{
+    const ProgramResult result = RunDeskPlayer({SampleDisc, "--describe", "2"});
+
+    EXPECT_EQ(result.status, 0);
+    EXPECT_EQ(result.errors, "");
+    EXPECT_NE(result.output.find("00020"), std::string::npos) << "its clip";
+}
+
+TEST_F(ScratchDisc, IsListedAsFarAsItCanBeRead)
+{
+    fs::copy_file(disc / "BDMV/index.bdmv", disc / "BDMV/PLAYLIST/00003.mpls");
+
+    const ProgramResult result = RunDeskPlayer({disc, "--list"});
+
+    EXPECT_EQ(result.status, 3);
+    EXPECT_NE(result.output.find("\n00001 "), std::string::npos);
+    EXPECT_TRUE(
+        std::regex_search(result.output + result.errors, std::regex("00003.*offset 0: .*INDX")))
+        << result.output << result.errors;
+}
+
+TEST(DeskPlayer, DescribesNoPlayListThatIsNotThere)
+{
+    const ProgramResult result = RunDeskPlayer({SampleDisc, "--describe", "7"});
+
+    EXPECT_EQ(result.status, 3);
+    EXPECT_EQ(result.output, "");
+    EXPECT_NE(result.errors.find("PLAYLIST/00007.mpls: "), std::string::npos) << result.errors;
+}
+
+TEST(DeskPlayer, ExplainsItself)
+{
+    const ProgramResult help = RunDeskPlayer({"--help"});
+    EXPECT_EQ(help.status, 0);
+    EXPECT_EQ(help.errors, "");
+    for (const char* const option :
+         {"--help", "--version", "--commands", "--playlist", "--list", "--describe", "--session",
+          "--realtime", "--remote", "--format", "--output", "--listen", "--only", "--log"}) {
+        EXPECT_NE(help.output.find(option), std::string::npos) << option;
+    }
+
+    const ProgramResult version = RunDeskPlayer({"--version"});
+    EXPECT_EQ(version.status, 0);
+    EXPECT_TRUE(
+        std::regex_match(version.output, std::regex("bdmv-deskplayer \\d+\\.\\d+\\.\\d+\n")))
+        << version.output;
+
+    const ProgramResult commands = RunDeskPlayer({"--commands"});
+    EXPECT_EQ(commands.status, 0);
+    EXPECT_EQ(LinesOf(commands.output).front(),
+              "play                                start at the beginning of the play list");
+    EXPECT_EQ(LinesOf(commands.output).back(),
+              "fail stream                         have the stream run dry");
+}
+
+TEST(DeskPlayer, ExplainsWrongUsageAndExitsWithStatus2)
+{
+    const std::vector<std::vector<std::string>> wrong = {
+        {},
+        {"a", "b"},
+        {SampleDisc, "--playlist", "100000"},
+        {SampleDisc, "--playlist", "-1"},
+        {SampleDisc, "--playlist", "first"},
+        {SampleDisc, "--describe", "100000"},
+        {SampleDisc, "--no-such-option"},
+        {SampleDisc, "--session"},
+        {SampleDisc, "--log", "NoSuchComponent=Event"}};
+    for (const std::vector<std::string>& arguments : wrong) {
+        const ProgramResult result = RunDeskPlayer(arguments);
+        EXPECT_EQ(result.status, 2);
+        EXPECT_EQ(result.output, "");
+        EXPECT_NE(result.errors, "");
+    }
+}
+
+TEST(DeskPlayer, RefusesOptionsThatExcludeEachOther)
+{
+    const std::vector<std::vector<std::string>> pairs = {{"--list", "--describe", "1"},
+                                                         {"--list", "--playlist", "1"},
+                                                         {"--list", "--session", Evening},
+                                                         {"--list", "--realtime"},
+                                                         {"--list", "--remote"},
+                                                         {"--describe", "1", "--playlist", "1"},
+                                                         {"--describe", "1", "--realtime"},
+                                                         {"--describe", "1", "--session", Evening},
+                                                         {"--describe", "1", "--remote"},
+                                                         {"--remote", "--session", Evening}};
+    for (std::vector<std::string> arguments : pairs) {
+        SCOPED_TRACE(arguments.front() + " and others");
+        arguments.insert(arguments.begin(), SampleDisc);
+        const ProgramResult result = RunDeskPlayer(arguments);
+        EXPECT_EQ(result.status, 2);
+        EXPECT_EQ(result.output, "");
+        EXPECT_NE(result.errors.find(" excludes "), std::string::npos) << result.errors;
+    }
+}
+
+TEST(DeskPlayer, ShowsTheKeysOfTheRemoteAndEndsWithoutAnInput)
+{
+    const ProgramResult result =
+        RunDeskPlayer({SampleDisc, "--remote", "--only", "PlayStarted,Finished"});
+
+    EXPECT_EQ(result.status, 0);
+    EXPECT_EQ(result.output, "00:00:00.000  PlayStarted\n");
+    EXPECT_NE(result.errors.find("space pause, continue"), std::string::npos) << result.errors;
+}
+
 TEST(DeskPlayer, RefusesAFolderThatIsNotThere)
 {
     const ProgramResult result = RunDeskPlayer({"no/such/folder"});
@@ -144,86 +682,70 @@ TEST(DeskPlayer, RefusesAFolderThatIsNotThere)
 
 TEST(DeskPlayer, RefusesAPlayListThatIsNotOnTheDisc)
 {
-    const ProgramResult result = RunDeskPlayer({BDMVNAVIGATOR_SAMPLE_DISC, "--playlist", "7"});
+    const ProgramResult result = RunDeskPlayer({SampleDisc, "--playlist", "7"});
 
     EXPECT_EQ(result.status, 3);
     EXPECT_EQ(result.output, "");
     EXPECT_NE(result.errors.find("PLAYLIST/00007.mpls: "), std::string::npos) << result.errors;
 }
 
-TEST(DeskPlayer, ExplainsWrongUsageAndExitsWithStatus2)
-{
-    const std::vector<std::vector<std::string>> wrong = {
-        {},
-        {"a", "b"},
-        {BDMVNAVIGATOR_SAMPLE_DISC, "--playlist", "100000"},
-        {BDMVNAVIGATOR_SAMPLE_DISC, "--playlist", "first"},
-        {BDMVNAVIGATOR_SAMPLE_DISC, "--no-such-option"},
-        {BDMVNAVIGATOR_SAMPLE_DISC, "--log", "NoSuchComponent=Event"}};
-    for (const std::vector<std::string>& arguments : wrong) {
-        const ProgramResult result = RunDeskPlayer(arguments);
-        EXPECT_EQ(result.status, 2);
-        EXPECT_EQ(result.output, "");
-        EXPECT_NE(result.errors, "");
-    }
-}
+// ---------------------------------------------------------------------------------------------
+// Spoilt discs
 
-TEST(DeskPlayer, ReportsThatItsOutputCannotBeWritten)
+TEST_F(ScratchDisc, IsRefusedWhenThePlayListIsAnotherKindOfFile)
 {
-    const std::string command = std::string(BDMVNAVIGATOR_DESKPLAYER) + " " +
-                                BDMVNAVIGATOR_SAMPLE_DISC + " >/dev/full 2>&1";
-    EXPECT_EQ(WEXITSTATUS(std::system(command.c_str())), 1);
-}
-
-TEST_F(SpoiltDisc, IsRefusedWhenThePlayListIsAnotherKindOfFile)
-{
-    Write(0, "INDX");
+    Patch(0, "INDX");
     ExpectRefused("PLAYLIST/00001\\.mpls: offset 0: .*INDX.*MPLS");
 }
 
-TEST_F(SpoiltDisc, IsRefusedWhenThePlayListIsTruncated)
+TEST_F(ScratchDisc, IsRefusedWhenThePlayListIsTruncated)
 {
     fs::resize_file(playList, 600);
     ExpectRefused("PLAYLIST/00001\\.mpls: offset \\d+: .*expected");
+    ExpectRefused("PLAYLIST/00001\\.mpls: offset \\d+: .*expected", {"--playlist", "1"});
+    ExpectRefused("PLAYLIST/00001\\.mpls: offset \\d+: .*expected", {"--describe", "1"});
+    ExpectRefused("PLAYLIST/00001\\.mpls: offset \\d+: .*expected", {"--session", Evening});
 }
 
-TEST_F(SpoiltDisc, IsRefusedWhenThePlayListIsEmpty)
+TEST_F(ScratchDisc, IsRefusedWhenThePlayListIsEmpty)
 {
     fs::resize_file(playList, 0);
     ExpectRefused("PLAYLIST/00001\\.mpls: offset 0: .*expected");
 }
 
-TEST_F(SpoiltDisc, IsRefusedWhenAPlayItemEndsBeforeItStarts)
+TEST_F(ScratchDisc, IsRefusedWhenThePlayListIsHuge)
+{
+    fs::resize_file(playList, std::uintmax_t{1} << 40);
+    ExpectRefused("PLAYLIST/00001\\.mpls: .*expected");
+}
+
+TEST_F(ScratchDisc, IsRefusedWhenThePlayListIsAFolderOrADevice)
+{
+    fs::remove(playList);
+    fs::create_directory(playList);
+    ExpectRefused("PLAYLIST.*expected", {"--playlist", "1"});
+    fs::remove(playList);
+    fs::create_symlink("/dev/zero", playList);
+    ExpectRefused("PLAYLIST.*expected", {"--playlist", "1"});
+}
+
+TEST_F(ScratchDisc, IsRefusedWhenAPlayItemEndsBeforeItStarts)
 {
     const std::streamoff outTimeOfTheFirstItem = 58 + 10 + 18;
-    Write(outTimeOfTheFirstItem, std::string(4, '\0'));
+    Patch(outTimeOfTheFirstItem, std::string(4, '\0'));
     ExpectRefused("PLAYLIST/00001\\.mpls: offset 86: .*0.*expected");
 }
 
-TEST_F(SpoiltDisc, IsRefusedWhenTheClipInformationIsSpoilt)
+TEST_F(ScratchDisc, IsRefusedWhenTheClipInformationIsSpoilt)
 {
-    fs::resize_file(folder / "BDMV/CLIPINF/00002.clpi", 100);
+    fs::resize_file(disc / "BDMV/CLIPINF/00002.clpi", 100);
     ExpectRefused("CLIPINF/00002\\.clpi: offset \\d+: .*expected");
 }
 
-TEST_F(SpoiltDisc, IsRefusedWhenThereIsNoPlayList)
+TEST_F(ScratchDisc, IsRefusedWhenThereIsNoPlayList)
 {
     fs::remove(playList);
     ExpectRefused("PLAYLIST: .*expected");
-}
-
-TEST_F(SpoiltDisc, PlaysWhatCanBeReadAndNamesWhatCannot)
-{
-    fs::copy_file(folder / "BDMV/index.bdmv", folder / "BDMV/PLAYLIST/00003.mpls");
-
-    const ProgramResult result = RunDeskPlayer({folder});
-
-    EXPECT_EQ(result.status, 0);
-    EXPECT_TRUE(
-        std::regex_search(result.errors, std::regex("left out: .*00003\\.mpls: offset 0: .*INDX")))
-        << result.errors;
-    EXPECT_EQ(LastLine(result.output),
-              "00:03:03.958  Finished                    reason=EndOfMedia");
 }
 
 } // namespace

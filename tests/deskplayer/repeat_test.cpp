@@ -56,7 +56,7 @@ TEST(Repeat, GoesFromBBackToAInAnItemBefore)
 
     desk.navigator.Advance(2 * Second);
 
-    EXPECT_EQ(desk.TakeWithoutPositions(), "4+10 PlayItem(7, 1, 6, 15)\n"
+    EXPECT_EQ(desk.TakeWithoutPositions(), "4 PlayItem(7, 1, 6, 15)\n"
                                            "5+10 TriggerTimeReached(6, 135010)\n"
                                            "5+10 JumpOccurred()\n"
                                            "5+10 PlayItem(7, 0, 6, 15)\n");
@@ -207,6 +207,19 @@ TEST(Repeat, PlaysPastAnEmptyChapterAndRepeatsTheNext)
     EXPECT_EQ(desk.navigator.GetCurrentChapter(), 2);
     EXPECT_GE(desk.navigator.GetCurrentTimePosition(), Second);
     EXPECT_LT(desk.navigator.GetCurrentTimePosition(), 2 * Second);
+}
+
+TEST(Repeat, EndsInAnEmptyChapterAtTheEndOfThePlayList)
+{
+    TestDesk desk(ListOf({Item(2)}, {Entry(0, 0), Entry(0, 2 * Second)}));
+    desk.Start();
+    desk.Do(desk.navigator.RepeatChapter());
+    desk.Do(desk.navigator.SearchChapter(2));
+
+    EXPECT_FALSE(desk.navigator.IsRepeating());
+    desk.navigator.Advance(Second);
+
+    EXPECT_EQ(desk.TakeWithoutPositions(), "0 Finished(0)\n");
 }
 
 TEST(Repeat, RepeatsThePlayList)

@@ -25,9 +25,9 @@ bd::PlayMode Backward(bd::PlaySpeedDef speed)
 
 TEST(PlaySpeed, HasARatioForEveryStep)
 {
-    const SpeedRatio ratios[] = {{1, 32},  {1, 16},  {1, 8},   {1, 4},  {1, 2},  {1, 1},
-                                 {2, 1},   {4, 1},   {8, 1},   {16, 1}, {32, 1}, {48, 1},
-                                 {64, 1},  {80, 1},  {96, 1},  {112, 1}, {120, 1}, {128, 1}};
+    const SpeedRatio ratios[] = {{1, 32}, {1, 16}, {1, 8},  {1, 4},   {1, 2},   {1, 1},
+                                 {2, 1},  {4, 1},  {8, 1},  {16, 1},  {32, 1},  {48, 1},
+                                 {64, 1}, {80, 1}, {96, 1}, {112, 1}, {120, 1}, {128, 1}};
     for (int step = bd::PlaySpeedSlow5; step <= bd::PlaySpeedFast12; ++step) {
         SCOPED_TRACE(step);
         const SpeedRatio ratio = RatioOf(static_cast<bd::PlaySpeedDef>(step));
@@ -250,7 +250,9 @@ TEST(Backward, HasNoStills)
 
 TEST(Backward, TellsTheStreamsOfTheItemItGetsTo)
 {
-    TestDesk desk(ListOf({RichItem(1), Item(1)}));
+    PlayItem withAudio = Item(1);
+    withAudio.streams.primaryAudio = {StreamOf(CodingAc3, 0x1100)};
+    TestDesk desk(ListOf({withAudio, Item(1)}));
     desk.Start(Second + 10);
     desk.Do(desk.navigator.SetPlayMode(Backward(bd::PlaySpeedNormal)));
 
@@ -258,8 +260,8 @@ TEST(Backward, TellsTheStreamsOfTheItemItGetsTo)
 
     EXPECT_EQ(desk.Take(), "1+20 CurrentTimePosition(45000)\n"
                            "1+21 PlayItem(7, 0, 6, 15)\n"
-                           "1+21 VideoInfo(1)\n"
-                           "1+21 AudioInfo(1)\n");
+                           "1+21 AudioInfo(1)\n"
+                           "1+21 AudioInfoChanged(true, (2, 0, 0, 0, 4352, 0))\n");
 }
 
 } // namespace

@@ -11,7 +11,7 @@ namespace
 
 typedef SimulatedNavigator::Status Status;
 
-/** A resume point in which no two fields are alike. */
+/** A resume point in which no two numbers are alike. */
 ResumePoint UnusualPoint()
 {
     ResumePoint point;
@@ -30,9 +30,22 @@ ResumePoint UnusualPoint()
     point.selection.style = 20;
     point.selection.pgShown = false;
     point.selection.secondaryVideoShown = true;
-    point.selection.secondaryAudioShown = true;
+    point.selection.secondaryAudioShown = false;
     point.selection.pipPgPicked = true;
     return point;
+}
+
+/** A block with the FNV-1a checksum of its bytes at its end. */
+std::vector<bd::UInt8> WithChecksum(std::vector<bd::UInt8> block)
+{
+    std::uint32_t sum = 2166136261U;
+    for (const bd::UInt8 byte : block) {
+        sum = (sum ^ byte) * 16777619U;
+    }
+    for (int shift = 24; shift >= 0; shift -= 8) {
+        block.push_back(static_cast<bd::UInt8>(sum >> shift));
+    }
+    return block;
 }
 
 TEST(ResumeData, GivesBackWhatWasPutIn)
@@ -82,20 +95,27 @@ TEST(ResumeData, TellsTheFlagsApart)
 TEST(ResumeData, IsTheSameOnEveryMachine)
 {
     const std::vector<bd::UInt8> expected = {
-        'B', 'D', 'R', '1',             // what it is
-        0, 0x01, 0x86, 0x9F,            // play list
-        1,                              // playing
-        1, 2, 3, 4, 5, 6, 7, 8,         // position
-        0, 0, 0, 1, 0, 0, 0, 17,        // play mode
-        0, 11, 0, 12, 0, 13, 0x14, 0x15, // video, audio, menu, subtitles
-        0, 16, 0, 17, 0, 18,            // secondary video and audio, picture-in-picture subtitles
-        19, 20, 0, 1, 1, 1};            // angle, style, what is shown
+        'B', 'D',  'R',  '1',                     // what it is
+        0,   0x01, 0x86, 0x9F,                    // play list
+        1,                                        // playing
+        1,   2,    3,    4,    5, 6,  7,    8,    // position
+        0,   0,    0,    1,    0, 0,  0,    17,   // play mode
+        0,   11,   0,    12,   0, 13, 0x14, 0x15, // video, audio, menu, subtitles
+        0,   16,   0,    17,   0, 18, // secondary video and audio, picture-in-picture subtitles
+        19,  20,   0,    1,    0, 1}; // angle, style, what is shown
 
+    EXPECT_EQ(MakeResumeData(UnusualPoint()), WithChecksum(expected));
+}
+
+TEST(ResumeData, IsRefusedWhenItIsABlockOfAnotherKind)
+{
     std::vector<bd::UInt8> block = MakeResumeData(UnusualPoint());
+    block.resize(block.size() - 4);
+    ASSERT_TRUE(ReadResumeData(WithChecksum(block)));
 
-    ASSERT_EQ(block.size(), expected.size() + 4);
-    block.resize(expected.size());
-    EXPECT_EQ(block, expected);
+    block[3] = '2';
+
+    EXPECT_FALSE(ReadResumeData(WithChecksum(block)));
 }
 
 TEST(ResumeData, IsRefusedWhenABitOfItIsDamaged)
@@ -189,8 +209,7 @@ TEST(Standby, IsLeftWithPositionStreamsAndPlayMode)
     desk.Start(5 * Second + 7);
     desk.Do(desk.navigator.SelectAudio(2));
     desk.Do(desk.navigator.ShowSubtitles(false));
-    desk.Do(desk.navigator.SetPlayMode(
-        bd::PlayMode(bd::PlayDirectionForward, bd::PlaySpeedSlow1)));
+    desk.Do(desk.navigator.SetPlayMode(bd::PlayMode(bd::PlayDirectionForward, bd::PlaySpeedSlow1)));
     const std::string before = desk.Snapshot();
     desk.Do(desk.navigator.GoToStandby());
     desk.navigator.Advance(60 * Second);
@@ -276,7 +295,7 @@ TEST(Standby, EndsInAStopWhenTheResumeDataIsNoGood)
     std::vector<bd::UInt8> damaged = MakeResumeData(ResumePoint());
     damaged.back() ^= 1;
     for (const std::vector<bd::UInt8>& data :
-         {std::vector<bd::UInt8>(), std::vector<bd::UInt8>(51, 0), damaged,
+         {std::vector<bd::UInt8>(), std::vector<bd::UInt8>(damaged.size(), 0), damaged,
           MakeResumeData(ofAnotherPlayList), MakeResumeData(behindTheEnd)}) {
         TestDesk desk(ListOf({Item(10)}));
         desk.Start(Second);

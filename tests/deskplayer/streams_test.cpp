@@ -71,10 +71,10 @@ TEST(Streams, ThatAreNotThereAreRefused)
         desk.Start(Second);
         const std::string before = desk.Snapshot();
 
-        for (const std::uint64_t number : {0, 3, 65537, 257}) {
+        for (const std::uint64_t number : std::vector<std::uint64_t>{0, 3, 257, 65537}) {
             EXPECT_EQ((desk.navigator.*selection.select)(number).Reason(),
-                      "there is no " + std::string(selection.what) + " " +
-                          std::to_string(number) + ", they count from 1 to 2");
+                      "there is no " + std::string(selection.what) + " " + std::to_string(number) +
+                          ", they count from 1 to 2");
         }
         EXPECT_EQ(desk.Take(), "");
         EXPECT_EQ(desk.Snapshot(), before);

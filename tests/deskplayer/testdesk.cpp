@@ -150,7 +150,9 @@ std::string TestDesk::TakeWithoutPositions()
 void TestDesk::Start(std::uint64_t ticks)
 {
     const Outcome outcome = navigator.Play();
-    navigator.Advance(ticks);
+    if (ticks > 0) {
+        navigator.Advance(ticks);
+    }
     Do(outcome);
 }
 
@@ -175,16 +177,14 @@ std::string TestDesk::Snapshot()
          << " mode " << Describe(navigator.GetPlayMode()) << " current mode "
          << Describe(navigator.GetCurrentPlayMode()) << " repeat "
          << navigator.GetCurrentABRepeatState() << " " << navigator.GetCurrentChpTitleRepeatState()
-         << " " << navigator.IsRepeating() << " trigger "
-         << Describe(navigator.GetTrigger()) << " at "
-         << navigator.TimeToNextChange().value_or(bd::TimePosition(-1));
-    for (const Kind& kind :
-         {Kind{"video", &PlaybackContext::GetVideoInfo},
-          Kind{"audio", &PlaybackContext::GetAudioInfo},
-          Kind{"subtitle", &PlaybackContext::GetPgTextStInfo},
-          Kind{"menu", &PlaybackContext::GetIgInfo},
-          Kind{"secondary audio", &PlaybackContext::GetSecondaryAudioInfo},
-          Kind{"pip subtitle", &PlaybackContext::GetPipPgTextStInfo}}) {
+         << " " << navigator.IsRepeating() << " trigger " << Describe(navigator.GetTrigger())
+         << " at " << navigator.TimeToNextChange().value_or(bd::TimePosition(-1));
+    for (const Kind& kind : {Kind{"video", &PlaybackContext::GetVideoInfo},
+                             Kind{"audio", &PlaybackContext::GetAudioInfo},
+                             Kind{"subtitle", &PlaybackContext::GetPgTextStInfo},
+                             Kind{"menu", &PlaybackContext::GetIgInfo},
+                             Kind{"secondary audio", &PlaybackContext::GetSecondaryAudioInfo},
+                             Kind{"pip subtitle", &PlaybackContext::GetPipPgTextStInfo}}) {
         bd::StreamNumberDef number = 0;
         bd::UInt8 count = 0;
         (navigator.*kind.get)(&number, &count);

@@ -1,6 +1,7 @@
 #include "docs/declarations.h"
 
 #include <regex>
+#include <sstream>
 #include <stdexcept>
 
 #include "docs/markdown.h"
@@ -8,10 +9,15 @@
 namespace
 {
 
+/** The words of a header, with one blank between them. */
 std::string Header(const std::string& name)
 {
-    const std::string root = BDMVNAVIGATOR_SOURCE_DIR "/";
-    return std::regex_replace(ReadFile(root + name), std::regex("\\s+"), " ");
+    std::istringstream words(ReadFile(BDMVNAVIGATOR_SOURCE_DIR "/" + name));
+    std::string text;
+    for (std::string word; words >> word;) {
+        text += word + " ";
+    }
+    return text;
 }
 
 std::map<std::string, std::string> ReadCallbacks()

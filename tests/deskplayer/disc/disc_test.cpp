@@ -121,6 +121,14 @@ TEST_F(DiscTest, ReadsAFileOfTheGreatestSize)
     EXPECT_EQ(MakeDisc().ReadPlayList(0).playItems.size(), 1u);
 }
 
+// The sanitizer itself opens files while the test lets nobody do so.
+#if defined(__has_feature)
+#define UNDEFINED_BEHAVIOR_SANITIZER __has_feature(undefined_behavior_sanitizer)
+#else
+#define UNDEFINED_BEHAVIOR_SANITIZER 0
+#endif
+
+#if !UNDEFINED_BEHAVIOR_SANITIZER
 TEST_F(DiscTest, ReportsAFileThatCannotBeOpened)
 {
     WritePlayList("00000", 1);
@@ -135,6 +143,7 @@ TEST_F(DiscTest, ReportsAFileThatCannotBeOpened)
     EXPECT_EQ(error, PathOf("PLAYLIST/00000.mpls").string() +
                          ": cannot be read: Too many open files, expected 122 bytes");
 }
+#endif
 
 TEST_F(DiscTest, NamesAFileWithinTheDiscWhenItsContentIsWrong)
 {

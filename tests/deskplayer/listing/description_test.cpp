@@ -161,6 +161,8 @@ Bytes RichPlayList()
     PlayItemBytes second;
     second.inTime = 90000;
     second.outTime = 180000;
+    second.angleAndConnection = 0x11;
+    second.angleTable = {1, 1};
 
     SubPlayItemBytes subItem;
     subItem.connectionAndClips = 5 << 1 | 1;
@@ -248,6 +250,7 @@ TEST(DescribePlayList, SaysWhatTheValuesMean)
     still: mode 0 (none), seconds 0
     flags: random access flag no
     user operations: mask 0000000000000000 (forbids nothing)
+    angles: count 1, different audios no, seamless change yes
   sub path 0: type 6 (picture in picture of another clip, not in step), repeat yes
     sub play item 0: clip 00002, codec M2TS, STC sequence 4, connection condition 5 (seamless)
       time: IN 2000 (00:00:00.044), OUT 2020 (00:00:00.044), duration 20 (00:00:00.000)
@@ -328,6 +331,21 @@ TEST(DescribePlayList, SaysWhyAnAspectRatioIsNotKnown)
     EXPECT_EQ(AspectOfVideo(scratch, 0x1011, "00000")
                   .rfind("aspect none (BDMV/CLIPINF/00000.clpi: offset 4: ", 0),
               0u);
+}
+
+TEST(DescribePlayList, LooksForAnAspectRatioInTheClipOfThePlayItem)
+{
+    PlayItemBytes item;
+    item.clip = "00009";
+    PlayItemBytes withVideo;
+    withVideo.clip = "00000";
+    withVideo.streamTable =
+        StreamTableBytes({1, 0, 0, 0, 0, 0, 0, 0},
+                         Join({StreamEntry(0x1011), StreamAttributesBytes(0x1B, {0x61, 0, 0, 0})}));
+    PlayListBytes playList;
+    playList.itemCount = 2;
+    playList.items = Join({item.Make(), withVideo.Make()});
+    EXPECT_NE(DescriptionOf(playList).find("aspect 3 (16:9)"), std::string::npos);
 }
 
 /** Clip information with @p count programs. */

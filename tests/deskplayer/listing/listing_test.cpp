@@ -298,18 +298,19 @@ Number  Duration      Items  Chapters  Angles  Streams
 TEST(ListPlayLists, TellsThatOtherPlayItemsHaveOtherStreamsThanTheLongest)
 {
     PlayItemBytes shorter;
-    PlayItemBytes longest;
+    PlayItemBytes alike;
+    alike.streamTable = StreamTableBytes({0, 1, 0, 0, 0, 0, 0, 0}, AudioStream(0x1100));
+    PlayItemBytes longest = alike;
     longest.outTime = longest.inTime + 100;
-    longest.streamTable = StreamTableBytes({0, 1, 0, 0, 0, 0, 0, 0}, AudioStream(0x1100));
     PlayListBytes playList;
     playList.itemCount = 3;
-    playList.items = Join({shorter.Make(), longest.Make(), shorter.Make()});
+    playList.items = Join({shorter.Make(), longest.Make(), alike.Make()});
 
     const Lines rows = RowsOf(playList.Make());
 
     ASSERT_EQ(rows.size(), 2u);
     EXPECT_EQ(rows[0].substr(47), "audio: no language: AC-3 audio, reserved (0), reserved (0)");
-    EXPECT_EQ(rows[1], std::string(47, ' ') + "other streams in 2 of 3 play items");
+    EXPECT_EQ(rows[1], std::string(47, ' ') + "other streams in 1 of 3 play items");
 }
 
 TEST(ListPlayLists, DoesNotTellOfOtherStreamsIfOnlyPidsDiffer)
@@ -324,6 +325,42 @@ TEST(ListPlayLists, DoesNotTellOfOtherStreamsIfOnlyPidsDiffer)
     EXPECT_EQ(RowsOf(playList.Make()).size(), 1u);
 }
 
+TEST(ListPlayLists, ShowsStreamsOfEveryKind)
+{
+    const auto audio = [](const std::string& language) {
+        return Join(
+            {StreamEntry(1), StreamAttributesBytes(0x81, Join({U8(0x31), Ascii(language)}))});
+    };
+    const auto graphics = [](const std::string& language) {
+        return Join({StreamEntry(1), StreamAttributesBytes(0x90, Join({Ascii(language), U8(0)}))});
+    };
+    const auto video = [](unsigned format) {
+        return Join({StreamEntry(1),
+                     StreamAttributesBytes(0x1B, {std::uint8_t(format << 4 | 1), 0, 0, 0})});
+    };
+    PlayListBytes playList =
+        WithStreams({1, 1, 1, 1, 1, 1, 1, 1},
+                    Join({video(6), audio("eng"), graphics("fra"), graphics("deu"), graphics("spa"),
+                          audio("ita"), Zeros(2), video(3), Zeros(4), video(8)}));
+    playList.version = "0300";
+    const Lines rows = RowsOf(playList.Make());
+
+    const Lines expected = {
+        "video: H.264 video, 1080p, 23.976 Hz, aspect ratio not known",
+        "enhancement video: H.264 video, 2160p, 23.976 Hz, aspect ratio not known",
+        "audio: English: AC-3 audio, stereo, 48 kHz",
+        "subtitles: French",
+        "menus: Spanish",
+        "secondary video: H.264 video, 480p, 23.976 Hz, aspect ratio not known",
+        "secondary audio: Italian: AC-3 audio, stereo, 48 kHz",
+        "secondary subtitles: German",
+    };
+    ASSERT_EQ(rows.size(), expected.size());
+    for (std::size_t line = 0; line < rows.size(); ++line) {
+        EXPECT_EQ(rows[line].substr(47), expected[line]);
+    }
+}
+
 TEST(ListPlayLists, BreaksLongListsOfLanguages)
 {
     const Lines rows =
@@ -333,11 +370,19 @@ TEST(ListPlayLists, BreaksLongListsOfLanguages)
     EXPECT_EQ(rows[1], std::string(58, ' ') + "Japanese, Dutch, Swedish");
 }
 
-TEST(ListPlayLists, ShowsOneLanguageHoweverLongTheLabel)
+TEST(ListPlayLists, BreaksALineBeforeItIsTooLong)
 {
-    const Lines rows = RowsOf(WithSubtitles({std::string(3, '\0')}));
+    const Lines rows = RowsOf(WithSubtitles({"eng", "fra", "deu", "spa", "est", "ita"}));
+    ASSERT_EQ(rows.size(), 2u);
+    EXPECT_EQ(rows[0].substr(47), "subtitles: English, French, German, Spanish,");
+}
+
+TEST(ListPlayLists, ShowsAStreamThatIsLongerThanALine)
+{
+    const Bytes stream = Join({StreamEntry(0x1200), StreamAttributesBytes(0x20, {0x61, 0, 0, 0})});
+    const Lines rows = RowsOf(WithStreams({0, 0, 1, 0, 0, 0, 0, 0}, stream).Make());
     ASSERT_EQ(rows.size(), 1u);
-    EXPECT_EQ(rows[0].substr(47), "subtitles: no language");
+    EXPECT_EQ(rows[0].substr(47), "subtitles: H.264 video, dependent view, 1080p, 23.976 Hz");
 }
 
 TEST(ListPlayLists, ShowsAPlayListWithoutPlayItems)
@@ -352,6 +397,23 @@ TEST(ListPlayLists, SaysThatAnAspectRatioIsNotKnown)
     const Lines rows = RowsOf(WithStreams({1, 0, 0, 0, 0, 0, 0, 0}, video).Make());
     EXPECT_EQ(rows.at(0).substr(47),
               "video: H.264 video, 1080p, 23.976 Hz, aspect ratio not known");
+}
+
+TEST(ListPlayLists, LooksForAnAspectRatioInTheClipOfThePlayItem)
+{
+    PlayItemBytes item;
+    item.clip = "00009";
+    PlayItemBytes longest;
+    longest.clip = "00000";
+    longest.outTime = longest.inTime + 100;
+    longest.streamTable =
+        StreamTableBytes({1, 0, 0, 0, 0, 0, 0, 0},
+                         Join({StreamEntry(0x1011), StreamAttributesBytes(0x1B, {0x61, 0, 0, 0})}));
+    PlayListBytes playList;
+    playList.itemCount = 2;
+    playList.items = Join({item.Make(), longest.Make()});
+    EXPECT_EQ(RowsOf(playList.Make()).at(0).substr(47),
+              "video: H.264 video, 1080p, 23.976 Hz, 16:9");
 }
 
 TEST(ListPlayLists, CountsThePlayListsThatCannotBeReadAndSaysWhy)
