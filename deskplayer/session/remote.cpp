@@ -19,7 +19,7 @@ namespace
 typedef std::chrono::steady_clock Clock;
 
 constexpr char QuitKey = 'q';
-constexpr std::int64_t MillisecondsPerHour = 3600 * 1000;
+constexpr std::int64_t MillisecondsPerHour = std::int64_t{3600} * 1000;
 
 Outcome PauseOrContinue(Desk& desk)
 {

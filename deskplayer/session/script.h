@@ -31,7 +31,7 @@ namespace deskplayer
 {
 
 /** Longest script that is read, in bytes. */
-constexpr std::size_t LongestScript = 1024 * 1024;
+constexpr std::size_t LongestScript = std::size_t{1024} * 1024;
 
 /** Latest time of a session, and greatest value of a TIME: 1000 hours, in ticks of 45 kHz. */
 constexpr std::uint64_t LongestSession = std::uint64_t(1000) * 3600 * TicksPerSecond;
