@@ -330,14 +330,14 @@ std::vector<bool> AsyncFlagsOf(PlaybackContext& context)
 TEST(PlaybackContext, TellsWhichSecondaryStreamsRunOnTheirOwn)
 {
     PlayItem onItsOwn = Item(1);
-    onItsOwn.streams.secondaryVideo = {StreamOf(0x1B), StreamOfSubPath(0x1B, 1)};
+    onItsOwn.streams.secondaryVideo = {StreamOf(0x1B), StreamOfSubPath(0x1B, 0)};
     PlayItem inStep = Item(1);
-    inStep.streams.secondaryVideo = {StreamOfSubPath(0x1B, 0)};
-    inStep.streams.secondaryAudio = {StreamOfSubPath(CodingEac3Secondary, 1)};
+    inStep.streams.secondaryVideo = {StreamOf(0x1B), StreamOfSubPath(0x1B, 1)};
+    inStep.streams.secondaryAudio = {StreamOfSubPath(CodingEac3Secondary, 0)};
     PlayList playList = ListOf({onItsOwn, inStep, Item(1)});
     playList.subPaths.resize(2);
-    playList.subPaths[0].type = bd::SubPathOutOfMuxSynchPipPresentationPath;
-    playList.subPaths[1].type = bd::SubPathOutOfMuxASynchPipPresentationPath;
+    playList.subPaths[0].type = bd::SubPathOutOfMuxASynchPipPresentationPath;
+    playList.subPaths[1].type = bd::SubPathOutOfMuxSynchPipPresentationPath;
     OpenContext context(LayOut(1, playList));
 
     EXPECT_EQ(AsyncFlagsOf(context), (std::vector<bool>{true, false, false, false}));
