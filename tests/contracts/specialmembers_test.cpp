@@ -3,6 +3,7 @@
 
 #include <gtest/gtest.h>
 
+#include <memory>
 #include <type_traits>
 
 #include "bdmvnavigator/inavigatorevent.h"
@@ -102,4 +103,19 @@ TEST(ProgramData, NamesItsPointerTypeAndItsIndexType)
 {
     EXPECT_TRUE((std::is_same_v<bdmv::IProgramData::RefPtr, bd::RefPtr<bdmv::IProgramData>>));
     EXPECT_TRUE((std::is_same_v<bdmv::IProgramData::CommandIdDef, bd::UInt16>));
+}
+
+TEST(PlayListMark, IsDestroyedWithWhatImplementsIt)
+{
+    struct Mark : bdmv::IPlayListMark {
+        explicit Mark(bool& isDestroyed) : destroyed(isDestroyed) {}
+        ~Mark() override { destroyed = true; }
+
+        bool& destroyed;
+    };
+    bool destroyed = false;
+
+    std::unique_ptr<bdmv::IPlayListMark>(new Mark(destroyed)).reset();
+
+    EXPECT_TRUE(destroyed);
 }
