@@ -1,0 +1,1 @@
+// Nothing but a source to build the precompiled header with.
