@@ -5,7 +5,10 @@
 #include <unistd.h>
 
 #include <algorithm>
+#include <array>
 #include <chrono>
+#include <csignal>
+#include <cstddef>
 #include <sstream>
 
 #include "disc/codes.h"
@@ -19,6 +22,7 @@ namespace
 typedef std::chrono::steady_clock Clock;
 
 constexpr char QuitKey = 'q';
+constexpr char ControlC = '\x03'; ///< quits as well: as a key, for the terminal must be put back
 constexpr std::int64_t MillisecondsPerHour = std::int64_t{3600} * 1000;
 
 Outcome PauseOrContinue(Desk& desk)
@@ -57,6 +61,19 @@ Outcome PerformNamed(Desk& desk, std::string_view pattern)
     return found->perform(desk, {});
 }
 
+/** Signals that end a program from outside, and that a program can still answer. */
+constexpr std::array<int, 4> EndingSignals = {SIGHUP, SIGINT, SIGQUIT, SIGTERM};
+
+/** The terminal to put back when a signal ends the program; there is one remote at a time. */
+int g_Terminal = -1;
+termios g_TerminalBefore = {};
+
+extern "C" void PutTerminalBack(int signal)
+{
+    tcsetattr(g_Terminal, TCSANOW, &g_TerminalBefore);
+    raise(signal); // its handler is gone: the program ends as it would have without one
+}
+
 /** Has a terminal give single keys without showing them; puts it back as it was. */
 class SingleKeys
 {
@@ -64,19 +81,35 @@ public:
     explicit SingleKeys(int terminal)
         : m_Terminal(terminal), m_Changed(tcgetattr(terminal, &m_Before) == 0)
     {
-        if (m_Changed) {
-            termios single = m_Before;
-            single.c_lflag &= ~static_cast<tcflag_t>(ICANON | ECHO);
-            single.c_cc[VMIN] = 1;
-            single.c_cc[VTIME] = 0;
-            tcsetattr(m_Terminal, TCSANOW, &single);
+        if (!m_Changed) {
+            return;
         }
+        g_Terminal = m_Terminal;
+        g_TerminalBefore = m_Before;
+        struct sigaction putBack = {};
+        putBack.sa_handler = PutTerminalBack;
+        putBack.sa_flags = static_cast<int>(SA_RESETHAND);
+        for (std::size_t i = 0; i < EndingSignals.size(); ++i) {
+            sigaction(EndingSignals[i], nullptr, &m_Actions[i]);
+            if (m_Actions[i].sa_handler == SIG_DFL) {
+                sigaction(EndingSignals[i], &putBack, nullptr);
+            }
+        }
+        termios single = m_Before;
+        single.c_lflag &= ~static_cast<tcflag_t>(ICANON | ECHO | ISIG);
+        single.c_cc[VMIN] = 1;
+        single.c_cc[VTIME] = 0;
+        tcsetattr(m_Terminal, TCSANOW, &single);
     }
 
     ~SingleKeys()
     {
-        if (m_Changed) {
-            tcsetattr(m_Terminal, TCSANOW, &m_Before);
+        if (!m_Changed) {
+            return;
+        }
+        tcsetattr(m_Terminal, TCSANOW, &m_Before);
+        for (std::size_t i = 0; i < EndingSignals.size(); ++i) {
+            sigaction(EndingSignals[i], &m_Actions[i], nullptr);
         }
     }
 
@@ -86,6 +119,7 @@ public:
 private:
     int m_Terminal;
     termios m_Before = {};
+    std::array<struct sigaction, EndingSignals.size()> m_Actions = {};
     bool m_Changed;
 };
 
@@ -150,7 +184,7 @@ std::string RemoteHelp()
             help << '\n';
         }
     }
-    help << QuitKey << " quit\n";
+    help << QuitKey << " or Ctrl-C quit\n";
     return help.str();
 }
 
@@ -171,7 +205,7 @@ void PlayByRemote(Desk& desk, VirtualClock& clock, int keys,
             continue;
         }
         char key = QuitKey;
-        if (read(keys, &key, 1) <= 0 || key == QuitKey) {
+        if (read(keys, &key, 1) <= 0 || key == QuitKey || key == ControlC) {
             return;
         }
         const auto found =

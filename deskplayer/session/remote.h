@@ -22,15 +22,17 @@ struct RemoteKey {
     Outcome (*perform)(Desk& desk);
 };
 
-/** All keys but the one that quits, `q`. */
+/** All keys but those that quit, `q` and Ctrl-C. */
 const std::vector<RemoteKey>& RemoteKeys();
 
 /** The keys and what they are for, in a few lines. */
 std::string RemoteHelp();
 
 /**
- * Plays in real time under the keys that are read from a terminal, until `q`, the end of the input,
- * or the end of playback. What is no terminal is read as it is.
+ * Plays in real time under the keys that are read from a terminal, until `q`, Ctrl-C, the end of
+ * the input, or the end of playback. What is no terminal is read as it is.
+ *
+ * The terminal is put back as it was at the end, also when a signal ends the program.
  *
  * @param keys file descriptor to read single characters from
  * @param onRefused called when a key could not be obeyed, with the reason

@@ -6,6 +6,7 @@
 #include <termios.h>
 #include <unistd.h>
 
+#include <csignal>
 #include <cstring>
 #include <functional>
 #include <set>
@@ -20,6 +21,8 @@ namespace
 {
 
 typedef SimulatedNavigator::Status Status;
+
+constexpr char ControlC = '\x03';
 
 /** An item of an hour, so that nothing ends by itself, with chapters every ten minutes. */
 PlayList LongPlayList()
@@ -271,7 +274,7 @@ TEST(Remote, IgnoresKeysThatMeanNothing)
     for (int key = 0; key < 256; ++key) {
         const auto character = static_cast<char>(key);
         const auto& known = RemoteKeys();
-        if (character != 'q' &&
+        if (character != 'q' && character != ControlC &&
             std::none_of(known.begin(), known.end(), [character](const RemoteKey& remoteKey) {
                 return remoteKey.key == character;
             })) {
@@ -292,7 +295,7 @@ TEST(Remote, ExplainsEveryKey)
         const std::string name = key.key == ' ' ? "space" : std::string(1, key.key);
         EXPECT_NE((" " + help).find(name + " " + key.help), std::string::npos) << key.help;
     }
-    EXPECT_NE(help.find("q quit\n"), std::string::npos);
+    EXPECT_NE(help.find("q or Ctrl-C quit\n"), std::string::npos);
 }
 
 /** A terminal whose other end the test holds. */
@@ -375,6 +378,62 @@ TEST(RemoteTerminal, GivesSingleKeysWithoutShowingThem)
     EXPECT_EQ(terminal.Screen(), "");
     EXPECT_NE(before.c_lflag & (ICANON | ECHO), 0) << "there was something to change";
     EXPECT_TRUE(SameSettings(terminal.Settings(), before));
+    desk.delivery.Listeners().RemoveListener(&presser);
+}
+
+TEST(RemoteTerminal, TakesControlCForAKeyThatQuits)
+{
+    TestDesk desk(LongPlayList());
+    const Terminal terminal;
+    const termios before = terminal.Settings();
+    AtStart presser([&terminal] { terminal.Press({ControlC, ' ', 'q'}); });
+    desk.delivery.Listeners().AddListener(&presser);
+
+    PlayByRemote(desk.desk, desk.clock, terminal.Descriptor(), {});
+
+    EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Playing) << "the key behind it was not read";
+    EXPECT_TRUE(SameSettings(terminal.Settings(), before));
+    desk.delivery.Listeners().RemoveListener(&presser);
+}
+
+TEST(RemoteTerminal, IsPutBackWhenASignalEndsTheProgram)
+{
+    const Terminal terminal;
+    const termios before = terminal.Settings();
+    for (const int signal : {SIGHUP, SIGINT, SIGQUIT, SIGTERM}) {
+        EXPECT_EXIT(
+            {
+                TestDesk desk(LongPlayList());
+                AtStart ender([signal] { kill(getpid(), signal); });
+                desk.delivery.Listeners().AddListener(&ender);
+                PlayByRemote(desk.desk, desk.clock, terminal.Descriptor(), {});
+            },
+            testing::KilledBySignal(signal), "");
+        EXPECT_TRUE(SameSettings(terminal.Settings(), before)) << signal;
+    }
+}
+
+TEST(RemoteTerminal, LeavesSignalsAsItFoundThem)
+{
+    struct sigaction ignore = {};
+    ignore.sa_handler = SIG_IGN;
+    struct sigaction before = {};
+    sigaction(SIGHUP, &ignore, &before);
+    TestDesk desk(LongPlayList());
+    const Terminal terminal;
+    AtStart presser([&terminal] {
+        raise(SIGHUP);
+        terminal.Press("q");
+    });
+    desk.delivery.Listeners().AddListener(&presser);
+
+    PlayByRemote(desk.desk, desk.clock, terminal.Descriptor(), {});
+
+    struct sigaction after = {};
+    sigaction(SIGHUP, &before, &after);
+    EXPECT_EQ(after.sa_handler, SIG_IGN);
+    sigaction(SIGTERM, nullptr, &after);
+    EXPECT_EQ(after.sa_handler, SIG_DFL);
     desk.delivery.Listeners().RemoveListener(&presser);
 }
 
