@@ -15,6 +15,8 @@
 #include <stdexcept>
 #include <string>
 #include <thread>
+#include <utility>
+#include <vector>
 
 #include "disc/disc.h"
 #include "kevro_linux.h"
@@ -89,6 +91,16 @@ std::string ReadSession(const std::string& fileName)
     return text;
 }
 
+/** The steps of the session; none without one. */
+std::vector<deskplayer::ScriptStep> ReadSteps(const Options& options)
+{
+    if (options.session.empty()) {
+        return {};
+    }
+    return deskplayer::ParseScript(ReadSession(options.session), options.session,
+                                   deskplayer::CommandSyntaxes());
+}
+
 deskplayer::OutputOptions OutputOptionsOf(const Options& options)
 {
     deskplayer::OutputOptions output;
@@ -158,17 +170,13 @@ private:
         std::chrono::steady_clock::now() + std::chrono::seconds(1);
 };
 
-void Play(deskplayer::LoadedPlayList playList, const Options& options, std::ostream& stream)
+void Play(deskplayer::LoadedPlayList playList, const std::vector<deskplayer::ScriptStep>& steps,
+          const Options& options, const deskplayer::OutputOptions& outputOptions,
+          std::ostream& stream)
 {
-    std::vector<deskplayer::ScriptStep> steps;
-    if (!options.session.empty()) {
-        steps = deskplayer::ParseScript(ReadSession(options.session), options.session,
-                                        deskplayer::CommandSyntaxes());
-    }
-
     deskplayer::VirtualClock clock;
     const std::unique_ptr<deskplayer::Output> output =
-        deskplayer::MakeOutput(OutputOptionsOf(options), stream, clock);
+        deskplayer::MakeOutput(outputOptions, stream, clock);
     deskplayer::ResumeDataKeeper keeper;
     deskplayer::EventDelivery delivery;
     deskplayer::SimulatedNavigator navigator(std::move(playList), clock, delivery);
@@ -204,36 +212,60 @@ void Play(deskplayer::LoadedPlayList playList, const Options& options, std::ostr
     }
 }
 
-/** @return the exit status */
-int Run(const Options& options, std::ostream& stream)
+/** Standard output, or the file that is to be written. */
+class Target
 {
-    const deskplayer::Disc disc(options.disc);
-    int status = ExitOk;
-    if (options.list) {
-        status = deskplayer::ListPlayLists(stream, disc) == 0 ? ExitOk : ExitDisc;
-    } else if (options.describe) {
-        deskplayer::DescribePlayList(stream, disc, *options.describe);
-    } else {
-        Play(Load(disc, options), options, stream);
-    }
-    if (!stream.flush()) {
-        throw OutputError((options.output.empty() ? "standard output" : options.output) +
-                          ": could not be written");
-    }
-    return status;
-}
+public:
+    /** @param fileName empty for standard output */
+    explicit Target(const std::string& fileName) : m_rFileName(fileName) {}
 
+    /** What the file holds is lost: called only once all that is to be read has been read. */
+    std::ostream& Open()
+    {
+        if (m_rFileName.empty()) {
+            return std::cout;
+        }
+        m_File.open(m_rFileName, std::ios::binary | std::ios::trunc);
+        if (!m_File) {
+            throw OutputError(m_rFileName + ": cannot be written");
+        }
+        return m_File;
+    }
+
+    /** Has everything arrive. */
+    void Finish()
+    {
+        if (m_rFileName.empty() ? !std::cout.flush() : !m_File.flush()) {
+            throw OutputError((m_rFileName.empty() ? "standard output" : m_rFileName) +
+                              ": could not be written");
+        }
+    }
+
+private:
+    const std::string& m_rFileName;
+    std::ofstream m_File;
+};
+
+/** @return the exit status */
 int Run(const Options& options)
 {
-    if (options.output.empty()) {
-        return Run(options, std::cout);
+    const deskplayer::OutputOptions outputOptions = OutputOptionsOf(options);
+    const deskplayer::Disc disc(options.disc);
+    Target target(options.output);
+    int status = ExitOk;
+    if (options.list) {
+        const std::vector<std::uint32_t> numbers = disc.PlayListNumbers();
+        status = deskplayer::ListPlayLists(target.Open(), disc, numbers) == 0 ? ExitOk : ExitDisc;
+    } else if (options.describe) {
+        const deskplayer::PlayList playList = disc.ReadPlayList(*options.describe);
+        deskplayer::DescribePlayList(target.Open(), disc, *options.describe, playList);
+    } else {
+        deskplayer::LoadedPlayList playList = Load(disc, options);
+        const std::vector<deskplayer::ScriptStep> steps = ReadSteps(options);
+        Play(std::move(playList), steps, options, outputOptions, target.Open());
     }
-    OutputOptionsOf(options); // what is wrong with the options comes before the file is touched
-    std::ofstream file(options.output, std::ios::binary | std::ios::trunc);
-    if (!file) {
-        throw OutputError(options.output + ": cannot be written");
-    }
-    return Run(options, file);
+    target.Finish();
+    return status;
 }
 
 /** Log lines appear when they are asked for, here or in the environment. */

@@ -194,22 +194,23 @@ Fields FieldsOtherThanVideo(const StreamAttributes& attributes)
 class Description
 {
 public:
-    Description(std::ostream& output, const Disc& disc, std::uint32_t number)
-        : m_rOutput(output), m_AspectRatios(disc), m_Number(number),
-          m_PlayList(disc.ReadPlayList(number)), m_TimeLine(BuildTimeLine(m_PlayList))
+    Description(std::ostream& output, const Disc& disc, std::uint32_t number,
+                const PlayList& playList)
+        : m_rOutput(output), m_AspectRatios(disc), m_Number(number), m_rPlayList(playList),
+          m_TimeLine(BuildTimeLine(playList))
     {
     }
 
     void Write()
     {
         WriteApplicationInfo();
-        for (std::size_t item = 0; item < m_PlayList.playItems.size(); ++item) {
+        for (std::size_t item = 0; item < m_rPlayList.playItems.size(); ++item) {
             WritePlayItem(item);
         }
-        for (std::size_t path = 0; path < m_PlayList.subPaths.size(); ++path) {
+        for (std::size_t path = 0; path < m_rPlayList.subPaths.size(); ++path) {
             WriteSubPath(path);
         }
-        for (std::size_t mark = 0; mark < m_PlayList.marks.size(); ++mark) {
+        for (std::size_t mark = 0; mark < m_rPlayList.marks.size(); ++mark) {
             WriteMark(mark);
         }
         for (const Chapter& chapter : m_TimeLine.chapters) {
@@ -217,8 +218,8 @@ public:
                  {Time("start", chapter.start), Time("end", chapter.end),
                   Number("mark", chapter.mark)});
         }
-        for (std::size_t number = 0; number < m_PlayList.extensionBlocks.size(); ++number) {
-            const ExtensionBlock& block = m_PlayList.extensionBlocks[number];
+        for (std::size_t number = 0; number < m_rPlayList.extensionBlocks.size(); ++number) {
+            const ExtensionBlock& block = m_rPlayList.extensionBlocks[number];
             Line(1, "extension block " + std::to_string(number),
                  {{"kind", std::to_string(block.kind) + "." + std::to_string(block.subKind)},
                   Number("offset", block.offset),
@@ -243,9 +244,9 @@ private:
 
     void WriteApplicationInfo()
     {
-        const ApplicationInfo& info = m_PlayList.applicationInfo;
+        const ApplicationInfo& info = m_rPlayList.applicationInfo;
         Line(0, "play list " + Digits(m_Number),
-             {{"version", m_PlayList.version},
+             {{"version", m_rPlayList.version},
               Code("playback type", info.playbackType, NameIn(g_PlaybackTypes, info.playbackType)),
               Number("playback count", info.playbackCount),
               Time("duration", m_TimeLine.duration)});
@@ -259,7 +260,7 @@ private:
 
     void WritePlayItem(std::size_t number)
     {
-        const PlayItem& item = m_PlayList.playItems[number];
+        const PlayItem& item = m_rPlayList.playItems[number];
         Fields clip = ClipFields(item.clip);
         clip.push_back(ConnectionCondition(item.connectionCondition));
         Line(1, "play item " + std::to_string(number), clip);
@@ -336,7 +337,7 @@ private:
         fields.push_back(std::move(coding));
         const Fields rest =
             KindOfStream(attributes.codingType) == StreamKindVideo
-                ? VideoFields(attributes, m_AspectRatios.Find(m_PlayList, playItem, stream))
+                ? VideoFields(attributes, m_AspectRatios.Find(m_rPlayList, playItem, stream))
                 : FieldsOtherThanVideo(attributes);
         fields.insert(fields.end(), rest.begin(), rest.end());
         return fields;
@@ -344,7 +345,7 @@ private:
 
     void WriteSubPath(std::size_t number)
     {
-        const SubPath& path = m_PlayList.subPaths[number];
+        const SubPath& path = m_rPlayList.subPaths[number];
         Line(1, "sub path " + std::to_string(number),
              {Code("type", path.type, SubPathTypeName(path.type)), YesNo("repeat", path.repeat)});
         for (std::size_t index = 0; index < path.items.size(); ++index) {
@@ -365,7 +366,7 @@ private:
 
     void WriteMark(std::size_t number)
     {
-        const Mark& mark = m_PlayList.marks[number];
+        const Mark& mark = m_rPlayList.marks[number];
         const std::optional<std::uint64_t> position = m_TimeLine.markPositions[number];
         Line(1, "mark " + std::to_string(number),
              {Code("type", mark.type, NameIn(g_MarkTypes, mark.type)),
@@ -380,15 +381,16 @@ private:
     std::ostream& m_rOutput;
     AspectRatios m_AspectRatios;
     std::uint32_t m_Number;
-    PlayList m_PlayList;
+    const PlayList& m_rPlayList;
     TimeLine m_TimeLine;
 };
 
 } // namespace
 
-void DescribePlayList(std::ostream& output, const Disc& disc, std::uint32_t number)
+void DescribePlayList(std::ostream& output, const Disc& disc, std::uint32_t number,
+                      const PlayList& playList)
 {
-    Description(output, disc, number).Write();
+    Description(output, disc, number, playList).Write();
 }
 
 } // namespace deskplayer

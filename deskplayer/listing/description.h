@@ -27,10 +27,12 @@ namespace deskplayer
  * Prints everything that a play list says, where its parts lie in time, and the aspect ratios that
  * the clip information adds. Lines are written as they are made; nobody flushes @p output.
  *
- * @throw DiscError the play list cannot be read; nothing has been written then. Clip information
- *        that cannot be read is told in the place of the aspect ratio.
+ * Clip information that cannot be read is told in the place of the aspect ratio.
+ *
+ * @param playList the one with this @p number, read from @p disc
  */
-void DescribePlayList(std::ostream& output, const Disc& disc, std::uint32_t number);
+void DescribePlayList(std::ostream& output, const Disc& disc, std::uint32_t number,
+                      const PlayList& playList);
 
 } // namespace deskplayer
 

@@ -231,9 +231,9 @@ void ListPlayList(std::ostream& output, const PlayList& playList, AspectRatios& 
 
 } // namespace
 
-std::size_t ListPlayLists(std::ostream& output, const Disc& disc)
+std::size_t ListPlayLists(std::ostream& output, const Disc& disc,
+                          const std::vector<std::uint32_t>& numbers)
 {
-    const std::vector<std::uint32_t> numbers = disc.PlayListNumbers();
     ListTitles(output, disc);
     output << '\n';
     if (numbers.empty()) {

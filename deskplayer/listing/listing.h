@@ -16,7 +16,9 @@
 #define DESKPLAYER_LISTING_LISTING_H
 
 #include <cstddef>
+#include <cstdint>
 #include <ostream>
+#include <vector>
 
 #include "disc/disc.h"
 
@@ -30,10 +32,11 @@ namespace deskplayer
  * Streams can differ from play item to play item. Shown are those of the longest one, and how many
  * have others. Where the index or a play list cannot be read, a line says why.
  *
+ * @param numbers of the play lists, as Disc::PlayListNumbers() gives them
  * @return how many play lists cannot be read
- * @throw FileError the folder of the play lists cannot be read
  */
-std::size_t ListPlayLists(std::ostream& output, const Disc& disc);
+std::size_t ListPlayLists(std::ostream& output, const Disc& disc,
+                          const std::vector<std::uint32_t>& numbers);
 
 } // namespace deskplayer
 

@@ -53,6 +53,12 @@ std::string Without(const std::string& pattern, const std::string& text)
     return rest;
 }
 
+std::string ContentOf(const fs::path& path)
+{
+    std::ifstream file(path, std::ios::binary);
+    return {std::istreambuf_iterator<char>(file), {}};
+}
+
 /** Wrong usage is explained in one line, nothing is played, and the exit status is 2. */
 void ExpectUsageError(const std::vector<std::string>& arguments, const std::string& message)
 {
@@ -465,20 +471,42 @@ TEST_F(ScratchFolder, GetsTheOutputThatIsSentToAFile)
 
     EXPECT_EQ(result.status, 0);
     EXPECT_EQ(result.output, "");
-    std::ifstream written(file, std::ios::binary);
-    EXPECT_EQ(std::string(std::istreambuf_iterator<char>(written), {}),
-              RunDeskPlayer({SampleDisc}).output);
+    EXPECT_EQ(ContentOf(file), RunDeskPlayer({SampleDisc}).output);
 }
 
-TEST_F(ScratchFolder, KeepsItsFilesWhenTheUsageIsWrong)
+TEST_F(ScratchDisc, LeavesTheOutputFileAloneUntilAllThatIsToBeReadWasRead)
 {
     const std::string file = WriteFile("precious.txt", "precious");
-
-    ExpectUsageError({SampleDisc, "--output", file, "--format", "x"},
-                     "'x' is no output format; expected text, json or trace");
-
-    std::ifstream kept(file);
-    EXPECT_EQ(std::string(std::istreambuf_iterator<char>(kept), {}), "precious");
+    const std::string wrong = WriteFile("wrong.session", "nxt");
+    fs::copy_file(disc / "BDMV/index.bdmv", disc / "BDMV/PLAYLIST/00003.mpls");
+    fs::create_directory(folder / "BDMV");
+    const struct {
+        int status;
+        std::vector<std::string> arguments;
+    } faults[] = {{2, {disc, "--format", "x"}},
+                  {2, {disc, "--listen", "x"}},
+                  {2, {disc, "--only", "x"}},
+                  {2, {disc, "--list", "--format", "x"}},
+                  {2, {disc, "--log", "x"}},
+                  {2, {disc, "--session", wrong}},
+                  {2, {disc, "--session", "no.session"}},
+                  {3, {"no/such/folder"}},
+                  {3, {folder}},
+                  {3, {folder, "--list"}},
+                  {3, {disc, "--playlist", "7"}},
+                  {3, {disc, "--playlist", "3"}},
+                  {3, {disc, "--describe", "7"}},
+                  {3, {disc, "--describe", "3"}}};
+    for (const auto& fault : faults) {
+        SCOPED_TRACE(testing::PrintToString(fault.arguments));
+        for (const std::string& output : {file, std::string(folder / "new.txt")}) {
+            std::vector<std::string> arguments = fault.arguments;
+            arguments.insert(arguments.end(), {"--output", output});
+            EXPECT_EQ(RunDeskPlayer(arguments).status, fault.status);
+        }
+        EXPECT_EQ(ContentOf(file), "precious");
+        EXPECT_FALSE(fs::exists(folder / "new.txt"));
+    }
 }
 
 TEST(DeskPlayerOutput, HoldsTheInterfacesAndCallbacksThatAreAskedFor)
