@@ -90,6 +90,12 @@ struct PlayItem {
     StreamTable streams;
 };
 
+/** How many angles there are to choose among; 1 where there is no choice. */
+inline std::size_t NumberOfAngles(const PlayItem& item)
+{
+    return 1 + item.furtherAngles.size();
+}
+
 struct SubPlayItem {
     ClipReference clip;
     std::uint8_t connectionCondition = 0;

@@ -41,7 +41,8 @@ TimeLine BuildTimeLine(const PlayList& playList)
         }
         ++chapterNumber;
         if (position) {
-            timeLine.chapters.push_back({chapterNumber, index, *position, timeLine.duration});
+            timeLine.chapters.push_back(
+                {chapterNumber, index, mark.playItem, *position, timeLine.duration});
         }
     }
 

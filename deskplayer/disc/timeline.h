@@ -17,8 +17,9 @@ namespace deskplayer
 
 /** The stretch from a mark of type entry to the next. */
 struct Chapter {
-    std::size_t number = 0; ///< from 1; see TimeLine::chapters
-    std::size_t mark = 0;   ///< index of its mark
+    std::size_t number = 0;   ///< from 1; see TimeLine::chapters
+    std::size_t mark = 0;     ///< index of its mark
+    std::size_t playItem = 0; ///< of its mark
     std::uint64_t start = 0;
     std::uint64_t end = 0; ///< not before start
 };

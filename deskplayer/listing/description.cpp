@@ -275,7 +275,7 @@ private:
         Line(2, "user operations", {UOMask(item.uoMask)});
         if (item.multiAngle) {
             Line(2, "angles",
-                 {Number("count", item.furtherAngles.size() + 1),
+                 {Number("count", NumberOfAngles(item)),
                   YesNo("different audios", item.differentAudios),
                   YesNo("seamless change", item.seamlessAngleChange)});
         }

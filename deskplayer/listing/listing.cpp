@@ -208,7 +208,7 @@ std::size_t MostAngles(const PlayList& playList)
 {
     std::size_t most = 0;
     for (const PlayItem& item : playList.playItems) {
-        most = std::max(most, item.furtherAngles.size() + 1);
+        most = std::max(most, NumberOfAngles(item));
     }
     return most;
 }

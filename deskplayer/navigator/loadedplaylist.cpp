@@ -1,6 +1,7 @@
 #include "navigator/loadedplaylist.h"
 
 #include <algorithm>
+#include <tuple>
 
 #include "output/timetext.h"
 
@@ -20,9 +21,11 @@ LoadedPlayList LayOut(std::uint32_t number, PlayList playList)
     }
     std::sort(loaded.marksByPosition.begin(), loaded.marksByPosition.end());
     loaded.chaptersByStart = loaded.timeLine.chapters;
-    std::stable_sort(
-        loaded.chaptersByStart.begin(), loaded.chaptersByStart.end(),
-        [](const Chapter& left, const Chapter& right) { return left.start < right.start; });
+    std::stable_sort(loaded.chaptersByStart.begin(), loaded.chaptersByStart.end(),
+                     [](const Chapter& left, const Chapter& right) {
+                         return std::tie(left.start, left.playItem) <
+                                std::tie(right.start, right.playItem);
+                     });
     loaded.aspectRatios.resize(loaded.playList.playItems.size());
     return loaded;
 }

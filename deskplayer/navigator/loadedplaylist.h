@@ -11,6 +11,7 @@
 #include <utility>
 #include <vector>
 
+#include "disc/codes.h"
 #include "disc/disc.h"
 #include "disc/playlist.h"
 #include "disc/timeline.h"
@@ -19,7 +20,7 @@ namespace deskplayer
 {
 
 /** The longest play list that is played, in ticks of 45 kHz: 100 hours. No disc holds so much. */
-constexpr std::uint64_t LongestDuration = std::uint64_t{100} * 3600 * 45000;
+constexpr std::uint64_t LongestDuration = std::uint64_t{100} * 3600 * TicksPerSecond;
 
 /** A play list, where its parts lie in time, and what the clips add to it. */
 struct LoadedPlayList {
@@ -30,7 +31,7 @@ struct LoadedPlayList {
     /** Positions of the marks that have one, with their indices, in order of position. */
     std::vector<std::pair<std::uint64_t, std::size_t>> marksByPosition;
 
-    /** The chapters in order of their start. */
+    /** The chapters in order of their start, those at the same position of their play items. */
     std::vector<Chapter> chaptersByStart;
 
     /** Of the first primary video of every play item, as the disc codes it. */

@@ -83,6 +83,9 @@ bd::TriggerType PlaybackContext::GetCurrentChpTitleRepeatState()
 
 bd::TriggerType PlaybackContext::GetTriggerTypeByTime(bd::TimePosition time)
 {
+    if (m_State.triggerReached && time == m_State.triggerReachedTime) {
+        return *m_State.triggerReached;
+    }
     if (time == m_State.pointB) {
         return bd::TRIGGER_B;
     }
@@ -107,8 +110,7 @@ bd::PlayListMarkIdDef PlaybackContext::GetCurrentPLMarkId(bd::TimePosition& time
 
 void PlaybackContext::GetVideoInfo(bd::StreamNumberDef* number, bd::UInt8* count)
 {
-    std::tie(*number, *count) =
-        Choose(m_State.selection.video, CurrentStreams().primaryVideo.size());
+    std::tie(*number, *count) = ChosenVideo();
 }
 
 void PlaybackContext::GetVideoAttributes(bd::VideoFormatType& format,
@@ -128,52 +130,47 @@ void PlaybackContext::GetVideoAttributes(bd::VideoFormatType& format,
 
 void PlaybackContext::GetAudioInfo(bd::StreamNumberDef* number, bd::UInt8* count)
 {
-    std::tie(*number, *count) =
-        Choose(m_State.selection.audio, CurrentStreams().primaryAudio.size());
+    std::tie(*number, *count) = ChosenAudio();
 }
 
 void PlaybackContext::GetIgInfo(bd::StreamNumberDef* number, bd::UInt8* count)
 {
-    std::tie(*number, *count) = Choose(m_State.selection.ig, CurrentStreams().ig.size());
+    std::tie(*number, *count) = ChosenIg();
 }
 
 bdmv::IPlaybackContext::ErrCode PlaybackContext::rGetPgTextStInfo(bd::StreamNumberDef* number,
                                                                   bd::UInt8* count)
 {
-    std::tie(*number, *count) = Choose(m_State.selection.pg, CurrentStreams().pg.size());
+    GetPgTextStInfo(number, count);
     return CurrentItem() == nullptr ? ErrNotAllowed : ErrOk;
 }
 
 void PlaybackContext::GetPgTextStInfo(bd::StreamNumberDef* number, bd::UInt8* count)
 {
-    std::tie(*number, *count) = Choose(m_State.selection.pg, CurrentStreams().pg.size());
+    std::tie(*number, *count) = ChosenPg();
 }
 
 void PlaybackContext::GetSecondaryVideoInfo(bd::StreamNumberDef* number, bd::UInt8* count,
                                             bool* async)
 {
-    const std::vector<Stream>& streams = CurrentStreams().secondaryVideo;
-    std::tie(*number, *count) = Choose(m_State.selection.secondaryVideo, streams.size());
-    *async = *number != 0 && IsAsync(streams[*number - 1U]);
+    std::tie(*number, *count) = ChosenSecondaryVideo();
+    *async = *number != 0 && IsAsync(CurrentStreams().secondaryVideo[*number - 1U]);
 }
 
 void PlaybackContext::GetSecondaryAudioInfo(bd::StreamNumberDef* number, bd::UInt8* count)
 {
-    std::tie(*number, *count) =
-        Choose(m_State.selection.secondaryAudio, CurrentStreams().secondaryAudio.size());
+    std::tie(*number, *count) = ChosenSecondaryAudio();
 }
 
 void PlaybackContext::GetPipPgTextStInfo(bd::StreamNumberDef* number, bd::UInt8* count)
 {
-    std::tie(*number, *count) = Choose(m_State.selection.pipPg, CurrentStreams().pipPg.size());
+    std::tie(*number, *count) = ChosenPipPg();
 }
 
 void PlaybackContext::GetAngleInfo(bd::AngleNumberDef* number, bd::UInt8* count)
 {
-    const PlayItem* const item = CurrentItem();
-    const std::size_t angles = item == nullptr ? 0 : 1 + item->furtherAngles.size();
     bd::StreamNumberDef angle = 0;
-    std::tie(angle, *count) = Choose(m_State.selection.angle, angles);
+    std::tie(angle, *count) = ChosenAngle();
     *number = static_cast<bd::AngleNumberDef>(angle);
 }
 
@@ -272,10 +269,13 @@ const PlayItem* PlaybackContext::CurrentItem() const
 
 const Chapter* PlaybackContext::CurrentChapter() const
 {
+    // Where one play item ends and the next starts, those of the next one come later.
     const std::vector<Chapter>& chapters = m_PlayList.chaptersByStart;
-    const auto behind = std::upper_bound(
-        chapters.begin(), chapters.end(), m_State.position,
-        [](std::uint64_t position, const Chapter& chapter) { return position < chapter.start; });
+    const auto behind = std::upper_bound(chapters.begin(), chapters.end(), m_State,
+                                         [](const PlaybackState& state, const Chapter& chapter) {
+                                             return std::tie(state.position, state.item) <
+                                                    std::tie(chapter.start, chapter.playItem);
+                                         });
     return behind == chapters.begin() ? nullptr : &*std::prev(behind);
 }
 
@@ -285,11 +285,53 @@ const StreamTable& PlaybackContext::CurrentStreams() const
     return item == nullptr ? NoStreams : item->streams;
 }
 
-std::pair<bd::StreamNumberDef, bd::UInt8> PlaybackContext::Choose(bd::StreamNumberDef wanted,
-                                                                  std::size_t count)
+/** The stream that was asked for, or the last where it is not there. */
+PlaybackContext::NumberAndCount PlaybackContext::Choose(bd::StreamNumberDef wanted,
+                                                        std::size_t count)
 {
     const auto all = static_cast<bd::UInt8>(count);
     return {std::min<bd::StreamNumberDef>(wanted, all), all};
+}
+
+PlaybackContext::NumberAndCount PlaybackContext::ChosenVideo() const
+{
+    return Choose(m_State.selection.video, CurrentStreams().primaryVideo.size());
+}
+
+PlaybackContext::NumberAndCount PlaybackContext::ChosenAudio() const
+{
+    return Choose(m_State.selection.audio, CurrentStreams().primaryAudio.size());
+}
+
+PlaybackContext::NumberAndCount PlaybackContext::ChosenPg() const
+{
+    return Choose(m_State.selection.pg, CurrentStreams().pg.size());
+}
+
+PlaybackContext::NumberAndCount PlaybackContext::ChosenSecondaryVideo() const
+{
+    return Choose(m_State.selection.secondaryVideo, CurrentStreams().secondaryVideo.size());
+}
+
+PlaybackContext::NumberAndCount PlaybackContext::ChosenSecondaryAudio() const
+{
+    return Choose(m_State.selection.secondaryAudio, CurrentStreams().secondaryAudio.size());
+}
+
+PlaybackContext::NumberAndCount PlaybackContext::ChosenPipPg() const
+{
+    return Choose(m_State.selection.pipPg, CurrentStreams().pipPg.size());
+}
+
+PlaybackContext::NumberAndCount PlaybackContext::ChosenIg() const
+{
+    return Choose(m_State.selection.ig, CurrentStreams().ig.size());
+}
+
+PlaybackContext::NumberAndCount PlaybackContext::ChosenAngle() const
+{
+    const PlayItem* const item = CurrentItem();
+    return Choose(m_State.selection.angle, item == nullptr ? 0 : NumberOfAngles(*item));
 }
 
 void PlaybackContext::StoreSystemResumeData(std::vector<bd::UInt8> block)

@@ -88,12 +88,17 @@ protected:
     PlaybackState& State() { return m_State; }
     const PlaybackState& State() const { return m_State; }
 
-    /**
-     * The stream that is selected where there are @p count, and that count: the wanted one, or the
-     * last when it is not there.
-     */
-    static std::pair<bd::StreamNumberDef, bd::UInt8> Choose(bd::StreamNumberDef wanted,
-                                                            std::size_t count);
+    /** A stream that is selected, from 1, and how many there are of its kind; 0 of 0 for none. */
+    typedef std::pair<bd::StreamNumberDef, bd::UInt8> NumberAndCount;
+
+    NumberAndCount ChosenVideo() const;
+    NumberAndCount ChosenAudio() const;
+    NumberAndCount ChosenPg() const;
+    NumberAndCount ChosenSecondaryVideo() const;
+    NumberAndCount ChosenSecondaryAudio() const;
+    NumberAndCount ChosenPipPg() const;
+    NumberAndCount ChosenIg() const;
+    NumberAndCount ChosenAngle() const;
 
     /** Stores the block that GetSystemResumeData() gives, until it is cleaned up. */
     void StoreSystemResumeData(std::vector<bd::UInt8> block);
@@ -102,6 +107,8 @@ protected:
     bool IsAsync(const Stream& stream) const;
 
 private:
+    static NumberAndCount Choose(bd::StreamNumberDef wanted, std::size_t count);
+
     const LoadedPlayList m_PlayList;
     PlaybackState m_State;
     std::vector<bd::UInt8> m_SystemResumeData;

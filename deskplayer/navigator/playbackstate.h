@@ -61,6 +61,7 @@ struct PlaybackState {
     bd::TriggerType chapterTitleRepeat = bd::TRIGGER_NONE; ///< TRIGGER_CHP, TRIGGER_TITLE
     bd::TriggerType trigger = bd::TRIGGER_NONE;            ///< what was set last
     bd::TimePosition triggerReachedTime = 0;
+    std::optional<bd::TriggerType> triggerReached; ///< which one, while the listeners are told
 
     bd::ZOOM_PARAM_Def zoom = {};
     bdstreaming::FinishedReason finishedReason = bdstreaming::FinishedReasonEndOfMedia;

@@ -62,6 +62,7 @@ void VisitFields(Visitor& visit, std::uint32_t& magic, Point& point,
     visit(magic);
     visit(point.playList);
     visit(point.playing);
+    visit(point.playItem);
     visit(point.position);
     visit(direction);
     visit(speed);

@@ -19,7 +19,8 @@ namespace deskplayer
 struct ResumePoint {
     bd::PlayListIdDef playList = 0;
     bool playing = false; ///< rather than paused, or stopped
-    std::uint64_t position = 0;
+    bd::PlayItemIdDef playItem = 0;
+    std::uint64_t position = 0; ///< can be where the play item ends, and the next one starts
     bd::PlayMode playMode;
     StreamSelection selection;
 };

@@ -10,7 +10,6 @@
 #include "navigator/audioinfo.h"
 #include "navigator/buttonprogram.h"
 #include "navigator/playspeed.h"
-#include "navigator/resumedata.h"
 #include "output/names.h"
 #include "output/timetext.h"
 
@@ -188,9 +187,12 @@ std::uint64_t SimulatedNavigator::EndOfItem(std::size_t item) const
                                                  : timeLine.duration;
 }
 
+/** The direction of play; while paused, that of the next step. */
 bool SimulatedNavigator::IsForward() const
 {
-    return State().currentPlayMode.Direction() == bd::PlayDirectionForward;
+    const bd::PlayMode& mode =
+        m_Status == Status::Paused ? State().playMode : State().currentPlayMode;
+    return mode.Direction() == bd::PlayDirectionForward;
 }
 
 /** The next position at which something happens by itself, ahead in the direction of play. */
@@ -288,10 +290,11 @@ std::uint64_t SimulatedNavigator::Advance(std::uint64_t ticks)
         m_rClock.Advance(pass);
         ticks -= pass;
 
+        std::uint64_t distance = 0;
         if (m_Status == Status::Playing) {
             const SpeedRatio ratio = RatioOf(State().currentPlayMode.Speed());
             m_Carry += pass * ratio.played;
-            const std::uint64_t distance = changes ? DistanceToNextStop() : m_Carry / ratio.passed;
+            distance = changes ? DistanceToNextStop() : m_Carry / ratio.passed;
             m_Carry -= distance * ratio.passed;
             Move(distance);
         } else if (m_Status == Status::Still && m_StillLeft) {
@@ -301,16 +304,18 @@ std::uint64_t SimulatedNavigator::Advance(std::uint64_t ticks)
         if (!changes) {
             break;
         }
-        if (m_Status == Status::Playing) {
+        if (m_Status == Status::Still) {
+            LeaveStill();
+        } else if (distance > 0) {
             ReachPosition();
         } else {
-            LeaveStill();
+            ReachEnd();
         }
     }
     return ticks;
 }
 
-/** Does what is due at a position that playback got to by itself. */
+/** Does what is due at a position that playback has moved to by itself, but for leaving it. */
 void SimulatedNavigator::ReachPosition()
 {
     const std::uint64_t position = State().position;
@@ -318,13 +323,18 @@ void SimulatedNavigator::ReachPosition()
         Send<bdmv::CurrentTimePositionEvent>();
     }
     if (position == State().notifyAt) {
-        State().triggerReachedTime = position;
-        Send<bdmv::TriggerReachedEvent>();
+        ReachTrigger(bd::TRIGGER_NOTIFY_FROM_CURPOS);
     }
-    if (!IsForward()) {
+    if (IsForward()) {
+        ReachForward();
+    } else {
         ReachBackward();
-        return;
     }
+}
+
+void SimulatedNavigator::ReachForward()
+{
+    const std::uint64_t position = State().position;
     if (position == State().pointB) {
         RepeatFrom(*State().pointA);
         return;
@@ -336,11 +346,7 @@ void SimulatedNavigator::ReachPosition()
             return;
         }
     }
-    if (position == EndOfItem(State().item)) {
-        ReachEndOfItem();
-        return;
-    }
-    AnnounceMarks();
+    AnnounceMarks(State().item);
     AnnounceChapter();
 }
 
@@ -352,11 +358,17 @@ void SimulatedNavigator::ReachBackward()
         State().item = ItemAt(state.position);
         AnnounceItem();
     }
-    AnnounceMarks();
+    AnnounceMarks(0);
     AnnounceChapter();
-    if (state.position == 0) {
-        // There is nothing before the start: a player turns around.
-        ChangePlayMode(bd::PlayMode());
+}
+
+/** Goes on where there is nothing left ahead in the play item, or before the play list. */
+void SimulatedNavigator::ReachEnd()
+{
+    if (IsForward()) {
+        ReachEndOfItem();
+    } else {
+        ChangePlayMode(bd::PlayMode()); // a player turns around
     }
 }
 
@@ -394,7 +406,7 @@ void SimulatedNavigator::EnterNextItem()
         ++State().item;
         State().position = timeLine.itemStarts[State().item];
         AnnounceItem();
-        AnnounceMarks();
+        AnnounceMarks(State().item); // the end of the one before told of those there
         AnnounceChapter();
     } else if (State().chapterTitleRepeat == bd::TRIGGER_TITLE && timeLine.duration > 0) {
         RepeatFrom(0);
@@ -439,26 +451,15 @@ void SimulatedNavigator::AnnounceStreams()
         NumberAndCount now;
         void (SimulatedNavigator::*send)();
     };
-    const StreamTable& streams = CurrentStreams();
-    const StreamSelection& selected = State().selection;
-    const PlayItem* const item = CurrentItem();
-    const std::size_t angles = item == nullptr ? 0 : 1 + item->furtherAngles.size();
     const std::array<Kind, StreamKinds> kinds = {
-        {{Choose(selected.video, streams.primaryVideo.size()),
-          &SimulatedNavigator::Send<bdmv::VideoInfoEvent>},
-         {Choose(selected.audio, streams.primaryAudio.size()),
-          &SimulatedNavigator::Send<bdmv::AudioInfoEvent>},
-         {Choose(selected.angle, angles), &SimulatedNavigator::Send<bdmv::AngleInfoEvent>},
-         {Choose(selected.pg, streams.pg.size()),
-          &SimulatedNavigator::Send<bdmv::PresentationGraphicsInfoEvent>},
-         {Choose(selected.secondaryVideo, streams.secondaryVideo.size()),
-          &SimulatedNavigator::Send<bdmv::SecondaryVideoInfoEvent>},
-         {Choose(selected.secondaryAudio, streams.secondaryAudio.size()),
-          &SimulatedNavigator::Send<bdmv::SecondaryAudioInfoEvent>},
-         {Choose(selected.pipPg, streams.pipPg.size()),
-          &SimulatedNavigator::Send<bdmv::PipPgTextStInfoEvent>},
-         {Choose(selected.ig, streams.ig.size()),
-          &SimulatedNavigator::Send<bdmv::InteractiveGraphicsInfoEvent>}}};
+        {{ChosenVideo(), &SimulatedNavigator::Send<bdmv::VideoInfoEvent>},
+         {ChosenAudio(), &SimulatedNavigator::Send<bdmv::AudioInfoEvent>},
+         {ChosenAngle(), &SimulatedNavigator::Send<bdmv::AngleInfoEvent>},
+         {ChosenPg(), &SimulatedNavigator::Send<bdmv::PresentationGraphicsInfoEvent>},
+         {ChosenSecondaryVideo(), &SimulatedNavigator::Send<bdmv::SecondaryVideoInfoEvent>},
+         {ChosenSecondaryAudio(), &SimulatedNavigator::Send<bdmv::SecondaryAudioInfoEvent>},
+         {ChosenPipPg(), &SimulatedNavigator::Send<bdmv::PipPgTextStInfoEvent>},
+         {ChosenIg(), &SimulatedNavigator::Send<bdmv::InteractiveGraphicsInfoEvent>}}};
 
     for (std::size_t i = 0; i < kinds.size(); ++i) {
         if (std::exchange(m_Told.streams[i], kinds[i].now) != kinds[i].now) {
@@ -466,6 +467,7 @@ void SimulatedNavigator::AnnounceStreams()
         }
     }
 
+    const StreamTable& streams = CurrentStreams();
     AnnounceAudioInfo(true, streams.primaryAudio, State().selection.audio, m_Told.audio);
     AnnounceAudioInfo(false, streams.secondaryAudio, State().selection.secondaryAudio,
                       m_Told.secondaryAudio);
@@ -559,15 +561,20 @@ void SimulatedNavigator::AnnounceChapter()
     }
 }
 
-/** Tells about every mark that lies at the position, in the order of the play list. */
-void SimulatedNavigator::AnnounceMarks()
+/**
+ * Tells about the marks at the position, in the order of the play list.
+ *
+ * @param firstItem the first whose marks are told, up to the one in playback: those at OUT of play
+ *        items before it lie at the same position
+ */
+void SimulatedNavigator::AnnounceMarks(std::size_t firstItem)
 {
     const LoadedPlayList& list = PlayListInPlayback();
     const auto& marks = list.marksByPosition;
     auto mark = std::lower_bound(marks.begin(), marks.end(), MarkAt(State().position, 0));
     for (; mark != marks.end() && mark->first == State().position; ++mark) {
         const Mark& passed = list.playList.marks[mark->second];
-        if (passed.playItem == State().item) {
+        if (passed.playItem >= firstItem && passed.playItem <= State().item) {
             State().mark = mark->second;
             Send<bdmv::MarkInfoEvent>(static_cast<bdmv::IPlayListMark::MarkType>(passed.type));
         }
@@ -594,7 +601,7 @@ void SimulatedNavigator::JumpTo(std::uint64_t position)
     if (changesItem) {
         AnnounceItem();
     }
-    AnnounceMarks();
+    AnnounceMarks(0);
     AnnounceChapter();
     Send<bdmv::CurrentTimePositionEvent>();
 }
@@ -602,9 +609,17 @@ void SimulatedNavigator::JumpTo(std::uint64_t position)
 /** Goes back in a repeat, after telling that its end was reached. */
 void SimulatedNavigator::RepeatFrom(std::uint64_t position)
 {
-    State().triggerReachedTime = State().position;
-    Send<bdmv::TriggerReachedEvent>();
+    ReachTrigger(bd::TRIGGER_INVALID); // the repeat states tell which repeat it is
     JumpTo(position);
+}
+
+/** @param type of the trigger, for there can be several at the position */
+void SimulatedNavigator::ReachTrigger(bd::TriggerType type)
+{
+    State().triggerReachedTime = State().position;
+    State().triggerReached = type;
+    Send<bdmv::TriggerReachedEvent>();
+    State().triggerReached.reset();
 }
 
 void SimulatedNavigator::ChangePlayMode(bd::PlayMode mode)
@@ -651,7 +666,7 @@ Outcome SimulatedNavigator::Play()
     }
     AnnounceItem();
     Send<bdmv::FirstPictureDeliveredEvent>();
-    AnnounceMarks();
+    AnnounceMarks(0);
     AnnounceChapter();
     Send<bdmv::CurrentTimePositionEvent>();
     return outcome;
@@ -688,19 +703,33 @@ Outcome SimulatedNavigator::Step()
 {
     const std::uint64_t duration = PictureDuration(CurrentStreams().primaryVideo);
     const std::uint64_t position = State().position;
-    const bool forward = State().playMode.Direction() == bd::PlayDirectionForward;
     Outcome outcome = CheckStatus({Status::Paused});
     if (outcome.IsDone() &&
-        (forward ? position + duration >= EndOfItem(State().item)
-                 : position < PlayListInPlayback().timeLine.itemStarts[State().item] + duration)) {
+        (IsForward()
+             ? position + duration >= EndOfItem(State().item)
+             : position < PlayListInPlayback().timeLine.itemStarts[State().item] + duration)) {
         outcome = Outcome::Refused("the play item has no further picture in this direction");
     }
     return Operate(outcome, [&] {
         m_Carry = 0;
-        State().position = forward ? position + duration : position - duration;
+        StepBy(duration);
         Send<bdmv::SteppedEvent>();
-        AnnounceChapter();
     });
+}
+
+/** Passes what lies ahead as playback does. A repeat ends the step at its start. */
+void SimulatedNavigator::StepBy(std::uint64_t duration)
+{
+    while (duration > 0) {
+        const std::uint64_t distance = std::min(duration, DistanceToNextStop());
+        duration -= distance;
+        Move(distance);
+        const std::uint64_t reached = State().position;
+        ReachPosition();
+        if (State().position != reached) {
+            return;
+        }
+    }
 }
 
 Outcome SimulatedNavigator::SetPlayMode(bd::PlayMode mode)
@@ -874,7 +903,13 @@ Outcome SimulatedNavigator::EndChapterTitleRepeat()
 
 Outcome SimulatedNavigator::SetTrigger(std::uint64_t position)
 {
-    return Operate(CheckActive(), [this, position] {
+    const std::uint64_t duration = PlayListInPlayback().timeLine.duration;
+    Outcome outcome = CheckActive();
+    if (outcome.IsDone() && position > duration) {
+        outcome = Outcome::Refused(TimeText(position) + " is behind the end of the play list, " +
+                                   "which lasts " + TimeText(duration));
+    }
+    return Operate(outcome, [this, position] {
         State().notifyAt = position;
         SetTriggerType(bd::TRIGGER_NOTIFY_FROM_CURPOS, true);
     });
@@ -940,9 +975,7 @@ Outcome SimulatedNavigator::SelectStyle(std::uint64_t number)
 
 Outcome SimulatedNavigator::SelectAngle(std::uint64_t number)
 {
-    const PlayItem* const item = CurrentItem();
-    return SelectStream(bd::UserOperationAngleNumberChange, number,
-                        item == nullptr ? 0 : 1 + item->furtherAngles.size(), "angle",
+    return SelectStream(bd::UserOperationAngleNumberChange, number, ChosenAngle().second, "angle",
                         State().selection.angle);
 }
 
@@ -1107,6 +1140,7 @@ Outcome SimulatedNavigator::GoToStandby()
         ResumePoint point;
         point.playList = PlayListInPlayback().number;
         point.playing = m_Status != Status::Paused;
+        point.playItem = GetPlayItemId();
         point.position = State().position;
         point.playMode = State().playMode;
         point.selection = State().selection;
@@ -1122,26 +1156,37 @@ Outcome SimulatedNavigator::WakeUp(const std::vector<bd::UInt8>& resumeData)
 {
     return Operate(CheckStatus({Status::Standby}), [this, &resumeData] {
         const std::optional<ResumePoint> point = ReadResumeData(resumeData);
-        if (!point || point->playList != PlayListInPlayback().number ||
-            point->position > PlayListInPlayback().timeLine.duration) {
+        if (!point || !IsInPlayList(*point)) {
             m_Status = Status::Stopped;
             Send<bdmv::SystemResumeFailedEvent>();
             return;
         }
         StartFresh();
         State().position = point->position;
-        State().item = ItemAt(point->position);
+        State().item = point->playItem;
         State().playMode = point->playMode;
-        State().currentPlayMode = point->playMode;
+        if (point->playing) {
+            State().currentPlayMode = point->playMode;
+        }
         State().selection = point->selection;
         State().playingAfterSystemResume = point->playing;
         m_Status = point->playing ? Status::Playing : Status::Paused;
         Send<bdmv::SystemResumedEvent>();
         Send<bdmv::PlaylistEvent>();
         AnnounceItem();
+        if (State().currentPlayMode != bd::PlayMode()) {
+            Send<bdmv::PlayModeEvent>();
+        }
         AnnounceChapter();
         Send<bdmv::CurrentTimePositionEvent>();
     });
+}
+
+bool SimulatedNavigator::IsInPlayList(const ResumePoint& point) const
+{
+    const std::vector<std::uint64_t>& starts = PlayListInPlayback().timeLine.itemStarts;
+    return point.playList == PlayListInPlayback().number && point.playItem < starts.size() &&
+           point.position >= starts[point.playItem] && point.position <= EndOfItem(point.playItem);
 }
 
 // ---------------------------------------------------------------------------------------------

@@ -16,6 +16,7 @@
 #include "navigator/eventdelivery.h"
 #include "navigator/outcome.h"
 #include "navigator/playbackcontext.h"
+#include "navigator/resumedata.h"
 #include "navigator/virtualclock.h"
 
 namespace deskplayer
@@ -80,7 +81,10 @@ public:
     /** Goes on after Pause(), in the play mode that was set last. */
     Outcome Continue();
 
-    /** Shows the next or the previous picture, as the direction says; only while paused. */
+    /**
+     * Shows the next or the previous picture, as the direction says; only while paused. The
+     * listeners are told of what lies on the way, and then of the step.
+     */
     Outcome Step();
 
     /** Takes effect at once while playing, with Continue() while paused. */
@@ -117,7 +121,7 @@ public:
     Outcome RepeatTitle();
     Outcome EndChapterTitleRepeat();
 
-    /** Has the listeners told when playback gets to @p position. */
+    /** Has the listeners told when playback gets to @p position, at most the end. */
     Outcome SetTrigger(std::uint64_t position);
 
     // Streams.
@@ -154,7 +158,7 @@ public:
     Outcome GoToStandby();
 
     /**
-     * Comes back from standby.
+     * Comes back from standby, to where playback stood. A still is shown again, in full.
      *
      * @param resumeData what a listener kept of SystemSuspended(); anything else fails
      */
@@ -174,9 +178,6 @@ public:
     Outcome Starve();
 
 private:
-    /** A stream that is selected, and how many there are of its kind. */
-    typedef std::pair<bd::StreamNumberDef, bd::UInt8> NumberAndCount;
-
     /** The kinds of streams that events tell number and count of. */
     static constexpr std::size_t StreamKinds = 8;
 
@@ -212,7 +213,10 @@ private:
     std::uint64_t DistanceToNextStop() const;
     void Move(std::uint64_t distance);
     void ReachPosition();
+    void ReachForward();
     void ReachBackward();
+    void ReachTrigger(bd::TriggerType type);
+    void ReachEnd();
     void ReachEndOfItem();
     void EnterNextItem();
     void Finish(bdstreaming::FinishedReason reason);
@@ -227,11 +231,12 @@ private:
     void AnnounceMask();
     void AnnounceMenu();
     void AnnounceChapter();
-    void AnnounceMarks();
+    void AnnounceMarks(std::size_t firstItem);
 
     // Steps of operations.
     std::size_t ItemAt(std::uint64_t position) const;
     const Chapter* FindChapter(std::uint64_t number) const;
+    void StepBy(std::uint64_t duration);
     void JumpTo(std::uint64_t position);
     void RepeatFrom(std::uint64_t position);
     void ChangePlayMode(bd::PlayMode mode);
@@ -248,6 +253,7 @@ private:
     Outcome CheckButton(std::uint64_t number) const;
     void CloseMenu();
     void ExecuteButton();
+    bool IsInPlayList(const ResumePoint& point) const;
 
     VirtualClock& m_rClock;
     EventDelivery& m_rDelivery;

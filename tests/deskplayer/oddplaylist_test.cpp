@@ -25,6 +25,7 @@ TEST(OddPlayList, PassesItemsWithoutLength)
 
     EXPECT_EQ(desk.TakeWithoutPositions(), "0 PlayItem(7, 1, 6, 15)\n"
                                            "0 MarkInfo(7, 0, 0)\n"
+                                           "0 ChapterNumber(1)\n"
                                            "0 PlayItem(7, 2, 6, 15)\n"
                                            "0+100 PlayItem(7, 3, 6, 15)\n"
                                            "0+100 Finished(0)\n");
@@ -92,16 +93,65 @@ TEST(OddPlayList, LeavesOutMarksThatAreNowhere)
                                            "1 Finished(0)\n");
 }
 
-TEST(OddPlayList, TellsNoMarkOfAnotherItemAtTheSamePosition)
+TEST(OddPlayList, TellsTheMarksWhereAnItemEndsAndTheNextStartsEachInItsItem)
 {
-    // The mark lies where item 0 ends, which is where item 1 starts.
-    TestDesk desk(ListOf({Item(1), Item(1)}, {Link(0, Second), Link(1, 0)}));
+    TestDesk desk(
+        ListOf({WithTimedStill(Item(1), 5), Item(1)}, {Entry(1, 0), Link(0, Second), Link(1, 0)}));
     desk.Start();
 
-    desk.navigator.Advance(Second);
+    desk.navigator.Advance(6 * Second);
 
-    EXPECT_EQ(desk.TakeWithoutPositions(), "1 PlayItem(7, 1, 6, 15)\n"
-                                           "1 MarkInfo(7, 1, 45000)\n");
+    EXPECT_EQ(desk.TakeWithoutPositions(), "1 MarkInfo(7, 1, 45000)\n"
+                                           "1 StillOn()\n"
+                                           "6 StillOff()\n"
+                                           "6 PlayItem(7, 1, 6, 15)\n"
+                                           "6 MarkInfo(7, 0, 45000)\n"
+                                           "6 MarkInfo(7, 2, 45000)\n"
+                                           "6 ChapterNumber(1)\n");
+}
+
+TEST(OddPlayList, TellsAChapterAtTheEndOfAnItemWithItsMark)
+{
+    TestDesk desk(ListOf({Item(1), Item(1)}, {Entry(0, 0), Entry(0, Second)}));
+    desk.Start();
+
+    desk.navigator.Advance(Second + 1);
+    EXPECT_EQ(desk.TakeWithoutPositions(), "1 MarkInfo(7, 1, 45000)\n"
+                                           "1 ChapterNumber(2)\n"
+                                           "1 PlayItem(7, 1, 6, 15)\n");
+
+    desk.navigator.SetPlayMode(bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedNormal));
+    desk.navigator.Advance(2);
+    EXPECT_EQ(desk.TakeWithoutPositions(), "1+1 PlayMode(1, 5)\n"
+                                           "1+2 MarkInfo(7, 1, 45000)\n"
+                                           "1+3 PlayItem(7, 0, 6, 15)\n"
+                                           "1+3 ChapterNumber(1)\n");
+
+    desk.navigator.SearchChapter(2);
+    EXPECT_EQ(desk.TakeWithoutPositions(), "1+3 JumpOccurred()\n"
+                                           "1+3 PlayItem(7, 1, 6, 15)\n"
+                                           "1+3 MarkInfo(7, 1, 45000)\n"
+                                           "1+3 ChapterNumber(2)\n");
+}
+
+TEST(OddPlayList, TellsAChapterAtTheEndOfThePlayListOnceWithItsMark)
+{
+    TestDesk desk(ListOf({Item(2)}, {Entry(0, 0), Entry(0, 2 * Second)}));
+    desk.Start();
+
+    desk.navigator.Advance(2 * Second);
+    EXPECT_EQ(desk.TakeWithoutPositions(), "2 MarkInfo(7, 1, 90000)\n"
+                                           "2 ChapterNumber(2)\n"
+                                           "2 Finished(0)\n");
+
+    desk.Start();
+    desk.navigator.SearchChapter(2);
+    desk.navigator.Advance(Second);
+    EXPECT_EQ(desk.Take(), "2 JumpOccurred()\n"
+                           "2 MarkInfo(7, 1, 90000)\n"
+                           "2 ChapterNumber(2)\n"
+                           "2 CurrentTimePosition(90000)\n"
+                           "2 Finished(0)\n");
 }
 
 TEST(OddPlayList, HasAllStreamsThereCanBe)

@@ -269,7 +269,36 @@ TEST(Playback, StepsAsLongAsAPictureIsShown)
     }
 }
 
-TEST(Playback, StepsIntoAnotherChapter)
+TEST(Playback, TellsAllThatAStepPasses)
+{
+    TestDesk desk(ListOf({Item(10)}, {Entry(0, 0), Entry(0, Second - 500), Link(0, Second - 300),
+                                      Entry(0, Second + 400)}));
+    desk.Start(Second - 500);
+    desk.Do(desk.navigator.SearchTime(Second - 501));
+    desk.Do(desk.navigator.SetTrigger(Second + 100));
+    desk.Do(desk.navigator.Pause());
+
+    EXPECT_TRUE(desk.navigator.Step().IsDone());
+    EXPECT_EQ(desk.Take(), "0+44500 MarkInfo(7, 1, 44500)\n"
+                           "0+44500 ChapterNumber(2)\n"
+                           "0+44500 MarkInfo(7, 2, 44700)\n"
+                           "0+44500 CurrentTimePosition(45000)\n"
+                           "0+44500 TriggerTimeReached(13, 45100)\n"
+                           "0+44500 Stepped(45399, 0)\n");
+
+    EXPECT_TRUE(desk.navigator.Step().IsDone());
+    EXPECT_EQ(desk.Take(), "0+44500 MarkInfo(7, 3, 45400)\n"
+                           "0+44500 ChapterNumber(3)\n"
+                           "0+44500 Stepped(46299, 0)\n");
+
+    desk.navigator.SetPlayMode(bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedNormal));
+    EXPECT_TRUE(desk.navigator.Step().IsDone());
+    EXPECT_EQ(desk.Take(), "0+44500 MarkInfo(7, 3, 45400)\n"
+                           "0+44500 ChapterNumber(2)\n"
+                           "0+44500 Stepped(45399, 1)\n");
+}
+
+TEST(Playback, TellsWhatLiesWhereAStepEnds)
 {
     TestDesk desk(ListOf({Item(10)}, {Entry(0, 0), Entry(0, 900)}));
     desk.Start();
@@ -277,8 +306,43 @@ TEST(Playback, StepsIntoAnotherChapter)
 
     EXPECT_TRUE(desk.navigator.Step().IsDone());
 
-    EXPECT_EQ(desk.Take(), "0 Stepped(900, 0)\n"
-                           "0 ChapterNumber(2)\n");
+    EXPECT_EQ(desk.Take(), "0 MarkInfo(7, 1, 900)\n"
+                           "0 ChapterNumber(2)\n"
+                           "0 Stepped(900, 0)\n");
+}
+
+TEST(Playback, StepsFromTheEndOfARepeatToItsStart)
+{
+    TestDesk desk(ListOf({Item(10)}));
+    desk.Start(Second + 1);
+    desk.Do(desk.navigator.SetPointA());
+    desk.navigator.Advance(1000);
+    desk.Do(desk.navigator.SetPointB());
+    desk.navigator.Advance(500);
+    desk.Do(desk.navigator.Pause());
+
+    EXPECT_TRUE(desk.navigator.Step().IsDone());
+
+    EXPECT_EQ(desk.Take(), "1+1501 TriggerTimeReached(6, 46001)\n"
+                           "1+1501 JumpOccurred()\n"
+                           "1+1501 CurrentTimePosition(45001)\n"
+                           "1+1501 Stepped(45001, 0)\n");
+    EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Paused);
+}
+
+TEST(Playback, StepsBackToTheStartAndKeepsItsDirection)
+{
+    TestDesk desk(ListOf({Item(10)}));
+    desk.Start(900);
+    desk.Do(desk.navigator.Pause());
+    desk.Do(
+        desk.navigator.SetPlayMode(bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedNormal)));
+
+    EXPECT_TRUE(desk.navigator.Step().IsDone());
+
+    EXPECT_EQ(desk.Take(), "0+900 CurrentTimePosition(0)\n"
+                           "0+900 Stepped(0, 1)\n");
+    EXPECT_FALSE(desk.navigator.Step().IsDone());
 }
 
 TEST(Playback, RefusesToStepOutOfAnItem)

@@ -122,6 +122,10 @@ TEST_F(PlaybackContextTest, KnowsTheTriggerAtATime)
     EXPECT_EQ(context.GetTriggerTypeByTime(21), bd::TRIGGER_INVALID);
     state().notifyAt = 10;
     EXPECT_EQ(context.GetTriggerTypeByTime(10), bd::TRIGGER_B);
+    state().triggerReachedTime = 10;
+    state().triggerReached = bd::TRIGGER_NOTIFY_FROM_CURPOS;
+    EXPECT_EQ(context.GetTriggerTypeByTime(10), bd::TRIGGER_NOTIFY_FROM_CURPOS);
+    EXPECT_EQ(context.GetTriggerTypeByTime(20), bd::TRIGGER_INVALID);
 }
 
 TEST_F(PlaybackContextTest, TellsTheChapterOfThePosition)
@@ -130,6 +134,8 @@ TEST_F(PlaybackContextTest, TellsTheChapterOfThePosition)
     state().position = 10 * Second - 1;
     EXPECT_EQ(context.GetCurrentChapter(), 1);
     state().position = 10 * Second;
+    EXPECT_EQ(context.GetCurrentChapter(), 1) << "which is where the play item ends";
+    state().item = 1;
     EXPECT_EQ(context.GetCurrentChapter(), 2);
     state().position = 30 * Second;
     EXPECT_EQ(context.GetCurrentChapter(), 2);

@@ -1,5 +1,8 @@
 #include <gtest/gtest.h>
 
+#include <functional>
+#include <sstream>
+
 #include "testdesk.h"
 
 namespace deskplayer
@@ -251,8 +254,7 @@ TEST(Repeat, OfAPlayListWithoutLengthEnds)
     desk.Do(desk.navigator.EndStill());
     desk.navigator.Advance(Second);
 
-    EXPECT_EQ(desk.Take(), "0 CurrentTimePosition(0)\n"
-                           "0 Finished(0)\n");
+    EXPECT_EQ(desk.Take(), "0 Finished(0)\n");
 }
 
 TEST(Repeat, EndsTheRepeatOfAChapterOrThePlayList)
@@ -353,6 +355,69 @@ TEST(Trigger, IsANotificationDuringARepeatToo)
     desk.navigator.Advance(200);
 
     EXPECT_EQ(desk.Take(), "0+100 TriggerTimeReached(13, 100)\n");
+}
+
+TEST(Trigger, IsReachedBesideTheRepeatThatGoesBackThere)
+{
+    TestDesk desk(ListOf({Item(10)}, {Entry(0, 0), Entry(0, 2 * Second)}));
+    const struct {
+        std::function<void()> repeat;
+        std::uint64_t end;
+        std::string heard;
+    } repeats[] = {{[&desk] {
+                        desk.Do(desk.navigator.SetPointA());
+                        desk.navigator.Advance(Second / 2);
+                        desk.Do(desk.navigator.SetPointB());
+                    },
+                    Second / 2, "TriggerTimeReached(6, 22500)\n"},
+                   {[&desk] { desk.Do(desk.navigator.RepeatChapter()); }, 2 * Second,
+                    "TriggerTimeReached(8, 90000)\n"},
+                   {[&desk] { desk.Do(desk.navigator.RepeatTitle()); }, 10 * Second,
+                    "TriggerTimeReached(9, 450000)\n"}};
+    for (const auto& repeat : repeats) {
+        SCOPED_TRACE(repeat.heard);
+        desk.Start();
+        repeat.repeat();
+        desk.Do(desk.navigator.SetTrigger(repeat.end));
+
+        desk.navigator.Advance(repeat.end);
+
+        std::string reached;
+        std::istringstream heard(desk.Take());
+        for (std::string line; std::getline(heard, line);) {
+            if (line.find("TriggerTimeReached") != std::string::npos) {
+                reached += line.substr(line.find(' ') + 1) + "\n";
+            }
+        }
+        EXPECT_EQ(reached,
+                  "TriggerTimeReached(13, " + std::to_string(repeat.end) + ")\n" + repeat.heard);
+        desk.Do(desk.navigator.Stop());
+    }
+}
+
+TEST(Trigger, IsReachedAtTheEndOfThePlayList)
+{
+    TestDesk desk(ListOf({Item(1)}));
+    desk.Start();
+    desk.Do(desk.navigator.SetTrigger(Second));
+
+    desk.navigator.Advance(Second);
+
+    EXPECT_EQ(desk.TakeWithoutPositions(), "1 TriggerTimeReached(13, 45000)\n"
+                                           "1 Finished(0)\n");
+}
+
+TEST(Trigger, IsRefusedBehindTheEndOfThePlayList)
+{
+    TestDesk desk(ListOf({Item(10), Item(10)}));
+    desk.Start();
+    const std::string before = desk.Snapshot();
+
+    EXPECT_EQ(desk.navigator.SetTrigger(20 * Second + 45).Reason(),
+              "00:00:20.001 is behind the end of the play list, which lasts 00:00:20.000");
+
+    EXPECT_EQ(desk.Take(), "");
+    EXPECT_EQ(desk.Snapshot(), before);
 }
 
 TEST(Trigger, LeavesOtherTriggersAlone)

@@ -17,6 +17,7 @@ ResumePoint UnusualPoint()
     ResumePoint point;
     point.playList = 99999;
     point.playing = true;
+    point.playItem = 0x090A;
     point.position = 0x0102030405060708;
     point.playMode = bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedFast12);
     point.selection.video = 11;
@@ -57,6 +58,7 @@ TEST(ResumeData, GivesBackWhatWasPutIn)
     ASSERT_TRUE(read);
     EXPECT_EQ(read->playList, point.playList);
     EXPECT_EQ(read->playing, point.playing);
+    EXPECT_EQ(read->playItem, point.playItem);
     EXPECT_EQ(read->position, point.position);
     EXPECT_EQ(read->playMode, point.playMode);
     EXPECT_EQ(read->selection.video, point.selection.video);
@@ -98,6 +100,7 @@ TEST(ResumeData, IsTheSameOnEveryMachine)
         'B', 'D',  'R',  '1',                     // what it is
         0,   0x01, 0x86, 0x9F,                    // play list
         1,                                        // playing
+        9,   10,                                  // play item
         1,   2,    3,    4,    5, 6,  7,    8,    // position
         0,   0,    0,    1,    0, 0,  0,    17,   // play mode
         0,   11,   0,    12,   0, 13, 0x14, 0x15, // video, audio, menu, subtitles
@@ -235,6 +238,7 @@ TEST(Standby, IsLeftWithPositionStreamsAndPlayMode)
                            "65+7 TextSubtitleStyleInfo(1)\n"
                            "65+7 UOMask(0)\n"
                            "65+7 PopUpMenuAvailable()\n"
+                           "65+7 PlayMode(0, 4)\n"
                            "65+7 ChapterNumber(2)\n"
                            "65+7 CurrentTimePosition(225007)\n");
     EXPECT_EQ(desk.Snapshot(), before);
@@ -274,6 +278,42 @@ TEST(Standby, IsLeftIntoTheStillAtTheEndAgain)
                                            "7 Finished(0)\n");
 }
 
+TEST(Standby, IsLeftWhereItWasEnteredInEveryItem)
+{
+    const PlayList playList = ListOf(
+        {Item(2), Item(0), WithTimedStill(Item(2), 5), WithTimedStill(Item(0), 5), RichItem(2)},
+        {Entry(0, 0), Entry(2, 0), Entry(4, 0)});
+    for (std::uint64_t time = 0; time < 16; ++time) {
+        SCOPED_TRACE(time);
+        TestDesk desk(playList);
+        desk.Start(time * Second + 22500);
+        const std::string before = desk.Snapshot();
+        const std::size_t size = // a still is shown anew, and takes its time again
+            desk.navigator.CurrentStatus() == Status::Still ? before.find(" at ") : before.size();
+        desk.Do(desk.navigator.GoToStandby());
+
+        desk.Do(desk.navigator.WakeUp(desk.keeper.ResumeData()));
+        desk.navigator.Advance(0);
+
+        EXPECT_EQ(desk.Snapshot().substr(0, size), before.substr(0, size));
+    }
+}
+
+TEST(Standby, TellsThePlayModeThatWasAskedForWhilePaused)
+{
+    TestDesk desk(ListOf({Item(10)}));
+    desk.Start(Second);
+    desk.Do(desk.navigator.Pause());
+    desk.Do(desk.navigator.SetPlayMode(bd::PlayMode(bd::PlayDirectionForward, bd::PlaySpeedSlow1)));
+    desk.Do(desk.navigator.GoToStandby());
+    desk.Do(desk.navigator.WakeUp(desk.keeper.ResumeData()));
+
+    desk.navigator.Continue();
+
+    EXPECT_EQ(desk.Take(), "1 Continued(0, 4)\n"
+                           "1 PlayMode(0, 4)\n");
+}
+
 TEST(Standby, EndsARepeat)
 {
     TestDesk desk(ListOf({Item(10)}));
@@ -291,13 +331,24 @@ TEST(Standby, EndsInAStopWhenTheResumeDataIsNoGood)
     ofAnotherPlayList.playList = 8;
     ResumePoint behindTheEnd;
     behindTheEnd.playList = 7;
+    behindTheEnd.playItem = 1;
     behindTheEnd.position = 10 * Second + 1;
+    ResumePoint beforeItsItem;
+    beforeItsItem.playList = 7;
+    beforeItsItem.playItem = 1;
+    beforeItsItem.position = 5 * Second - 1;
+    ResumePoint behindItsItem;
+    behindItsItem.playList = 7;
+    behindItsItem.position = 5 * Second + 1;
+    ResumePoint inNoItem = beforeItsItem;
+    inNoItem.playItem = 2;
     std::vector<bd::UInt8> damaged = MakeResumeData(ResumePoint());
     damaged.back() ^= 1;
     for (const std::vector<bd::UInt8>& data :
          {std::vector<bd::UInt8>(), std::vector<bd::UInt8>(damaged.size(), 0), damaged,
-          MakeResumeData(ofAnotherPlayList), MakeResumeData(behindTheEnd)}) {
-        TestDesk desk(ListOf({Item(10)}));
+          MakeResumeData(ofAnotherPlayList), MakeResumeData(behindTheEnd),
+          MakeResumeData(beforeItsItem), MakeResumeData(behindItsItem), MakeResumeData(inNoItem)}) {
+        TestDesk desk(ListOf({Item(5), Item(5)}));
         desk.Start(Second);
         desk.Do(desk.navigator.GoToStandby());
 
