@@ -153,32 +153,32 @@ void TraceOutput::Follow(const Callback& callback)
         BeginNumbered(Track::PlayItem, "playItemId", callback);
         break;
     case CallbackId::ChapterNumber:
-        BeginNumbered(Track::Chapter, "chapter", callback);
+        BeginCounted(Track::Chapter, "chapter", callback);
         break;
 
     case CallbackId::VideoInfo:
-        BeginNumbered(Track::Video, "number", callback);
+        BeginCounted(Track::Video, "number", callback);
         break;
     case CallbackId::AudioInfo:
-        BeginNumbered(Track::Audio, "number", callback);
+        BeginCounted(Track::Audio, "number", callback);
         break;
     case CallbackId::PresentationGraphicsInfo:
-        BeginNumbered(Track::Subtitles, "number", callback);
+        BeginCounted(Track::Subtitles, "number", callback);
         break;
     case CallbackId::AngleInfo:
-        BeginNumbered(Track::Angle, "number", callback);
+        BeginCounted(Track::Angle, "number", callback);
         break;
     case CallbackId::InteractiveGraphicsInfo:
-        BeginNumbered(Track::InteractiveGraphics, "number", callback);
+        BeginCounted(Track::InteractiveGraphics, "number", callback);
         break;
     case CallbackId::SecondaryVideoInfo:
-        BeginNumbered(Track::SecondaryVideo, "number", callback);
+        BeginCounted(Track::SecondaryVideo, "number", callback);
         break;
     case CallbackId::SecondaryAudioInfo:
-        BeginNumbered(Track::SecondaryAudio, "number", callback);
+        BeginCounted(Track::SecondaryAudio, "number", callback);
         break;
     case CallbackId::PipPgTextStInfo:
-        BeginNumbered(Track::PipSubtitles, "number", callback);
+        BeginCounted(Track::PipSubtitles, "number", callback);
         break;
 
     case CallbackId::InteractiveGraphicsVisible:
@@ -214,6 +214,16 @@ void TraceOutput::BeginNumbered(Track track, std::string_view number, const Call
     Begin(track,
           StateOf(track).name + " " + std::to_string(ValueOf<std::uint64_t>(number, callback)),
           callback);
+}
+
+/** Streams, angles and chapters count from 1: 0 says that there is none. */
+void TraceOutput::BeginCounted(Track track, std::string_view number, const Callback& callback)
+{
+    if (ValueOf<std::uint64_t>(number, callback) == 0) {
+        End(track);
+    } else {
+        BeginNumbered(track, number, callback);
+    }
 }
 
 void TraceOutput::End(Track track)

@@ -51,6 +51,7 @@ private:
 
     void Begin(Track track, const std::string& slice, const Callback& callback);
     void BeginNumbered(Track track, std::string_view number, const Callback& callback);
+    void BeginCounted(Track track, std::string_view number, const Callback& callback);
     void End(Track track);
     void EndPlayback();
     void AppendEvent(Track track, const char* phase, const nlohmann::ordered_json& members);

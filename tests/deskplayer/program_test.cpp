@@ -9,6 +9,7 @@
 #include <filesystem>
 #include <fstream>
 #include <iterator>
+#include <map>
 #include <nlohmann/json.hpp>
 #include <regex>
 #include <set>
@@ -452,15 +453,60 @@ TEST(DeskPlayerOutput, IsOneJsonObjectALine)
     }
 }
 
-TEST(DeskPlayerOutput, IsATraceInOneJsonArray)
+/** Reads a trace as a viewer does: track by track. */
+void ExpectTraceThatAViewerCanShow(const std::string& output)
 {
-    const ProgramResult result =
-        RunDeskPlayer({SampleDisc, "--session", Evening, "--format", "trace"});
-
-    EXPECT_EQ(result.status, 0);
-    const nlohmann::json trace = nlohmann::json::parse(result.output);
+    struct Track {
+        double last = 0;
+        std::vector<std::string> open;
+    };
+    std::map<int, Track> tracks;
+    const nlohmann::json trace = nlohmann::json::parse(output);
     ASSERT_TRUE(trace.is_array());
-    EXPECT_GT(trace.size(), 100U);
+    for (const nlohmann::json& event : trace) {
+        const std::string phase = event.at("ph");
+        if (phase == "M") {
+            continue;
+        }
+        Track& track = tracks[event.at("tid")];
+        EXPECT_GE(event.at("ts"), track.last) << event;
+        track.last = event.at("ts");
+        if (phase == "B") {
+            track.open.push_back(event.at("name"));
+            EXPECT_EQ(track.open.size(), 1U) << event;
+        } else if (phase == "E") {
+            ASSERT_FALSE(track.open.empty()) << event;
+            track.open.pop_back();
+        } else {
+            EXPECT_EQ(phase, "i") << event;
+        }
+    }
+    EXPECT_GT(tracks.size(), 5U);
+    for (const auto& [thread, track] : tracks) {
+        EXPECT_TRUE(track.open.empty()) << thread << ": " << testing::PrintToString(track.open);
+    }
+}
+
+TEST(DeskPlayerOutput, IsATraceWhoseSlicesPairAndWhoseTimesNeverDecrease)
+{
+    for (const std::string& session : {AllEvents, Evening}) {
+        SCOPED_TRACE(session);
+        const ProgramResult result =
+            RunDeskPlayer({SampleDisc, "--session", session, "--format", "trace"});
+
+        EXPECT_EQ(result.status, 0);
+        ExpectTraceThatAViewerCanShow(result.output);
+    }
+}
+
+TEST(DeskPlayerOutput, IsATraceOfEveryDisc)
+{
+    for (const fs::directory_entry& disc : fs::directory_iterator(BDMVNAVIGATOR_TEST_DISCS)) {
+        if (fs::is_directory(disc.path() / "BDMV")) {
+            SCOPED_TRACE(disc.path().filename());
+            ExpectTraceThatAViewerCanShow(RunDeskPlayer({disc.path(), "--format", "trace"}).output);
+        }
+    }
 }
 
 TEST_F(ScratchFolder, GetsTheOutputThatIsSentToAFile)

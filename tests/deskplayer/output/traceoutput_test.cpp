@@ -345,6 +345,45 @@ TEST(TraceOutput, ShowsEveryStateByItsNumberOrName)
     }
 }
 
+TEST(TraceOutput, EndsTheSliceWhenNothingIsSelected)
+{
+    typedef bdmv::INavigatorListener Listener;
+    const std::map<std::string, std::function<void(Listener&, bd::UInt8)>> tell = {
+        {"chapter", [](Listener& l, bd::UInt8 number) { l.ChapterNumber(number); }},
+        {"video", [](Listener& l, bd::UInt8 number) { l.VideoInfo(number); }},
+        {"audio", [](Listener& l, bd::UInt8 number) { l.AudioInfo(number); }},
+        {"angle", [](Listener& l, bd::UInt8 number) { l.AngleInfo(number); }},
+        {"subtitles",
+         [](Listener& l, bd::UInt8 number) { l.PresentationGraphicsInfo(number, true); }},
+        {"interactive graphics",
+         [](Listener& l, bd::UInt8 number) { l.InteractiveGraphicsInfo(number); }},
+        {"secondary video", [](Listener& l, bd::UInt8 number) { l.SecondaryVideoInfo(number); }},
+        {"secondary audio", [](Listener& l, bd::UInt8 number) { l.SecondaryAudioInfo(number); }},
+        {"picture-in-picture subtitles",
+         [](Listener& l, bd::UInt8 number) { l.PipPgTextStInfo(number, true); }}};
+    for (const auto& [track, tellOf] : tell) {
+        TracedSession session;
+        for (const bd::UInt8 number : std::vector<bd::UInt8>{0, 1, 0}) {
+            tellOf(*session.operator->(), number);
+            session.PassSecond();
+        }
+
+        EXPECT_EQ(session.Slices(track), track + " 1 1000-2000");
+    }
+}
+
+TEST(TraceOutput, CountsPlayListsAndPlayItemsFrom0)
+{
+    for (const char* const track : {"play list", "play item"}) {
+        TracedSession session;
+        session->Playlist(0);
+        session->PlayItem(0, 0, bd::VideoFormatTypeNoInfo, bd::VideoAspectRatioTypeNoInfo);
+        session.PassSecond();
+
+        EXPECT_EQ(session.Slices(track), std::string(track) + " 0 0-1000");
+    }
+}
+
 TEST(TraceOutput, BeginsASliceWithEveryCallbackOfItsTrack)
 {
     TracedSession session;
