@@ -360,8 +360,8 @@ public:
 };
 
 /**
- * Playback reached its end, or starved. A reason that the streaming layer does not know is reported
- * through Assert() and sent as the end of the media.
+ * Playback reached its end, or starved. A reason that is neither of the two is reported through
+ * Assert() and sent as the end of the media.
  */
 class FinishedEvent : public NavigatorEvent
 {

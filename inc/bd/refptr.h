@@ -12,7 +12,7 @@
  * the counter. Give a raw pointer to one RefPtr only; copy that one from then on.
  *
  * Re-entrancy. The destructor of an object may release, assign or read the very RefPtr that is
- * letting go of it. It must not copy that RefPtr, and it must not throw.
+ * letting go of it. It must not copy or move from that RefPtr, and it must not throw.
  *
  * Threads. RefPtr objects that share an object may be copied and released on different threads at
  * once. One RefPtr object is not safe for concurrent use.

@@ -352,6 +352,15 @@ TEST_F(EventDelivery, CallsNobodyWhenTheLockIsRefused)
     ExpectListAndLockAreSound();
 }
 
+TEST_F(EventDelivery, CopiesItsValueBeforeItTakesTheLock)
+{
+    const CountedValue value(1);
+    bdmvtest::FailMutexLock(EAGAIN);
+    EXPECT_THROW(EventListenerList_FireParam1(list, &IProbe::Copy1, value), std::system_error);
+
+    EXPECT_EQ(1, CountedValue::copies);
+}
+
 // Listeners that throw
 
 TEST_F(EventDelivery, EndsAtTheListenerThatThrows)

@@ -123,6 +123,18 @@ TEST(Guard, DoesNotReleaseWhatItDidNotGetAgain)
     EXPECT_EQ("acquire release acquire ", lock.calls);
 }
 
+TEST(Guard, ReleasesWhatItHeldWhenItCannotGetItTwice)
+{
+    FakeLock lock;
+    {
+        FakeGuard guard(lock);
+        lock.refuses = true;
+        EXPECT_THROW(guard.Acquire(), std::runtime_error);
+    }
+
+    EXPECT_EQ("acquire acquire release ", lock.calls);
+}
+
 TEST(Guard, HoldsTheLockThenTheFlag)
 {
     const FakeLock lock;

@@ -207,4 +207,12 @@ TEST_F(SuppressedEventTest, SecondaryAudioUnavailableDoesNotTouchTheLock)
                   Logged("Not send unavailable for async 2nd audio"));
 }
 
+TEST_F(SuppressedEventTest, PresentationGraphicsInfoDoesNotTouchTheLock)
+{
+    context.rPgTextStResult = bdmv::INavError::ErrNotAllowed;
+
+    EXPECT_EQ(DispatchWhileTheListIsHeld<bdmv::PresentationGraphicsInfoEvent>(),
+              Queried("rGetPgTextStInfo(0, 0) -> 0, 0") + Queried("rGetPgTextStInfo returned 7"));
+}
+
 } // namespace

@@ -49,7 +49,7 @@ public:
     virtual void Continued(bd::PlayDirectionDef direction, bd::PlaySpeedDef speed) = 0;
 
     /**
-     * Playback made one step while paused. Sent by SteppedEvent.
+     * Playback made one step. Sent by SteppedEvent.
      *
      * @param position  the current time position
      * @param direction direction of the play mode that is set
@@ -110,7 +110,7 @@ public:
      * The block is discarded right after the last listener has returned: a listener that is to keep
      * it copies the bytes during the call.
      *
-     * @param data first byte of the system resume data; may be null when @p size is 0
+     * @param data first byte of the system resume data; may be null, whatever the size
      * @param size its size in bytes
      */
     virtual void SystemSuspended(const void* data, bd::UInt32 size) = 0;
