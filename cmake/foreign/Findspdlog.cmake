@@ -1,0 +1,5 @@
+include(${CMAKE_CURRENT_LIST_DIR}/HostHeaders.cmake)
+bdmvnavigator_find_host_headers(spdlog spdlog::spdlog spdlog fmt)
+if(spdlog_FOUND)
+  target_compile_definitions(spdlog::spdlog INTERFACE SPDLOG_FMT_EXTERNAL FMT_HEADER_ONLY)
+endif()
