@@ -2,6 +2,8 @@
 // listeners are told.
 
 #include <CLI/CLI.hpp>
+#include <fcntl.h>
+#include <poll.h>
 #include <unistd.h>
 
 #include <array>
@@ -74,16 +76,52 @@ void Complain(const std::string& message)
     std::cerr << "bdmv-deskplayer: " << message << '\n';
 }
 
+/** An open file. */
+class File
+{
+public:
+    explicit File(const std::string& fileName)
+        : m_Descriptor(open(fileName.c_str(), O_RDONLY | O_NONBLOCK | O_CLOEXEC))
+    {
+    }
+
+    ~File() { close(m_Descriptor); }
+
+    File(const File&) = delete;
+    File& operator=(const File&) = delete;
+
+    /** Whether there is something to read, even if a fault, before long: a pipe can stay silent. */
+    bool HasMore() const
+    {
+        constexpr int patience = 500; // milliseconds
+        pollfd input = {m_Descriptor, POLLIN, 0};
+        return m_Descriptor < 0 || poll(&input, 1, patience) != 0;
+    }
+
+    /** @return how many bytes; 0 at the end, negative if it cannot be read */
+    ssize_t Read(char* bytes, std::size_t size) const { return read(m_Descriptor, bytes, size); }
+
+private:
+    int m_Descriptor;
+};
+
 /** Reads no more than it takes to see that a session is too long. */
 std::string ReadSession(const std::string& fileName)
 {
-    std::ifstream file(fileName, std::ios::binary);
-    std::string text(deskplayer::LongestScript + 1, '\0');
-    file.read(text.data(), static_cast<std::streamsize>(text.size()));
-    if (!file.is_open() || file.bad()) {
-        throw UsageError(fileName + ": no session that can be read, expected a text file");
+    const File file(fileName);
+    std::string text;
+    std::array<char, 4096> piece;
+    ssize_t size = 1;
+    while (size > 0 && text.size() <= deskplayer::LongestScript) {
+        if (!file.HasMore()) {
+            throw UsageError(fileName + ": nothing comes out of it, expected a session");
+        }
+        size = file.Read(piece.data(), piece.size());
+        if (size < 0) {
+            throw UsageError(fileName + ": no session that can be read, expected a text file");
+        }
+        text.append(piece.data(), static_cast<std::size_t>(size));
     }
-    text.resize(static_cast<std::size_t>(file.gcount()));
     if (text.size() > deskplayer::LongestScript) {
         throw UsageError(fileName + ": has more than " + std::to_string(deskplayer::LongestScript) +
                          " bytes, expected a session");

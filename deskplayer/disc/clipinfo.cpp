@@ -1,5 +1,7 @@
 #include "disc/clipinfo.h"
 
+#include <algorithm>
+
 #include "disc/codes.h"
 #include "disc/fields.h"
 
@@ -120,17 +122,24 @@ std::uint64_t Duration(const ClipInfo& clipInfo)
     return duration;
 }
 
-std::optional<std::uint8_t> FindAspectRatio(const ClipInfo& clipInfo, std::uint16_t pid)
+std::vector<std::pair<std::uint16_t, std::uint8_t>> AspectRatiosOf(const ClipInfo& clipInfo)
 {
+    std::vector<std::pair<std::uint16_t, std::uint8_t>> ratios;
     for (const Program& program : clipInfo.programs) {
         for (const ProgramStream& stream : program.streams) {
-            if (stream.pid == pid &&
-                KindOfStream(stream.attributes.codingType) == StreamKindVideo) {
-                return stream.aspectRatio;
+            if (KindOfStream(stream.attributes.codingType) == StreamKindVideo) {
+                ratios.emplace_back(stream.pid, stream.aspectRatio);
             }
         }
     }
-    return std::nullopt;
+    const auto byPid = [](const auto& left, const auto& right) { return left.first < right.first; };
+    const auto samePid = [](const auto& left, const auto& right) {
+        return left.first == right.first;
+    };
+    std::stable_sort(ratios.begin(), ratios.end(), byPid);
+    ratios.erase(std::unique(ratios.begin(), ratios.end(), samePid), ratios.end());
+    ratios.shrink_to_fit();
+    return ratios;
 }
 
 } // namespace deskplayer

@@ -6,8 +6,8 @@
 #define DESKPLAYER_DISC_CLIPINFO_H
 
 #include <cstdint>
-#include <optional>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "disc/bytereader.h"
@@ -69,8 +69,11 @@ ClipInfo ParseClipInfo(const Bytes& bytes, const std::string& fileName);
 /** How long the clip plays, over all its STC sequences, in ticks. */
 std::uint64_t Duration(const ClipInfo& clipInfo);
 
-/** Aspect ratio of the video stream with @p pid; nothing if the clip has no such video stream. */
-std::optional<std::uint8_t> FindAspectRatio(const ClipInfo& clipInfo, std::uint16_t pid);
+/**
+ * Aspect ratios of the video streams, by the PID of the stream, in ascending order. Of several
+ * streams with one PID the first counts.
+ */
+std::vector<std::pair<std::uint16_t, std::uint8_t>> AspectRatiosOf(const ClipInfo& clipInfo);
 
 } // namespace deskplayer
 

@@ -33,7 +33,7 @@ fs::path FindBdmv(const fs::path& folder)
     throw FileError(folder.string(), "no disc, expected a folder that holds BDMV or is it");
 }
 
-Bytes ReadFile(const fs::path& path)
+Bytes ReadFile(const fs::path& path, std::uintmax_t largest)
 {
     std::error_code error;
     const fs::file_status status = fs::status(path, error);
@@ -44,9 +44,9 @@ Bytes ReadFile(const fs::path& path)
         throw FileError(path.string(), "not a regular file, expected one");
     }
     const std::uintmax_t size = fs::file_size(path, error); // if that fails, the greatest there is
-    if (size > LargestFile) {
+    if (size > largest) {
         throw FileError(path.string(), "has " + std::to_string(size) + " bytes, expected at most " +
-                                           std::to_string(LargestFile));
+                                           std::to_string(largest));
     }
 
     Bytes bytes(static_cast<std::size_t>(size));
@@ -105,53 +105,48 @@ std::vector<std::uint32_t> Disc::PlayListNumbers() const
 }
 
 template <typename Value>
-Value Disc::Read(const std::string& name, Value (*parse)(const Bytes&, const std::string&)) const
+Value Disc::Read(const std::string& name, std::uintmax_t largest,
+                 Value (*parse)(const Bytes&, const std::string&)) const
 {
-    return parse(ReadFile(m_Bdmv / name), "BDMV/" + name);
+    return parse(ReadFile(m_Bdmv / name, largest), "BDMV/" + name);
 }
 
 PlayList Disc::ReadPlayList(std::uint32_t number) const
 {
-    return Read(PlayListFileName(number), ParsePlayList);
+    return Read(PlayListFileName(number), LargestPlayListFile, ParsePlayList);
 }
 
 ClipInfo Disc::ReadClipInfo(const std::string& clip) const
 {
-    return Read(ClipInfoFileName(clip), ParseClipInfo);
+    return Read(ClipInfoFileName(clip), LargestFile, ParseClipInfo);
+}
+
+bool Disc::HasClipInfo(const std::string& clip) const
+{
+    std::error_code error;
+    return fs::exists(m_Bdmv / ClipInfoFileName(clip), error);
 }
 
 Index Disc::ReadIndex() const
 {
-    return Read("index.bdmv", ParseIndex);
+    return Read("index.bdmv", LargestFile, ParseIndex);
 }
 
 MovieObjects Disc::ReadMovieObjects() const
 {
-    return Read("MovieObject.bdmv", ParseMovieObjects);
-}
-
-std::optional<std::uint8_t> Disc::AspectRatio(const PlayList& playList, std::size_t playItem,
-                                              const Stream& stream) const
-{
-    const std::optional<std::string> clip = ClipOfStream(playList, playItem, stream);
-    std::error_code error;
-    if (!clip || !fs::exists(m_Bdmv / ClipInfoFileName(*clip), error)) {
-        return std::nullopt;
-    }
-    return FindAspectRatio(ReadClipInfo(*clip), stream.pid);
+    return Read("MovieObject.bdmv", LargestFile, ParseMovieObjects);
 }
 
 LongestPlayList Disc::FindLongestPlayList() const
 {
-    std::optional<LongestPlayList> longest;
+    std::optional<std::uint32_t> longest;
     std::uint64_t greatestDuration = 0;
     std::vector<std::string> unreadable;
     for (const std::uint32_t number : PlayListNumbers()) {
         try {
-            PlayList playList = ReadPlayList(number);
-            const std::uint64_t duration = BuildTimeLine(playList).duration;
+            const std::uint64_t duration = BuildTimeLine(ReadPlayList(number)).duration;
             if (!longest || duration > greatestDuration) {
-                longest = LongestPlayList{number, std::move(playList), {}};
+                longest = number;
                 greatestDuration = duration;
             }
         } catch (const DiscError& error) {
@@ -163,8 +158,8 @@ LongestPlayList Disc::FindLongestPlayList() const
                         unreadable.empty() ? "no play list, expected files like 00000.mpls"
                                            : "no play list can be read: " + unreadable.front());
     }
-    longest->unreadable = std::move(unreadable);
-    return *longest;
+    // Read again rather than kept: two of the greatest would take twice the memory.
+    return {*longest, ReadPlayList(*longest), std::move(unreadable)};
 }
 
 } // namespace deskplayer

@@ -27,10 +27,12 @@ namespace deskplayer
 {
 
 /**
- * Greatest file that is read, in bytes. Metadata files are far smaller. Values take about five
- * times the memory of the bytes they were read from, those of a file made for the purpose some
- * thirty.
+ * Greatest play list that is read, in bytes; real ones have a tenth of that. The values of one that
+ * was made for the purpose take almost forty times the memory of its bytes.
  */
+constexpr std::uintmax_t LargestPlayListFile = std::uintmax_t{1024} * 1024;
+
+/** The same of any other file, whose values do not grow as much. */
 constexpr std::uintmax_t LargestFile = std::uintmax_t{4} * 1024 * 1024;
 
 /** The play list of a disc that plays longest, most likely the main movie. */
@@ -44,8 +46,9 @@ struct LongestPlayList {
  * Reads the files of one disc, each time anew. Holds nothing but the path of the folder.
  *
  * All operations throw FileError if a file is missing, is not a regular file, is larger than
- * LargestFile or cannot be read, and FormatError if its content is wrong; both are DiscErrors. The
- * copies in BDMV/BACKUP are not used: a damaged disc is reported, not papered over.
+ * LargestPlayListFile or LargestFile or cannot be read, and FormatError if its content is wrong;
+ * both are DiscErrors. The copies in BDMV/BACKUP are not used: a damaged disc is reported, not
+ * papered over.
  */
 class Disc
 {
@@ -67,15 +70,8 @@ public:
     Index ReadIndex() const;
     MovieObjects ReadMovieObjects() const;
 
-    /**
-     * Aspect ratio of a video stream, from the clip information of the clip that carries it.
-     *
-     * @param playItem from 0; @p stream is one of its streams
-     * @return nothing if it is not known: there is no such clip information or no such video stream
-     *         in it. Clip information that is there but cannot be read is an error.
-     */
-    std::optional<std::uint8_t> AspectRatio(const PlayList& playList, std::size_t playItem,
-                                            const Stream& stream) const;
+    /** Whether there is clip information, be it readable or not. */
+    bool HasClipInfo(const std::string& clip) const;
 
     /**
      * Reads all play lists and chooses the longest, of several the one with the lowest number.
@@ -88,7 +84,8 @@ public:
 
 private:
     template <typename Value>
-    Value Read(const std::string& name, Value (*parse)(const Bytes&, const std::string&)) const;
+    Value Read(const std::string& name, std::uintmax_t largest,
+               Value (*parse)(const Bytes&, const std::string&)) const;
 
     std::filesystem::path m_Bdmv;
 };

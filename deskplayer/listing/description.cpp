@@ -7,9 +7,9 @@
 #include <utility>
 #include <vector>
 
+#include "disc/aspectratios.h"
 #include "disc/codes.h"
 #include "disc/timeline.h"
-#include "listing/aspectratios.h"
 #include "output/names.h"
 #include "output/timetext.h"
 

@@ -8,9 +8,9 @@
 #include <string>
 #include <vector>
 
+#include "disc/aspectratios.h"
 #include "disc/codes.h"
 #include "disc/timeline.h"
-#include "listing/aspectratios.h"
 #include "output/timetext.h"
 
 namespace deskplayer

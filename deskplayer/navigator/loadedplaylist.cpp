@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <tuple>
 
+#include "disc/aspectratios.h"
 #include "output/timetext.h"
 
 namespace deskplayer
@@ -38,10 +39,15 @@ LoadedPlayList LoadPlayList(const Disc& disc, std::uint32_t number, PlayList pla
                         "lasts " + TimeText(loaded.timeLine.duration) + ", expected at most " +
                             TimeText(LongestDuration));
     }
+    AspectRatios aspectRatios(disc);
     for (std::size_t item = 0; item < loaded.playList.playItems.size(); ++item) {
         const std::vector<Stream>& videos = loaded.playList.playItems[item].streams.primaryVideo;
         if (!videos.empty()) {
-            loaded.aspectRatios[item] = disc.AspectRatio(loaded.playList, item, videos.front());
+            const AspectRatio ratio = aspectRatios.Find(loaded.playList, item, videos.front());
+            if (ratio.damaged) {
+                throw DiscError(ratio.reason);
+            }
+            loaded.aspectRatios[item] = ratio.code;
         }
     }
     return loaded;

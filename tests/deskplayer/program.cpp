@@ -29,14 +29,14 @@ std::string Quoted(const std::string& word)
     return quoted + "'";
 }
 
-} // namespace
-
-ProgramResult RunDeskPlayer(const std::vector<std::string>& arguments, const std::string& output)
+/** @param preparation a command of the shell that comes first */
+ProgramResult Run(const std::string& preparation, const std::vector<std::string>& arguments,
+                  const std::string& output)
 {
     const std::filesystem::path folder =
         std::filesystem::temp_directory_path() / ("deskplayer-" + std::to_string(getpid()));
     std::filesystem::create_directories(folder);
-    std::string command = Quoted(BDMVNAVIGATOR_DESKPLAYER);
+    std::string command = preparation + "exec " + Quoted(BDMVNAVIGATOR_DESKPLAYER);
     for (const std::string& argument : arguments) {
         command += ' ' + Quoted(argument);
     }
@@ -50,4 +50,17 @@ ProgramResult RunDeskPlayer(const std::vector<std::string>& arguments, const std
     result.errors = ReadWhole(folder / "errors");
     std::filesystem::remove_all(folder);
     return result;
+}
+
+} // namespace
+
+ProgramResult RunDeskPlayer(const std::vector<std::string>& arguments, const std::string& output)
+{
+    return Run("", arguments, output);
+}
+
+ProgramResult RunDeskPlayerInLittleMemory(const std::vector<std::string>& arguments,
+                                          unsigned long kibibytes)
+{
+    return Run("ulimit -v " + std::to_string(kibibytes) + " && ", arguments, "");
 }

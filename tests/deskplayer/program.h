@@ -23,4 +23,8 @@ struct ProgramResult {
 ProgramResult RunDeskPlayer(const std::vector<std::string>& arguments,
                             const std::string& output = {});
 
+/** The same with so many KiB of address space at the most. */
+ProgramResult RunDeskPlayerInLittleMemory(const std::vector<std::string>& arguments,
+                                          unsigned long kibibytes);
+
 #endif

@@ -160,4 +160,19 @@ PlayListBytes WithStreams(const Bytes& counts, const Bytes& streams)
     return WithItem(item);
 }
 
+Bytes ClipInfoOf(unsigned count, const Bytes& programs)
+{
+    const Bytes clipInfo = Part32(Zeros(144));
+    const Bytes sequences = Part32(Zeros(2));
+    const auto sequencesAt = std::uint32_t(40 + clipInfo.size());
+    const auto programsAt = std::uint32_t(sequencesAt + sequences.size());
+    return Join({Ascii("HDMV0200"), U32(sequencesAt), U32(programsAt), Zeros(24), clipInfo,
+                 sequences, Part32(Join({U8(0), U8(count), programs}))});
+}
+
+Bytes ProgramBytes(unsigned count, const Bytes& streams)
+{
+    return Join({U32(0), U16(0x100), U8(count), U8(0), streams});
+}
+
 } // namespace deskplayer

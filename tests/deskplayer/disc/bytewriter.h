@@ -105,6 +105,12 @@ PlayListBytes WithItem(const PlayItemBytes& item);
 /** A play list of one play item with the streams of @p streamTable. */
 PlayListBytes WithStreams(const Bytes& counts, const Bytes& streams);
 
+/** A program of clip information with @p count streams. */
+Bytes ProgramBytes(unsigned count, const Bytes& streams);
+
+/** Clip information with @p count programs, and with nothing else of interest. */
+Bytes ClipInfoOf(unsigned count, const Bytes& programs);
+
 } // namespace deskplayer
 
 #endif

@@ -219,15 +219,17 @@ TEST(ClipDuration, IsTheSumOverAllStcSequencesInSixtyFourBits)
     EXPECT_EQ(Duration(clipInfo), 2u * 0xFFFFFFFFull + 2u);
 }
 
-TEST(FindAspectRatio, LooksForTheVideoStreamInAllPrograms)
+TEST(AspectRatiosOf, AreThoseOfTheVideoStreamsOfAllProgramsByPid)
 {
-    const Bytes audio = Join({U16(2), Part8(Join({U8(0x81), Zeros(4)}))});
-    const Bytes video = Join({U16(1), Part8({0x1B, 0x61, 0x20})});
+    const auto video = [](unsigned pid, unsigned ratio) {
+        return Join({U16(pid), Part8({0x1B, 0x61, static_cast<std::uint8_t>(ratio << 4)})});
+    };
+    const Bytes audio = Join({U16(3), Part8(Join({U8(0x81), Zeros(4)}))});
     const ClipInfo clipInfo =
-        WithPrograms(Join({U8(2), Zeros(6), U8(1), U8(0), audio, Zeros(6), U8(1), U8(0), video}));
-    EXPECT_EQ(FindAspectRatio(clipInfo, 1), 2);
-    EXPECT_EQ(FindAspectRatio(clipInfo, 2), std::nullopt) << "not a video stream";
-    EXPECT_EQ(FindAspectRatio(clipInfo, 3), std::nullopt) << "not there";
+        WithPrograms(Join({U8(2), Zeros(6), U8(2), U8(0), video(4, 3), audio, Zeros(6), U8(2),
+                           U8(0), video(1, 2), video(4, 2)}));
+    const std::vector<std::pair<std::uint16_t, std::uint8_t>> expected = {{1, 2}, {4, 3}};
+    EXPECT_EQ(AspectRatiosOf(clipInfo), expected) << "of two with a PID the first";
 }
 
 } // namespace

@@ -53,7 +53,7 @@ void UseClipInfo(const Bytes& bytes)
 {
     const ClipInfo clipInfo = ParseClipInfo(bytes, "file");
     Duration(clipInfo);
-    FindAspectRatio(clipInfo, 0);
+    AspectRatiosOf(clipInfo);
 }
 
 json BdmvToJson(const Bytes& bytes)
@@ -160,10 +160,10 @@ TEST(DamagedFiles, GetMemoryInProportionToTheirSizeAtMost)
     item.streamTable = StreamTableBytes(Join({Repeat(4, {0xFF}), Zeros(2), {0xFF, 0}}),
                                         Repeat(std::size_t{5} * 255, smallestStream));
     PlayListBytes bytes;
-    bytes.itemCount = unsigned(LargestFile / item.Make().size());
+    bytes.itemCount = unsigned(LargestPlayListFile / item.Make().size());
     bytes.items = Repeat(bytes.itemCount, item.Make());
     const Bytes dense = bytes.Make();
-    ASSERT_GT(dense.size(), LargestFile * 9 / 10);
+    ASSERT_GT(dense.size(), LargestPlayListFile * 9 / 10);
     EXPECT_LT(MemoryForPlayList(dense), 40 * dense.size());
 }
 

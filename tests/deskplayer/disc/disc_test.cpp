@@ -5,6 +5,7 @@
 #include <unistd.h>
 
 #include "bytewriter.h"
+#include "disc/aspectratios.h"
 #include "disc/disc.h"
 #include "expectederror.h"
 #include "testdiscs.h"
@@ -112,12 +113,18 @@ TEST_F(DiscTest, RefusesAFileThatIsTooLarge)
     fs::resize_file(PathOf("index.bdmv"), LargestFile + 1);
     EXPECT_EQ(FileErrorOf([&] { MakeDisc().ReadIndex(); }),
               PathOf("index.bdmv").string() + ": has 4194305 bytes, expected at most 4194304");
+
+    WritePlayList("00000", 1);
+    fs::resize_file(PathOf("PLAYLIST/00000.mpls"), LargestPlayListFile + 1);
+    EXPECT_EQ(FileErrorOf([&] { MakeDisc().ReadPlayList(0); }),
+              PathOf("PLAYLIST/00000.mpls").string() +
+                  ": has 1048577 bytes, expected at most 1048576");
 }
 
 TEST_F(DiscTest, ReadsAFileOfTheGreatestSize)
 {
     Write("PLAYLIST/00000.mpls", WithItem(PlayItemBytes()).Make());
-    fs::resize_file(PathOf("PLAYLIST/00000.mpls"), LargestFile);
+    fs::resize_file(PathOf("PLAYLIST/00000.mpls"), LargestPlayListFile);
     EXPECT_EQ(MakeDisc().ReadPlayList(0).playItems.size(), 1u);
 }
 
@@ -175,9 +182,14 @@ protected:
 
     Stream& Video() { return m_PlayList.playItems.at(0).streams.primaryVideo.at(0); }
 
-    std::optional<std::uint8_t> AspectRatio()
+    AspectRatio Find() { return AspectRatios(MakeDisc()).Find(m_PlayList, 0, Video()); }
+
+    void ExpectNotKnown(const std::string& reason, bool damaged)
     {
-        return MakeDisc().AspectRatio(m_PlayList, 0, Video());
+        const AspectRatio ratio = Find();
+        EXPECT_EQ(ratio.code, std::nullopt);
+        EXPECT_NE(ratio.reason.find(reason), std::string::npos) << ratio.reason;
+        EXPECT_EQ(ratio.damaged, damaged);
     }
 
     PlayList m_PlayList;
@@ -185,7 +197,7 @@ protected:
 
 TEST_F(AspectRatioTest, ComesFromTheClipInformation)
 {
-    EXPECT_EQ(AspectRatio(), 2);
+    EXPECT_EQ(Find().code, 2);
 }
 
 TEST_F(AspectRatioTest, ComesFromTheClipThatTheSubPathNames)
@@ -195,31 +207,42 @@ TEST_F(AspectRatioTest, ComesFromTheClipThatTheSubPathNames)
     m_PlayList.subPaths = {{5, false, {subItem}}};
     m_PlayList.playItems.at(0).clip.name = "00001";
     Video().entryType = EntryTypeSubPath;
-    EXPECT_EQ(AspectRatio(), 2);
+    EXPECT_EQ(Find().code, 2);
 }
 
 TEST_F(AspectRatioTest, IsNotKnownWithoutClipInformation)
 {
     fs::remove(PathOf("CLIPINF/00000.clpi"));
-    EXPECT_EQ(AspectRatio(), std::nullopt);
+    ExpectNotKnown("00000.clpi: No such file or directory", false);
 }
 
 TEST_F(AspectRatioTest, IsNotKnownIfTheClipHasNoSuchStream)
 {
     Video().pid = 1;
-    EXPECT_EQ(AspectRatio(), std::nullopt);
+    ExpectNotKnown("not in the clip information", false);
+    Video().pid = 0xFFFF;
+    ExpectNotKnown("not in the clip information", false);
 }
 
 TEST_F(AspectRatioTest, IsNotKnownIfNoClipIsNamed)
 {
     Video().entryType = EntryTypeSubPath;
-    EXPECT_EQ(AspectRatio(), std::nullopt);
+    ExpectNotKnown("its clip is not known", false);
 }
 
-TEST_F(AspectRatioTest, IsAnErrorIfTheClipInformationIsDamaged)
+TEST_F(AspectRatioTest, IsNotKnownIfTheClipInformationIsDamaged)
 {
     fs::resize_file(PathOf("CLIPINF/00000.clpi"), 50);
-    EXPECT_THROW(AspectRatio(), FormatError);
+    ExpectNotKnown("BDMV/CLIPINF/00000.clpi: offset ", true);
+}
+
+TEST_F(AspectRatioTest, IsReadOncePerClip)
+{
+    const Disc disc = MakeDisc();
+    AspectRatios ratios(disc);
+    EXPECT_EQ(ratios.Find(m_PlayList, 0, Video()).code, 2);
+    fs::remove(PathOf("CLIPINF/00000.clpi"));
+    EXPECT_EQ(ratios.Find(m_PlayList, 0, Video()).code, 2);
 }
 
 TEST_F(DiscTest, FindsThePlayListThatPlaysLongest)

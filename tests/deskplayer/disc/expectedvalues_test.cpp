@@ -3,6 +3,7 @@
 
 #include <gtest/gtest.h>
 
+#include "disc/aspectratios.h"
 #include "disc/disc.h"
 #include "json.h"
 #include "testdiscs.h"
@@ -71,7 +72,7 @@ TEST_P(EveryDisc, HasTheExpectedPlayLists)
         const PlayList playList = m_Disc.ReadPlayList(number);
         const std::string name = std::to_string(100000 + number).substr(1);
         playLists[name] = ToJson(playList, [&](std::size_t playItem, const Stream& stream) {
-            return m_Disc.AspectRatio(playList, playItem, stream);
+            return AspectRatios(m_Disc).Find(playList, playItem, stream).code;
         });
     }
     Compare(playLists, m_Expected.at("play_lists"));

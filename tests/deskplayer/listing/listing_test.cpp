@@ -503,7 +503,7 @@ TEST(ListPlayLists, WritesTheGreatestPlayListsPromptly)
         {255, 0, 0, 0, 0, 0, 0, 0},
         Repeat(255, Join({StreamEntry(0x1011), StreamAttributesBytes(0x1B, {0x61, 0, 0, 0})})));
     PlayListBytes playList;
-    playList.itemCount = unsigned((LargestFile - 200) / item.Make().size());
+    playList.itemCount = unsigned((LargestPlayListFile - 200) / item.Make().size());
     playList.items = Repeat(playList.itemCount, item.Make());
     const ScratchDisc scratch("pip");
     scratch.Write("PLAYLIST/00000.mpls", playList.Make());
