@@ -1,61 +1,151 @@
 // The order of the virtual operations is part of the binary interface: an implementation compiled
-// elsewhere is called by slot number. The order is read from pointers to members, which hold the
-// slot of a virtual function in every ABI that follows the Itanium C++ ABI.
+// elsewhere is called by slot number. Two things prove it, in every ABI that follows the Itanium
+// C++ ABI. A caller: pointers to members hold the slot that a call by name uses. And an object: its
+// own virtual table is read, each entry called for what it is, a function whose first argument is
+// the object, and the override that ran has recorded its name.
 
 #include <gtest/gtest.h>
 
 #include <cstddef>
 #include <cstdint>
 #include <cstring>
+#include <functional>
+#include <new>
 #include <string>
+#include <type_traits>
 #include <vector>
 
 #include "bdmvnavigator/inavigatorevent.h"
 #include "bdmvnavigator/inavigatorlistener.h"
 #include "bdmvnavigator/iplaybackcontext.h"
-#include "bdmvnavigator/navigatorlisteneradapter.h"
 #include "database/inavigationcommanddata.h"
+#include "database/iplaylistmark.h"
 #include "database/iprogramdata.h"
+#include "support/journal.h"
+#include "support/recordinglistener.h"
+#include "support/scriptableplaybackcontext.h"
+
+#if defined(__clang__)
+// A virtual function is called as the plain function that it is to the processor.
+#define CALLS_TABLE_ENTRY __attribute__((no_sanitize("function")))
+#else
+#define CALLS_TABLE_ENTRY
+#endif
 
 namespace
 {
 
+constexpr long CompleteDestructorSlot = 0;
+constexpr long DeletingDestructorSlot = 1;
 constexpr long DestructorSlots = 2;
 constexpr long NotVirtual = -1;
 
+// Where the lowest bit of a function's address is not free, the mark of a virtual function stands
+// in the adjustment of the object, which is doubled.
+#if defined(__arm__) || defined(__aarch64__) || defined(__mips__)
+constexpr bool MarkIsInAdjustment = true;
+#else
+constexpr bool MarkIsInAdjustment = false;
+#endif
+
 /**
- * The slot of a virtual member function in the virtual table, from 0.
- *
- * @tparam Signature the parameters and the result that the function must have
+ * The slot of a virtual member function in the virtual table, from 0: the one that a call by name
+ * uses.
  */
-template <typename Signature, typename Interface> long SlotOf(Signature Interface::*function)
+template <typename Function> long SlotOf(Function function)
 {
     struct {
-        std::intptr_t pointer;    // to the function; for a virtual one its offset in the table,
-        std::intptr_t adjustment; // and one of the two is odd to say so
+        std::intptr_t pointer; // to the function; for a virtual one its offset in the table
+        std::intptr_t adjustment;
     } parts;
     static_assert(sizeof(parts) == sizeof(function), "a pointer to member of the Itanium C++ ABI");
     std::memcpy(&parts, &function, sizeof(parts));
 
     const std::intptr_t size = sizeof(void*);
-    if ((parts.pointer & 1) != 0) {
-        return (parts.pointer - 1) / size;
+    if (MarkIsInAdjustment) {
+        return (parts.adjustment & 1) != 0 ? parts.pointer / size : NotVirtual;
     }
-    return (parts.adjustment & 1) != 0 ? parts.pointer / size : NotVirtual;
+    return (parts.pointer & 1) != 0 ? (parts.pointer - 1) / size : NotVirtual;
 }
 
-/** An operation and where it stands. */
+/** What stands in a slot of the virtual table of an object, as a function. */
+template <typename Function> Function TableEntry(const void* object, long slot)
+{
+    const void* const* table = nullptr;
+    std::memcpy(&table, object, sizeof(table));
+    Function function = nullptr;
+    std::memcpy(&function, &table[slot], sizeof(function));
+    return function;
+}
+
+/** Something to pass: a value, or what a reference or a pointer refers to. */
+template <typename Parameter> struct Argument {
+    std::remove_const_t<std::remove_reference_t<Parameter>> value = {};
+    operator Parameter() { return static_cast<Parameter>(value); }
+};
+
+template <typename Value> struct Argument<Value*> {
+    Value value = {};
+    operator Value*() { return &value; }
+};
+
+template <> struct Argument<const void*> {
+    operator const void*() { return nullptr; }
+};
+
+/** Calls the operation of a signature that stands in a slot of an object's table. */
+template <typename Signature> struct TableCall;
+
+template <typename Result, typename... Parameters> struct TableCall<Result(Parameters...)> {
+    CALLS_TABLE_ENTRY static void Call(void* object, long slot)
+    {
+        const auto entry = TableEntry<Result (*)(void*, Parameters...)>(object, slot);
+        static_cast<void>(entry(object, Argument<Parameters>()...));
+    }
+};
+
+template <typename Result, typename... Parameters>
+struct TableCall<Result(Parameters...) const> : TableCall<Result(Parameters...)> {
+};
+
+CALLS_TABLE_ENTRY void CallDestructor(void* object, long slot)
+{
+    TableEntry<void (*)(void*)>(object, slot)(object);
+}
+
+/** An operation, the slot that callers use, and how to call what an object has in a slot. */
 struct Operation {
     std::string name;
     long slot;
+    std::function<void(void* object, long slot)> call;
 };
 
-/** The operations fill the table behind the two slots of the destructor, in this order. */
-void ExpectInThisOrder(const std::vector<Operation>& operations)
+/** @tparam Signature the parameters and the result that the operation must have */
+template <typename Signature, typename Interface>
+Operation Op(const char* name, Signature Interface::*function)
+{
+    return {name, SlotOf(function), TableCall<Signature>::Call};
+}
+
+/**
+ * Callers find the operations behind the two slots of the destructor, in this order, and there
+ * the object has them.
+ *
+ * @param object  implements the interface, and writes what is called into the journal
+ * @param journal has entries such as "name.Operation(arguments)"
+ */
+template <typename Interface>
+void ExpectInThisOrder(Interface& object, bdmvtest::Journal& journal,
+                       const std::vector<Operation>& operations)
 {
     long slot = DestructorSlots;
     for (const Operation& operation : operations) {
         EXPECT_EQ(slot, operation.slot) << operation.name;
+        journal.Take();
+        operation.call(&object, slot);
+        const std::string ran = journal.Take();
+        EXPECT_NE(std::string::npos, ran.find("." + operation.name + "("))
+            << operation.name << ", but slot " << slot << " ran " << ran;
         ++slot;
     }
 }
@@ -68,227 +158,353 @@ template <typename Interface> struct Extended : Interface {
 /** How many operations an interface has besides its destructor. */
 template <typename Interface> long CountOperations()
 {
-    return SlotOf<void()>(&Extended<Interface>::Next) - DestructorSlots;
+    return SlotOf(&Extended<Interface>::Next) - DestructorSlots;
 }
 
 struct NotVirtualAtAll {
     void Plain() {}
 };
 
-} // namespace
-
-TEST(BinaryInterface, OrdinaryMemberFunctionsHaveNoSlot)
+class BinaryInterface : public testing::Test
 {
-    EXPECT_EQ(NotVirtual, SlotOf<void()>(&NotVirtualAtAll::Plain));
+protected:
+    bdmvtest::Journal journal;
+    bdmvtest::RecordingListener listener{journal, "listener"};
+    bdmvtest::ScriptablePlaybackContext context{journal};
+};
+
+class RecordingProgram : public bdmv::IProgramData
+{
+public:
+    explicit RecordingProgram(bdmvtest::Journal& journal) : m_rJournal(journal) {}
+
+    bd::UInt16 GetNumberOfNavigationCommands() const override
+    {
+        m_rJournal.Add("program.GetNumberOfNavigationCommands()");
+        return 0;
+    }
+
+    const bdmv::INavigationCommandData* GetNavigationCommandData(CommandIdDef) const override
+    {
+        m_rJournal.Add("program.GetNavigationCommandData(command)");
+        return nullptr;
+    }
+
+private:
+    bdmvtest::Journal& m_rJournal;
+};
+
+class RecordingCommand : public bdmv::INavigationCommandData
+{
+public:
+    explicit RecordingCommand(bdmvtest::Journal& journal) : m_rJournal(journal) {}
+
+    Command GetCommand() const override
+    {
+        m_rJournal.Add("command.GetCommand()");
+        return CommandNop;
+    }
+
+    void GetOperands(bool&, bd::UInt32&, bool&, bd::UInt32&) const override
+    {
+        m_rJournal.Add("command.GetOperands(operands)");
+    }
+
+private:
+    bdmvtest::Journal& m_rJournal;
+};
+
+class RecordingEvent : public bdmv::INavigatorEvent
+{
+public:
+    explicit RecordingEvent(bdmvtest::Journal& journal) : m_rJournal(journal) {}
+
+    void Dispatch(Listeners&) override { m_rJournal.Add("event.Dispatch(listeners)"); }
+
+private:
+    bdmvtest::Journal& m_rJournal;
+};
+
+/** Counts how often it is destroyed, and how often its memory is given back, which is not its own.
+ */
+template <typename Implementation> struct Doomed : Implementation {
+    using Implementation::Implementation;
+    ~Doomed() override { ++destroyed; }
+    static void operator delete(void*) { ++deleted; }
+
+    static inline int destroyed = 0;
+    static inline int deleted = 0;
+};
+
+/** The table begins with the destructor: the one that only destroys, then the one that deletes. */
+template <typename Interface, typename Implementation, typename... Arguments>
+void ExpectDestructorFirst(const char* name, Arguments&&... arguments)
+{
+    SCOPED_TRACE(name);
+    typedef Doomed<Implementation> Object;
+    Object::destroyed = 0;
+    Object::deleted = 0;
+
+    alignas(Object) unsigned char memory[sizeof(Object)];
+    Interface* object = ::new (memory) Object(arguments...);
+    CallDestructor(object, CompleteDestructorSlot);
+    EXPECT_EQ(1, Object::destroyed);
+    EXPECT_EQ(0, Object::deleted);
+
+    object = ::new (memory) Object(arguments...);
+    CallDestructor(object, DeletingDestructorSlot);
+    EXPECT_EQ(2, Object::destroyed);
+    EXPECT_EQ(1, Object::deleted);
 }
 
-TEST(BinaryInterface, OfControlListener)
+struct Mark : bdmv::IPlayListMark {
+};
+
+} // namespace
+
+TEST_F(BinaryInterface, OrdinaryMemberFunctionsHaveNoSlot)
+{
+    EXPECT_EQ(NotVirtual, SlotOf(&NotVirtualAtAll::Plain));
+}
+
+TEST_F(BinaryInterface, BeginsWithTheDestructor)
+{
+    using bdmvtest::RecordingListener;
+    using bdmvtest::ScriptablePlaybackContext;
+    ExpectDestructorFirst<bdmv::INavControlListener, RecordingListener>("control", journal, "");
+    ExpectDestructorFirst<bdmv::INavSettingsListener, RecordingListener>("settings", journal, "");
+    ExpectDestructorFirst<bdmv::INavButtonListener, RecordingListener>("button", journal, "");
+    ExpectDestructorFirst<bdmv::INavInteractiveListener, RecordingListener>("menu", journal, "");
+    ExpectDestructorFirst<bdmv::INavigatorListener, RecordingListener>("listener", journal, "");
+    ExpectDestructorFirst<bdmv::IPlaybackContext, ScriptablePlaybackContext>("context", journal);
+    ExpectDestructorFirst<bdmv::INavError, ScriptablePlaybackContext>("error", journal);
+    ExpectDestructorFirst<bdmv::IProgramData, RecordingProgram>("program", journal);
+    ExpectDestructorFirst<bdmv::INavigationCommandData, RecordingCommand>("command", journal);
+    ExpectDestructorFirst<bdmv::IPlayListMark, Mark>("mark");
+    ExpectDestructorFirst<bdmv::INavigatorEvent, RecordingEvent>("event", journal);
+}
+
+TEST_F(BinaryInterface, OfControlListener)
 {
     typedef bdmv::INavControlListener I;
-    ExpectInThisOrder({
-        {"PlayStarted", SlotOf<void()>(&I::PlayStarted)},
-        {"FirstPictureDelivered", SlotOf<void()>(&I::FirstPictureDelivered)},
-        {"PlayFailed", SlotOf<void()>(&I::PlayFailed)},
-        {"Paused", SlotOf<void()>(&I::Paused)},
-        {"Continued", SlotOf<void(bd::PlayDirectionDef, bd::PlaySpeedDef)>(&I::Continued)},
-        {"Stepped", SlotOf<void(const bd::TimePosition&, bd::PlayDirectionDef)>(&I::Stepped)},
-        {"TriggerTimeReached",
-         SlotOf<void(bd::TriggerType, const bd::TimePosition&)>(&I::TriggerTimeReached)},
-        {"TriggerSet", SlotOf<void(bd::TriggerType, bool)>(&I::TriggerSet)},
-        {"ZoomModeSet", SlotOf<void(bd::ZOOM_PARAM_Def)>(&I::ZoomModeSet)},
-        {"Stopped", SlotOf<void()>(&I::Stopped)},
-        {"Finished", SlotOf<void(bdmv::INavControlListener::FinishedReason)>(&I::Finished)},
-        {"StillOn", SlotOf<void()>(&I::StillOn)},
-        {"StillOff", SlotOf<void()>(&I::StillOff)},
-        {"Suspended", SlotOf<void()>(&I::Suspended)},
-        {"Resumed", SlotOf<void()>(&I::Resumed)},
-        {"ResumeFailed", SlotOf<void()>(&I::ResumeFailed)},
-        {"SystemSuspended", SlotOf<void(const void*, bd::UInt32)>(&I::SystemSuspended)},
-        {"SystemResumed", SlotOf<void(bool)>(&I::SystemResumed)},
-        {"SystemResumeFailed", SlotOf<void()>(&I::SystemResumeFailed)},
-        {"JumpOccurred", SlotOf<void()>(&I::JumpOccurred)},
-        {"PreloadFailed", SlotOf<void()>(&I::PreloadFailed)},
-    });
+    ExpectInThisOrder<I>(
+        listener, journal,
+        {
+            Op<void()>("PlayStarted", &I::PlayStarted),
+            Op<void()>("FirstPictureDelivered", &I::FirstPictureDelivered),
+            Op<void()>("PlayFailed", &I::PlayFailed),
+            Op<void()>("Paused", &I::Paused),
+            Op<void(bd::PlayDirectionDef, bd::PlaySpeedDef)>("Continued", &I::Continued),
+            Op<void(const bd::TimePosition&, bd::PlayDirectionDef)>("Stepped", &I::Stepped),
+            Op<void(bd::TriggerType, const bd::TimePosition&)>("TriggerTimeReached",
+                                                               &I::TriggerTimeReached),
+            Op<void(bd::TriggerType, bool)>("TriggerSet", &I::TriggerSet),
+            Op<void(bd::ZOOM_PARAM_Def)>("ZoomModeSet", &I::ZoomModeSet),
+            Op<void()>("Stopped", &I::Stopped),
+            Op<void(bdmv::INavControlListener::FinishedReason)>("Finished", &I::Finished),
+            Op<void()>("StillOn", &I::StillOn),
+            Op<void()>("StillOff", &I::StillOff),
+            Op<void()>("Suspended", &I::Suspended),
+            Op<void()>("Resumed", &I::Resumed),
+            Op<void()>("ResumeFailed", &I::ResumeFailed),
+            Op<void(const void*, bd::UInt32)>("SystemSuspended", &I::SystemSuspended),
+            Op<void(bool)>("SystemResumed", &I::SystemResumed),
+            Op<void()>("SystemResumeFailed", &I::SystemResumeFailed),
+            Op<void()>("JumpOccurred", &I::JumpOccurred),
+            Op<void()>("PreloadFailed", &I::PreloadFailed),
+        });
     EXPECT_EQ(21, CountOperations<I>());
 }
 
-TEST(BinaryInterface, OfSettingsListener)
+TEST_F(BinaryInterface, OfSettingsListener)
 {
     typedef bdmv::INavSettingsListener I;
-    ExpectInThisOrder({
-        {"Playlist", SlotOf<void(bd::PlayListIdDef)>(&I::Playlist)},
-        {"PlayItem", SlotOf<void(bd::PlayListIdDef, bd::PlayItemIdDef, bd::VideoFormatType,
-                                 bd::VideoAspectRatioType)>(&I::PlayItem)},
-        {"PlayMode", SlotOf<void(bd::PlayDirectionDef, bd::PlaySpeedDef)>(&I::PlayMode)},
-        {"AudioInfo", SlotOf<void(bd::StreamNumberDef)>(&I::AudioInfo)},
-        {"VideoInfo", SlotOf<void(bd::StreamNumberDef)>(&I::VideoInfo)},
-        {"AngleInfo", SlotOf<void(bd::AngleNumberDef)>(&I::AngleInfo)},
-        {"InteractiveGraphicsInfo", SlotOf<void(bd::StreamNumberDef)>(&I::InteractiveGraphicsInfo)},
-        {"PresentationGraphicsInfo",
-         SlotOf<void(bd::StreamNumberDef, bool)>(&I::PresentationGraphicsInfo)},
-        {"SecondaryAudioInfo", SlotOf<void(bd::StreamNumberDef)>(&I::SecondaryAudioInfo)},
-        {"SecondaryVideoInfo", SlotOf<void(bd::StreamNumberDef)>(&I::SecondaryVideoInfo)},
-        {"PipPgTextStInfo", SlotOf<void(bd::StreamNumberDef, bool)>(&I::PipPgTextStInfo)},
-        {"AudioInfoChanged", SlotOf<void(bool, bd::AudioInfoType)>(&I::AudioInfoChanged)},
-        {"TextSubtitleStyleInfo", SlotOf<void(bd::UserStyleNumber)>(&I::TextSubtitleStyleInfo)},
-        {"TextSubtitleStylesAvailable", SlotOf<void(bd::UInt8)>(&I::TextSubtitleStylesAvailable)},
-        {"UOMask", SlotOf<void(const bdmv::UOMaskTable&)>(&I::UOMask)},
-        {"ChapterNumber", SlotOf<void(const bd::ChapterNumberDef&)>(&I::ChapterNumber)},
-        {"MarkInfo",
-         SlotOf<void(bd::PlayListIdDef, const bd::PlayListMarkIdDef&, const bd::TimePosition&)>(
-             &I::MarkInfo)},
-        {"CurrentTimePosition", SlotOf<void(const bd::TimePosition&)>(&I::CurrentTimePosition)},
-        {"PictureInPictureAvailable", SlotOf<void()>(&I::PictureInPictureAvailable)},
-        {"PictureInPictureUnavailable", SlotOf<void()>(&I::PictureInPictureUnavailable)},
-        {"SecondaryAudioAvailable", SlotOf<void()>(&I::SecondaryAudioAvailable)},
-        {"SecondaryAudioUnavailable", SlotOf<void()>(&I::SecondaryAudioUnavailable)},
-        {"PresentationGraphicsDisplay", SlotOf<void(bool)>(&I::PresentationGraphicsDisplay)},
-        {"SecondaryVideoDisplay",
-         SlotOf<void(bd::StreamNumberDef, bool)>(&I::SecondaryVideoDisplay)},
-        {"SecondaryAudioDisplay",
-         SlotOf<void(bd::StreamNumberDef, bool)>(&I::SecondaryAudioDisplay)},
-        {"PipPgTextSelect", SlotOf<void(bool)>(&I::PipPgTextSelect)},
-    });
+    ExpectInThisOrder<I>(
+        listener, journal,
+        {
+            Op<void(bd::PlayListIdDef)>("Playlist", &I::Playlist),
+            Op<void(bd::PlayListIdDef, bd::PlayItemIdDef, bd::VideoFormatType,
+                    bd::VideoAspectRatioType)>("PlayItem", &I::PlayItem),
+            Op<void(bd::PlayDirectionDef, bd::PlaySpeedDef)>("PlayMode", &I::PlayMode),
+            Op<void(bd::StreamNumberDef)>("AudioInfo", &I::AudioInfo),
+            Op<void(bd::StreamNumberDef)>("VideoInfo", &I::VideoInfo),
+            Op<void(bd::AngleNumberDef)>("AngleInfo", &I::AngleInfo),
+            Op<void(bd::StreamNumberDef)>("InteractiveGraphicsInfo", &I::InteractiveGraphicsInfo),
+            Op<void(bd::StreamNumberDef, bool)>("PresentationGraphicsInfo",
+                                                &I::PresentationGraphicsInfo),
+            Op<void(bd::StreamNumberDef)>("SecondaryAudioInfo", &I::SecondaryAudioInfo),
+            Op<void(bd::StreamNumberDef)>("SecondaryVideoInfo", &I::SecondaryVideoInfo),
+            Op<void(bd::StreamNumberDef, bool)>("PipPgTextStInfo", &I::PipPgTextStInfo),
+            Op<void(bool, bd::AudioInfoType)>("AudioInfoChanged", &I::AudioInfoChanged),
+            Op<void(bd::UserStyleNumber)>("TextSubtitleStyleInfo", &I::TextSubtitleStyleInfo),
+            Op<void(bd::UInt8)>("TextSubtitleStylesAvailable", &I::TextSubtitleStylesAvailable),
+            Op<void(const bdmv::UOMaskTable&)>("UOMask", &I::UOMask),
+            Op<void(const bd::ChapterNumberDef&)>("ChapterNumber", &I::ChapterNumber),
+            Op<void(bd::PlayListIdDef, const bd::PlayListMarkIdDef&, const bd::TimePosition&)>(
+                "MarkInfo", &I::MarkInfo),
+            Op<void(const bd::TimePosition&)>("CurrentTimePosition", &I::CurrentTimePosition),
+            Op<void()>("PictureInPictureAvailable", &I::PictureInPictureAvailable),
+            Op<void()>("PictureInPictureUnavailable", &I::PictureInPictureUnavailable),
+            Op<void()>("SecondaryAudioAvailable", &I::SecondaryAudioAvailable),
+            Op<void()>("SecondaryAudioUnavailable", &I::SecondaryAudioUnavailable),
+            Op<void(bool)>("PresentationGraphicsDisplay", &I::PresentationGraphicsDisplay),
+            Op<void(bd::StreamNumberDef, bool)>("SecondaryVideoDisplay", &I::SecondaryVideoDisplay),
+            Op<void(bd::StreamNumberDef, bool)>("SecondaryAudioDisplay", &I::SecondaryAudioDisplay),
+            Op<void(bool)>("PipPgTextSelect", &I::PipPgTextSelect),
+        });
     EXPECT_EQ(26, CountOperations<I>());
 }
 
-TEST(BinaryInterface, OfButtonListener)
+TEST_F(BinaryInterface, OfButtonListener)
 {
     typedef bdmv::INavButtonListener I;
-    ExpectInThisOrder({
-        {"ExecuteButton", SlotOf<void(bd::UInt32, bd::ButtonId, bd::RefPtr<bdmv::IProgramData>&)>(
-                              &I::ExecuteButton)},
-    });
+    ExpectInThisOrder<I>(listener, journal,
+                         {
+                             Op<void(bd::UInt32, bd::ButtonId, bd::RefPtr<bdmv::IProgramData>&)>(
+                                 "ExecuteButton", &I::ExecuteButton),
+                         });
     EXPECT_EQ(1, CountOperations<I>());
 }
 
-TEST(BinaryInterface, OfInteractiveListener)
+TEST_F(BinaryInterface, OfInteractiveListener)
 {
     typedef bdmv::INavInteractiveListener I;
-    ExpectInThisOrder({
-        {"InteractiveGraphicsVisible", SlotOf<void()>(&I::InteractiveGraphicsVisible)},
-        {"InteractiveGraphicsInvisible", SlotOf<void()>(&I::InteractiveGraphicsInvisible)},
-        {"PopUpMenuAvailable", SlotOf<void()>(&I::PopUpMenuAvailable)},
-        {"PopUpMenuUnavailable", SlotOf<void()>(&I::PopUpMenuUnavailable)},
-        {"ButtonActivationBusy", SlotOf<void()>(&I::ButtonActivationBusy)},
-        {"ButtonActivationDone", SlotOf<void()>(&I::ButtonActivationDone)},
-        {"InteractiveGraphicsActive", SlotOf<void()>(&I::InteractiveGraphicsActive)},
-        {"InteractiveGraphicsInactive", SlotOf<void()>(&I::InteractiveGraphicsInactive)},
-    });
+    ExpectInThisOrder<I>(
+        listener, journal,
+        {
+            Op<void()>("InteractiveGraphicsVisible", &I::InteractiveGraphicsVisible),
+            Op<void()>("InteractiveGraphicsInvisible", &I::InteractiveGraphicsInvisible),
+            Op<void()>("PopUpMenuAvailable", &I::PopUpMenuAvailable),
+            Op<void()>("PopUpMenuUnavailable", &I::PopUpMenuUnavailable),
+            Op<void()>("ButtonActivationBusy", &I::ButtonActivationBusy),
+            Op<void()>("ButtonActivationDone", &I::ButtonActivationDone),
+            Op<void()>("InteractiveGraphicsActive", &I::InteractiveGraphicsActive),
+            Op<void()>("InteractiveGraphicsInactive", &I::InteractiveGraphicsInactive),
+        });
     EXPECT_EQ(8, CountOperations<I>());
 }
 
-TEST(BinaryInterface, OfListenerIsControlSettingsButtonInteractive)
+TEST_F(BinaryInterface, OfListenerIsControlSettingsButtonInteractive)
 {
-    bdmv::NavigatorListenerAdapter adapter;
-    bdmv::INavigatorListener* const listener = &adapter;
-    const char* const start = reinterpret_cast<const char*>(listener);
+    bdmv::INavigatorListener* const all = &listener;
+    const char* const start = reinterpret_cast<const char*>(all);
     const auto offsetOf = [start](const void* base) {
         return static_cast<const char*>(base) - start;
     };
     const std::ptrdiff_t size = sizeof(void*);
 
-    EXPECT_EQ(0 * size, offsetOf(static_cast<bdmv::INavControlListener*>(listener)));
-    EXPECT_EQ(1 * size, offsetOf(static_cast<bdmv::INavSettingsListener*>(listener)));
-    EXPECT_EQ(2 * size, offsetOf(static_cast<bdmv::INavButtonListener*>(listener)));
-    EXPECT_EQ(3 * size, offsetOf(static_cast<bdmv::INavInteractiveListener*>(listener)));
+    EXPECT_EQ(0 * size, offsetOf(static_cast<bdmv::INavControlListener*>(all)));
+    EXPECT_EQ(1 * size, offsetOf(static_cast<bdmv::INavSettingsListener*>(all)));
+    EXPECT_EQ(2 * size, offsetOf(static_cast<bdmv::INavButtonListener*>(all)));
+    EXPECT_EQ(3 * size, offsetOf(static_cast<bdmv::INavInteractiveListener*>(all)));
 }
 
-TEST(BinaryInterface, OfListenerAddsNoOperations)
+TEST_F(BinaryInterface, OfListenerAddsNoOperations)
 {
     EXPECT_EQ(CountOperations<bdmv::INavControlListener>(),
               CountOperations<bdmv::INavigatorListener>());
 }
 
-TEST(BinaryInterface, OfErrorInterfaceHasNoOperations)
+TEST_F(BinaryInterface, OfErrorInterfaceHasNoOperations)
 {
     EXPECT_EQ(0, CountOperations<bdmv::INavError>());
 }
 
-TEST(BinaryInterface, OfPlaybackContext)
+TEST_F(BinaryInterface, OfPlayListMarkHasNoOperations)
+{
+    EXPECT_EQ(0, CountOperations<bdmv::IPlayListMark>());
+}
+
+TEST_F(BinaryInterface, OfPlaybackContext)
 {
     typedef bdmv::IPlaybackContext I;
     typedef void StreamInfo(bd::StreamNumberDef*, bd::UInt8*);
-    ExpectInThisOrder({
-        {"GetSystemResumeData", SlotOf<const bd::DataBlockDef&()>(&I::GetSystemResumeData)},
-        {"CleanupSystemResumeData", SlotOf<void()>(&I::CleanupSystemResumeData)},
-        {"IsPlayingAfterSystemResume", SlotOf<bool()>(&I::IsPlayingAfterSystemResume)},
-        {"GetPlayListId", SlotOf<bd::PlayListIdDef()>(&I::GetPlayListId)},
-        {"GetPlayItemId", SlotOf<bd::PlayItemIdDef()>(&I::GetPlayItemId)},
-        {"GetPlayMode", SlotOf<const bd::PlayMode&()>(&I::GetPlayMode)},
-        {"GetTrigger", SlotOf<bd::Trigger()>(&I::GetTrigger)},
-        {"GetTriggerReachedTime", SlotOf<bd::TimePosition()>(&I::GetTriggerReachedTime)},
-        {"GetCurrentABRepeatState", SlotOf<bd::TriggerType()>(&I::GetCurrentABRepeatState)},
-        {"GetCurrentChpTitleRepeatState",
-         SlotOf<bd::TriggerType()>(&I::GetCurrentChpTitleRepeatState)},
-        {"GetTriggerTypeByTime",
-         SlotOf<bd::TriggerType(bd::TimePosition)>(&I::GetTriggerTypeByTime)},
-        {"GetCurrentChapter", SlotOf<bd::ChapterNumberDef()>(&I::GetCurrentChapter)},
-        {"GetCurrentPLMarkId",
-         SlotOf<bd::PlayListMarkIdDef(bd::TimePosition&)>(&I::GetCurrentPLMarkId)},
-        {"GetVideoInfo", SlotOf<StreamInfo>(&I::GetVideoInfo)},
-        {"GetVideoAttributes",
-         SlotOf<void(bd::VideoFormatType&, bd::VideoAspectRatioType&)>(&I::GetVideoAttributes)},
-        {"GetAudioInfo", SlotOf<StreamInfo>(&I::GetAudioInfo)},
-        {"GetIgInfo", SlotOf<StreamInfo>(&I::GetIgInfo)},
-        {"rGetPgTextStInfo",
-         SlotOf<bdmv::INavError::ErrCode(bd::StreamNumberDef*, bd::UInt8*)>(&I::rGetPgTextStInfo)},
-        {"GetPgTextStInfo", SlotOf<StreamInfo>(&I::GetPgTextStInfo)},
-        {"GetSecondaryVideoInfo",
-         SlotOf<void(bd::StreamNumberDef*, bd::UInt8*, bool*)>(&I::GetSecondaryVideoInfo)},
-        {"GetSecondaryAudioInfo", SlotOf<StreamInfo>(&I::GetSecondaryAudioInfo)},
-        {"GetPipPgTextStInfo", SlotOf<StreamInfo>(&I::GetPipPgTextStInfo)},
-        {"GetAngleInfo", SlotOf<void(bd::AngleNumberDef*, bd::UInt8*)>(&I::GetAngleInfo)},
-        {"GetPgTextStDisplay", SlotOf<bool()>(&I::GetPgTextStDisplay)},
-        {"GetSecondaryVideoDisplay", SlotOf<bool()>(&I::GetSecondaryVideoDisplay)},
-        {"GetSecondaryAudioDisplay", SlotOf<bool()>(&I::GetSecondaryAudioDisplay)},
-        {"GetPipPgTextStSelect", SlotOf<bool()>(&I::GetPipPgTextStSelect)},
-        {"GetUOMask", SlotOf<void(bdmv::UOMaskTable&)>(&I::GetUOMask)},
-        {"GetCurrentPlayMode", SlotOf<const bd::PlayMode&()>(&I::GetCurrentPlayMode)},
-        {"GetCurrentTimePosition", SlotOf<bd::TimePosition()>(&I::GetCurrentTimePosition)},
-        {"GetExecuteButtonData",
-         SlotOf<void(bd::RefPtr<bdmv::IProgramData>&, bd::UInt32&, bd::ButtonId&)>(
-             &I::GetExecuteButtonData)},
-        {"GetCurrentTextSubtitleStyleNumber",
-         SlotOf<bd::UserStyleNumber()>(&I::GetCurrentTextSubtitleStyleNumber)},
-        {"GetNumberOfTextSubtitleStyles", SlotOf<bd::UInt8()>(&I::GetNumberOfTextSubtitleStyles)},
-        {"GetFinishedReason", SlotOf<bdstreaming::FinishedReason()>(&I::GetFinishedReason)},
-        {"GetZoomScaleInfo", SlotOf<void(bd::ZOOM_PARAM_Def&)>(&I::GetZoomScaleInfo)},
-        {"IsAsyncPipInCurrentPlayItem",
-         SlotOf<void(bool&, bool&, bool&, bool&)>(&I::IsAsyncPipInCurrentPlayItem)},
-    });
+    ExpectInThisOrder<I>(
+        context, journal,
+        {
+            Op<const bd::DataBlockDef&()>("GetSystemResumeData", &I::GetSystemResumeData),
+            Op<void()>("CleanupSystemResumeData", &I::CleanupSystemResumeData),
+            Op<bool()>("IsPlayingAfterSystemResume", &I::IsPlayingAfterSystemResume),
+            Op<bd::PlayListIdDef()>("GetPlayListId", &I::GetPlayListId),
+            Op<bd::PlayItemIdDef()>("GetPlayItemId", &I::GetPlayItemId),
+            Op<const bd::PlayMode&()>("GetPlayMode", &I::GetPlayMode),
+            Op<bd::Trigger()>("GetTrigger", &I::GetTrigger),
+            Op<bd::TimePosition()>("GetTriggerReachedTime", &I::GetTriggerReachedTime),
+            Op<bd::TriggerType()>("GetCurrentABRepeatState", &I::GetCurrentABRepeatState),
+            Op<bd::TriggerType()>("GetCurrentChpTitleRepeatState",
+                                  &I::GetCurrentChpTitleRepeatState),
+            Op<bd::TriggerType(bd::TimePosition)>("GetTriggerTypeByTime", &I::GetTriggerTypeByTime),
+            Op<bd::ChapterNumberDef()>("GetCurrentChapter", &I::GetCurrentChapter),
+            Op<bd::PlayListMarkIdDef(bd::TimePosition&)>("GetCurrentPLMarkId",
+                                                         &I::GetCurrentPLMarkId),
+            Op<StreamInfo>("GetVideoInfo", &I::GetVideoInfo),
+            Op<void(bd::VideoFormatType&, bd::VideoAspectRatioType&)>("GetVideoAttributes",
+                                                                      &I::GetVideoAttributes),
+            Op<StreamInfo>("GetAudioInfo", &I::GetAudioInfo),
+            Op<StreamInfo>("GetIgInfo", &I::GetIgInfo),
+            Op<bdmv::INavError::ErrCode(bd::StreamNumberDef*, bd::UInt8*)>("rGetPgTextStInfo",
+                                                                           &I::rGetPgTextStInfo),
+            Op<StreamInfo>("GetPgTextStInfo", &I::GetPgTextStInfo),
+            Op<void(bd::StreamNumberDef*, bd::UInt8*, bool*)>("GetSecondaryVideoInfo",
+                                                              &I::GetSecondaryVideoInfo),
+            Op<StreamInfo>("GetSecondaryAudioInfo", &I::GetSecondaryAudioInfo),
+            Op<StreamInfo>("GetPipPgTextStInfo", &I::GetPipPgTextStInfo),
+            Op<void(bd::AngleNumberDef*, bd::UInt8*)>("GetAngleInfo", &I::GetAngleInfo),
+            Op<bool()>("GetPgTextStDisplay", &I::GetPgTextStDisplay),
+            Op<bool()>("GetSecondaryVideoDisplay", &I::GetSecondaryVideoDisplay),
+            Op<bool()>("GetSecondaryAudioDisplay", &I::GetSecondaryAudioDisplay),
+            Op<bool()>("GetPipPgTextStSelect", &I::GetPipPgTextStSelect),
+            Op<void(bdmv::UOMaskTable&)>("GetUOMask", &I::GetUOMask),
+            Op<const bd::PlayMode&()>("GetCurrentPlayMode", &I::GetCurrentPlayMode),
+            Op<bd::TimePosition()>("GetCurrentTimePosition", &I::GetCurrentTimePosition),
+            Op<void(bd::RefPtr<bdmv::IProgramData>&, bd::UInt32&, bd::ButtonId&)>(
+                "GetExecuteButtonData", &I::GetExecuteButtonData),
+            Op<bd::UserStyleNumber()>("GetCurrentTextSubtitleStyleNumber",
+                                      &I::GetCurrentTextSubtitleStyleNumber),
+            Op<bd::UInt8()>("GetNumberOfTextSubtitleStyles", &I::GetNumberOfTextSubtitleStyles),
+            Op<bdstreaming::FinishedReason()>("GetFinishedReason", &I::GetFinishedReason),
+            Op<void(bd::ZOOM_PARAM_Def&)>("GetZoomScaleInfo", &I::GetZoomScaleInfo),
+            Op<void(bool&, bool&, bool&, bool&)>("IsAsyncPipInCurrentPlayItem",
+                                                 &I::IsAsyncPipInCurrentPlayItem),
+        });
     EXPECT_EQ(36, CountOperations<I>());
 }
 
-TEST(BinaryInterface, OfProgramData)
+TEST_F(BinaryInterface, OfProgramData)
 {
     typedef bdmv::IProgramData I;
-    ExpectInThisOrder({
-        {"GetNumberOfNavigationCommands",
-         SlotOf<bd::UInt16() const>(&I::GetNumberOfNavigationCommands)},
-        {"GetNavigationCommandData",
-         SlotOf<const bdmv::INavigationCommandData*(I::CommandIdDef) const>(
-             &I::GetNavigationCommandData)},
-    });
+    RecordingProgram program(journal);
+    ExpectInThisOrder<I>(program, journal,
+                         {
+                             Op<bd::UInt16() const>("GetNumberOfNavigationCommands",
+                                                    &I::GetNumberOfNavigationCommands),
+                             Op<const bdmv::INavigationCommandData*(I::CommandIdDef) const>(
+                                 "GetNavigationCommandData", &I::GetNavigationCommandData),
+                         });
     EXPECT_EQ(2, CountOperations<I>());
 }
 
-TEST(BinaryInterface, OfNavigationCommandData)
+TEST_F(BinaryInterface, OfNavigationCommandData)
 {
     typedef bdmv::INavigationCommandData I;
-    ExpectInThisOrder({
-        {"GetCommand", SlotOf<I::Command() const>(&I::GetCommand)},
-        {"GetOperands",
-         SlotOf<void(bool&, bd::UInt32&, bool&, bd::UInt32&) const>(&I::GetOperands)},
-    });
+    RecordingCommand command(journal);
+    ExpectInThisOrder<I>(
+        command, journal,
+        {
+            Op<I::Command() const>("GetCommand", &I::GetCommand),
+            Op<void(bool&, bd::UInt32&, bool&, bd::UInt32&) const>("GetOperands", &I::GetOperands),
+        });
     EXPECT_EQ(2, CountOperations<I>());
 }
 
-TEST(BinaryInterface, OfNavigatorEvent)
+TEST_F(BinaryInterface, OfNavigatorEvent)
 {
     typedef bdmv::INavigatorEvent I;
-    ExpectInThisOrder({
-        {"Dispatch", SlotOf<void(bd::EventListenerList<bdmv::INavigatorListener>&)>(&I::Dispatch)},
-    });
+    RecordingEvent event(journal);
+    ExpectInThisOrder<I>(
+        event, journal,
+        {
+            Op<void(bd::EventListenerList<bdmv::INavigatorListener>&)>("Dispatch", &I::Dispatch),
+        });
     EXPECT_EQ(1, CountOperations<I>());
 }
