@@ -7,15 +7,25 @@
 namespace bd
 {
 
+namespace
+{
+
+[[noreturn]] void Throw(int error, const char* what)
+{
+    throw std::system_error(error, std::generic_category(), what);
+}
+
+} // namespace
+
 void ThreadMutex::ThrowHeldAlready()
 {
-    throw std::system_error(std::make_error_code(std::errc::resource_deadlock_would_occur),
-                            "bd::ThreadMutex: the calling thread holds it already");
+    Throw(static_cast<int>(std::errc::resource_deadlock_would_occur),
+          "bd::ThreadMutex: the calling thread holds it already");
 }
 
 void ThreadMutex::ThrowRefused(int error)
 {
-    throw std::system_error(error, std::generic_category(), "bd::ThreadMutex: not acquired");
+    Throw(error, "bd::ThreadMutex: not acquired");
 }
 
 void ThreadMutex::ReportNotHeld()

@@ -20,7 +20,7 @@ template <typename LockType> class Guard
 {
 public:
     /** Acquires @p lock, waiting until it is free. Throws what Acquire() of the lock throws. */
-    explicit Guard(const LockType& lock) : m_rLock(lock), m_Acquired(false) { Acquire(); }
+    explicit Guard(const LockType& lock) : m_rLock(lock), m_Acquired(true) { lock.Acquire(); }
 
     ~Guard() { Release(); }
 
