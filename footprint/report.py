@@ -1,0 +1,140 @@
+#!/usr/bin/env python3
+"""Prints the figures of docs/footprint.md, for scripts/footprint.
+
+    report.py BUILD BUILD_WITHOUT_LOG_LINES
+
+Both are build directories. Fails, after printing, when an event takes more than it may.
+"""
+
+import pathlib
+import re
+import subprocess
+import sys
+
+from elftools.elf.elffile import ELFFile
+
+LIMIT = 200  # bytes of text an event on average, beyond texts and names
+EVENT = re.compile(r"_ZN4bdmv\d+(\w+Event)(8DispatchE|D[02]Ev)")
+TABLE = re.compile(r"_ZT[VI]N4bdmv\d+(\w+Event)E$")
+TYPE_NAME = re.compile(r"_ZTSN4bdmv\d+(\w+Event)E$")
+
+
+class Footprint:
+    """The sizes in a linked library, in bytes."""
+
+    def __init__(self, path):
+        with open(path, "rb") as file:
+            elf = ELFFile(file)
+            sections = {section.name: section["sh_size"] for section in elf.iter_sections()}
+            symbols = {
+                symbol.name: symbol["st_size"]
+                for symbol in elf.get_section_by_name(".symtab").iter_symbols()
+            }
+        self.code_of = by_event(EVENT, symbols)
+        self.tables_of = by_event(TABLE, symbols)
+        self.name_of = by_event(TYPE_NAME, symbols)
+
+        code = sections[".text"]
+        self.events = sum(self.code_of.values())
+        self.firing = sum_of(symbols, "EventListenerList_Fire")
+        self.rest = code - self.events - self.firing
+        self.unwinding = sections[".ARM.extab"] + sections[".ARM.exidx"]
+        self.names = sum_of(symbols, "_ZTS")
+        self.texts = sections[".rodata"] - self.names - sum_of(symbols, "UO_MASK_TABLE_SIZE")
+        self.text = code + self.unwinding + sections[".rodata"]
+        self.beyond_strings = self.text - self.texts - self.names
+        self.data = sections[".data.rel.ro"] + sections.get(".data", 0)
+        self.bss = sections.get(".bss", 0)
+
+
+def sum_of(symbols, part):
+    return sum(size for name, size in symbols.items() if part in name)
+
+
+def by_event(pattern, symbols):
+    totals = {}
+    for name, size in symbols.items():
+        match = pattern.match(name)
+        if match:
+            totals[match[1]] = totals.get(match[1], 0) + size
+    return totals
+
+
+def object_sizes(build, pattern):
+    """Text, data and bss of object files together, as the tool `size` counts them."""
+    paths = [str(path) for path in pathlib.Path(build).glob(pattern)]
+    if not paths:
+        sys.exit(f"there is no {pattern} in {build}")
+    lines = subprocess.run(
+        ["arm-linux-gnueabihf-size", *paths], check=True, capture_output=True, text=True
+    ).stdout.splitlines()[1:]
+    return [sum(int(line.split()[column]) for line in lines) for column in range(3)]
+
+
+def print_row(title, cells):
+    print(f"| {title} | " + " | ".join(str(cell) for cell in cells) + " |")
+
+
+def print_heading(title, columns):
+    print_row(title, columns)
+    print_row("---", ["---:"] * len(columns))
+
+
+def print_program(builds, count):
+    print(f"All {count} events, in bytes:\n")
+    print_heading("the library in a program", ("with log lines", "without"))
+    for title, attribute in (
+        ("text", "text"),
+        ("- code of the events", "events"),
+        ("- code that fires callbacks", "firing"),
+        ("- code of locks, shared pointers, the log, the mask and helpers", "rest"),
+        ("- tables for exceptions", "unwinding"),
+        ("- texts of log lines and assertions", "texts"),
+        ("- names of types", "names"),
+        ("data, which is virtual tables and type information", "data"),
+        ("bss", "bss"),
+    ):
+        print_row(title, [getattr(build, attribute) for build in builds])
+
+    print("\nOne event on average, in bytes:\n")
+    print_heading("the library in a program", ("with log lines", "without"))
+    for title, attribute in (
+        ("text", "text"),
+        ("text beyond texts and names", "beyond_strings"),
+        ("data", "data"),
+    ):
+        print_row(title, [round(getattr(build, attribute) / count) for build in builds])
+
+
+def print_objects(directory, quiet_directory):
+    print("\nObject files before they are linked, in bytes:\n")
+    print_heading("`arm-linux-gnueabihf-size`", ("text", "data", "bss"))
+    library = "CMakeFiles/bdmvnavigator.dir/**/{}.o"
+    print_row("the library", object_sizes(directory, library.format("*")))
+    print_row("the library without log lines", object_sizes(quiet_directory, library.format("*")))
+    print_row("`navigatorevent.cpp`", object_sizes(directory, library.format("navigatorevent.cpp")))
+    for feature in ("rtti", "exceptions"):
+        pattern = f"footprint/CMakeFiles/events_no_{feature}.dir/**/navigatorevent.cpp.o"
+        print_row(f"`navigatorevent.cpp`, `-fno-{feature}`", object_sizes(directory, pattern))
+
+
+def print_events(full, quiet):
+    print("\nEvent by event, in bytes; the code has its destructors in it:\n")
+    print_heading("event", ("code", "without log lines", "name", "tables"))
+    for name in sorted(full.code_of):
+        sizes = (full.code_of, quiet.code_of, full.name_of, full.tables_of)
+        print_row(f"`{name}`", [size[name] for size in sizes])
+
+
+def main():
+    directory, quiet_directory = sys.argv[1:]
+    full, quiet = (Footprint(f"{path}/footprint/footprint") for path in sys.argv[1:])
+    count = len(full.code_of)
+    print_program((full, quiet), count)
+    print_objects(directory, quiet_directory)
+    print_events(full, quiet)
+    if full.beyond_strings > LIMIT * count:
+        sys.exit(f"an event takes more than {LIMIT} bytes of text beyond texts and names")
+
+
+main()
