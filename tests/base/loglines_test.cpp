@@ -1,4 +1,6 @@
-// Compiled with BD_LOG_LINES=0.
+// Lines as they are in a library that is built without them.
+
+#define BD_LOG_LINES 0
 
 #include <gtest/gtest.h>
 
