@@ -1,0 +1,78 @@
+/**
+ * @file
+ * The groups of benchmarks, and the names by which the tables find their rows.
+ */
+#ifndef BENCH_BENCHMARKS_H
+#define BENCH_BENCHMARKS_H
+
+#include <string>
+
+namespace bench
+{
+
+constexpr int ListenerCounts[] = {1, 8, 64, 1024};
+constexpr int ThreadCounts[] = {2, 4};
+
+constexpr char FloorName[] = "floor, by hand";
+constexpr char LibraryName[] = "this library";
+
+constexpr char BoostName[] = "Boost.Signals2";
+constexpr char SigcName[] = "libsigc++, not thread-safe";
+constexpr char LockedSigcName[] = "libsigc++ under a mutex";
+constexpr char QtName[] = "Qt, direct connections";
+
+constexpr char NoArguments[] = "no arguments";
+constexpr char ByReference[] = "a reference";
+constexpr char ByValue[] = "AudioInfoType by value";
+
+constexpr char OneList[] = "one list";
+constexpr char OwnLists[] = "lists of their own";
+
+constexpr char Delivery[] = "its delivery alone, by hand";
+constexpr char DispatchOff[] = "dispatch, line off";
+constexpr char DispatchNull[] = "dispatch, null sink";
+constexpr char DispatchQueue[] = "dispatch, queue";
+constexpr char WholeOff[] = "create, dispatch, delete; line off";
+constexpr char WholeNull[] = "create, dispatch, delete; null sink";
+constexpr char WholeQueue[] = "create, dispatch, delete; queue";
+
+constexpr char LogSwitch[] = "the switch alone";
+constexpr char LogOff[] = "line off";
+constexpr char LogNull[] = "line on, null sink";
+constexpr char LogQueue[] = "line on, queue";
+constexpr char LogVsnprintf[] = "vsnprintf alone";
+constexpr char LogSpdlog[] = "plain spdlog, null sink";
+constexpr char LogSpdlogQueue[] = "plain spdlog, queue";
+
+constexpr char AllocationsCounter[] = "allocations";
+constexpr char WaitedCounter[] = "waited";
+
+void RegisterDelivery();
+void RegisterQtDelivery();
+void RegisterEvents();
+void RegisterThreads();
+void RegisterLogLines();
+
+inline std::string DeliveryRow(const std::string& callback, const std::string& subject, int count)
+{
+    return "delivery/" + callback + "/" + subject + "/" + std::to_string(count);
+}
+
+inline std::string EventRow(const std::string& event, const std::string& what)
+{
+    return "event/" + event + "/" + what;
+}
+
+inline std::string ThreadRow(const std::string& lists, const std::string& subject, int threads)
+{
+    return "threads/" + lists + "/" + subject + "/" + std::to_string(threads);
+}
+
+inline std::string LogRow(const std::string& what)
+{
+    return "log/" + what;
+}
+
+} // namespace bench
+
+#endif

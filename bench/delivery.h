@@ -1,0 +1,49 @@
+/**
+ * @file
+ * The rows of the delivery table, the same for every subject.
+ */
+#ifndef BENCH_DELIVERY_H
+#define BENCH_DELIVERY_H
+
+#include <memory>
+#include <string>
+
+#include <benchmark/benchmark.h>
+
+#include "benchmarks.h"
+#include "listener.h"
+
+namespace bench
+{
+
+/**
+ * Registers three callbacks to each number of listeners.
+ *
+ * The subjects are made here, before anything runs: the heap is still in one piece, so that what
+ * they allocate lies in order.
+ */
+template <typename Subject> void RegisterDelivery(const std::string& name)
+{
+    for (const int count : ListenerCounts) {
+        const auto subject = std::make_shared<Subject>();
+        for (int i = 0; i < count; ++i) {
+            subject->Add(Listeners()[i]);
+        }
+        const auto row = [&](const std::string& callback, auto deliver) {
+            const std::string rowName = DeliveryRow(callback, name, count);
+            benchmark::RegisterBenchmark(rowName.c_str(),
+                                         [subject, deliver](benchmark::State& state) {
+                                             for (auto _ : state) {
+                                                 deliver(*subject);
+                                             }
+                                         });
+        };
+        row(NoArguments, [](Subject& s) { s.PlayStarted(); });
+        row(ByReference, [](Subject& s) { s.CurrentTimePosition(Position); });
+        row(ByValue, [](Subject& s) { s.AudioInfoChanged(true, AudioInfo); });
+    }
+}
+
+} // namespace bench
+
+#endif

@@ -1,0 +1,132 @@
+// Whole events to one listener, where what an event adds to its delivery weighs most.
+
+#include <memory>
+#include <optional>
+#include <string>
+
+#include <benchmark/benchmark.h>
+
+#include "bdmvnavigator/navigatorevent.h"
+#include "benchmarks.h"
+#include "context.h"
+#include "logging.h"
+#include "support/allocationcounter.h"
+
+namespace bench
+{
+
+namespace
+{
+
+using List = bdmv::INavigatorEvent::Listeners;
+
+struct Stage {
+    Stage() { listeners.AddListener(&Listeners()[0]); }
+
+    Context context;
+    List listeners;
+};
+
+Stage& TheStage()
+{
+    static Stage stage;
+    return stage;
+}
+
+template <typename Event>
+void Whole(benchmark::State& state, std::optional<std::size_t> logQueueLines)
+{
+    std::optional<LoggingOn> logging;
+    if (logQueueLines) {
+        logging.emplace(*logQueueLines);
+    }
+    Stage& stage = TheStage();
+    for (auto _ : state) {
+        bdmv::INavigatorEvent* event = new Event(stage.context);
+        benchmark::DoNotOptimize(event);
+        event->Dispatch(stage.listeners);
+        delete event;
+    }
+}
+
+template <typename Event>
+void Dispatch(benchmark::State& state, std::optional<std::size_t> logQueueLines)
+{
+    std::optional<LoggingOn> logging;
+    if (logQueueLines) {
+        logging.emplace(*logQueueLines);
+    }
+    Stage& stage = TheStage();
+    const std::unique_ptr<bdmv::INavigatorEvent> made(new Event(stage.context));
+    bdmv::INavigatorEvent* event = made.get();
+    const std::size_t before = bdmvtest::CountAllocations();
+    for (auto _ : state) {
+        benchmark::DoNotOptimize(event);
+        event->Dispatch(stage.listeners);
+    }
+    // Not an average: one allocation in a million dispatches is one too many.
+    state.counters[AllocationsCounter] =
+        static_cast<double>(bdmvtest::CountAllocations() - before);
+}
+
+/** Registers the rows of an event; @p deliver is its work without a log line, by hand. */
+template <typename Event>
+void RegisterEvent(const std::string& name, void (*deliver)(bdmv::IPlaybackContext&, List&))
+{
+    const auto row = [&](const std::string& what, auto function) {
+        benchmark::RegisterBenchmark(EventRow(name, what).c_str(), function);
+    };
+    row(Delivery, [deliver](benchmark::State& state) {
+        Stage& stage = TheStage();
+        for (auto _ : state) {
+            deliver(stage.context, stage.listeners);
+        }
+    });
+    row(DispatchOff, [](benchmark::State& state) { Dispatch<Event>(state, std::nullopt); });
+    row(DispatchNull, [](benchmark::State& state) { Dispatch<Event>(state, 0); });
+    row(DispatchQueue, [](benchmark::State& state) { Dispatch<Event>(state, QueueLines); });
+    row(WholeOff, [](benchmark::State& state) { Whole<Event>(state, std::nullopt); });
+    row(WholeNull, [](benchmark::State& state) { Whole<Event>(state, 0); });
+    row(WholeQueue, [](benchmark::State& state) { Whole<Event>(state, QueueLines); });
+}
+
+void DeliverPlayStarted(bdmv::IPlaybackContext& /*context*/, List& listeners)
+{
+    bd::EventListenerList_FireParam0(listeners, &bdmv::INavigatorListener::PlayStarted);
+}
+
+void DeliverCurrentTimePosition(bdmv::IPlaybackContext& context, List& listeners)
+{
+    const bd::TimePosition position = context.GetCurrentTimePosition();
+    bd::EventListenerList_FireParam1(listeners, &bdmv::INavigatorListener::CurrentTimePosition,
+                                     position);
+}
+
+void DeliverPlayItem(bdmv::IPlaybackContext& context, List& listeners)
+{
+    const bd::PlayListIdDef playListId = context.GetPlayListId();
+    const bd::PlayItemIdDef playItemId = context.GetPlayItemId();
+    bd::VideoFormatType videoFormat = bd::VideoFormatTypeNoInfo;
+    bd::VideoAspectRatioType aspectRatio = bd::VideoAspectRatioTypeNoInfo;
+    context.GetVideoAttributes(videoFormat, aspectRatio);
+    bd::EventListenerList_FireParam4(listeners, &bdmv::INavigatorListener::PlayItem, playListId,
+                                     playItemId, videoFormat, aspectRatio);
+    bool secondaryVideo = false;
+    bool secondaryAudio = false;
+    bool previousVideo = false;
+    bool previousAudio = false;
+    context.IsAsyncPipInCurrentPlayItem(secondaryVideo, secondaryAudio, previousVideo,
+                                        previousAudio);
+}
+
+} // namespace
+
+void RegisterEvents()
+{
+    RegisterEvent<bdmv::PlayStartedEvent>("PlayStartedEvent", DeliverPlayStarted);
+    RegisterEvent<bdmv::CurrentTimePositionEvent>("CurrentTimePositionEvent",
+                                                  DeliverCurrentTimePosition);
+    RegisterEvent<bdmv::PlayItemEvent>("PlayItemEvent", DeliverPlayItem);
+}
+
+} // namespace bench

@@ -1,0 +1,72 @@
+// Counts instructions: runs each piece of work a thousand times while callgrind collects, and has it
+// write the count under the name of the work. scripts/instructions reads them.
+
+#include <cstdio>
+
+#include <valgrind/callgrind.h>
+
+#include "bdmvnavigator/navigatorevent.h"
+#include "benchmarks.h"
+#include "context.h"
+#include "kevro_linux.h"
+#include "subjects.h"
+
+namespace
+{
+
+constexpr int Rounds = 1000;
+
+/** The first rounds resolve symbols and fill the caches of the heap; they are not counted. */
+template <typename Work> void Count(const char* name, Work work)
+{
+    for (int round = 0; round < Rounds; ++round) {
+        work();
+    }
+    CALLGRIND_TOGGLE_COLLECT;
+    for (int round = 0; round < Rounds; ++round) {
+        work();
+    }
+    CALLGRIND_TOGGLE_COLLECT;
+    CALLGRIND_DUMP_STATS_AT(name);
+}
+
+template <typename Subject> void CountDelivery(const char* toOne, const char* toEight)
+{
+    Subject subject;
+    int added = 0;
+    for (const auto& [count, name] : {std::pair{1, toOne}, std::pair{8, toEight}}) {
+        for (; added < count; ++added) {
+            subject.Add(bench::Listeners()[added]);
+        }
+        Count(name, [&] { subject.PlayStarted(); });
+    }
+}
+
+template <typename Event> void CountEvent(const char* name)
+{
+    bench::Context context;
+    bdmv::INavigatorEvent::Listeners listeners;
+    listeners.AddListener(&bench::Listeners()[0]);
+    Count(name, [&] {
+        bdmv::INavigatorEvent* const event = new Event(context);
+        event->Dispatch(listeners);
+        delete event;
+    });
+}
+
+} // namespace
+
+int main()
+{
+    if (RUNNING_ON_VALGRIND == 0) {
+        std::fputs("instructions: to be run by callgrind, see scripts/instructions\n", stderr);
+        return 2;
+    }
+    KEVRO_Log_Configure("", nullptr, 0);
+    CountDelivery<bench::Floor>("floor/1", "floor/8");
+    CountDelivery<bench::Library>("delivery/1", "delivery/8");
+    CountEvent<bdmv::PlayStartedEvent>("PlayStartedEvent");
+    CountEvent<bdmv::CurrentTimePositionEvent>("CurrentTimePositionEvent");
+    CountEvent<bdmv::PlayItemEvent>("PlayItemEvent");
+    return 0;
+}

@@ -1,0 +1,82 @@
+// Several threads that fire at once, each at eight listeners.
+
+#include <array>
+#include <chrono>
+#include <fstream>
+#include <memory>
+#include <string>
+
+#include <benchmark/benchmark.h>
+
+#include "benchmarks.h"
+#include "subjects.h"
+
+namespace bench
+{
+
+namespace
+{
+
+constexpr std::size_t ListenersEach = 8;
+constexpr std::size_t MostThreads = 4;
+
+/** A subject with its listeners, apart from others in the processors' caches. */
+template <typename Subject> struct alignas(128) Party {
+    Party()
+    {
+        for (CountingListener& listener : listeners) {
+            subject.Add(listener);
+        }
+    }
+
+    std::array<CountingListener, ListenersEach> listeners;
+    Subject subject;
+};
+
+/** How long the calling thread has been ready to run while no processor took it, in seconds. */
+double SecondsWaited()
+{
+    std::ifstream file("/proc/thread-self/schedstat");
+    double running = 0;
+    double waiting = 0;
+    file >> running >> waiting;
+    return waiting / 1e9;
+}
+
+template <typename Subject> void RegisterThreads(const std::string& name)
+{
+    using Parties = std::array<Party<Subject>, MostThreads>;
+    const auto parties = std::make_shared<Parties>();
+    for (const int threads : ThreadCounts) {
+        for (const bool own : {false, true}) {
+            const auto fire = [parties, own](benchmark::State& state) {
+                Subject& subject =
+                    (*parties)[own ? static_cast<std::size_t>(state.thread_index()) : 0].subject;
+                const double waited = SecondsWaited();
+                const auto begun = std::chrono::steady_clock::now();
+                for (auto _ : state) {
+                    subject.PlayStarted();
+                }
+                const std::chrono::duration<double> passed =
+                    std::chrono::steady_clock::now() - begun;
+                state.counters[WaitedCounter] =
+                    benchmark::Counter((SecondsWaited() - waited) / passed.count(),
+                                       benchmark::Counter::kAvgThreads);
+            };
+            benchmark::RegisterBenchmark(
+                ThreadRow(own ? OwnLists : OneList, name, threads).c_str(), fire)
+                ->Threads(threads)
+                ->UseRealTime();
+        }
+    }
+}
+
+} // namespace
+
+void RegisterThreads()
+{
+    RegisterThreads<Floor>(FloorName);
+    RegisterThreads<Library>(LibraryName);
+}
+
+} // namespace bench
