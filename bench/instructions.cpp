@@ -2,6 +2,7 @@
 // write the count under the name of the work. scripts/instructions reads them.
 
 #include <cstdio>
+#include <utility>
 
 #include <valgrind/callgrind.h>
 
@@ -9,6 +10,7 @@
 #include "benchmarks.h"
 #include "context.h"
 #include "kevro_linux.h"
+#include "parkedthread.h"
 #include "subjects.h"
 
 namespace
@@ -62,6 +64,7 @@ int main()
         std::fputs("instructions: to be run by callgrind, see scripts/instructions\n", stderr);
         return 2;
     }
+    const bench::ParkedThread parked;
     KEVRO_Log_Configure("", nullptr, 0);
     CountDelivery<bench::Floor>("floor/1", "floor/8");
     CountDelivery<bench::Library>("delivery/1", "delivery/8");
