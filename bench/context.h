@@ -15,7 +15,8 @@ namespace bench
 class Context final : public bdmv::IPlaybackContext
 {
 public:
-    // What is asked. The bodies stand in a source of their own, so that no caller sees through them.
+    // What is asked. The bodies stand in a source of their own, so that no caller sees through
+    // them.
     bd::PlayListIdDef GetPlayListId() override;
     bd::PlayItemIdDef GetPlayItemId() override;
     bd::TimePosition GetCurrentTimePosition() override;

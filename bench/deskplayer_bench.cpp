@@ -7,10 +7,10 @@
 
 #include <benchmark/benchmark.h>
 
+#include <cmath>
 #include <cstdint>
 #include <cstdio>
-#include <map>
-#include <memory>
+#include <string>
 #include <vector>
 
 #include "bdmvnavigator/navigatorlisteneradapter.h"
@@ -18,6 +18,7 @@
 #include "navigator/eventdelivery.h"
 #include "navigator/simulatednavigator.h"
 #include "navigator/virtualclock.h"
+#include "report.h"
 #include "session/session.h"
 
 namespace
@@ -53,17 +54,18 @@ public:
     std::uint64_t count = 0;
 };
 
-void PlaySession(benchmark::State& state)
+constexpr char EventsCounter[] = "events/s";
+
+void PlaySession(benchmark::State& state, int minutes, int listeners)
 {
-    const auto minutes = static_cast<std::uint32_t>(state.range(0));
-    const auto listeners = static_cast<std::size_t>(state.range(1));
     std::uint64_t events = 0;
     for (auto _ : state) {
-        std::vector<CountingListener> counting(listeners);
+        std::vector<CountingListener> counting(static_cast<std::size_t>(listeners));
         deskplayer::VirtualClock clock;
         deskplayer::ResumeDataKeeper keeper;
         deskplayer::EventDelivery delivery;
-        deskplayer::SimulatedNavigator navigator(PlayListOf(minutes), clock, delivery);
+        deskplayer::SimulatedNavigator navigator(PlayListOf(static_cast<std::uint32_t>(minutes)),
+                                                 clock, delivery);
         for (CountingListener& listener : counting) {
             delivery.Listeners().AddListener(&listener);
         }
@@ -71,56 +73,56 @@ void PlaySession(benchmark::State& state)
         deskplayer::PlayFromStartToEnd(desk, clock, {});
         events += counting.front().count;
     }
-    state.counters["events/s"] =
+    state.counters[EventsCounter] =
         benchmark::Counter(static_cast<double>(events), benchmark::Counter::kIsRate);
 }
 
-BENCHMARK(PlaySession)
-    ->ArgNames({"minutes", "listeners"})
-    ->Args({30, 1})
-    ->Args({60, 1})
-    ->Args({120, 1})
-    ->Args({240, 1})
-    ->Args({120, 8})
-    ->Args({120, 64})
-    ->Args({120, 1024})
-    ->UseRealTime()
-    ->Unit(benchmark::kMillisecond);
+struct Session {
+    int minutes;
+    int listeners;
 
-/** Prints, after the table, each session beside the two hours with one listener. */
-class RatioReporter : public benchmark::ConsoleReporter
-{
-public:
-    void ReportRuns(const std::vector<Run>& runs) override
+    std::string Row() const
     {
-        ConsoleReporter::ReportRuns(runs);
-        for (const Run& run : runs) {
-            if (run.run_type == Run::RT_Iteration) {
-                m_Times[run.run_name.args] = run.GetAdjustedRealTime();
-            }
-        }
+        return "session/" + std::to_string(minutes) + "/" + std::to_string(listeners);
     }
-
-    void Finalize() override
-    {
-        const double twoHours = m_Times["minutes:120/listeners:1"];
-        std::printf("\nBeside two hours with one listener:\n");
-        for (const auto& [session, time] : m_Times) {
-            std::printf("  %-32s %7.2f times\n", session.c_str(), time / twoHours);
-        }
-    }
-
-private:
-    std::map<std::string, double> m_Times;
 };
+
+constexpr Session TwoHours = {120, 1};
+constexpr Session Sessions[] = {{30, 1},  {60, 1},   TwoHours,   {240, 1},
+                                {120, 8}, {120, 64}, {120, 1024}};
+
+void PrintTable(const bench::Report& report)
+{
+    std::printf("\nSessions of the desk player, and times two hours with one listener\n"
+                "  %10s%12s%12s%12s%9s\n",
+                "minutes", "listeners", "ms", "events/s", "times");
+    const double twoHours = report[TwoHours.Row()].wall;
+    for (const Session& session : Sessions) {
+        const bench::Row row = report[session.Row()];
+        const auto events = row.counters.find(EventsCounter);
+        std::printf("  %10d%12d", session.minutes, session.listeners);
+        bench::PrintNumber(12, 1, row.wall);
+        bench::PrintNumber(12, 0, events == row.counters.end() ? std::nan("") : events->second);
+        bench::PrintNumber(9, 2, row.wall / twoHours);
+        std::printf("\n");
+    }
+}
 
 } // namespace
 
 int main(int argc, char** argv)
 {
     KEVRO_Log_Configure("", nullptr, 0);
-    benchmark::Initialize(&argc, argv);
-    RatioReporter reporter;
-    benchmark::RunSpecifiedBenchmarks(&reporter);
+    for (const Session& session : Sessions) {
+        benchmark::RegisterBenchmark(session.Row().c_str(), PlaySession, session.minutes,
+                                     session.listeners)
+            ->UseRealTime()
+            ->Unit(benchmark::kMillisecond);
+    }
+    bench::Report report;
+    if (!bench::RunBenchmarks(report, argc, argv)) {
+        return 2;
+    }
+    PrintTable(report);
     return 0;
 }

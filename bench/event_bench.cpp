@@ -65,8 +65,7 @@ void Dispatch(benchmark::State& state, std::optional<std::size_t> logQueueLines)
         event->Dispatch(stage.listeners);
     }
     // Not an average: one allocation in a million dispatches is one too many.
-    state.counters[AllocationsCounter] =
-        static_cast<double>(bdmvtest::CountAllocations() - before);
+    state.counters[AllocationsCounter] = static_cast<double>(bdmvtest::CountAllocations() - before);
 }
 
 /** Registers the rows of an event; @p deliver is its work without a log line, by hand. */

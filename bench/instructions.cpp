@@ -1,5 +1,5 @@
-// Counts instructions: runs each piece of work a thousand times while callgrind collects, and has it
-// write the count under the name of the work. scripts/instructions reads them.
+// Counts instructions: runs each piece of work a thousand times while callgrind collects, and has
+// it write the count under the name of the work. scripts/instructions reads them.
 
 #include <cstdio>
 #include <utility>

@@ -13,8 +13,8 @@ namespace bench
 {
 
 /**
- * Counts its callbacks, the least that a listener can do. The bodies stand in a source of their own,
- * so that no caller sees through them.
+ * Counts its callbacks, the least that a listener can do. The bodies stand in a source of their
+ * own, so that no caller sees through them.
  */
 class CountingListener final : public bdmv::NavigatorListenerAdapter
 {

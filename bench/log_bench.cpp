@@ -31,7 +31,8 @@ struct Values {
 
 void WriteLine(const Values& values)
 {
-    BD_LOG(Tag, "Sending PlayItem - playListId: %lu, playItemId: %u, videoFormat %d, aspectRatio %d",
+    BD_LOG(Tag,
+           "Sending PlayItem - playListId: %lu, playItemId: %u, videoFormat %d, aspectRatio %d",
            values.playListId, values.playItemId, values.videoFormat, values.aspectRatio);
 }
 

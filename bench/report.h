@@ -1,6 +1,6 @@
 /**
  * @file
- * Collects what was measured and prints it as tables, with ratios and goals.
+ * Runs the benchmarks of a program and collects what they measured.
  */
 #ifndef BENCH_REPORT_H
 #define BENCH_REPORT_H
@@ -14,10 +14,13 @@
 namespace bench
 {
 
-/** The medians of a row over its repetitions; not a number for what was not measured. */
+/**
+ * The medians of a row over its repetitions, for one iteration and in the unit of the row. Not a
+ * number for what was not measured.
+ */
 struct Row {
-    double cpu;  ///< nanoseconds of the processor for each iteration of the calling thread
-    double wall; ///< nanoseconds passed for each iteration of all threads
+    double cpu;  ///< of the processor for the calling thread
+    double wall; ///< passed; with several threads, divided by their number
     std::map<std::string, double> counters;
 };
 
@@ -34,8 +37,16 @@ private:
     std::map<std::string, std::vector<Run>> m_Runs;
 };
 
-/** Prints all tables, then which goals are met. */
-void PrintTables(const Report& report);
+/**
+ * Runs everything registered: 15 repetitions of each row, those of all rows in random order.
+ *
+ * @param argc, argv arguments of Google Benchmark, which overrule these defaults
+ * @return false, and a message on standard error, when an argument is unknown
+ */
+bool RunBenchmarks(Report& report, int argc, char** argv);
+
+/** Prints a number that may be none. */
+void PrintNumber(int width, int decimals, double value);
 
 } // namespace bench
 

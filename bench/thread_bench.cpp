@@ -59,12 +59,11 @@ template <typename Subject> void RegisterThreads(const std::string& name)
                 }
                 const std::chrono::duration<double> passed =
                     std::chrono::steady_clock::now() - begun;
-                state.counters[WaitedCounter] =
-                    benchmark::Counter((SecondsWaited() - waited) / passed.count(),
-                                       benchmark::Counter::kAvgThreads);
+                state.counters[WaitedCounter] = benchmark::Counter(
+                    (SecondsWaited() - waited) / passed.count(), benchmark::Counter::kAvgThreads);
             };
-            benchmark::RegisterBenchmark(
-                ThreadRow(own ? OwnLists : OneList, name, threads).c_str(), fire)
+            benchmark::RegisterBenchmark(ThreadRow(own ? OwnLists : OneList, name, threads).c_str(),
+                                         fire)
                 ->Threads(threads)
                 ->UseRealTime();
         }

@@ -1,0 +1,184 @@
+#include "tables.h"
+
+#include <algorithm>
+#include <cmath>
+#include <cstdio>
+#include <string>
+#include <vector>
+
+#include "benchmarks.h"
+
+namespace bench
+{
+
+namespace
+{
+
+constexpr const char* Events[] = {"PlayStartedEvent", "CurrentTimePositionEvent", "PlayItemEvent"};
+
+/** A limit, and what was measured against it. */
+class Goal
+{
+public:
+    Goal(const char* text, double limit) : m_Text(text), m_Limit(limit) {}
+
+    /** Takes a value; one that was not measured is not a number and does not count. */
+    void Judge(const std::string& where, double value)
+    {
+        if (std::isnan(value)) {
+            return;
+        }
+        ++m_Judged;
+        m_Worst = std::max(m_Worst, value);
+        if (value > m_Limit) {
+            char text[16];
+            std::snprintf(text, sizeof(text), "%.2f", value);
+            m_Missed.push_back(where + ": " + text);
+        }
+    }
+
+    void Print() const
+    {
+        if (m_Judged == 0) {
+            std::printf("  not measured  %s\n", m_Text);
+            return;
+        }
+        std::printf("  %-12s  %s (%zu of %zu within %.2f, worst %.2f)\n",
+                    m_Missed.empty() ? "met" : "MISSED", m_Text, m_Judged - m_Missed.size(),
+                    m_Judged, m_Limit, m_Worst);
+        for (const std::string& missed : m_Missed) {
+            std::printf("  %14s%s\n", "", missed.c_str());
+        }
+    }
+
+private:
+    const char* m_Text;
+    double m_Limit;
+    double m_Worst = 0;
+    std::size_t m_Judged = 0;
+    std::vector<std::string> m_Missed;
+};
+
+/** A time, and how many times another it is. */
+void PrintTime(double time, double other)
+{
+    PrintNumber(11, 1, time);
+    PrintNumber(7, 2, time / other);
+}
+
+void PrintDelivery(const Report& report, Goal& goal)
+{
+    for (const char* const callback : {NoArguments, ByReference, ByValue}) {
+        std::printf("\nDelivery with %s, ns and times the floor\n  %-28s", callback, "listeners");
+        for (const int count : ListenerCounts) {
+            std::printf("%11d%7s", count, "");
+        }
+        std::printf("\n");
+        for (const char* const subject :
+             {FloorName, LibraryName, BoostName, SigcName, LockedSigcName, QtName}) {
+            std::printf("  %-28s", subject);
+            for (const int count : ListenerCounts) {
+                const double floor = report[DeliveryRow(callback, FloorName, count)].cpu;
+                const double time = report[DeliveryRow(callback, subject, count)].cpu;
+                PrintTime(time, floor);
+                if (subject == LibraryName) {
+                    goal.Judge(std::string(callback) + " to " + std::to_string(count),
+                               time / floor);
+                }
+            }
+            std::printf("\n");
+        }
+    }
+}
+
+void PrintEvents(const Report& report, Goal& allocations, Goal& lineOff)
+{
+    const double logSwitch = report[LogRow(LogSwitch)].cpu;
+    std::printf("\nEvents to one listener, ns and times the delivery alone and one call of the "
+                "switch\n  %-38s",
+                "");
+    for (const char* const event : Events) {
+        std::printf("%25s", event);
+    }
+    std::printf("\n");
+    for (const char* const what :
+         {Delivery, DispatchOff, DispatchNull, DispatchQueue, WholeOff, WholeNull, WholeQueue}) {
+        std::printf("  %-38s       ", what);
+        for (const char* const event : Events) {
+            const Row row = report[EventRow(event, what)];
+            const double alone = report[EventRow(event, Delivery)].cpu + logSwitch;
+            PrintTime(row.cpu, alone);
+            std::printf("%7s", "");
+            if (what == DispatchOff) {
+                lineOff.Judge(event, row.cpu / alone);
+            }
+            if (row.counters.count(AllocationsCounter) != 0) {
+                allocations.Judge(std::string(event) + ", " + what,
+                                  row.counters.at(AllocationsCounter));
+            }
+        }
+        std::printf("\n");
+    }
+}
+
+void PrintThreads(const Report& report)
+{
+    std::printf("\nThreads that fire at eight listeners each: ns of one delivery as its thread "
+                "sees it, times the floor,\nhow much of the time a thread ran, and how much it "
+                "waited for a processor\n");
+    for (const char* const lists : {OneList, OwnLists}) {
+        for (const int threads : ThreadCounts) {
+            for (const char* const subject : {FloorName, LibraryName}) {
+                const Row row = report[ThreadRow(lists, subject, threads)];
+                const double floor = report[ThreadRow(lists, FloorName, threads)].wall;
+                std::printf("  %d threads, %-20s %-16s", threads, lists, subject);
+                PrintTime(row.wall * threads, floor * threads);
+                const auto waited = row.counters.find(WaitedCounter);
+                PrintNumber(9, 0, 100 * row.cpu / (row.wall * threads));
+                std::printf(" %%");
+                PrintNumber(9, 0,
+                            waited == row.counters.end() ? std::nan("") : 100 * waited->second);
+                std::printf(" %%\n");
+            }
+        }
+    }
+}
+
+void PrintLog(const Report& report, Goal& queued)
+{
+    std::printf("\nA log line: ns of the caller's processor, times vsnprintf alone, ns passed\n");
+    const double formatting = report[LogRow(LogVsnprintf)].cpu;
+    for (const char* const what :
+         {LogSwitch, LogOff, LogVsnprintf, LogNull, LogQueue, LogSpdlog, LogSpdlogQueue}) {
+        const Row row = report[LogRow(what)];
+        std::printf("  %-28s", what);
+        PrintTime(row.cpu, formatting);
+        PrintNumber(11, 1, row.wall);
+        std::printf("\n");
+        if (what == LogQueue) {
+            queued.Judge(what, row.cpu / formatting);
+        }
+    }
+}
+
+} // namespace
+
+void PrintTables(const Report& report)
+{
+    Goal delivery("delivery, times the floor", 1.10);
+    Goal allocations("allocations between Dispatch() and its return", 0);
+    Goal lineOff("an event with its line off, times its delivery and one call of the switch", 1.15);
+    Goal queued("a line into the queue, times vsnprintf alone", 1.5);
+
+    PrintDelivery(report, delivery);
+    PrintEvents(report, allocations, lineOff);
+    PrintThreads(report);
+    PrintLog(report, queued);
+
+    std::printf("\nGoals\n");
+    for (const Goal* goal : {&delivery, &allocations, &lineOff, &queued}) {
+        goal->Print();
+    }
+}
+
+} // namespace bench
