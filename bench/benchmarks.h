@@ -39,10 +39,12 @@ constexpr char WholeQueue[] = "create, dispatch, delete; queue";
 constexpr char LogSwitch[] = "the switch alone";
 constexpr char LogOff[] = "line off";
 constexpr char LogNull[] = "line on, null sink";
-constexpr char LogQueue[] = "line on, queue";
+constexpr char LogQueue[] = "line on, queue, slow sink";
+constexpr char LogQueueNull[] = "line on, queue, null sink";
 constexpr char LogVsnprintf[] = "vsnprintf alone";
 constexpr char LogSpdlog[] = "plain spdlog, null sink";
-constexpr char LogSpdlogQueue[] = "plain spdlog, queue";
+constexpr char LogSpdlogQueue[] = "plain spdlog, queue, slow sink";
+constexpr char LogSpdlogQueueNull[] = "plain spdlog, queue, null sink";
 
 constexpr char AllocationsCounter[] = "allocations";
 constexpr char WaitedCounter[] = "waited";

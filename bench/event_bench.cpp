@@ -1,7 +1,7 @@
 // Whole events to one listener, where what an event adds to its delivery weighs most.
 
+#include <chrono>
 #include <memory>
-#include <optional>
 #include <string>
 
 #include <benchmark/benchmark.h>
@@ -33,13 +33,8 @@ Stage& TheStage()
     return stage;
 }
 
-template <typename Event>
-void Whole(benchmark::State& state, std::optional<std::size_t> logQueueLines)
+template <typename Event> void Whole(benchmark::State& state)
 {
-    std::optional<LoggingOn> logging;
-    if (logQueueLines) {
-        logging.emplace(*logQueueLines);
-    }
     Stage& stage = TheStage();
     for (auto _ : state) {
         bdmv::INavigatorEvent* event = new Event(stage.context);
@@ -49,13 +44,8 @@ void Whole(benchmark::State& state, std::optional<std::size_t> logQueueLines)
     }
 }
 
-template <typename Event>
-void Dispatch(benchmark::State& state, std::optional<std::size_t> logQueueLines)
+template <typename Event> void Dispatch(benchmark::State& state)
 {
-    std::optional<LoggingOn> logging;
-    if (logQueueLines) {
-        logging.emplace(*logQueueLines);
-    }
     Stage& stage = TheStage();
     const std::unique_ptr<bdmv::INavigatorEvent> made(new Event(stage.context));
     bdmv::INavigatorEvent* event = made.get();
@@ -66,6 +56,15 @@ void Dispatch(benchmark::State& state, std::optional<std::size_t> logQueueLines)
     }
     // Not an average: one allocation in a million dispatches is one too many.
     state.counters[AllocationsCounter] = static_cast<double>(bdmvtest::CountAllocations() - before);
+}
+
+auto WithLog(void (*function)(benchmark::State&), std::chrono::microseconds sinkTime,
+             std::size_t queueLines)
+{
+    return [=](benchmark::State& state) {
+        const LoggingOn logging(sinkTime, queueLines);
+        function(state);
+    };
 }
 
 /** Registers the rows of an event; @p deliver is its work without a log line, by hand. */
@@ -81,12 +80,12 @@ void RegisterEvent(const std::string& name, void (*deliver)(bdmv::IPlaybackConte
             deliver(stage.context, stage.listeners);
         }
     });
-    row(DispatchOff, [](benchmark::State& state) { Dispatch<Event>(state, std::nullopt); });
-    row(DispatchNull, [](benchmark::State& state) { Dispatch<Event>(state, 0); });
-    row(DispatchQueue, [](benchmark::State& state) { Dispatch<Event>(state, QueueLines); });
-    row(WholeOff, [](benchmark::State& state) { Whole<Event>(state, std::nullopt); });
-    row(WholeNull, [](benchmark::State& state) { Whole<Event>(state, 0); });
-    row(WholeQueue, [](benchmark::State& state) { Whole<Event>(state, QueueLines); });
+    row(DispatchOff, Dispatch<Event>);
+    row(DispatchNull, WithLog(Dispatch<Event>, Null, 0));
+    row(DispatchQueue, WithLog(Dispatch<Event>, Slow, QueueLines));
+    row(WholeOff, Whole<Event>);
+    row(WholeNull, WithLog(Whole<Event>, Null, 0));
+    row(WholeQueue, WithLog(Whole<Event>, Slow, QueueLines));
 }
 
 void DeliverPlayStarted(bdmv::IPlaybackContext& /*context*/, List& listeners)

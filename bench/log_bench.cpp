@@ -1,5 +1,6 @@
 // One log line: the longest of the three measured events, and what a user would write instead.
 
+#include <chrono>
 #include <cstdarg>
 #include <cstdio>
 #include <memory>
@@ -8,7 +9,6 @@
 #include <benchmark/benchmark.h>
 #include <spdlog/async_logger.h>
 #include <spdlog/details/thread_pool.h>
-#include <spdlog/sinks/null_sink.h>
 
 #include "bd/logging.h"
 #include "benchmarks.h"
@@ -79,9 +79,9 @@ void Off(benchmark::State& state)
     Repeat(state, WriteLine);
 }
 
-void On(benchmark::State& state, std::size_t queueLines)
+void On(benchmark::State& state, std::chrono::microseconds sinkTime, std::size_t queueLines)
 {
-    const LoggingOn logging(queueLines);
+    const LoggingOn logging(sinkTime, queueLines);
     Repeat(state, WriteLine);
 }
 
@@ -92,16 +92,16 @@ void Vsnprintf(benchmark::State& state)
 
 void Spdlog(benchmark::State& state)
 {
-    spdlog::logger logger("", std::make_shared<spdlog::sinks::null_sink_mt>());
+    spdlog::logger logger("", std::make_shared<DroppingSink>(Null));
     Repeat(state, [&](const Values& values) { WriteBySpdlog(logger, values); });
 }
 
-void SpdlogQueue(benchmark::State& state)
+void SpdlogQueue(benchmark::State& state, std::chrono::microseconds sinkTime)
 {
     const auto queue = std::make_shared<spdlog::details::thread_pool>(QueueLines, 1);
-    const auto logger = std::make_shared<spdlog::async_logger>(
-        "", std::make_shared<spdlog::sinks::null_sink_mt>(), queue,
-        spdlog::async_overflow_policy::overrun_oldest);
+    const auto logger =
+        std::make_shared<spdlog::async_logger>("", std::make_shared<DroppingSink>(sinkTime), queue,
+                                               spdlog::async_overflow_policy::overrun_oldest);
     Repeat(state, [&](const Values& values) { WriteBySpdlog(*logger, values); });
 }
 
@@ -114,11 +114,13 @@ void RegisterLogLines()
     };
     row(LogSwitch, CheckSwitch);
     row(LogOff, Off);
-    row(LogNull, [](benchmark::State& state) { On(state, 0); });
-    row(LogQueue, [](benchmark::State& state) { On(state, QueueLines); });
+    row(LogNull, [](benchmark::State& state) { On(state, Null, 0); });
+    row(LogQueue, [](benchmark::State& state) { On(state, Slow, QueueLines); });
+    row(LogQueueNull, [](benchmark::State& state) { On(state, Null, QueueLines); });
     row(LogVsnprintf, Vsnprintf);
     row(LogSpdlog, Spdlog);
-    row(LogSpdlogQueue, SpdlogQueue);
+    row(LogSpdlogQueue, [](benchmark::State& state) { SpdlogQueue(state, Slow); });
+    row(LogSpdlogQueueNull, [](benchmark::State& state) { SpdlogQueue(state, Null); });
 }
 
 } // namespace bench

@@ -5,10 +5,13 @@
 #ifndef BENCH_LOGGING_H
 #define BENCH_LOGGING_H
 
+#include <chrono>
 #include <cstddef>
 #include <memory>
+#include <mutex>
+#include <thread>
 
-#include <spdlog/sinks/null_sink.h>
+#include <spdlog/sinks/base_sink.h>
 
 #include "kevro_linux.h"
 #include "logchannel.h"
@@ -17,17 +20,42 @@ namespace bench
 {
 
 /** Lines that may wait in a queue. */
-constexpr std::size_t QueueLines = 1024;
+constexpr std::size_t QueueLines = 100;
+
+/** A sink that drops its lines at once. */
+constexpr std::chrono::microseconds Null{0};
+
+/** One that takes as long as a terminal or a flash: the thread of a queue is never done then. */
+constexpr std::chrono::microseconds Slow{100};
+
+/** Drops lines, each after some time. */
+class DroppingSink final : public spdlog::sinks::base_sink<std::mutex>
+{
+public:
+    explicit DroppingSink(std::chrono::microseconds time) : m_Time(time) {}
+
+protected:
+    void sink_it_(const spdlog::details::log_msg& /*message*/) override
+    {
+        if (m_Time != Null) {
+            std::this_thread::sleep_for(m_Time);
+        }
+    }
+
+    void flush_() override {}
+
+private:
+    std::chrono::microseconds m_Time;
+};
 
 /** As long as it lives, all lines are on and go into a sink that drops them. */
 class LoggingOn
 {
 public:
     /** @param queueLines lines that may wait for the sink; 0 for no queue */
-    explicit LoggingOn(std::size_t queueLines)
+    LoggingOn(std::chrono::microseconds sinkTime, std::size_t queueLines)
     {
-        kevro::TheLogChannel().Exchange(std::make_unique<kevro::Output>(
-            std::make_unique<spdlog::sinks::null_sink_mt>(), queueLines));
+        kevro::TheLogChannel().Exchange({std::make_unique<DroppingSink>(sinkTime), queueLines});
         KEVRO_Log_Configure("*=*+hifreq", nullptr, 0);
     }
 

@@ -54,6 +54,21 @@ Row Report::operator[](const std::string& name) const
     return row;
 }
 
+double Report::Largest(const std::string& name, const std::string& counter) const
+{
+    double largest = std::numeric_limits<double>::quiet_NaN();
+    const auto found = m_Runs.find(name);
+    if (found != m_Runs.end()) {
+        for (const Run& run : found->second) {
+            const auto value = run.counters.find(counter);
+            if (value != run.counters.end()) {
+                largest = std::fmax(largest, value->second);
+            }
+        }
+    }
+    return largest;
+}
+
 bool RunBenchmarks(Report& report, int argc, char** argv)
 {
     char repetitions[] = "--benchmark_repetitions=15";

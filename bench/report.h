@@ -33,6 +33,10 @@ public:
 
     Row operator[](const std::string& name) const;
 
+    /** The largest value that a counter had in any repetition; not a number if it was not counted.
+     */
+    double Largest(const std::string& name, const std::string& counter) const;
+
 private:
     std::map<std::string, std::vector<Run>> m_Runs;
 };

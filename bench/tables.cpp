@@ -112,10 +112,8 @@ void PrintEvents(const Report& report, Goal& allocations, Goal& lineOff)
             if (what == DispatchOff) {
                 lineOff.Judge(event, row.cpu / alone);
             }
-            if (row.counters.count(AllocationsCounter) != 0) {
-                allocations.Judge(std::string(event) + ", " + what,
-                                  row.counters.at(AllocationsCounter));
-            }
+            allocations.Judge(std::string(event) + ", " + what,
+                              report.Largest(EventRow(event, what), AllocationsCounter));
         }
         std::printf("\n");
     }
@@ -148,14 +146,14 @@ void PrintLog(const Report& report, Goal& queued)
 {
     std::printf("\nA log line: ns of the caller's processor, times vsnprintf alone, ns passed\n");
     const double formatting = report[LogRow(LogVsnprintf)].cpu;
-    for (const char* const what :
-         {LogSwitch, LogOff, LogVsnprintf, LogNull, LogQueue, LogSpdlog, LogSpdlogQueue}) {
+    for (const char* const what : {LogSwitch, LogOff, LogVsnprintf, LogNull, LogQueue, LogQueueNull,
+                                   LogSpdlog, LogSpdlogQueue, LogSpdlogQueueNull}) {
         const Row row = report[LogRow(what)];
-        std::printf("  %-28s", what);
+        std::printf("  %-32s", what);
         PrintTime(row.cpu, formatting);
         PrintNumber(11, 1, row.wall);
         std::printf("\n");
-        if (what == LogQueue) {
+        if (what == LogQueue || what == LogQueueNull) {
             queued.Judge(what, row.cpu / formatting);
         }
     }

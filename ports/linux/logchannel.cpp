@@ -5,41 +5,18 @@
 namespace kevro
 {
 
-class LogChannel::Use
-{
-public:
-    explicit Use(LogChannel& channel) : m_rChannel(channel)
-    {
-        const std::lock_guard<std::mutex> lock(m_rChannel.m_PlaceMutex);
-        m_pPlace = m_rChannel.m_Current.get();
-        ++m_pPlace->users;
-    }
-
-    ~Use()
-    {
-        const std::lock_guard<std::mutex> lock(m_rChannel.m_PlaceMutex);
-        if (--m_pPlace->users == 0) {
-            m_rChannel.m_PlaceLeft.notify_all();
-        }
-    }
-
-    Use(const Use&) = delete;
-    Use& operator=(const Use&) = delete;
-
-    Output* operator->() const { return m_pPlace->output.get(); }
-
-private:
-    LogChannel& m_rChannel;
-    Place* m_pPlace;
-};
-
-LogChannel::LogChannel(std::unique_ptr<Output> output) : m_Current(new Place{std::move(output), 0})
+LogChannel::LogChannel(Destination destination)
+    : m_Current(
+          std::make_unique<Output>(m_Mutex, std::move(destination.sink), destination.queueLines))
 {
 }
 
-void LogChannel::Write(spdlog::level::level_enum level, std::string_view line) noexcept
+void LogChannel::Write(const LogLine& line) noexcept
 {
-    Use(*this)->Write(level, line);
+    {
+        Output::Lock lock(m_Mutex);
+        m_Current->Write(lock, line);
+    }
     if (m_Finishing) {
         Flush();
     }
@@ -47,23 +24,19 @@ void LogChannel::Write(spdlog::level::level_enum level, std::string_view line) n
 
 void LogChannel::AddLost() noexcept
 {
-    Use(*this)->AddLost();
+    const Output::Lock lock(m_Mutex);
+    m_Current->AddLost(lock);
 }
 
-void LogChannel::Exchange(std::unique_ptr<Output> next)
+void LogChannel::Exchange(Destination next)
 {
-    std::unique_ptr<Place> place(new Place{std::move(next), 0});
+    auto output = std::make_unique<Output>(m_Mutex, std::move(next.sink), next.queueLines);
     const std::lock_guard<std::mutex> exchange(m_ExchangeMutex);
-    {
-        std::unique_lock<std::mutex> lock(m_PlaceMutex);
-        m_Leaving = std::exchange(m_Current, std::move(place));
-        m_PlaceLeft.wait(lock, [this] { return m_Leaving->users == 0; });
-    }
-    m_Leaving->output->Drain();
-
-    std::unique_ptr<Place> gone; // ends its queue's thread after the lock is released
-    const std::lock_guard<std::mutex> lock(m_PlaceMutex);
-    m_LostBefore += m_Leaving->output->CountLost();
+    std::unique_ptr<Output> gone; // ends its queue's thread after the lock is released
+    Output::Lock lock(m_Mutex);
+    m_Leaving = std::exchange(m_Current, std::move(output));
+    m_Leaving->Drain(lock);
+    m_LostBefore += m_Leaving->CountLost(lock);
     gone = std::move(m_Leaving);
 }
 
@@ -71,7 +44,8 @@ void LogChannel::Flush() noexcept
 {
     // An exchange ends with a flush of the output before, so waiting for it covers that one, too.
     const std::lock_guard<std::mutex> exchange(m_ExchangeMutex);
-    m_Current->output->Drain();
+    Output::Lock lock(m_Mutex);
+    m_Current->Drain(lock);
 }
 
 void LogChannel::Finish() noexcept
@@ -82,9 +56,8 @@ void LogChannel::Finish() noexcept
 
 KEVRO_UInt64 LogChannel::CountLost() noexcept
 {
-    const std::lock_guard<std::mutex> lock(m_PlaceMutex);
-    return m_LostBefore + m_Current->output->CountLost() +
-           (m_Leaving ? m_Leaving->output->CountLost() : 0);
+    const Output::Lock lock(m_Mutex);
+    return m_LostBefore + m_Current->CountLost(lock) + (m_Leaving ? m_Leaving->CountLost(lock) : 0);
 }
 
 } // namespace kevro

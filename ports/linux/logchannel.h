@@ -6,33 +6,39 @@
 #define KEVRO_LOGCHANNEL_H
 
 #include <atomic>
-#include <condition_variable>
+#include <cstddef>
 #include <memory>
 #include <mutex>
-#include <string_view>
 
-#include "kevro/kevro_types.h"
+#include <spdlog/sinks/sink.h>
+
 #include "logoutput.h"
 
 namespace kevro
 {
 
+/** Where lines go. */
+struct Destination {
+    std::unique_ptr<spdlog::sinks::sink> sink;
+    std::size_t queueLines; ///< lines that may wait for it; 0 writes each directly
+};
+
 /** All operations may be called from several threads at once. */
 class LogChannel
 {
 public:
-    explicit LogChannel(std::unique_ptr<Output> output);
+    explicit LogChannel(Destination destination);
 
     LogChannel(const LogChannel&) = delete;
     LogChannel& operator=(const LogChannel&) = delete;
 
-    void Write(spdlog::level::level_enum level, std::string_view line) noexcept;
+    void Write(const LogLine& line) noexcept;
 
     /** Counts a line that was lost on its way here. */
     void AddLost() noexcept;
 
     /** Sends the lines from now on to @p next; returns when the output before has written all. */
-    void Exchange(std::unique_ptr<Output> next);
+    void Exchange(Destination next);
 
     /** Waits until every line written before is out. */
     void Flush() noexcept;
@@ -43,20 +49,11 @@ public:
     KEVRO_UInt64 CountLost() noexcept;
 
 private:
-    struct Place {
-        std::unique_ptr<Output> output;
-        unsigned users; ///< threads that are writing a line to it
-    };
-
-    /** Keeps the output in force from being taken away while a thread writes to it. */
-    class Use;
-
-    std::mutex m_ExchangeMutex; ///< one exchange or flush at a time; taken before m_PlaceMutex
-    std::mutex m_PlaceMutex;    ///< never held while anything is written
-    std::condition_variable m_PlaceLeft;
-    std::unique_ptr<Place> m_Current;
-    std::unique_ptr<Place> m_Leaving; ///< null, or what an exchange is waiting for
-    KEVRO_UInt64 m_LostBefore = 0;    ///< by outputs that are gone
+    std::mutex m_ExchangeMutex; ///< one exchange or flush at a time; taken before m_Mutex
+    std::mutex m_Mutex;         ///< never held while anything is written
+    std::unique_ptr<Output> m_Current;
+    std::unique_ptr<Output> m_Leaving; ///< null, or what an exchange is waiting for
+    KEVRO_UInt64 m_LostBefore = 0;     ///< by outputs that are gone
     std::atomic<bool> m_Finishing{false};
 };
 

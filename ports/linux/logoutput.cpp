@@ -2,138 +2,167 @@
 
 #include <cinttypes>
 #include <cstdio>
-#include <string>
 #include <utility>
+
+#include <spdlog/details/log_msg.h>
+
+#include "bd/logging.h"
 
 namespace kevro
 {
 
-Output::Output(std::unique_ptr<spdlog::sinks::sink> destination, std::size_t queueLines)
-    : m_Destination(std::move(destination))
+Output::Output(std::mutex& mutex, std::unique_ptr<spdlog::sinks::sink> destination,
+               std::size_t queueLines)
+    : m_Destination(std::move(destination)), m_rMutex(mutex), m_Queue(queueLines)
 {
-    // The logger lives inside this object and shares nothing with it.
-    const spdlog::sink_ptr self(spdlog::sink_ptr(), this);
-    if (queueLines == 0) {
-        m_Logger = std::make_shared<spdlog::logger>(std::string(), self);
-    } else {
-        m_Queue = std::make_shared<spdlog::details::thread_pool>(queueLines, 1);
-        m_Logger = std::make_shared<spdlog::async_logger>(
-            std::string(), self, m_Queue, spdlog::async_overflow_policy::overrun_oldest);
-    }
-    m_Logger->set_level(spdlog::level::trace);
-}
-
-void Output::Write(spdlog::level::level_enum level, std::string_view line) noexcept
-{
-    {
-        // Before the line is on its way, so that nobody who waits can overlook it.
-        const std::lock_guard<std::mutex> lock(m_CountMutex);
-        ++m_Accepted;
-    }
-    try {
-        m_Logger->log(spdlog::source_loc(), level, spdlog::string_view_t(line.data(), line.size()));
-    } catch (...) {
-        Account(false);
+    if (queueLines != 0) {
+        m_QueueThread = std::thread([this] { WriteQueued(); });
     }
 }
 
-void Output::Drain() noexcept
+Output::~Output()
 {
-    {
-        std::unique_lock<std::mutex> lock(m_CountMutex);
-        // The queue keeps the order and loses its oldest line first: once as many lines are through
-        // or lost as had been accepted, it is those.
-        const KEVRO_UInt64 accepted = m_Accepted;
-        m_Progress.wait(lock, [&] { return m_Done + CountOverrun() >= accepted; });
-    }
-    const std::lock_guard<std::mutex> lock(m_WriteMutex);
-    ReportLost();
-}
-
-void Output::AddLost() noexcept
-{
-    const std::lock_guard<std::mutex> lock(m_CountMutex);
-    ++m_Refused;
-}
-
-KEVRO_UInt64 Output::CountLost() const noexcept
-{
-    const std::lock_guard<std::mutex> lock(m_CountMutex);
-    return m_Refused + CountOverrun();
-}
-
-void Output::log(const spdlog::details::log_msg& message)
-{
-    bool written;
-    {
-        const std::lock_guard<std::mutex> lock(m_WriteMutex);
-        // Not while lines are waiting: each of these reports would cost one of them its place.
-        if (IsCaughtUp()) {
-            ReportLost();
+    if (m_QueueThread.joinable()) {
+        {
+            const Lock lock(m_rMutex);
+            m_Ending = true;
+            m_LineQueued.notify_one();
         }
-        written = TryWrite(message);
+        m_QueueThread.join();
     }
-    Account(written);
 }
 
-void Output::flush()
+void Output::Write(Lock& lock, const LogLine& line) noexcept
 {
-    m_Destination->flush();
+    ++m_Accepted;
+    if (m_Queue.empty()) {
+        const KEVRO_UInt64 lost = LostToReport();
+        lock.unlock();
+        const bool written = WriteToDestination(line, lost);
+        lock.lock();
+        Account(lock, written);
+        return;
+    }
+    try {
+        Queue(line);
+    } catch (...) {
+        Account(lock, false);
+    }
 }
 
-void Output::set_pattern(const std::string& pattern)
+void Output::Drain(Lock& lock) noexcept
 {
-    m_Destination->set_pattern(pattern);
+    // The queue keeps the order and loses its oldest line first: once as many lines are done as had
+    // been accepted, it is those.
+    const KEVRO_UInt64 accepted = m_Accepted;
+    m_Progress.wait(lock, [&] { return m_Done >= accepted; });
+    const KEVRO_UInt64 lost = m_Lost;
+    lock.unlock();
+    {
+        const std::lock_guard<std::mutex> writing(m_WriteMutex);
+        ReportLost(lost);
+    }
+    lock.lock();
 }
 
-void Output::set_formatter(std::unique_ptr<spdlog::formatter> formatter)
+void Output::AddLost(const Lock& /*lock*/) noexcept
 {
-    m_Destination->set_formatter(std::move(formatter));
+    ++m_Lost;
 }
 
-bool Output::TryWrite(const spdlog::details::log_msg& message) noexcept
+KEVRO_UInt64 Output::CountLost(const Lock& /*lock*/) const noexcept
+{
+    return m_Lost;
+}
+
+void Output::Queue(const LogLine& line)
+{
+    if (m_Waiting == m_Queue.size()) {
+        m_Oldest = m_Oldest + 1 == m_Queue.size() ? 0 : m_Oldest + 1;
+        --m_Waiting;
+        ++m_Done;
+        ++m_Lost;
+    }
+    const std::size_t place = m_Oldest + m_Waiting;
+    QueuedLine& queued = m_Queue[place < m_Queue.size() ? place : place - m_Queue.size()];
+    queued.line = line;
+    queued.text.clear();
+    queued.text.append(line.text.data(), line.text.data() + line.text.size());
+    if (++m_Waiting == 1) {
+        m_LineQueued.notify_one();
+    }
+}
+
+void Output::WriteQueued() noexcept
+{
+    Lock lock(m_rMutex);
+    for (;;) {
+        m_LineQueued.wait(lock, [this] { return m_Waiting != 0 || m_Ending; });
+        if (m_Waiting == 0) {
+            return;
+        }
+        QueuedLine& oldest = m_Queue[m_Oldest];
+        const TextBuffer text = std::move(oldest.text);
+        LogLine line = oldest.line;
+        line.text = std::string_view(text.data(), text.size());
+        m_Oldest = m_Oldest + 1 == m_Queue.size() ? 0 : m_Oldest + 1;
+        --m_Waiting;
+
+        const KEVRO_UInt64 lost = LostToReport();
+        lock.unlock();
+        const bool written = WriteToDestination(line, lost);
+        lock.lock();
+        Account(lock, written);
+    }
+}
+
+KEVRO_UInt64 Output::LostToReport() const noexcept
+{
+    // Not while lines are waiting: each of these reports would cost one of them its place.
+    return m_Waiting == 0 ? m_Lost : 0;
+}
+
+bool Output::WriteToDestination(const LogLine& line, KEVRO_UInt64 lost) noexcept
+{
+    const std::lock_guard<std::mutex> writing(m_WriteMutex);
+    ReportLost(lost);
+    return TryWrite(line);
+}
+
+bool Output::TryWrite(const LogLine& line) noexcept
 {
     try {
-        m_Destination->log(message);
+        TextBuffer text;
+        AppendLine(text, line);
+        m_Destination->log(spdlog::details::log_msg(
+            line.time, spdlog::source_loc(), spdlog::string_view_t(), Severity(line.level),
+            spdlog::string_view_t(text.data(), text.size())));
         return true;
     } catch (...) {
         return false;
     }
 }
 
-void Output::ReportLost() noexcept
+void Output::ReportLost(KEVRO_UInt64 lost) noexcept
 {
-    const KEVRO_UInt64 lost = CountLost();
-    if (lost == m_ReportedLost) {
+    // Another writer may have counted later and come first.
+    if (lost <= m_ReportedLost) {
         return;
     }
     char text[64];
-    const int length = std::snprintf(text, sizeof(text), "Common Warning: lines lost: %" PRIu64,
-                                     lost - m_ReportedLost);
-    const spdlog::string_view_t line(text, static_cast<std::size_t>(length));
-    if (TryWrite(spdlog::details::log_msg(spdlog::string_view_t(), spdlog::level::warn, line))) {
+    const int length =
+        std::snprintf(text, sizeof(text), "lines lost: %" PRIu64, lost - m_ReportedLost);
+    if (TryWrite({spdlog::log_clock::now(), bd::CompIdCommon, KEVRO_Log_LevelWarning,
+                  std::string_view(text, static_cast<std::size_t>(length))})) {
         m_ReportedLost = lost;
     }
 }
 
-void Output::Account(bool written) noexcept
+void Output::Account(const Lock& /*lock*/, bool written) noexcept
 {
-    {
-        const std::lock_guard<std::mutex> lock(m_CountMutex);
-        ++m_Done;
-        m_Refused += written ? 0 : 1;
-    }
+    ++m_Done;
+    m_Lost += written ? 0 : 1;
     m_Progress.notify_all();
-}
-
-bool Output::IsCaughtUp() const noexcept
-{
-    return !m_Queue || m_Queue->queue_size() == 0;
-}
-
-KEVRO_UInt64 Output::CountOverrun() const noexcept
-{
-    return m_Queue ? m_Queue->overrun_counter() : 0;
 }
 
 } // namespace kevro

@@ -52,7 +52,7 @@ struct Options {
     }
 };
 
-std::unique_ptr<Output> OpenOutput(const char* text)
+Destination OpenDestination(const char* text)
 {
     const std::vector<Word> words = Word::Whole(text).Split(',');
     const std::size_t colon = words[0].text.find(':');
@@ -78,18 +78,18 @@ std::unique_ptr<Output> OpenOutput(const char* text)
     } else {
         words[0].Refuse("stderr, file:PATH, syslog or syslog:IDENT");
     }
-    return std::make_unique<Output>(std::move(sink), options.queue.Value());
+    return {std::move(sink), options.queue.Value()};
 }
 
 LogChannel& MakeLogChannel()
 {
-    std::unique_ptr<Output> output;
-    ApplyEnvironment("KEVRO_LOG_SINK", [&](const char* text) { output = OpenOutput(text); });
-    if (!output) {
-        output = OpenOutput("stderr");
+    Destination destination;
+    if (!ApplyEnvironment("KEVRO_LOG_SINK",
+                          [&](const char* text) { destination = OpenDestination(text); })) {
+        destination = OpenDestination("stderr");
     }
     std::atexit([] { TheLogChannel().Finish(); });
-    return *new LogChannel(std::move(output));
+    return *new LogChannel(std::move(destination));
 }
 
 // Made at start in any case, so that what is wrong with the environment is told then.
@@ -108,8 +108,8 @@ LogChannel& TheLogChannel()
 bool KEVRO_Log_ConfigureSink(const char* text, char* message, size_t messageSize)
 {
     return kevro::Apply(
-        [](const char* sink) { kevro::TheLogChannel().Exchange(kevro::OpenOutput(sink)); }, text,
-        message, messageSize);
+        [](const char* sink) { kevro::TheLogChannel().Exchange(kevro::OpenDestination(sink)); },
+        text, message, messageSize);
 }
 
 KEVRO_UInt64 KEVRO_Log_GetDroppedLines(void)

@@ -5,6 +5,7 @@
 #ifndef KEVRO_PRINTABLE_H
 #define KEVRO_PRINTABLE_H
 
+#include <algorithm>
 #include <string_view>
 
 namespace kevro
@@ -15,38 +16,39 @@ namespace kevro
  *
  * A backslash is doubled, so that what a line shows can be told from what it was.
  *
- * @tparam Buffer a sequence of char with push_back()
+ * @tparam Buffer a sequence of char with push_back(), and append() of a range
  */
 template <typename Buffer> void AppendPrintable(Buffer& buffer, std::string_view text)
 {
     constexpr char Digits[] = "0123456789ABCDEF";
-    const auto appendEscape = [&buffer](char letter) {
+    const auto isPlain = [](char c) { return c >= ' ' && c <= '~' && c != '\\'; };
+    const char* rest = text.data();
+    const char* const end = rest + text.size();
+    for (;;) {
+        const char* const special = std::find_if_not(rest, end, isPlain);
+        buffer.append(rest, special);
+        if (special == end) {
+            return;
+        }
+        rest = special + 1;
         buffer.push_back('\\');
-        buffer.push_back(letter);
-    };
-    for (const char c : text) {
-        const auto byte = static_cast<unsigned char>(c);
-        switch (c) {
+        switch (*special) {
         case '\\':
-            appendEscape('\\');
+            buffer.push_back('\\');
             break;
         case '\n':
-            appendEscape('n');
+            buffer.push_back('n');
             break;
         case '\r':
-            appendEscape('r');
+            buffer.push_back('r');
             break;
         case '\t':
-            appendEscape('t');
+            buffer.push_back('t');
             break;
         default:
-            if (byte >= 0x20 && byte < 0x7F) {
-                buffer.push_back(c);
-            } else {
-                appendEscape('x');
-                buffer.push_back(Digits[byte >> 4]);
-                buffer.push_back(Digits[byte & 0xF]);
-            }
+            buffer.push_back('x');
+            buffer.push_back(Digits[static_cast<unsigned char>(*special) >> 4]);
+            buffer.push_back(Digits[static_cast<unsigned char>(*special) & 0xF]);
         }
     }
 }
