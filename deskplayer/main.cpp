@@ -175,7 +175,12 @@ deskplayer::LoadedPlayList Load(const deskplayer::Disc& disc, const Options& opt
 class Progress
 {
 public:
-    explicit Progress(const deskplayer::VirtualClock& clock) : m_rClock(clock) {}
+    /** @param options say whether output goes to the same terminal, where it would be in the way */
+    Progress(const deskplayer::VirtualClock& clock, const Options& options)
+        : m_rClock(clock), m_Possible(isatty(STDERR_FILENO) != 0 &&
+                                      (isatty(STDOUT_FILENO) == 0 || !options.output.empty()))
+    {
+    }
 
     ~Progress()
     {
@@ -201,8 +206,7 @@ private:
     static constexpr std::size_t Width = sizeof "00:00:00.000";
 
     const deskplayer::VirtualClock& m_rClock;
-    // Beside output on the same terminal it would only be in the way.
-    bool m_Possible = isatty(STDERR_FILENO) != 0 && isatty(STDOUT_FILENO) == 0;
+    const bool m_Possible;
     bool m_Shown = false;
     std::chrono::steady_clock::time_point m_Next =
         std::chrono::steady_clock::now() + std::chrono::seconds(1);
@@ -228,7 +232,7 @@ void Play(deskplayer::LoadedPlayList playList, const std::vector<deskplayer::Scr
         return;
     }
 
-    Progress progress(clock);
+    Progress progress(clock, options);
     deskplayer::SessionHooks hooks;
     const auto start = std::chrono::steady_clock::now();
     hooks.beforeTimePasses = [&](std::uint64_t ticks) {

@@ -1,5 +1,6 @@
 #include "program.h"
 
+#include <pty.h>
 #include <sys/wait.h>
 
 #include <cstdio>
@@ -57,6 +58,33 @@ ProgramResult Run(const std::string& preparation, const std::vector<std::string>
 ProgramResult RunDeskPlayer(const std::vector<std::string>& arguments, const std::string& output)
 {
     return Run("", arguments, output);
+}
+
+ProgramResult RunDeskPlayerOnTerminal(const std::vector<std::string>& arguments)
+{
+    int screen = -1;
+    const pid_t program = forkpty(&screen, nullptr, nullptr, nullptr);
+    if (program == 0) {
+        std::string name = BDMVNAVIGATOR_DESKPLAYER;
+        std::vector<std::string> words = arguments;
+        std::vector<char*> pointers = {name.data()};
+        for (std::string& word : words) {
+            pointers.push_back(word.data());
+        }
+        pointers.push_back(nullptr);
+        execv(name.c_str(), pointers.data());
+        _exit(127);
+    }
+    ProgramResult result;
+    char piece[1000];
+    for (ssize_t size = 0; (size = read(screen, piece, sizeof piece)) > 0;) {
+        result.output.append(piece, static_cast<std::size_t>(size));
+    }
+    close(screen);
+    int status = 0;
+    waitpid(program, &status, 0);
+    result.status = WIFEXITED(status) ? WEXITSTATUS(status) : -1;
+    return result;
 }
 
 ProgramResult RunDeskPlayerInLittleMemory(const std::vector<std::string>& arguments,

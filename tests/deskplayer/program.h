@@ -23,6 +23,9 @@ struct ProgramResult {
 ProgramResult RunDeskPlayer(const std::vector<std::string>& arguments,
                             const std::string& output = {});
 
+/** The same on a terminal, for input and all output: the result holds what the screen shows. */
+ProgramResult RunDeskPlayerOnTerminal(const std::vector<std::string>& arguments);
+
 /** The same with so many KiB of address space at the most. */
 ProgramResult RunDeskPlayerInLittleMemory(const std::vector<std::string>& arguments,
                                           unsigned long kibibytes);

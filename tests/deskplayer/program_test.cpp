@@ -627,6 +627,43 @@ TEST(DeskPlayerOutput, OfLogLinesGoesToStandardError)
 }
 
 // ---------------------------------------------------------------------------------------------
+// On a terminal
+
+TEST_F(ScratchDisc, ShowsHowFarItHasComeWhenItTakesLong)
+{
+    MakeShort(45 * 1500);
+
+    const ProgramResult result =
+        RunDeskPlayerOnTerminal({disc, "--realtime", "--output", folder / "out.txt"});
+
+    EXPECT_EQ(result.status, 0);
+    EXPECT_EQ(result.output, "\r00:00:01.000\r             \r") << "and nothing in the end";
+}
+
+TEST_F(ScratchDisc, ShowsNoProgressBesideItsOutput)
+{
+    MakeShort(45 * 1500);
+
+    const ProgramResult result =
+        RunDeskPlayerOnTerminal({disc, "--realtime", "--only", "Finished"});
+
+    EXPECT_EQ(result.output.find("\r0"), std::string::npos) << result.output;
+    EXPECT_NE(result.output.find("Finished"), std::string::npos);
+}
+
+TEST(DeskPlayerOutput, IsColouredOnATerminalUnlessTheEnvironmentForbidsIt)
+{
+    const std::vector<std::string> arguments = {SampleDisc, "--only", "Finished"};
+    unsetenv("NO_COLOR");
+    EXPECT_NE(RunDeskPlayerOnTerminal(arguments).output.find('\x1B'), std::string::npos);
+    setenv("NO_COLOR", "1", 1);
+    EXPECT_EQ(RunDeskPlayerOnTerminal(arguments).output,
+              "00:03:02.000  Finished                    reason=EndOfMedia\r\n");
+    unsetenv("NO_COLOR");
+    EXPECT_EQ(RunDeskPlayer(arguments).output.find('\x1B'), std::string::npos);
+}
+
+// ---------------------------------------------------------------------------------------------
 // Usage
 
 TEST(DeskPlayer, ListsThePlayListsOfADisc)
