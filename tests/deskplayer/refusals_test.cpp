@@ -71,6 +71,25 @@ struct StatusRule {
     const char* expected; ///< the end of the message
 };
 
+typedef std::pair<const char*, Operation> NamedOperation;
+
+/** Operations on what is on the screen that no mask can forbid. */
+const NamedOperation Unmaskable[] = {
+    {"Suspend", [](TestDesk& d) { return d.navigator.Suspend(); }},
+    {"SetPointA", [](TestDesk& d) { return d.navigator.SetPointA(); }},
+    {"SetPointB", [](TestDesk& d) { return d.navigator.SetPointB(); }},
+    {"EndABRepeat", [](TestDesk& d) { return d.navigator.EndABRepeat(); }},
+    {"RepeatChapter", [](TestDesk& d) { return d.navigator.RepeatChapter(); }},
+    {"RepeatTitle", [](TestDesk& d) { return d.navigator.RepeatTitle(); }},
+    {"EndChapterTitleRepeat", [](TestDesk& d) { return d.navigator.EndChapterTitleRepeat(); }},
+    {"SetTrigger", [](TestDesk& d) { return d.navigator.SetTrigger(Second); }},
+    {"SelectStyle", [](TestDesk& d) { return d.navigator.SelectStyle(2); }},
+    {"Zoom", [](TestDesk& d) { return d.navigator.Zoom({}); }},
+    {"GoToStandby", [](TestDesk& d) { return d.navigator.GoToStandby(); }},
+    {"FailPreload", [](TestDesk& d) { return d.navigator.FailPreload(); }},
+    {"Starve", [](TestDesk& d) { return d.navigator.Starve(); }},
+};
+
 std::vector<StatusRule> StatusRules()
 {
     std::vector<StatusRule> rules = {
@@ -113,24 +132,15 @@ std::vector<StatusRule> StatusRules()
          {Status::Standby},
          "in standby"},
     };
-    const std::pair<const char*, Operation> active[] = {
+    const NamedOperation maskable[] = {
         {"Stop", [](TestDesk& d) { return d.navigator.Stop(); }},
-        {"Suspend", [](TestDesk& d) { return d.navigator.Suspend(); }},
         {"SearchTime", [](TestDesk& d) { return d.navigator.SearchTime(Second); }},
         {"SearchChapter", [](TestDesk& d) { return d.navigator.SearchChapter(1); }},
         {"SkipToNextChapter", [](TestDesk& d) { return d.navigator.SkipToNextChapter(); }},
         {"SkipToPreviousChapter", [](TestDesk& d) { return d.navigator.SkipToPreviousChapter(); }},
-        {"SetPointA", [](TestDesk& d) { return d.navigator.SetPointA(); }},
-        {"SetPointB", [](TestDesk& d) { return d.navigator.SetPointB(); }},
-        {"EndABRepeat", [](TestDesk& d) { return d.navigator.EndABRepeat(); }},
-        {"RepeatChapter", [](TestDesk& d) { return d.navigator.RepeatChapter(); }},
-        {"RepeatTitle", [](TestDesk& d) { return d.navigator.RepeatTitle(); }},
-        {"EndChapterTitleRepeat", [](TestDesk& d) { return d.navigator.EndChapterTitleRepeat(); }},
-        {"SetTrigger", [](TestDesk& d) { return d.navigator.SetTrigger(Second); }},
         {"SelectAudio", [](TestDesk& d) { return d.navigator.SelectAudio(2); }},
         {"SelectSubtitle", [](TestDesk& d) { return d.navigator.SelectSubtitle(2); }},
         {"ShowSubtitles", [](TestDesk& d) { return d.navigator.ShowSubtitles(false); }},
-        {"SelectStyle", [](TestDesk& d) { return d.navigator.SelectStyle(2); }},
         {"SelectAngle", [](TestDesk& d) { return d.navigator.SelectAngle(2); }},
         {"SelectSecondaryVideo", [](TestDesk& d) { return d.navigator.SelectSecondaryVideo(2); }},
         {"ShowSecondaryVideo", [](TestDesk& d) { return d.navigator.ShowSecondaryVideo(true); }},
@@ -138,18 +148,16 @@ std::vector<StatusRule> StatusRules()
         {"ShowSecondaryAudio", [](TestDesk& d) { return d.navigator.ShowSecondaryAudio(true); }},
         {"SelectPipSubtitle", [](TestDesk& d) { return d.navigator.SelectPipSubtitle(2); }},
         {"PickPipSubtitle", [](TestDesk& d) { return d.navigator.PickPipSubtitle(true); }},
-        {"Zoom", [](TestDesk& d) { return d.navigator.Zoom({}); }},
         {"OpenPopUpMenu", [](TestDesk& d) { return d.navigator.OpenPopUpMenu(); }},
-        {"GoToStandby", [](TestDesk& d) { return d.navigator.GoToStandby(); }},
-        {"FailPreload", [](TestDesk& d) { return d.navigator.FailPreload(); }},
-        {"Starve", [](TestDesk& d) { return d.navigator.Starve(); }},
     };
-    for (const auto& [name, operation] : active) {
-        rules.push_back({name,
-                         operation,
+    const auto add = [&rules](const NamedOperation& named) {
+        rules.push_back({named.first,
+                         named.second,
                          {Status::Playing, Status::Paused, Status::Still},
                          "playing or paused or in a still"});
-    }
+    };
+    std::for_each(std::begin(maskable), std::end(maskable), add);
+    std::for_each(std::begin(Unmaskable), std::end(Unmaskable), add);
     return rules;
 }
 
@@ -366,22 +374,9 @@ TEST(Refusals, DoNotComeFromTheMaskOfAPlaybackThatIsOver)
 
 TEST(Refusals, DoNotMeetWhatNoMaskCanForbid)
 {
-    const std::pair<const char*, Operation> operations[] = {
-        {"normal speed", [](TestDesk& d) { return d.navigator.SetPlayMode(bd::PlayMode()); }},
-        {"Suspend", [](TestDesk& d) { return d.navigator.Suspend(); }},
-        {"SetPointA", [](TestDesk& d) { return d.navigator.SetPointA(); }},
-        {"SetPointB", [](TestDesk& d) { return d.navigator.SetPointB(); }},
-        {"EndABRepeat", [](TestDesk& d) { return d.navigator.EndABRepeat(); }},
-        {"RepeatChapter", [](TestDesk& d) { return d.navigator.RepeatChapter(); }},
-        {"RepeatTitle", [](TestDesk& d) { return d.navigator.RepeatTitle(); }},
-        {"EndChapterTitleRepeat", [](TestDesk& d) { return d.navigator.EndChapterTitleRepeat(); }},
-        {"SetTrigger", [](TestDesk& d) { return d.navigator.SetTrigger(0); }},
-        {"SelectStyle", [](TestDesk& d) { return d.navigator.SelectStyle(2); }},
-        {"Zoom", [](TestDesk& d) { return d.navigator.Zoom({}); }},
-        {"GoToStandby", [](TestDesk& d) { return d.navigator.GoToStandby(); }},
-        {"FailPreload", [](TestDesk& d) { return d.navigator.FailPreload(); }},
-        {"Starve", [](TestDesk& d) { return d.navigator.Starve(); }},
-    };
+    std::vector<NamedOperation> operations(std::begin(Unmaskable), std::end(Unmaskable));
+    operations.emplace_back("normal speed",
+                            [](TestDesk& d) { return d.navigator.SetPlayMode(bd::PlayMode()); });
     for (const auto& [name, operation] : operations) {
         SCOPED_TRACE(name);
         const auto desk = DeskForbidding(~std::uint64_t{0}, ~std::uint64_t{0});

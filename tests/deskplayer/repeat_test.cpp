@@ -22,6 +22,14 @@ bd::PlayMode BackwardMode()
     return bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedNormal);
 }
 
+/** Sets A here and B @p ticks later: playback is at A again. */
+void SetPoints(TestDesk& desk, std::uint64_t ticks)
+{
+    desk.Do(desk.navigator.SetPointA());
+    desk.navigator.Advance(ticks);
+    desk.Do(desk.navigator.SetPointB());
+}
+
 TEST(Repeat, GoesFromBBackToA)
 {
     TestDesk desk(ListOf({Item(100)}));
@@ -53,9 +61,7 @@ TEST(Repeat, GoesFromBBackToAInAnItemBefore)
 {
     TestDesk desk(ListOf({Item(2), Item(2)}));
     desk.Start(Second + 10);
-    desk.Do(desk.navigator.SetPointA());
-    desk.navigator.Advance(2 * Second);
-    desk.Do(desk.navigator.SetPointB());
+    SetPoints(desk, 2 * Second);
 
     desk.navigator.Advance(2 * Second);
 
@@ -97,9 +103,7 @@ TEST(Repeat, StartsOverWithANewA)
 {
     TestDesk desk(ListOf({Item(100)}));
     desk.Start(Second);
-    desk.Do(desk.navigator.SetPointA());
-    desk.navigator.Advance(Second);
-    desk.Do(desk.navigator.SetPointB());
+    SetPoints(desk, Second);
 
     desk.Do(desk.navigator.SetPointA());
 
@@ -111,9 +115,7 @@ TEST(Repeat, GoesOnBehindBOnceTheRepeatHasEnded)
 {
     TestDesk desk(ListOf({Item(100)}));
     desk.Start(Second);
-    desk.Do(desk.navigator.SetPointA());
-    desk.navigator.Advance(Second);
-    desk.Do(desk.navigator.SetPointB());
+    SetPoints(desk, Second);
 
     EXPECT_TRUE(desk.navigator.EndABRepeat().IsDone());
     desk.navigator.Advance(2 * Second);
@@ -128,9 +130,7 @@ TEST(Repeat, IsNoRepeatBehindB)
 {
     TestDesk desk(ListOf({Item(10)}));
     desk.Start(Second);
-    desk.Do(desk.navigator.SetPointA());
-    desk.navigator.Advance(Second);
-    desk.Do(desk.navigator.SetPointB());
+    SetPoints(desk, Second);
 
     desk.Do(desk.navigator.SearchTime(2 * Second));
     EXPECT_FALSE(desk.navigator.IsRepeating());
@@ -278,9 +278,7 @@ TEST(Repeat, IsOneKindAtATime)
 {
     TestDesk desk(ListOf({Item(10)}, {Entry(0, 0)}));
     desk.Start();
-    desk.Do(desk.navigator.SetPointA());
-    desk.navigator.Advance(Second);
-    desk.Do(desk.navigator.SetPointB());
+    SetPoints(desk, Second);
 
     desk.Do(desk.navigator.RepeatTitle());
     EXPECT_EQ(desk.navigator.GetCurrentABRepeatState(), bd::TRIGGER_AB_NONE);
@@ -364,16 +362,12 @@ TEST(Trigger, IsReachedBesideTheRepeatThatGoesBackThere)
         std::function<void()> repeat;
         std::uint64_t end;
         std::string heard;
-    } repeats[] = {{[&desk] {
-                        desk.Do(desk.navigator.SetPointA());
-                        desk.navigator.Advance(Second / 2);
-                        desk.Do(desk.navigator.SetPointB());
-                    },
-                    Second / 2, "TriggerTimeReached(6, 22500)\n"},
-                   {[&desk] { desk.Do(desk.navigator.RepeatChapter()); }, 2 * Second,
-                    "TriggerTimeReached(8, 90000)\n"},
-                   {[&desk] { desk.Do(desk.navigator.RepeatTitle()); }, 10 * Second,
-                    "TriggerTimeReached(9, 450000)\n"}};
+    } repeats[] = {
+        {[&desk] { SetPoints(desk, Second / 2); }, Second / 2, "TriggerTimeReached(6, 22500)\n"},
+        {[&desk] { desk.Do(desk.navigator.RepeatChapter()); }, 2 * Second,
+         "TriggerTimeReached(8, 90000)\n"},
+        {[&desk] { desk.Do(desk.navigator.RepeatTitle()); }, 10 * Second,
+         "TriggerTimeReached(9, 450000)\n"}};
     for (const auto& repeat : repeats) {
         SCOPED_TRACE(repeat.heard);
         desk.Start();

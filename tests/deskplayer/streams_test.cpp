@@ -238,64 +238,52 @@ PlayList WithSecondaryStreamsOf(bd::SubPathType type)
     return playList;
 }
 
-TEST(SecondaryStreams, InStepAreAvailableAtNormalSpeedOnly)
-{
-    TestDesk desk(WithSecondaryStreamsOf(bd::SubPathOutOfMuxSynchPipPresentationPath));
-    desk.navigator.Play();
-    EXPECT_EQ(desk.Take(), "0 PlayStarted()\n"
-                           "0 Playlist(7)\n"
-                           "0 PlayItem(7, 0, 6, 15)\n"
-                           "0 VideoInfo(1)\n"
-                           "0 AngleInfo(1)\n"
-                           "0 SecondaryVideoInfo(1)\n"
-                           "0 SecondaryVideoDisplay(1, false)\n"
-                           "0 SecondaryAudioInfo(1)\n"
-                           "0 SecondaryAudioDisplay(1, false)\n"
-                           "0 AudioInfoChanged(false, (8, 0, 0, 0, 0, 0))\n"
-                           "0 PictureInPictureAvailable()\n"
-                           "0 SecondaryAudioAvailable()\n"
-                           "0 UOMask(0)\n"
-                           "0 FirstPictureDelivered()\n"
-                           "0 CurrentTimePosition(0)\n");
+constexpr const char* Available = "0 PictureInPictureAvailable()\n"
+                                  "0 SecondaryAudioAvailable()\n";
+constexpr const char* Unavailable = "0 PictureInPictureUnavailable()\n"
+                                    "0 SecondaryAudioUnavailable()\n";
 
-    desk.navigator.SetPlayMode(Fast());
-    EXPECT_EQ(desk.Take(), "0 PlayMode(0, 6)\n"
-                           "0 PictureInPictureUnavailable()\n"
-                           "0 SecondaryAudioUnavailable()\n");
-    desk.navigator.SetPlayMode(bd::PlayMode());
-    EXPECT_EQ(desk.Take(), "0 PlayMode(0, 5)\n"
-                           "0 PictureInPictureAvailable()\n"
-                           "0 SecondaryAudioAvailable()\n");
+TEST(SecondaryStreams, AreAvailableWithTheItemOnTheirOwnAndBehindItsStreamsInStep)
+{
+    for (const bool inStep : {true, false}) {
+        SCOPED_TRACE(inStep);
+        TestDesk desk(WithSecondaryStreamsOf(inStep
+                                                 ? bd::SubPathOutOfMuxSynchPipPresentationPath
+                                                 : bd::SubPathOutOfMuxASynchPipPresentationPath));
+
+        desk.navigator.Play();
+
+        EXPECT_EQ(desk.Take(), "0 PlayStarted()\n"
+                               "0 Playlist(7)\n"
+                               "0 PlayItem(7, 0, 6, 15)\n" +
+                                   std::string(inStep ? "" : Available) +
+                                   "0 VideoInfo(1)\n"
+                                   "0 AngleInfo(1)\n"
+                                   "0 SecondaryVideoInfo(1)\n"
+                                   "0 SecondaryVideoDisplay(1, false)\n"
+                                   "0 SecondaryAudioInfo(1)\n"
+                                   "0 SecondaryAudioDisplay(1, false)\n"
+                                   "0 AudioInfoChanged(false, (8, 0, 0, 0, 0, 0))\n" +
+                                   (inStep ? Available : "") +
+                                   "0 UOMask(0)\n"
+                                   "0 FirstPictureDelivered()\n"
+                                   "0 CurrentTimePosition(0)\n");
+    }
 }
 
-TEST(SecondaryStreams, OnTheirOwnAreAvailableAtNormalSpeedOnly)
+TEST(SecondaryStreams, AreAvailableAtNormalSpeedOnly)
 {
-    TestDesk desk(WithSecondaryStreamsOf(bd::SubPathOutOfMuxASynchPipPresentationPath));
-    desk.navigator.Play();
-    EXPECT_EQ(desk.Take(), "0 PlayStarted()\n"
-                           "0 Playlist(7)\n"
-                           "0 PlayItem(7, 0, 6, 15)\n"
-                           "0 PictureInPictureAvailable()\n"
-                           "0 SecondaryAudioAvailable()\n"
-                           "0 VideoInfo(1)\n"
-                           "0 AngleInfo(1)\n"
-                           "0 SecondaryVideoInfo(1)\n"
-                           "0 SecondaryVideoDisplay(1, false)\n"
-                           "0 SecondaryAudioInfo(1)\n"
-                           "0 SecondaryAudioDisplay(1, false)\n"
-                           "0 AudioInfoChanged(false, (8, 0, 0, 0, 0, 0))\n"
-                           "0 UOMask(0)\n"
-                           "0 FirstPictureDelivered()\n"
-                           "0 CurrentTimePosition(0)\n");
+    for (const bd::SubPathType type : {bd::SubPathOutOfMuxSynchPipPresentationPath,
+                                       bd::SubPathOutOfMuxASynchPipPresentationPath}) {
+        SCOPED_TRACE(type);
+        TestDesk desk(WithSecondaryStreamsOf(type));
+        desk.Start();
 
-    desk.navigator.SetPlayMode(Fast());
-    EXPECT_EQ(desk.Take(), "0 PlayMode(0, 6)\n"
-                           "0 PictureInPictureUnavailable()\n"
-                           "0 SecondaryAudioUnavailable()\n");
-    desk.navigator.SetPlayMode(bd::PlayMode());
-    EXPECT_EQ(desk.Take(), "0 PlayMode(0, 5)\n"
-                           "0 PictureInPictureAvailable()\n"
-                           "0 SecondaryAudioAvailable()\n");
+        desk.navigator.SetPlayMode(Fast());
+        EXPECT_EQ(desk.Take(), std::string("0 PlayMode(0, 6)\n") + Unavailable);
+        desk.navigator.SetPlayMode(bd::PlayMode());
+        EXPECT_EQ(desk.Take(), std::string("0 PlayMode(0, 5)\n") + Available);
+    }
 }
 
 TEST(SecondaryStreams, AreUnavailableOnceInTheItemThatLacksThem)
