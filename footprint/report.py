@@ -1,9 +1,9 @@
 #!/usr/bin/env python3
 """Prints the figures of docs/footprint.md, for scripts/footprint.
 
-    report.py BUILD BUILD_WITHOUT_LOG_LINES
+    report.py BUILD
 
-Both are build directories. Fails, after printing, when an event takes more than it may.
+BUILD is a build directory. Fails, after printing, when an event takes more than it may.
 """
 
 import pathlib
@@ -106,16 +106,17 @@ def print_program(builds, count):
         print_row(title, [round(getattr(build, attribute) / count) for build in builds])
 
 
-def print_objects(directory, quiet_directory):
+def print_objects(directory):
     print("\nObject files before they are linked, in bytes:\n")
     print_heading("`arm-linux-gnueabihf-size`", ("text", "data", "bss"))
-    library = "CMakeFiles/bdmvnavigator.dir/**/{}.o"
-    print_row("the library", object_sizes(directory, library.format("*")))
-    print_row("the library without log lines", object_sizes(quiet_directory, library.format("*")))
-    print_row("`navigatorevent.cpp`", object_sizes(directory, library.format("navigatorevent.cpp")))
-    for feature in ("rtti", "exceptions"):
-        pattern = f"footprint/CMakeFiles/events_no_{feature}.dir/**/navigatorevent.cpp.o"
-        print_row(f"`navigatorevent.cpp`, `-fno-{feature}`", object_sizes(directory, pattern))
+    for title, pattern in (
+        ("the library", "CMakeFiles/bdmvnavigator.dir/**/*.o"),
+        ("the library without log lines", "**/library_without_log_lines.dir/**/*.o"),
+        ("`navigatorevent.cpp`", "CMakeFiles/bdmvnavigator.dir/**/navigatorevent.cpp.o"),
+        ("`navigatorevent.cpp`, `-fno-rtti`", "**/events_no_rtti.dir/**/*.o"),
+        ("`navigatorevent.cpp`, `-fno-exceptions`", "**/events_no_exceptions.dir/**/*.o"),
+    ):
+        print_row(title, object_sizes(directory, pattern))
 
 
 def print_events(full, quiet):
@@ -127,11 +128,12 @@ def print_events(full, quiet):
 
 
 def main():
-    directory, quiet_directory = sys.argv[1:]
-    full, quiet = (Footprint(f"{path}/footprint/footprint") for path in sys.argv[1:])
+    directory = sys.argv[1]
+    full = Footprint(f"{directory}/footprint/footprint")
+    quiet = Footprint(f"{directory}/footprint/footprint_without_log_lines")
     count = len(full.code_of)
     print_program((full, quiet), count)
-    print_objects(directory, quiet_directory)
+    print_objects(directory)
     print_events(full, quiet)
     if full.beyond_strings > LIMIT * count:
         sys.exit(f"an event takes more than {LIMIT} bytes of text beyond texts and names")

@@ -1,6 +1,6 @@
 /**
  * @file
- * The macros of the base layer: the printf-format attribute and the log guard.
+ * The two macros of the base layer: the printf-format attribute and the log guard.
  */
 #ifndef BD_MACROS_H
 #define BD_MACROS_H
@@ -20,14 +20,6 @@
 #endif
 
 /**
- * Whether log lines are compiled at all; 1 unless the build defines it as 0. At 0 the compiler
- * still checks them and then drops them, with the question at the switch and with their texts.
- */
-#ifndef BD_LOG_LINES
-#define BD_LOG_LINES 1
-#endif
-
-/**
  * Writes one log line if, and only if, the platform's log switch is on for it.
  *
  * A macro because the arguments must not be evaluated while the switch is off: whatever work only
@@ -42,8 +34,7 @@
  */
 #define BD_LOG(tag, ...)                                                                           \
     do {                                                                                           \
-        if (BD_LOG_LINES != 0 &&                                                                   \
-            KEVRO_Log_IsEnabled((tag).component, (tag).level, (tag).hiFreq) != 0) {                \
+        if (KEVRO_Log_IsEnabled((tag).component, (tag).level, (tag).hiFreq) != 0) {                \
             bd::VargLogger((tag).component, (tag).level, (tag).hiFreq).Log(__VA_ARGS__);           \
         }                                                                                          \
     } while (false)
