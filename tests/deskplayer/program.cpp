@@ -90,5 +90,5 @@ ProgramResult RunDeskPlayerOnTerminal(const std::vector<std::string>& arguments)
 ProgramResult RunDeskPlayerInLittleMemory(const std::vector<std::string>& arguments,
                                           unsigned long kibibytes)
 {
-    return Run("ulimit -v " + std::to_string(kibibytes) + " && ", arguments, "");
+    return Run("ulimit -S -v " + std::to_string(kibibytes) + " && ", arguments, "");
 }
