@@ -2,6 +2,7 @@
 
 #include <cinttypes>
 #include <cstdio>
+#include <cstring>
 #include <utility>
 
 #include <spdlog/details/log_msg.h>
@@ -11,52 +12,66 @@
 namespace kevro
 {
 
+namespace
+{
+
+/**
+ * What a queued line is beside its time and its text.
+ *
+ * spdlog's messages have no field for it, but the queue copies the name of a message's logger next
+ * to the text. Nobody needs that name here, so these bytes travel as it.
+ */
+struct Heading {
+    KEVRO_UInt64 number; ///< the first line has 1
+    KEVRO_UInt32 component;
+    KEVRO_UInt32 level;
+
+    spdlog::string_view_t AsName() const
+    {
+        return {reinterpret_cast<const char*>(this), sizeof(*this)};
+    }
+
+    static Heading FromName(spdlog::string_view_t name)
+    {
+        Heading heading;
+        std::memcpy(&heading, name.data(), sizeof(heading));
+        return heading;
+    }
+};
+
+} // namespace
+
 Output::Output(std::mutex& mutex, std::unique_ptr<spdlog::sinks::sink> destination,
                std::size_t queueLines)
-    : m_Destination(std::move(destination)), m_rMutex(mutex), m_Queue(queueLines)
+    : m_Destination(std::move(destination)), m_rMutex(mutex)
 {
     if (queueLines != 0) {
-        m_QueueThread = std::thread([this] { WriteQueued(); });
-    }
-}
-
-Output::~Output()
-{
-    if (m_QueueThread.joinable()) {
-        {
-            const Lock lock(m_rMutex);
-            m_Ending = true;
-            m_LineQueued.notify_one();
-        }
-        m_QueueThread.join();
+        // The logger lives inside this object and shares nothing with it.
+        const spdlog::sink_ptr self(spdlog::sink_ptr(), this);
+        m_Queue = std::make_shared<spdlog::details::thread_pool>(queueLines, 1);
+        m_Logger = std::make_shared<spdlog::async_logger>(
+            std::string(), self, m_Queue, spdlog::async_overflow_policy::overrun_oldest);
     }
 }
 
 void Output::Write(Lock& lock, const LogLine& line) noexcept
 {
-    ++m_Accepted;
-    if (m_Queue.empty()) {
-        const KEVRO_UInt64 lost = LostToReport();
-        lock.unlock();
-        const bool written = WriteToDestination(line, lost);
-        lock.lock();
-        Account(lock, written);
+    if (!m_Queue) {
+        WriteDirectly(lock, line);
         return;
     }
     try {
-        Queue(line);
+        Queue(lock, line);
     } catch (...) {
-        Account(lock, false);
+        ++m_Refused;
     }
 }
 
 void Output::Drain(Lock& lock) noexcept
 {
-    // The queue keeps the order and loses its oldest line first: once as many lines are done as had
-    // been accepted, it is those.
     const KEVRO_UInt64 accepted = m_Accepted;
     m_Progress.wait(lock, [&] { return m_Done >= accepted; });
-    const KEVRO_UInt64 lost = m_Lost;
+    const KEVRO_UInt64 lost = CountLost(lock);
     lock.unlock();
     {
         const std::lock_guard<std::mutex> writing(m_WriteMutex);
@@ -67,59 +82,65 @@ void Output::Drain(Lock& lock) noexcept
 
 void Output::AddLost(const Lock& /*lock*/) noexcept
 {
-    ++m_Lost;
+    ++m_Refused;
 }
 
 KEVRO_UInt64 Output::CountLost(const Lock& /*lock*/) const noexcept
 {
-    return m_Lost;
+    return m_Refused + (m_Queue ? m_Queue->overrun_counter() : 0);
 }
 
-void Output::Queue(const LogLine& line)
+void Output::log(const spdlog::details::log_msg& message)
 {
-    if (m_Waiting == m_Queue.size()) {
-        m_Oldest = m_Oldest + 1 == m_Queue.size() ? 0 : m_Oldest + 1;
-        --m_Waiting;
-        ++m_Done;
-        ++m_Lost;
-    }
-    const std::size_t place = m_Oldest + m_Waiting;
-    QueuedLine& queued = m_Queue[place < m_Queue.size() ? place : place - m_Queue.size()];
-    queued.line = line;
-    queued.text.clear();
-    queued.text.append(line.text.data(), line.text.data() + line.text.size());
-    if (++m_Waiting == 1) {
-        m_LineQueued.notify_one();
-    }
-}
+    const Heading heading = Heading::FromName(message.logger_name);
+    const std::string_view text(message.payload.data(), message.payload.size());
 
-void Output::WriteQueued() noexcept
-{
     Lock lock(m_rMutex);
-    for (;;) {
-        m_LineQueued.wait(lock, [this] { return m_Waiting != 0 || m_Ending; });
-        if (m_Waiting == 0) {
-            return;
-        }
-        QueuedLine& oldest = m_Queue[m_Oldest];
-        const TextBuffer text = std::move(oldest.text);
-        LogLine line = oldest.line;
-        line.text = std::string_view(text.data(), text.size());
-        m_Oldest = m_Oldest + 1 == m_Queue.size() ? 0 : m_Oldest + 1;
-        --m_Waiting;
-
-        const KEVRO_UInt64 lost = LostToReport();
-        lock.unlock();
-        const bool written = WriteToDestination(line, lost);
-        lock.lock();
-        Account(lock, written);
-    }
+    // Not while lines are waiting: each of these reports would cost one of them its place.
+    const KEVRO_UInt64 lost = m_Queue->queue_size() == 0 ? CountLost(lock) : 0;
+    lock.unlock();
+    const bool written =
+        WriteToDestination({message.time, heading.component, heading.level, text}, lost);
+    lock.lock();
+    // The queue keeps the order: the lines before this one are out, or it dropped them.
+    Account(lock, heading.number, written);
 }
 
-KEVRO_UInt64 Output::LostToReport() const noexcept
+void Output::flush()
 {
-    // Not while lines are waiting: each of these reports would cost one of them its place.
-    return m_Waiting == 0 ? m_Lost : 0;
+    m_Destination->flush();
+}
+
+void Output::set_pattern(const std::string& pattern)
+{
+    m_Destination->set_pattern(pattern);
+}
+
+void Output::set_formatter(std::unique_ptr<spdlog::formatter> formatter)
+{
+    m_Destination->set_formatter(std::move(formatter));
+}
+
+void Output::WriteDirectly(Lock& lock, const LogLine& line) noexcept
+{
+    ++m_Accepted;
+    const KEVRO_UInt64 lost = CountLost(lock);
+    lock.unlock();
+    const bool written = WriteToDestination(line, lost);
+    lock.lock();
+    Account(lock, m_Done + 1, written);
+}
+
+void Output::Queue(const Lock& /*lock*/, const LogLine& line)
+{
+    const Heading heading = {m_Accepted + 1, line.component, line.level};
+    // Not through the logger: some versions of it keep to themselves that memory ran out.
+    m_Queue->post_log(std::shared_ptr<spdlog::async_logger>(m_Logger),
+                      spdlog::details::log_msg(
+                          line.time, spdlog::source_loc(), heading.AsName(), Severity(line.level),
+                          spdlog::string_view_t(line.text.data(), line.text.size())),
+                      spdlog::async_overflow_policy::overrun_oldest);
+    ++m_Accepted;
 }
 
 bool Output::WriteToDestination(const LogLine& line, KEVRO_UInt64 lost) noexcept
@@ -158,10 +179,10 @@ void Output::ReportLost(KEVRO_UInt64 lost) noexcept
     }
 }
 
-void Output::Account(const Lock& /*lock*/, bool written) noexcept
+void Output::Account(const Lock& /*lock*/, KEVRO_UInt64 done, bool written) noexcept
 {
-    ++m_Done;
-    m_Lost += written ? 0 : 1;
+    m_Done = done;
+    m_Refused += written ? 0 : 1;
     m_Progress.notify_all();
 }
 

@@ -9,9 +9,10 @@
 #include <cstddef>
 #include <memory>
 #include <mutex>
-#include <thread>
-#include <vector>
+#include <string>
 
+#include <spdlog/async_logger.h>
+#include <spdlog/details/thread_pool.h>
 #include <spdlog/sinks/sink.h>
 
 #include "logline.h"
@@ -20,13 +21,16 @@ namespace kevro
 {
 
 /**
- * Takes lines and hands them to a destination, directly or through a bounded queue.
+ * Takes lines and hands them to a destination, directly or through spdlog's bounded queue.
  *
- * Its mutex is its owner's: who picks an output and gives it a line locks once for both. A writer
- * to a queue does no more than copy its text; names and escape sequences are left to the queue's
- * thread. All operations may be called from several threads at once.
+ * Behind the queue it stands before the destination as a sink of its own: there it composes the
+ * line, so that a writer does no more than copy its text, counts what went through, keeps
+ * exceptions from spdlog, and writes a line where others were lost.
+ *
+ * Its mutex is its owner's: who picks an output and gives it a line locks once for both. All
+ * operations may be called from several threads at once.
  */
-class Output
+class Output final : private spdlog::sinks::sink
 {
 public:
     /** Holds the mutex, before and after; an operation that takes its time lets it go meanwhile. */
@@ -40,7 +44,7 @@ public:
            std::size_t queueLines);
 
     /** Drain() first. No thread may write any more, and the mutex is free. */
-    ~Output();
+    ~Output() override = default;
 
     Output(const Output&) = delete;
     Output& operator=(const Output&) = delete;
@@ -58,36 +62,31 @@ public:
     KEVRO_UInt64 CountLost(const Lock& lock) const noexcept;
 
 private:
-    struct QueuedLine {
-        LogLine line; ///< its text is the one below
-        TextBuffer text;
-    };
+    void log(const spdlog::details::log_msg& message) override;
+    void flush() override;
+    void set_pattern(const std::string& pattern) override;
+    void set_formatter(std::unique_ptr<spdlog::formatter> formatter) override;
 
-    void Queue(const LogLine& line);
-    void WriteQueued() noexcept;
-    KEVRO_UInt64 LostToReport() const noexcept;
+    void WriteDirectly(Lock& lock, const LogLine& line) noexcept;
+    void Queue(const Lock& lock, const LogLine& line);
     bool WriteToDestination(const LogLine& line, KEVRO_UInt64 lost) noexcept;
     bool TryWrite(const LogLine& line) noexcept;
     void ReportLost(KEVRO_UInt64 lost) noexcept;
-    void Account(const Lock& lock, bool written) noexcept;
+    void Account(const Lock& lock, KEVRO_UInt64 done, bool written) noexcept;
 
     const std::unique_ptr<spdlog::sinks::sink> m_Destination;
-    std::mutex m_WriteMutex;         ///< held while the destination takes a line; before m_rMutex
+    std::mutex m_WriteMutex;         ///< held while the destination takes a line
     KEVRO_UInt64 m_ReportedLost = 0; ///< under m_WriteMutex
 
-    // All the following is guarded by it.
-    std::mutex& m_rMutex;
+    std::mutex& m_rMutex; ///< never held while anything is written
     std::condition_variable m_Progress;
-    KEVRO_UInt64 m_Accepted = 0; ///< given to Write()
-    KEVRO_UInt64 m_Done = 0;     ///< written, refused by the destination, or dropped by the queue
-    KEVRO_UInt64 m_Lost = 0;
+    KEVRO_UInt64 m_Accepted = 0; ///< on their way to the destination, or done
+    KEVRO_UInt64 m_Done = 0;     ///< written or lost; of queued lines the number of the last one
+    KEVRO_UInt64 m_Refused = 0;  ///< lost, but not by the queue
 
-    std::vector<QueuedLine> m_Queue; ///< a ring, as long as the queue may be
-    std::size_t m_Oldest = 0;        ///< where the line stands that waits longest
-    std::size_t m_Waiting = 0;       ///< how many wait
-    bool m_Ending = false;
-    std::condition_variable m_LineQueued;
-    std::thread m_QueueThread;
+    std::shared_ptr<spdlog::async_logger> m_Logger; ///< null, or what leads from the queue here
+    // Last, so that the queue's thread ends before anything it uses goes.
+    std::shared_ptr<spdlog::details::thread_pool> m_Queue; ///< null without a queue
 };
 
 } // namespace kevro
