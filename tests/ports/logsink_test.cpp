@@ -1,5 +1,7 @@
 // Where lines go: the sinks, the queue, and the account of what was lost.
 #include <atomic>
+#include <cstdio>
+#include <ctime>
 #include <filesystem>
 #include <fstream>
 #include <future>
@@ -265,6 +267,43 @@ TEST_F(LogSink, KeepsTheOrderOfQueuedLines)
     for (std::size_t i = 0; i < lines.size(); ++i) {
         ASSERT_EQ(TextOf(lines[i]), std::to_string(i));
     }
+}
+
+/** The time as a line shows it. */
+std::string Now()
+{
+    timespec now;
+    clock_gettime(CLOCK_REALTIME, &now);
+    tm local;
+    localtime_r(&now.tv_sec, &local);
+    char text[64];
+    const std::size_t length = std::strftime(text, sizeof(text), "%Y-%m-%d %H:%M:%S", &local);
+    std::snprintf(text + length, sizeof(text) - length, ".%06ld", now.tv_nsec / 1000);
+    return text;
+}
+
+TEST_F(LogSink, ShowsTheTimeAtWhichAQueuedLineWasGiven)
+{
+    StoppedPipe terminal;
+    std::string before;
+    std::string after;
+    std::future<std::vector<std::string>> reading;
+    {
+        const StderrRedirection redirection(terminal.WriteEnd());
+        ConfigureSink("stderr,queue=10");
+        EventLogger().Log("the terminal does not take it");
+        before = Now();
+        EventLogger().Log("nor this one behind it");
+        after = Now();
+        reading = terminal.StartReading();
+        ConfigureSink("file:" + m_LogFile);
+    }
+    terminal.CloseWriteEnd();
+    const auto lines = reading.get();
+    ASSERT_EQ(lines.size(), 2U);
+    const std::string shown = lines[1].substr(0, before.size());
+    EXPECT_LE(before, shown);
+    EXPECT_LE(shown, after);
 }
 
 TEST_F(LogSink, DropsTheOldestQueuedLinesInsteadOfWaitingAndSaysHowMany)
