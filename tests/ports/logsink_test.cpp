@@ -20,7 +20,6 @@ namespace
 
 using porttesting::ConfigureSink;
 using porttesting::EventLogger;
-using porttesting::ReadFile;
 using porttesting::ReadLines;
 using porttesting::ReadToEnd;
 using porttesting::SplitLines;
