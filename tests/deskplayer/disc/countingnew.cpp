@@ -29,6 +29,13 @@ void* operator new(std::size_t size)
     throw std::bad_alloc();
 }
 
+// Sorting asks this one for its buffer.
+void* operator new(std::size_t size, const std::nothrow_t& /*nothrow*/) noexcept
+{
+    g_BytesAskedFor += size;
+    return std::malloc(size);
+}
+
 void operator delete(void* memory) noexcept
 {
     std::free(memory);
