@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <array>
+#include <utility>
 
 #include "output/argumentsjson.h"
 
@@ -87,7 +88,7 @@ TraceOutput::TraceOutput(std::ostream& stream, const VirtualClock& clock,
     : Output(stream, clock, filter)
 {
     for (const std::string_view name : TrackNames) {
-        m_Tracks.push_back({std::string(name), false, ""});
+        m_Tracks.push_back({std::string(name), false, std::nullopt});
     }
     Append(Metadata("process_name", 0, "name", "session"));
 }
@@ -115,7 +116,7 @@ void TraceOutput::Follow(const Callback& callback)
         Begin(Track::Playback, "Still", callback);
         break;
     case CallbackId::StillOff:
-        if (StateOf(Track::Playback).slice == "Still") {
+        if (StateOf(Track::Playback).slice && StateOf(Track::Playback).slice->name == "Still") {
             Begin(Track::Playback, "Playing", callback);
         }
         break;
@@ -202,11 +203,11 @@ void TraceOutput::Write(const Callback& callback)
                 {{"s", "t"}, {"name", info.name}, {"args", ArgumentsJson(callback)}});
 }
 
-void TraceOutput::Begin(Track track, const std::string& slice, const Callback& callback)
+void TraceOutput::Begin(Track track, const std::string& name, const Callback& callback)
 {
     End(track);
-    AppendEvent(track, "B", {{"name", slice}, {"args", ArgumentsJson(callback)}});
-    StateOf(track).slice = slice;
+    StateOf(track).slice = Slice{name, callback};
+    AppendSlice(track, "B", *StateOf(track).slice);
 }
 
 void TraceOutput::BeginNumbered(Track track, std::string_view number, const Callback& callback)
@@ -228,9 +229,8 @@ void TraceOutput::BeginCounted(Track track, std::string_view number, const Callb
 
 void TraceOutput::End(Track track)
 {
-    if (!StateOf(track).slice.empty()) {
-        AppendEvent(track, "E", ordered_json::object());
-        StateOf(track).slice.clear();
+    if (const std::optional<Slice> slice = std::exchange(StateOf(track).slice, std::nullopt)) {
+        AppendSlice(track, "E", *slice);
     }
 }
 
@@ -240,6 +240,12 @@ void TraceOutput::EndPlayback()
          {Track::Playback, Track::PlayMode, Track::PlayList, Track::PlayItem, Track::Chapter}) {
         End(track);
     }
+}
+
+/** Says the same at both ends: some viewers find the begin of a slice by what its end says. */
+void TraceOutput::AppendSlice(Track track, const char* phase, const Slice& slice)
+{
+    AppendEvent(track, phase, {{"name", slice.name}, {"args", ArgumentsJson(slice.callback)}});
 }
 
 void TraceOutput::AppendEvent(Track track, const char* phase, const ordered_json& members)

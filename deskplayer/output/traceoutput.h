@@ -6,6 +6,7 @@
 #define DESKPLAYER_OUTPUT_TRACEOUTPUT_H
 
 #include <cstddef>
+#include <optional>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -40,20 +41,26 @@ public:
 private:
     enum class Track : std::size_t;
 
+    struct Slice {
+        std::string name;
+        Callback callback; ///< that told of it
+    };
+
     struct TrackState {
         std::string name;
-        bool named = false; ///< in the trace: only tracks with something on them are
-        std::string slice;  ///< the open one; empty when there is none
+        bool named = false;         ///< in the trace: only tracks with something on them are
+        std::optional<Slice> slice; ///< the open one
     };
 
     void Follow(const Callback& callback) override;
     void Write(const Callback& callback) override;
 
-    void Begin(Track track, const std::string& slice, const Callback& callback);
+    void Begin(Track track, const std::string& name, const Callback& callback);
     void BeginNumbered(Track track, std::string_view number, const Callback& callback);
     void BeginCounted(Track track, std::string_view number, const Callback& callback);
     void End(Track track);
     void EndPlayback();
+    void AppendSlice(Track track, const char* phase, const Slice& slice);
     void AppendEvent(Track track, const char* phase, const nlohmann::ordered_json& members);
     void Append(const nlohmann::ordered_json& event);
     TrackState& StateOf(Track track) { return m_Tracks[static_cast<std::size_t>(track)]; }

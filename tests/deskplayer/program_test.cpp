@@ -482,6 +482,7 @@ void ExpectTraceThatAViewerCanShow(const std::string& output)
             EXPECT_EQ(track.open.size(), 1U) << event;
         } else if (phase == "E") {
             ASSERT_FALSE(track.open.empty()) << event;
+            EXPECT_EQ(track.open.back(), event.at("name")) << event;
             track.open.pop_back();
         } else {
             EXPECT_EQ(phase, "i") << event;

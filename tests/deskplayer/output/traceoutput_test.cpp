@@ -23,7 +23,7 @@ struct TimedEvent {
     std::string phase;
     std::string track;
     std::uint64_t microseconds;
-    std::string name; ///< empty for the end of a slice
+    std::string name;
     json arguments;
 };
 
@@ -166,6 +166,26 @@ TEST(TraceOutput, BeginsAndEndsInTurnOnEveryTrack)
     for (const auto& [track, count] : open) {
         EXPECT_EQ(count, 0) << track;
     }
+}
+
+TEST(TraceOutput, SaysTheSameWhereASliceBeginsAndWhereItEnds)
+{
+    TracedSession session;
+    for (int round = 0; round < 3; ++round) {
+        CallEveryCallback(*session.operator->());
+        session.PassSecond();
+    }
+
+    std::map<std::string, TimedEvent> open;
+    for (const TimedEvent& event : ReadTrace(session.Trace()).events) {
+        if (event.phase == "B") {
+            open.insert_or_assign(event.track, event);
+        } else if (event.phase == "E") {
+            EXPECT_EQ(event.name, open.at(event.track).name) << event.track;
+            EXPECT_EQ(event.arguments, open.at(event.track).arguments) << event.track;
+        }
+    }
+    EXPECT_EQ(open.size(), 14U);
 }
 
 TEST(TraceOutput, HasTimesThatNeverDecrease)
@@ -423,7 +443,7 @@ TEST(TraceOutput, HidesInstantsButNoSlicesByTheFilter)
     for (const TimedEvent& event : ReadTrace(session.Trace()).events) {
         events += event.phase + " " + event.name + ", ";
     }
-    EXPECT_EQ(events, "B Playing, E , B Paused, i Stepped, E , ");
+    EXPECT_EQ(events, "B Playing, E Playing, B Paused, i Stepped, E Paused, ");
 }
 
 } // namespace
