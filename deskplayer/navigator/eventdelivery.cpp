@@ -5,6 +5,14 @@
 namespace deskplayer
 {
 
+namespace
+{
+
+/** How often a thread lets the other one run before it falls asleep. */
+constexpr int Patience = 100;
+
+} // namespace
+
 EventDelivery::EventDelivery() : m_Thread(&EventDelivery::Deliver, this) {}
 
 EventDelivery::~EventDelivery()
@@ -30,17 +38,29 @@ void EventDelivery::Post(std::unique_ptr<bdmv::INavigatorEvent> event)
 void EventDelivery::Settle()
 {
     std::unique_lock<std::mutex> lock(m_Mutex);
-    m_Changed.wait(lock, [this] { return m_Undelivered == 0; });
+    Wait(lock, [this] { return m_Undelivered == 0; });
     if (const std::exception_ptr failure = std::exchange(m_Failure, nullptr)) {
         std::rethrow_exception(failure);
     }
+}
+
+/** Waking a thread takes many times what an event does, so there is no hurry to sleep. */
+template <typename Condition>
+void EventDelivery::Wait(std::unique_lock<std::mutex>& lock, Condition condition)
+{
+    for (int turn = 0; turn < Patience && !condition(); ++turn) {
+        lock.unlock();
+        std::this_thread::yield();
+        lock.lock();
+    }
+    m_Changed.wait(lock, condition);
 }
 
 void EventDelivery::Deliver()
 {
     std::unique_lock<std::mutex> lock(m_Mutex);
     for (;;) {
-        m_Changed.wait(lock, [this] { return m_Ending || !m_Queue.empty(); });
+        Wait(lock, [this] { return m_Ending || !m_Queue.empty(); });
         if (m_Queue.empty()) {
             return;
         }

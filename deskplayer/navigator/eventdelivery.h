@@ -53,6 +53,8 @@ public:
 
 private:
     void Deliver();
+    template <typename Condition>
+    void Wait(std::unique_lock<std::mutex>& lock, Condition condition);
 
     bdmv::INavigatorEvent::Listeners m_Listeners;
     std::mutex m_Mutex; ///< guards what follows
