@@ -641,6 +641,17 @@ TEST_F(ScratchDisc, ShowsHowFarItHasComeWhenItTakesLong)
     EXPECT_EQ(result.output, "\r00:00:01.000\r             \r") << "and nothing in the end";
 }
 
+TEST_F(ScratchDisc, ShowsNoProgressWithoutATerminal)
+{
+    MakeShort(45 * 1500);
+
+    const ProgramResult result =
+        RunDeskPlayer({disc, "--realtime", "--output", folder / "out.txt"});
+
+    EXPECT_EQ(result.status, 0);
+    EXPECT_EQ(result.errors, "");
+}
+
 TEST_F(ScratchDisc, ShowsNoProgressBesideItsOutput)
 {
     MakeShort(45 * 1500);
