@@ -102,6 +102,17 @@ private:
     std::optional<TraceOutput> m_Output;
 };
 
+/** Of a session in which everything happens three times, a second apart. */
+std::vector<TimedEvent> EventsOfThreeRounds()
+{
+    TracedSession session;
+    for (int round = 0; round < 3; ++round) {
+        CallEveryCallback(*session.operator->());
+        session.PassSecond();
+    }
+    return ReadTrace(session.Trace()).events;
+}
+
 TEST(TraceOutput, IsValidWhenNothingHappened)
 {
     const json trace = TracedSession().Trace();
@@ -148,14 +159,8 @@ TEST(TraceOutput, GivesTheArgumentsOfACallback)
 
 TEST(TraceOutput, BeginsAndEndsInTurnOnEveryTrack)
 {
-    TracedSession session;
-    for (int round = 0; round < 3; ++round) {
-        CallEveryCallback(*session.operator->());
-        session.PassSecond();
-    }
-
     std::map<std::string, int> open;
-    for (const TimedEvent& event : ReadTrace(session.Trace()).events) {
+    for (const TimedEvent& event : EventsOfThreeRounds()) {
         if (event.phase == "B") {
             EXPECT_EQ(++open[event.track], 1) << event.track << ' ' << event.name;
         } else if (event.phase == "E") {
@@ -170,14 +175,8 @@ TEST(TraceOutput, BeginsAndEndsInTurnOnEveryTrack)
 
 TEST(TraceOutput, SaysTheSameWhereASliceBeginsAndWhereItEnds)
 {
-    TracedSession session;
-    for (int round = 0; round < 3; ++round) {
-        CallEveryCallback(*session.operator->());
-        session.PassSecond();
-    }
-
     std::map<std::string, TimedEvent> open;
-    for (const TimedEvent& event : ReadTrace(session.Trace()).events) {
+    for (const TimedEvent& event : EventsOfThreeRounds()) {
         if (event.phase == "B") {
             open.insert_or_assign(event.track, event);
         } else if (event.phase == "E") {
@@ -190,14 +189,8 @@ TEST(TraceOutput, SaysTheSameWhereASliceBeginsAndWhereItEnds)
 
 TEST(TraceOutput, HasTimesThatNeverDecrease)
 {
-    TracedSession session;
-    for (int round = 0; round < 3; ++round) {
-        CallEveryCallback(*session.operator->());
-        session.PassSecond();
-    }
-
     std::uint64_t last = 0;
-    for (const TimedEvent& event : ReadTrace(session.Trace()).events) {
+    for (const TimedEvent& event : EventsOfThreeRounds()) {
         EXPECT_GE(event.microseconds, last) << event.track << ' ' << event.name;
         last = event.microseconds;
     }
