@@ -7,7 +7,6 @@
 
 #include <benchmark/benchmark.h>
 
-#include <cmath>
 #include <cstdint>
 #include <cstdio>
 #include <string>
@@ -99,10 +98,9 @@ void PrintTable(const bench::Report& report)
     const double twoHours = report[TwoHours.Row()].wall;
     for (const Session& session : Sessions) {
         const bench::Row row = report[session.Row()];
-        const auto events = row.counters.find(EventsCounter);
         std::printf("  %10d%12d", session.minutes, session.listeners);
         bench::PrintNumber(12, 1, row.wall);
-        bench::PrintNumber(12, 0, events == row.counters.end() ? std::nan("") : events->second);
+        bench::PrintNumber(12, 0, row.Counter(EventsCounter));
         bench::PrintNumber(9, 2, row.wall / twoHours);
         std::printf("\n");
     }

@@ -23,6 +23,12 @@ double Median(std::vector<double> values)
 
 } // namespace
 
+double Row::Counter(const std::string& name) const
+{
+    const auto found = counters.find(name);
+    return found == counters.end() ? std::numeric_limits<double>::quiet_NaN() : found->second;
+}
+
 void Report::ReportRuns(const std::vector<Run>& runs)
 {
     for (const Run& run : runs) {

@@ -22,6 +22,8 @@ struct Row {
     double cpu;  ///< of the processor for the calling thread
     double wall; ///< passed; with several threads, divided by their number
     std::map<std::string, double> counters;
+
+    double Counter(const std::string& name) const;
 };
 
 /** Keeps the repetitions of every row instead of printing them. */

@@ -131,11 +131,9 @@ void PrintThreads(const Report& report)
                 const double floor = report[ThreadRow(lists, FloorName, threads)].wall;
                 std::printf("  %d threads, %-20s %-16s", threads, lists, subject);
                 PrintTime(row.wall * threads, floor * threads);
-                const auto waited = row.counters.find(WaitedCounter);
                 PrintNumber(9, 0, 100 * row.cpu / (row.wall * threads));
                 std::printf(" %%");
-                PrintNumber(9, 0,
-                            waited == row.counters.end() ? std::nan("") : 100 * waited->second);
+                PrintNumber(9, 0, 100 * row.Counter(WaitedCounter));
                 std::printf(" %%\n");
             }
         }
