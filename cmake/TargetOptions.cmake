@@ -24,3 +24,11 @@ function(bdmvnavigator_target_options target)
     target_compile_options(${target} PRIVATE -Werror)
   endif()
 endfunction()
+
+# bdmvnavigator_sources_of(TARGET VARIABLE): where its sources are, to compile them in another way.
+function(bdmvnavigator_sources_of target variable)
+  get_target_property(sources ${target} SOURCES)
+  get_target_property(folder ${target} SOURCE_DIR)
+  list(TRANSFORM sources PREPEND ${folder}/)
+  set(${variable} ${sources} PARENT_SCOPE)
+endfunction()
