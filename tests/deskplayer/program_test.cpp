@@ -19,7 +19,7 @@
 #include <thread>
 
 #include "disc/bytewriter.h"
-#include "disc/disc.h"
+#include "disc/testdiscs.h"
 #include "output/callbacks.h"
 #include "session/script.h"
 
@@ -964,38 +964,19 @@ TEST_F(HostileInput, CanBeAPipeOrAFolderInThePlaceOfAPlayList)
     ExpectRefusedPlayList("PLAYLIST/00001.mpls: not a regular file, expected one");
 }
 
-/** A play list of almost the greatest size whose values take the most memory. */
-deskplayer::Bytes DensePlayList(unsigned claimedItems)
-{
-    using namespace deskplayer;
-    const Bytes smallestStream{1, 9, 1, 0x7F};
-    PlayItemBytes item;
-    item.streamTable = StreamTableBytes(Join({Repeat(4, {0xFF}), Zeros(2), {0xFF, 0}}),
-                                        Repeat(std::size_t{5} * 255, smallestStream));
-    PlayListBytes bytes;
-    const auto items = static_cast<unsigned>(LargestPlayListFile / item.Make().size());
-    bytes.itemCount = std::max(items, claimedItems);
-    bytes.items = Repeat(items, item.Make());
-    return bytes.Make();
-}
-
-void WriteBytes(const fs::path& path, const deskplayer::Bytes& bytes)
-{
-    std::ofstream(path, std::ios::binary)
-        .write(reinterpret_cast<const char*>(bytes.data()),
-               static_cast<std::streamsize>(bytes.size()));
-}
-
 TEST_F(HostileInput, CanClaimMoreThanItHas)
 {
-    WriteBytes(playList, DensePlayList(20000));
+    deskplayer::PlayListBytes bytes = deskplayer::DensePlayList();
+    bytes.itemCount = 20000;
+    deskplayer::WriteBytes(playList, bytes.Make());
     ExpectRefusedPlayList("PLAYLIST/00001.mpls: offset ");
 }
 
 TEST_F(HostileInput, CanBeThePlayListThatTakesTheMostMemory)
 {
-    WriteBytes(playList, DensePlayList(0));
-    WriteBytes(disc / "BDMV/PLAYLIST/00002.mpls", DensePlayList(0));
+    const deskplayer::Bytes dense = deskplayer::DensePlayList().Make();
+    deskplayer::WriteBytes(playList, dense);
+    deskplayer::WriteBytes(disc / "BDMV/PLAYLIST/00002.mpls", dense);
     for (const std::vector<std::string>& option :
          {std::vector<std::string>{"--list"}, {"--describe", "1"}, {}}) {
         std::vector<std::string> arguments = {disc};

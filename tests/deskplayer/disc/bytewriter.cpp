@@ -2,6 +2,8 @@
 
 #include <algorithm>
 
+#include "disc/disc.h"
+
 namespace deskplayer
 {
 
@@ -158,6 +160,18 @@ PlayListBytes WithStreams(const Bytes& counts, const Bytes& streams)
     PlayItemBytes item;
     item.streamTable = StreamTableBytes(counts, streams);
     return WithItem(item);
+}
+
+PlayListBytes DensePlayList()
+{
+    const Bytes smallestStream{1, 9, 1, 0x7F};
+    PlayItemBytes item;
+    item.streamTable = StreamTableBytes(Join({Repeat(4, {0xFF}), Zeros(2), {0xFF, 0}}),
+                                        Repeat(std::size_t{5} * 255, smallestStream));
+    PlayListBytes playList;
+    playList.itemCount = unsigned(LargestPlayListFile / item.Make().size());
+    playList.items = Repeat(playList.itemCount, item.Make());
+    return playList;
 }
 
 Bytes ClipInfoOf(unsigned count, const Bytes& programs)

@@ -105,6 +105,12 @@ PlayListBytes WithItem(const PlayItemBytes& item);
 /** A play list of one play item with the streams of @p streamTable. */
 PlayListBytes WithStreams(const Bytes& counts, const Bytes& streams);
 
+/**
+ * The densest play list there can be, whose values take the most memory: streams of four bytes, in
+ * as many items as fit into the greatest file that is read.
+ */
+PlayListBytes DensePlayList();
+
 /** A program of clip information with @p count streams. */
 Bytes ProgramBytes(unsigned count, const Bytes& streams);
 

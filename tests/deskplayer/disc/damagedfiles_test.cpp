@@ -154,15 +154,7 @@ TEST(DamagedFiles, DoNotGetMemoryForWhatTheyOnlyAnnounce)
 
 TEST(DamagedFiles, GetMemoryInProportionToTheirSizeAtMost)
 {
-    // The densest play list there can be: streams of four bytes, in as many items as fit.
-    const Bytes smallestStream{1, 9, 1, 0x7F};
-    PlayItemBytes item;
-    item.streamTable = StreamTableBytes(Join({Repeat(4, {0xFF}), Zeros(2), {0xFF, 0}}),
-                                        Repeat(std::size_t{5} * 255, smallestStream));
-    PlayListBytes bytes;
-    bytes.itemCount = unsigned(LargestPlayListFile / item.Make().size());
-    bytes.items = Repeat(bytes.itemCount, item.Make());
-    const Bytes dense = bytes.Make();
+    const Bytes dense = DensePlayList().Make();
     ASSERT_GT(dense.size(), LargestPlayListFile * 9 / 10);
     EXPECT_LT(MemoryForPlayList(dense), 40 * dense.size());
 }

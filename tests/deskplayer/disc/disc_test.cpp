@@ -1,5 +1,3 @@
-#include <fstream>
-
 #include <gtest/gtest.h>
 #include <sys/resource.h>
 #include <unistd.h>
@@ -36,8 +34,7 @@ protected:
 
     void Write(const std::string& name, const Bytes& bytes) const
     {
-        std::ofstream(PathOf(name), std::ios::binary)
-            .write(reinterpret_cast<const char*>(bytes.data()), std::streamsize(bytes.size()));
+        WriteBytes(PathOf(name), bytes);
     }
 
     /** A play list of one item of @p duration ticks. */

@@ -68,11 +68,12 @@ TEST_P(EveryDisc, HasTheExpectedClips)
 TEST_P(EveryDisc, HasTheExpectedPlayLists)
 {
     json playLists = json::object();
+    AspectRatios ratios(m_Disc);
     for (const std::uint32_t number : m_Disc.PlayListNumbers()) {
         const PlayList playList = m_Disc.ReadPlayList(number);
         const std::string name = std::to_string(100000 + number).substr(1);
         playLists[name] = ToJson(playList, [&](std::size_t playItem, const Stream& stream) {
-            return AspectRatios(m_Disc).Find(playList, playItem, stream).code;
+            return ratios.Find(playList, playItem, stream).code;
         });
     }
     Compare(playLists, m_Expected.at("play_lists"));

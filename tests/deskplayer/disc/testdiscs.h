@@ -30,6 +30,9 @@ std::vector<std::filesystem::path> FilesBelow(const std::filesystem::path& folde
 
 Bytes ContentOf(const std::filesystem::path& path);
 
+/** Makes the file, or writes it anew. */
+void WriteBytes(const std::filesystem::path& path, const Bytes& bytes);
+
 } // namespace deskplayer
 
 #endif

@@ -193,6 +193,7 @@ TEST(DescribePlayList, ShowsWhicheverByteIsChanged)
 {
     const ScratchDisc scratch("pip");
     const Disc disc = scratch.Read();
+    AspectRatios ratios(disc);
     std::size_t compared = 0;
     Bytes bytes = RichPlayList();
     for (std::uint8_t& byte : bytes) {
@@ -207,7 +208,7 @@ TEST(DescribePlayList, ShowsWhicheverByteIsChanged)
                 continue;
             }
             json expected = ToJson(playList, [&](std::size_t playItem, const Stream& stream) {
-                return AspectRatios(disc).Find(playList, playItem, stream).code;
+                return ratios.Find(playList, playItem, stream).code;
             });
             expected["chapters"] = ExpectedChapters(expected);
             RemoveSubPathsOfReservedEntryTypes(expected);

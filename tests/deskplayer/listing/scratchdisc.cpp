@@ -2,8 +2,6 @@
 
 #include <unistd.h>
 
-#include <fstream>
-
 #include "../disc/testdiscs.h"
 
 namespace deskplayer
@@ -26,9 +24,7 @@ ScratchDisc::~ScratchDisc()
 
 void ScratchDisc::Write(const std::string& name, const Bytes& content) const
 {
-    std::ofstream file(m_Folder / "BDMV" / name, std::ios::binary);
-    file.write(reinterpret_cast<const char*>(content.data()),
-               static_cast<std::streamsize>(content.size()));
+    WriteBytes(m_Folder / "BDMV" / name, content);
 }
 
 void ScratchDisc::Remove(const std::string& name) const
