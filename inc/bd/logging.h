@@ -7,6 +7,9 @@
  * BD_LOG(Diagnostic, "play item %u has no stream table", playItemId);
  * @endcode
  *
+ * Levels: a line's level is a value of bd::LogLevelDef or of KEVRO_Log_Level, which are one list of
+ * numbers. LogHighFrequency is not a line's level: high frequency is the separate flag.
+ *
  * Cost: while the platform's switch is off for the tag, a line costs one call of
  * KEVRO_Log_IsEnabled() and a test; its arguments are not evaluated. While it is on, the writer is
  * three words on the stack. Nothing here allocates, and nothing limits the length of a line.
@@ -99,11 +102,10 @@ enum LogLevelDef : KEVRO_Int32 {
     LogRuntime = 12,
     LogFatal = 13,
     LogLevel__sizeof = 14, ///< number of levels; not a level
-    LogHighFrequency = 16  ///< marks high-frequency logging; not a level of the platform
+    LogHighFrequency = 16  ///< marks high-frequency logging; not a level of a line
 };
 
-// A log tag carries a platform level, so a drift between the two lists would change meaning
-// silently.
+// A level may come from either list, so a drift between the two would change meaning silently.
 static_assert(static_cast<KEVRO_Int32>(LogMethod) == KEVRO_Log_LevelMethod, "one list of levels");
 static_assert(static_cast<KEVRO_Int32>(LogInterface) == KEVRO_Log_LevelInterface,
               "one list of levels");
@@ -122,22 +124,34 @@ static_assert(static_cast<KEVRO_Int32>(LogRuntime) == KEVRO_Log_LevelRuntime, "o
 static_assert(static_cast<KEVRO_Int32>(LogFatal) == KEVRO_Log_LevelFatal, "one list of levels");
 static_assert(static_cast<KEVRO_Int32>(LogLevel__sizeof) == KEVRO_Log_Level__sizeof,
               "one list of levels");
-static_assert(sizeof(KEVRO_Log_Level) == 4, "passed to the platform as 32 bits");
+static_assert(sizeof(KEVRO_Log_Level) == 4, "layout of the writer");
 
 /** Component, level and high-frequency flag: what a line is switched on by and written under. */
 struct LogTag {
     KEVRO_UInt32 component; ///< a CompIdDef value
-    KEVRO_Log_Level level;
-    KEVRO_Bool hiFreq; ///< non-zero for high-frequency lines
+    KEVRO_Int32 level;      ///< a LogLevelDef or KEVRO_Log_Level value
+    KEVRO_Bool hiFreq;      ///< non-zero for high-frequency lines
 };
 
 /** Writes lines under one component, level and high-frequency flag. Lives on the stack. */
 class VargLogger
 {
 public:
-    /** Stores the three values and does nothing else. */
+    /**
+     * Stores the three values and does nothing else.
+     *
+     * @param userId a CompIdDef value
+     * @param level  the level of every line written
+     * @param hiFreq non-zero for high-frequency lines
+     */
     VargLogger(KEVRO_UInt32 userId, KEVRO_Log_Level level, KEVRO_Bool hiFreq)
         : m_UserId(userId), m_Level(level), m_HiFreq(hiFreq)
+    {
+    }
+
+    /** The same, with a level of the library's own enumeration: any but LogHighFrequency. */
+    VargLogger(KEVRO_UInt32 userId, LogLevelDef level, KEVRO_Bool hiFreq)
+        : VargLogger(userId, static_cast<KEVRO_Log_Level>(level), hiFreq)
     {
     }
 

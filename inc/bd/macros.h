@@ -35,7 +35,9 @@
 #define BD_LOG(tag, ...)                                                                           \
     do {                                                                                           \
         if (KEVRO_Log_IsEnabled((tag).component, (tag).level, (tag).hiFreq) != 0) {                \
-            bd::VargLogger((tag).component, (tag).level, (tag).hiFreq).Log(__VA_ARGS__);           \
+            bd::VargLogger((tag).component, static_cast<bd::LogLevelDef>((tag).level),             \
+                           (tag).hiFreq)                                                           \
+                .Log(__VA_ARGS__);                                                                 \
         }                                                                                          \
     } while (false)
 

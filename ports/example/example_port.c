@@ -17,7 +17,7 @@ int g_u1Bduopmask = 0;
  * A real port looks up one bit in a table that its debug console changes: one relaxed atomic load,
  * no lock. It is asked for every event, mostly to answer no.
  */
-KEVRO_Bool KEVRO_Log_IsEnabled(KEVRO_UInt32 component, KEVRO_Log_Level level, KEVRO_Bool hiFreq)
+KEVRO_Bool KEVRO_Log_IsEnabled(KEVRO_UInt32 component, KEVRO_Int32 level, KEVRO_Bool hiFreq)
 {
     (void)component;
     (void)level;
@@ -29,7 +29,7 @@ KEVRO_Bool KEVRO_Log_IsEnabled(KEVRO_UInt32 component, KEVRO_Log_Level level, KE
  * A real port formats the line with vsnprintf, puts time, component and level before it, makes
  * control characters harmless and hands it to the system's log without waiting for a slow one.
  */
-void KEVRO_Log_VWrite(KEVRO_UInt32 component, KEVRO_Log_Level level, KEVRO_Bool hiFreq,
+void KEVRO_Log_VWrite(KEVRO_UInt32 component, KEVRO_Int32 level, KEVRO_Bool hiFreq,
                       const char* format, va_list args)
 {
     (void)component;

@@ -18,9 +18,9 @@ void Append(TextBuffer& buffer, std::string_view text)
 }
 
 /** The name of a number, or the number where it has none. */
-void AppendName(TextBuffer& buffer, const Names& names, KEVRO_UInt32 number)
+template <typename Number> void AppendName(TextBuffer& buffer, const Names& names, Number number)
 {
-    if (const Names::Entry* const entry = names.Find(number)) {
+    if (const Names::Entry* const entry = names.Find(static_cast<KEVRO_UInt32>(number))) {
         Append(buffer, entry->name);
         return;
     }
@@ -40,7 +40,7 @@ void AppendLine(TextBuffer& buffer, const LogLine& line)
     AppendPrintable(buffer, line.text);
 }
 
-spdlog::level::level_enum Severity(KEVRO_UInt32 level)
+spdlog::level::level_enum Severity(KEVRO_Int32 level)
 {
     switch (level) {
     case KEVRO_Log_LevelFatal:

@@ -21,7 +21,7 @@ using TextBuffer = spdlog::memory_buf_t;
 struct LogLine {
     spdlog::log_clock::time_point time;
     KEVRO_UInt32 component;
-    KEVRO_UInt32 level;
+    KEVRO_Int32 level;
     std::string_view text;
 };
 
@@ -29,7 +29,7 @@ struct LogLine {
 void AppendLine(TextBuffer& buffer, const LogLine& line);
 
 /** What spdlog and the system's logger call a level. */
-spdlog::level::level_enum Severity(KEVRO_UInt32 level);
+spdlog::level::level_enum Severity(KEVRO_Int32 level);
 
 } // namespace kevro
 

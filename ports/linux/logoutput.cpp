@@ -24,7 +24,7 @@ namespace
 struct Heading {
     KEVRO_UInt64 number; ///< the first line has 1
     KEVRO_UInt32 component;
-    KEVRO_UInt32 level;
+    KEVRO_Int32 level;
 
     spdlog::string_view_t AsName() const
     {

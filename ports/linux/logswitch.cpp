@@ -129,9 +129,9 @@ void Configure(const char* text)
 
 } // namespace kevro
 
-KEVRO_Bool KEVRO_Log_IsEnabled(KEVRO_UInt32 component, KEVRO_Log_Level level, KEVRO_Bool hiFreq)
+KEVRO_Bool KEVRO_Log_IsEnabled(KEVRO_UInt32 component, KEVRO_Int32 level, KEVRO_Bool hiFreq)
 {
-    const KEVRO_UInt32 number = kevro::LevelNumber(level);
+    const auto number = static_cast<KEVRO_UInt32>(level); // a negative one is above all levels
     if (number >= KEVRO_Log_Level__sizeof) {
         return 0;
     }

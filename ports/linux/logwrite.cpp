@@ -3,13 +3,12 @@
 
 #include "kevro/kevro_log.h"
 #include "logchannel.h"
-#include "names.h"
 
-void KEVRO_Log_VWrite(KEVRO_UInt32 component, KEVRO_Log_Level level, KEVRO_Bool, const char* format,
+void KEVRO_Log_VWrite(KEVRO_UInt32 component, KEVRO_Int32 level, KEVRO_Bool, const char* format,
                       va_list args)
 {
     using namespace kevro;
-    LogLine line = {spdlog::log_clock::now(), component, LevelNumber(level), {}};
+    LogLine line = {spdlog::log_clock::now(), component, level, {}};
     va_list argsAgain;
     va_copy(argsAgain, args);
     try {

@@ -6,10 +6,9 @@
 #define KEVRO_NAMES_H
 
 #include <cstddef>
-#include <cstring>
 #include <string_view>
 
-#include "kevro/kevro_log.h"
+#include "kevro/kevro_types.h"
 
 namespace kevro
 {
@@ -47,15 +46,6 @@ private:
 
 extern const Names Components;
 extern const Names Levels;
-
-/** The number of a level. A caller in C may pass any, so it is not looked at as an enumerator. */
-inline KEVRO_UInt32 LevelNumber(const KEVRO_Log_Level& level)
-{
-    KEVRO_UInt32 number;
-    static_assert(sizeof(number) == sizeof(level), "a level is passed as 32 bits");
-    std::memcpy(&number, &level, sizeof(number));
-    return number;
-}
 
 } // namespace kevro
 

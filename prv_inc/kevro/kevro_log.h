@@ -15,7 +15,13 @@
 extern "C" {
 #endif
 
-/** Levels of a log line. The values are those of bd::LogLevelDef. */
+/**
+ * Levels of a log line. The values are those of bd::LogLevelDef.
+ *
+ * The functions below take a level as an integer, so that a caller may name it by either
+ * enumeration. A C compiler may choose an unsigned type for a variable of this one: cast such a
+ * variable to KEVRO_Int32 where conversions of the sign are reported.
+ */
 typedef enum KEVRO_Log_Level {
     KEVRO_Log_LevelMethod = 0,
     KEVRO_Log_LevelInterface = 1,
@@ -40,11 +46,11 @@ typedef enum KEVRO_Log_Level {
  * Has no side effects and is cheap enough to be called for every event.
  *
  * @param component a bd::CompIdDef value
- * @param level     the level of the line
+ * @param level     a KEVRO_Log_Level or bd::LogLevelDef value
  * @param hiFreq    non-zero for a high-frequency line
  * @return non-zero when the line would be written, 0 otherwise
  */
-KEVRO_Bool KEVRO_Log_IsEnabled(KEVRO_UInt32 component, KEVRO_Log_Level level, KEVRO_Bool hiFreq);
+KEVRO_Bool KEVRO_Log_IsEnabled(KEVRO_UInt32 component, KEVRO_Int32 level, KEVRO_Bool hiFreq);
 
 /**
  * Formats and writes one line; a line that cannot be written is dropped.
@@ -53,7 +59,7 @@ KEVRO_Bool KEVRO_Log_IsEnabled(KEVRO_UInt32 component, KEVRO_Log_Level level, KE
  * nor keeps @p format, @p args or what they point to after it has returned.
  *
  * @param component a bd::CompIdDef value
- * @param level     the level of the line
+ * @param level     a KEVRO_Log_Level or bd::LogLevelDef value
  * @param hiFreq    non-zero for a high-frequency line
  * @param format    a printf format without a line end
  * @param args      its arguments
@@ -61,7 +67,7 @@ KEVRO_Bool KEVRO_Log_IsEnabled(KEVRO_UInt32 component, KEVRO_Log_Level level, KE
 #if defined(__GNUC__)
 __attribute__((format(printf, 4, 0)))
 #endif
-void KEVRO_Log_VWrite(KEVRO_UInt32 component, KEVRO_Log_Level level, KEVRO_Bool hiFreq,
+void KEVRO_Log_VWrite(KEVRO_UInt32 component, KEVRO_Int32 level, KEVRO_Bool hiFreq,
                       const char* format, va_list args);
 
 #ifdef __cplusplus

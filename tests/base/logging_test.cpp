@@ -8,6 +8,9 @@
 #include "support/allocationcounter.h"
 #include "support/fakeplatform.h"
 
+extern "C" KEVRO_Bool IsEnabledFromC();
+extern "C" void WriteFromC(int ignored, ...);
+
 namespace
 {
 
@@ -19,8 +22,7 @@ class Logging : public testing::Test
 protected:
     void SwitchAnswers(KEVRO_Bool answer)
     {
-        platform.SetLogSwitch(
-            [answer](KEVRO_UInt32, KEVRO_Log_Level, KEVRO_Bool) { return answer; });
+        platform.SetLogSwitch([answer](KEVRO_UInt32, KEVRO_Int32, KEVRO_Bool) { return answer; });
     }
 
     /** An argument of a line whose evaluation leaves a trace. */
@@ -46,6 +48,71 @@ TEST_F(Logging, LoggerHoldsItsThreeValuesInOrder)
     EXPECT_EQ(57u, words[0]);
     EXPECT_EQ(3u, words[1]);
     EXPECT_EQ(9u, words[2]);
+}
+
+TEST_F(Logging, LoggerHoldsTheSameWhicheverEnumerationNamesItsLevel)
+{
+    const bd::VargLogger one(bd::CompIdBdmvNavigator, KEVRO_Log_LevelEvent, 0);
+    const bd::VargLogger other(bd::CompIdBdmvNavigator, bd::LogEvent, 0);
+
+    EXPECT_EQ(0, std::memcmp(&one, &other, sizeof(other)));
+}
+
+TEST_F(Logging, LoggerWritesAtAnyLevelOfItsOwnEnumeration)
+{
+    for (KEVRO_Int32 level = bd::LogMethod; level < bd::LogLevel__sizeof; ++level) {
+        bd::VargLogger(57, static_cast<bd::LogLevelDef>(level), 0).Log("text");
+
+        EXPECT_EQ("log 57 " + std::to_string(level) + " 0: text\n", journal.Take());
+    }
+}
+
+TEST_F(Logging, SwitchIsAskedTheSameWhateverNamesTheLevel)
+{
+    const KEVRO_Log_Level platformLevel = KEVRO_Log_LevelEvent;
+    const bd::LogLevelDef ownLevel = bd::LogEvent;
+
+    KEVRO_Log_IsEnabled(57, 5, 0);
+    KEVRO_Log_IsEnabled(bd::CompIdBdmvNavigator, bd::LogEvent, 0);
+    KEVRO_Log_IsEnabled(bd::CompIdBdmvNavigator, KEVRO_Log_LevelEvent, 0);
+    KEVRO_Log_IsEnabled(bd::CompIdBdmvNavigator, platformLevel, 0);
+    KEVRO_Log_IsEnabled(bd::CompIdBdmvNavigator, ownLevel, 0);
+
+    EXPECT_EQ("log? 57 5 0 -> on\n"
+              "log? 57 5 0 -> on\n"
+              "log? 57 5 0 -> on\n"
+              "log? 57 5 0 -> on\n"
+              "log? 57 5 0 -> on\n",
+              journal.Take());
+}
+
+TEST_F(Logging, SwitchIsAskedTheSameInC)
+{
+    EXPECT_EQ(1, IsEnabledFromC());
+
+    EXPECT_EQ("log? 57 5 0 -> on\n"
+              "log? 57 5 0 -> on\n"
+              "log? 57 5 0 -> on\n",
+              journal.Take());
+}
+
+TEST_F(Logging, LineIsWrittenTheSameInC)
+{
+    WriteFromC(0, 7);
+
+    EXPECT_EQ("log 57 5 0: number 7\n"
+              "log 57 5 0: number 7\n",
+              journal.Take());
+}
+
+TEST_F(Logging, SwitchIsAskedForAnyNumber)
+{
+    KEVRO_Log_IsEnabled(57, bd::LogHighFrequency, 0);
+    KEVRO_Log_IsEnabled(57, INT32_MIN, 0);
+
+    EXPECT_EQ("log? 57 16 0 -> on\n"
+              "log? 57 -2147483648 0 -> on\n",
+              journal.Take());
 }
 
 TEST_F(Logging, MakingAndDroppingALoggerCallsNothing)
@@ -109,6 +176,20 @@ TEST_F(Logging, LineIsCheckedAndWrittenUnderTheSameTag)
               journal.Take());
 }
 
+TEST_F(Logging, TagTakesItsLevelFromEitherEnumeration)
+{
+    constexpr bd::LogTag tag = {bd::CompIdBdmvNavigator, bd::LogWarning, 0};
+    constexpr bd::LogTag platformTag = {bd::CompIdBdmvNavigator, KEVRO_Log_LevelWarning, 0};
+    BD_LOG(tag, "text");
+    BD_LOG(platformTag, "text");
+
+    EXPECT_EQ("log? 57 3 0 -> on\n"
+              "log 57 3 0: text\n"
+              "log? 57 3 0 -> on\n"
+              "log 57 3 0: text\n",
+              journal.Take());
+}
+
 TEST_F(Logging, LineCallsNothingButTheSwitchWhenOff)
 {
     SwitchAnswers(0);
@@ -164,7 +245,7 @@ TEST(LoggingMemory, LineAllocatesNothing)
 {
     int lines = 0;
     bdmvtest::FakePlatform platform(nullptr);
-    platform.SetLogSwitch([&lines](KEVRO_UInt32, KEVRO_Log_Level, KEVRO_Bool) -> KEVRO_Bool {
+    platform.SetLogSwitch([&lines](KEVRO_UInt32, KEVRO_Int32, KEVRO_Bool) -> KEVRO_Bool {
         ++lines;
         return lines % 2;
     });

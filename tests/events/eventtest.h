@@ -79,7 +79,7 @@ protected:
     void WhenTheLogSwitchIsAsked(KEVRO_Bool answer, std::function<void()> action)
     {
         platform.SetLogSwitch(
-            [answer, action = std::move(action)](KEVRO_UInt32, KEVRO_Log_Level, KEVRO_Bool) {
+            [answer, action = std::move(action)](KEVRO_UInt32, KEVRO_Int32, KEVRO_Bool) {
                 action();
                 return answer;
             });

@@ -129,10 +129,10 @@ class TriggerReachedEventTest : public EventTest
 {
 protected:
     /** Switches the log on for one level, without high-frequency lines. */
-    void EnableLevel(KEVRO_Log_Level enabled)
+    void EnableLevel(KEVRO_Int32 enabled)
     {
         platform.SetLogSwitch(
-            [enabled](KEVRO_UInt32 component, KEVRO_Log_Level level, KEVRO_Bool hiFreq) {
+            [enabled](KEVRO_UInt32 component, KEVRO_Int32 level, KEVRO_Bool hiFreq) {
                 return KEVRO_Bool{component == 57 && level == enabled && hiFreq == 0};
             });
     }

@@ -25,6 +25,15 @@ protected:
     }
 };
 
+/** Writes past the logger, whose level is one of the list. */
+BD_PRINTF_FORMAT(2, 3) void WriteAtLevel(KEVRO_Int32 level, const char* format, ...)
+{
+    va_list args;
+    va_start(args, format);
+    KEVRO_Log_VWrite(bd::CompIdJpi, level, 0, format, args);
+    va_end(args);
+}
+
 TEST_F(LogLine, BeginsWithTimeComponentAndLevel)
 {
     EventLogger().Log("playListId: %lu", 3UL);
@@ -39,6 +48,12 @@ TEST_F(LogLine, ShowsNumbersThatHaveNoName)
 {
     bd::VargLogger(42, static_cast<KEVRO_Log_Level>(15), 0).Log("x");
     EXPECT_EQ(TheLine(), "42 15: x");
+}
+
+TEST_F(LogLine, ShowsALevelBelowTheList)
+{
+    WriteAtLevel(-1, "x");
+    EXPECT_EQ(TheLine(), "Jpi -1: x");
 }
 
 TEST_F(LogLine, ShowsTheLargestNumbers)

@@ -90,7 +90,7 @@ const std::vector<KEVRO_UInt32> NamelessComponents = {0,  1,  31,         42,   
 
 bool IsOn(KEVRO_UInt32 component, KEVRO_UInt32 level, KEVRO_Bool hiFreq = 0)
 {
-    return KEVRO_Log_IsEnabled(component, static_cast<KEVRO_Log_Level>(level), hiFreq) != 0;
+    return KEVRO_Log_IsEnabled(component, static_cast<KEVRO_Int32>(level), hiFreq) != 0;
 }
 
 /** The levels of a component that are on: bit n for level n, bit n + 16 for high frequency. */

@@ -46,8 +46,7 @@ int main(int argc, char** argv)
     const char* const command = argc > 1 ? argv[1] : "";
     if (std::strcmp(command, "enabled") == 0 && argc > 4) {
         std::printf("%d\n", KEVRO_Log_IsEnabled(static_cast<KEVRO_UInt32>(std::atoi(argv[2])),
-                                                static_cast<KEVRO_Log_Level>(std::atoi(argv[3])),
-                                                std::atoi(argv[4])));
+                                                std::atoi(argv[3]), std::atoi(argv[4])));
     } else if (std::strcmp(command, "write") == 0 && argc > 2) {
         WriteEvents(std::atoi(argv[2]));
     } else if (std::strcmp(command, "write-at-end") == 0) {

@@ -20,7 +20,7 @@ namespace
 
 std::atomic<FakePlatform*> installed{nullptr};
 
-std::string DescribeTag(KEVRO_UInt32 component, KEVRO_Log_Level level, KEVRO_Bool hiFreq)
+std::string DescribeTag(KEVRO_UInt32 component, KEVRO_Int32 level, KEVRO_Bool hiFreq)
 {
     return Describe(component) + " " + Describe(level) + " " + Describe(hiFreq);
 }
@@ -30,7 +30,7 @@ std::string DescribeTag(KEVRO_UInt32 component, KEVRO_Log_Level level, KEVRO_Boo
 /** Lets the platform functions see the inside of the platform in place. */
 struct FakePlatformAccess {
     static KEVRO_Bool IsEnabled(const FakePlatform& platform, KEVRO_UInt32 component,
-                                KEVRO_Log_Level level, KEVRO_Bool hiFreq)
+                                KEVRO_Int32 level, KEVRO_Bool hiFreq)
     {
         const KEVRO_Bool enabled = platform.m_LogSwitch(component, level, hiFreq);
         if (platform.m_pJournal != nullptr) {
@@ -40,7 +40,7 @@ struct FakePlatformAccess {
         return enabled;
     }
 
-    static void Write(const FakePlatform& platform, KEVRO_UInt32 component, KEVRO_Log_Level level,
+    static void Write(const FakePlatform& platform, KEVRO_UInt32 component, KEVRO_Int32 level,
                       KEVRO_Bool hiFreq, const char* format, const char* text)
     {
         if (platform.m_pJournal != nullptr) {
@@ -73,7 +73,7 @@ struct FakePlatformAccess {
 
 FakePlatform::FakePlatform(Journal* journal)
     : m_pJournal(journal),
-      m_LogSwitch([](KEVRO_UInt32, KEVRO_Log_Level, KEVRO_Bool) -> KEVRO_Bool { return 1; })
+      m_LogSwitch([](KEVRO_UInt32, KEVRO_Int32, KEVRO_Bool) -> KEVRO_Bool { return 1; })
 {
     FakePlatform* none = nullptr;
     if (!installed.compare_exchange_strong(none, this)) {
@@ -95,7 +95,7 @@ void FakePlatform::SetLogSwitch(LogSwitch logSwitch)
 
 void FakePlatform::DisableLog()
 {
-    SetLogSwitch([](KEVRO_UInt32, KEVRO_Log_Level, KEVRO_Bool) -> KEVRO_Bool { return 0; });
+    SetLogSwitch([](KEVRO_UInt32, KEVRO_Int32, KEVRO_Bool) -> KEVRO_Bool { return 0; });
 }
 
 void FakePlatform::RecordFormats()
@@ -113,14 +113,14 @@ void FakePlatform::RecordAtomicAdds()
 using bdmvtest::FakePlatformAccess;
 using bdmvtest::installed;
 
-KEVRO_Bool KEVRO_Log_IsEnabled(KEVRO_UInt32 component, KEVRO_Log_Level level, KEVRO_Bool hiFreq)
+KEVRO_Bool KEVRO_Log_IsEnabled(KEVRO_UInt32 component, KEVRO_Int32 level, KEVRO_Bool hiFreq)
 {
     const bdmvtest::FakePlatform* const platform = installed;
     return platform == nullptr ? 0
                                : FakePlatformAccess::IsEnabled(*platform, component, level, hiFreq);
 }
 
-void KEVRO_Log_VWrite(KEVRO_UInt32 component, KEVRO_Log_Level level, KEVRO_Bool hiFreq,
+void KEVRO_Log_VWrite(KEVRO_UInt32 component, KEVRO_Int32 level, KEVRO_Bool hiFreq,
                       const char* format, va_list args)
 {
     std::array<char, 1024> text;

@@ -33,8 +33,7 @@ namespace bdmvtest
 class FakePlatform
 {
 public:
-    typedef std::function<KEVRO_Bool(KEVRO_UInt32 component, KEVRO_Log_Level level,
-                                     KEVRO_Bool hiFreq)>
+    typedef std::function<KEVRO_Bool(KEVRO_UInt32 component, KEVRO_Int32 level, KEVRO_Bool hiFreq)>
         LogSwitch;
 
     /**

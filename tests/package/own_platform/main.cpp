@@ -10,11 +10,11 @@
 static char written[100];
 
 int g_u1Bduopmask = 0;
-KEVRO_Bool KEVRO_Log_IsEnabled(KEVRO_UInt32, KEVRO_Log_Level, KEVRO_Bool)
+KEVRO_Bool KEVRO_Log_IsEnabled(KEVRO_UInt32, KEVRO_Int32, KEVRO_Bool)
 {
     return 1;
 }
-void KEVRO_Log_VWrite(KEVRO_UInt32, KEVRO_Log_Level, KEVRO_Bool, const char* format, va_list args)
+void KEVRO_Log_VWrite(KEVRO_UInt32, KEVRO_Int32, KEVRO_Bool, const char* format, va_list args)
 {
     std::vsnprintf(written, sizeof written, format, args);
 }
