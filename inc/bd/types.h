@@ -3,7 +3,8 @@
  * The vocabulary of disc navigation: fixed-width integers, identifiers, the enumerations that
  * events and listener callbacks carry, and the small value structures handed to listeners.
  *
- * Everything here is a plain value: no ownership, freely copied, safe to read from any thread.
+ * Everything here is a plain value: no ownership, freely copied, compared member by member with ==
+ * and !=, safe to read from any thread.
  *
  * Enumerations have the fixed underlying type KEVRO_Int32, so a value outside the list, from a disc
  * or from another layer, can travel and be reported, and no size depends on compiler flags.
@@ -374,6 +375,72 @@ inline bool operator==(const PlayMode& left, const PlayMode& right)
 }
 
 inline bool operator!=(const PlayMode& left, const PlayMode& right)
+{
+    return !(left == right);
+}
+
+inline bool operator==(const AudioInfoType& left, const AudioInfoType& right)
+{
+    return left.format == right.format && left.sampleRate == right.sampleRate &&
+           left.bitsPerSampling == right.bitsPerSampling && left.channels == right.channels &&
+           left.pid == right.pid && left.u4AudChannelLayout == right.u4AudChannelLayout;
+}
+
+inline bool operator!=(const AudioInfoType& left, const AudioInfoType& right)
+{
+    return !(left == right);
+}
+
+inline bool operator==(const ZoomRectangleDef& left, const ZoomRectangleDef& right)
+{
+    return left.X == right.X && left.Y == right.Y && left.Width == right.Width &&
+           left.Height == right.Height;
+}
+
+inline bool operator!=(const ZoomRectangleDef& left, const ZoomRectangleDef& right)
+{
+    return !(left == right);
+}
+
+inline bool operator==(const ZOOM_PARAM_Def& left, const ZOOM_PARAM_Def& right)
+{
+    return left.rClipRectangle == right.rClipRectangle &&
+           left.rDestRectangle == right.rDestRectangle && left.u4Delay == right.u4Delay;
+}
+
+inline bool operator!=(const ZOOM_PARAM_Def& left, const ZOOM_PARAM_Def& right)
+{
+    return !(left == right);
+}
+
+inline bool operator==(const Trigger& left, const Trigger& right)
+{
+    return left.triggerType == right.triggerType;
+}
+
+inline bool operator!=(const Trigger& left, const Trigger& right)
+{
+    return !(left == right);
+}
+
+inline bool operator==(const BDMarkDef& left, const BDMarkDef& right)
+{
+    return left.time == right.time && left.chpNo == right.chpNo;
+}
+
+inline bool operator!=(const BDMarkDef& left, const BDMarkDef& right)
+{
+    return !(left == right);
+}
+
+/** Whether both are the same block: address and size. Its bytes are not looked at. */
+inline bool operator==(const DataBlockDef& left, const DataBlockDef& right)
+{
+    return left.pData == right.pData && left.size == right.size;
+}
+
+/** See operator==(const DataBlockDef&, const DataBlockDef&). */
+inline bool operator!=(const DataBlockDef& left, const DataBlockDef& right)
 {
     return !(left == right);
 }

@@ -35,6 +35,33 @@ void ExpectSomeAudioInfo(const bd::AudioInfoType& info)
     EXPECT_EQ(0x0000003Fu, info.u4AudChannelLayout);
 }
 
+bd::ZOOM_PARAM_Def SomeZoom()
+{
+    return {{1, 2, 3, 4}, {5, 6, 7, 8}, 9};
+}
+
+/** Two values that == and != both call equal. */
+template <typename Value> void ExpectEqual(const Value& left, const Value& right)
+{
+    EXPECT_TRUE(left == right);
+    EXPECT_FALSE(left != right);
+}
+
+/** Changes one member of a copy after the other: each change alone makes the copy differ. */
+template <typename Value, typename... Changes>
+void ExpectEachToDiffer(const Value& original, Changes... changes)
+{
+    int number = 0;
+    const auto expectToDiffer = [&](auto change) {
+        Value changed = original;
+        change(changed);
+        EXPECT_FALSE(changed == original) << "change " << number;
+        EXPECT_TRUE(changed != original) << "change " << number;
+        ++number;
+    };
+    (expectToDiffer(changes), ...);
+}
+
 } // namespace
 
 TEST(PlatformTypes, HaveTheirExactWidths)
@@ -144,6 +171,34 @@ TEST(AudioInfoType, CopiesFieldForField)
     ExpectSomeAudioInfo(bd::AudioInfoType(info));
 }
 
+TEST(AudioInfoType, IsEqualWhenAllMembersAre)
+{
+    ExpectEqual(SomeAudioInfo(), SomeAudioInfo());
+    ExpectEqual(bd::AudioInfoType(), bd::AudioInfoType());
+}
+
+TEST(AudioInfoType, DiffersByEachMemberAlone)
+{
+    typedef bd::AudioInfoType Value;
+    ExpectEachToDiffer(
+        SomeAudioInfo(), [](Value& value) { value.format = bd::AudioFormatAc3; },
+        [](Value& value) { value.sampleRate = bd::AudioSampleRate_96000; },
+        [](Value& value) { value.bitsPerSampling = bd::AudioBitsPerSamplingType16; },
+        [](Value& value) { value.channels = bd::AudioChannelTypeStereo; },
+        [](Value& value) { value.pid = 0x1101; },
+        [](Value& value) { value.u4AudChannelLayout = 0x0001003F; });
+}
+
+TEST(AudioInfoType, IsEqualWhateverItsPaddingHolds)
+{
+    alignas(bd::AudioInfoType) unsigned char dirty[sizeof(bd::AudioInfoType)];
+    for (unsigned char& byte : dirty) {
+        byte = 0xA5;
+    }
+
+    ExpectEqual(*new (dirty) bd::AudioInfoType, bd::AudioInfoType());
+}
+
 TEST(AudioInfoType, CopyIsUnaffectedByLaterChangesToTheSource)
 {
     bd::AudioInfoType info = SomeAudioInfo();
@@ -167,6 +222,19 @@ TEST(ZoomRectangleDef, HasItsFieldsInOrder)
     EXPECT_EQ(8u, sizeof(bd::ZoomRectangleDef));
 }
 
+TEST(ZoomRectangleDef, IsEqualWhenAllMembersAre)
+{
+    ExpectEqual(bd::ZoomRectangleDef{1, 2, 3, 4}, bd::ZoomRectangleDef{1, 2, 3, 4});
+}
+
+TEST(ZoomRectangleDef, DiffersByEachMemberAlone)
+{
+    typedef bd::ZoomRectangleDef Value;
+    ExpectEachToDiffer(
+        Value{1, 2, 3, 4}, [](Value& value) { value.X = 0; }, [](Value& value) { value.Y = 0; },
+        [](Value& value) { value.Width = 0; }, [](Value& value) { value.Height = 0; });
+}
+
 TEST(ZoomParam, HasItsFieldsInOrder)
 {
     EXPECT_TRUE((Is<decltype(bd::ZOOM_PARAM_Def::rClipRectangle), bd::ZoomRectangleDef>));
@@ -181,25 +249,60 @@ TEST(ZoomParam, HasItsFieldsInOrder)
 
 TEST(ZoomParam, CopyIsUnaffectedByLaterChangesToTheSource)
 {
-    bd::ZOOM_PARAM_Def zoom = {{1, 2, 3, 4}, {5, 6, 7, 8}, 9};
+    bd::ZOOM_PARAM_Def zoom = SomeZoom();
     const bd::ZOOM_PARAM_Def copy = zoom;
     zoom = bd::ZOOM_PARAM_Def();
 
-    EXPECT_EQ(1, copy.rClipRectangle.X);
-    EXPECT_EQ(2, copy.rClipRectangle.Y);
-    EXPECT_EQ(3, copy.rClipRectangle.Width);
-    EXPECT_EQ(4, copy.rClipRectangle.Height);
-    EXPECT_EQ(5, copy.rDestRectangle.X);
-    EXPECT_EQ(6, copy.rDestRectangle.Y);
-    EXPECT_EQ(7, copy.rDestRectangle.Width);
-    EXPECT_EQ(8, copy.rDestRectangle.Height);
-    EXPECT_EQ(9u, copy.u4Delay);
+    EXPECT_TRUE(copy == SomeZoom());
+}
+
+TEST(ZoomParam, IsEqualWhenAllMembersAre)
+{
+    ExpectEqual(SomeZoom(), SomeZoom());
+}
+
+TEST(ZoomParam, DiffersByEachMemberAlone)
+{
+    typedef bd::ZOOM_PARAM_Def Value;
+    ExpectEachToDiffer(
+        SomeZoom(),
+        [](Value& value) {
+            value.rClipRectangle = {0, 2, 3, 4};
+        },
+        [](Value& value) {
+            value.rDestRectangle = {5, 6, 7, 0};
+        },
+        [](Value& value) { value.u4Delay = 0; });
 }
 
 TEST(Trigger, IsOneTriggerType)
 {
     EXPECT_TRUE((Is<decltype(bd::Trigger::triggerType), bd::TriggerType>));
     EXPECT_EQ(4u, sizeof(bd::Trigger));
+}
+
+TEST(Trigger, IsEqualWhenItsTypeIs)
+{
+    ExpectEqual(bd::Trigger{bd::TRIGGER_B}, bd::Trigger{bd::TRIGGER_B});
+}
+
+TEST(Trigger, DiffersByItsType)
+{
+    ExpectEachToDiffer(bd::Trigger{bd::TRIGGER_B},
+                       [](bd::Trigger& value) { value.triggerType = bd::TRIGGER_A; });
+}
+
+TEST(BDMarkDef, IsEqualWhenAllMembersAre)
+{
+    ExpectEqual(bd::BDMarkDef{90000, 2}, bd::BDMarkDef{90000, 2});
+}
+
+TEST(BDMarkDef, DiffersByEachMemberAlone)
+{
+    typedef bd::BDMarkDef Value;
+    ExpectEachToDiffer(
+        Value{90000, 2}, [](Value& value) { value.time += bd::TimePosition{1} << 32; },
+        [](Value& value) { value.chpNo = 3; });
 }
 
 TEST(BDMarkDef, HasItsFieldsInOrder)
@@ -221,6 +324,29 @@ TEST(DataBlockDef, HasItsFieldsInOrder)
     EXPECT_EQ(0u, offsetof(bd::DataBlockDef, pData));
     EXPECT_EQ(sizeof(void*), offsetof(bd::DataBlockDef, size));
     EXPECT_EQ(2 * sizeof(void*), sizeof(bd::DataBlockDef));
+}
+
+TEST(DataBlockDef, IsEqualWhenAddressAndSizeAre)
+{
+    bd::UInt8 bytes[2] = {};
+    ExpectEqual(bd::DataBlockDef{bytes, 2}, bd::DataBlockDef{bytes, 2});
+    ExpectEqual(bd::DataBlockDef{nullptr, 0}, bd::DataBlockDef{nullptr, 0});
+}
+
+TEST(DataBlockDef, DiffersByEachMemberAlone)
+{
+    typedef bd::DataBlockDef Value;
+    bd::UInt8 bytes[2] = {};
+    ExpectEachToDiffer(
+        Value{bytes, 1}, [&](Value& value) { value.pData = bytes + 1; },
+        [](Value& value) { value.size = 2; });
+}
+
+TEST(DataBlockDef, DiffersFromABlockOfEqualBytesElsewhere)
+{
+    bd::UInt8 bytes[2] = {7, 7};
+
+    EXPECT_TRUE((bd::DataBlockDef{bytes, 1} != bd::DataBlockDef{bytes + 1, 1}));
 }
 
 TEST(ValueStructures, AreCopiedAsBytes)
