@@ -22,8 +22,10 @@ namespace bdmv
  * changes meanwhile makes each single query consistent; events do not try to read several values at
  * once. Queries are taken to succeed.
  *
- * An operation with output parameters writes all of them. Whatever it leaves keeps the value that
- * the event preset: 0, false, empty, or no information, unless the operation says otherwise.
+ * An operation with output parameters writes all of them. An output that it leaves keeps what the
+ * variable held: the value that the event preset (0, false, empty, or no information, unless the
+ * operation says otherwise) or, for the GetPgTextStInfo() of PresentationGraphicsInfoEvent, what
+ * rGetPgTextStInfo() wrote.
  *
  * The order of the operations is part of the binary interface.
  */
@@ -105,6 +107,9 @@ public:
 
     /**
      * As GetPgTextStInfo(), with a result.
+     *
+     * PresentationGraphicsInfoEvent calls it first and GetPgTextStInfo() with the same variables,
+     * so an output that the latter leaves keeps the answer of this one.
      *
      * @return INavError::ErrNotAllowed keeps the event from being sent
      */

@@ -67,7 +67,7 @@ public:
     void Dispatch(Listeners& listeners) override;
 };
 
-/** Playback could not be started. */
+/** Playback failed, at its start or later. */
 class PlayFailedEvent : public NavigatorEvent
 {
 public:

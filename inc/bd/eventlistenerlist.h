@@ -252,7 +252,8 @@ inline void EventListenerList_FireInvoker(EventListenerList<T>& list, Invoker& i
  * Calls a method without parameters on every listener; see EventListenerList_FireInvoker().
  *
  * EventListenerList_FireParam1() to EventListenerList_FireParam4() do the same for methods with
- * that many parameters.
+ * that many parameters. The argument for a value parameter P binds to a `const P&`: a static
+ * constant of a class that is given there needs a definition, not only its value in the class.
  *
  * @tparam Owner the class that declares the method: T or one of its bases
  */

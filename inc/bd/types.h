@@ -317,7 +317,10 @@ struct AudioInfoType {
     }
 };
 
-/** A rectangle of the picture, in pixels from the top left corner. */
+/**
+ * A rectangle of the picture. Neither its unit nor its origin is settled: navigator and clients
+ * agree on them.
+ */
 struct ZoomRectangleDef {
     UInt16 X;
     UInt16 Y;
@@ -329,7 +332,7 @@ struct ZoomRectangleDef {
 struct ZOOM_PARAM_Def {
     ZoomRectangleDef rClipRectangle; ///< the part of the picture to enlarge
     ZoomRectangleDef rDestRectangle; ///< where it is shown
-    UInt32 u4Delay;
+    UInt32 u4Delay;                  ///< passed through unchanged; its unit is not settled
 };
 
 /** The trigger that is set. */
@@ -343,7 +346,7 @@ struct BDMarkDef {
     UInt16 chpNo; ///< chapter number
 };
 
-/** A block of bytes that somebody else owns. */
+/** A block of bytes owned elsewhere. */
 struct DataBlockDef {
     UInt8* pData; ///< first byte; not owned
     UInt32 size;  ///< bytes at pData

@@ -33,7 +33,7 @@ public:
     /** The first picture reached the screen. Sent by FirstPictureDeliveredEvent. */
     virtual void FirstPictureDelivered() = 0;
 
-    /** Playback could not be started. Sent by PlayFailedEvent. */
+    /** Playback failed, at its start or later. Sent by PlayFailedEvent. */
     virtual void PlayFailed() = 0;
 
     /** Playback paused. Sent by PausedEvent. */
@@ -75,7 +75,8 @@ public:
     /**
      * A zoom was set. Sent by ZoomModeSetEvent.
      *
-     * @param zoom the clip and destination rectangles in pixels, and the delay
+     * @param zoom the clip and destination rectangles, and the delay; none has a settled unit, see
+     *             bd::ZOOM_PARAM_Def
      */
     virtual void ZoomModeSet(bd::ZOOM_PARAM_Def zoom) = 0;
 

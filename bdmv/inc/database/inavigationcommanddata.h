@@ -72,14 +72,15 @@ public:
     virtual Command GetCommand() const = 0;
 
     /**
-     * Writes the two operands.
+     * Writes the two operands, each a flag and a value. What a flag means is not settled: the
+     * program's author and whatever executes it agree on it.
      *
-     * @param[out] isImmediate1 the flag of the first operand
-     * @param[out] operand1     its value
-     * @param[out] isImmediate2 the flag of the second operand
-     * @param[out] operand2     its value
+     * @param[out] flag1    the flag of the first operand
+     * @param[out] operand1 its value
+     * @param[out] flag2    the flag of the second operand
+     * @param[out] operand2 its value
      */
-    virtual void GetOperands(bool& isImmediate1, bd::UInt32& operand1, bool& isImmediate2,
+    virtual void GetOperands(bool& flag1, bd::UInt32& operand1, bool& flag2,
                              bd::UInt32& operand2) const = 0;
 };
 
