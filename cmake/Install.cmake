@@ -9,6 +9,8 @@ foreach(root inc bdmv/inc prv_inc)
   install(DIRECTORY ${root}/ DESTINATION ${header_dir} FILES_MATCHING PATTERN "*.h")
 endforeach()
 install(DIRECTORY bdmv/bdmvnavigator DESTINATION ${header_dir} FILES_MATCHING PATTERN "*.h")
+install(FILES ${bdmvnavigator_generated_headers}/bdmvnavigator/version.h
+  DESTINATION ${header_dir}/bdmvnavigator)
 
 install(TARGETS bdmvnavigator EXPORT bdmvnavigator-targets
   ARCHIVE DESTINATION ${CMAKE_INSTALL_LIBDIR})

@@ -20,6 +20,7 @@
 #include <utility>
 #include <vector>
 
+#include "bdmvnavigator/version.h"
 #include "disc/disc.h"
 #include "kevro_linux.h"
 #include "listing/description.h"
@@ -343,7 +344,7 @@ public:
 void AddOptions(CLI::App& app, Options& options)
 {
     app.formatter(std::make_shared<HelpFormatter>());
-    app.set_version_flag("--version", "bdmv-deskplayer " BDMVNAVIGATOR_VERSION);
+    app.set_version_flag("--version", "bdmv-deskplayer " BDMVNAVIGATOR_VERSION_TEXT);
     app.add_flag_callback(
         "--commands",
         [] {
