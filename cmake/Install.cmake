@@ -33,8 +33,14 @@ endif()
 configure_package_config_file(cmake/bdmvnavigator-config.cmake.in
   ${PROJECT_BINARY_DIR}/bdmvnavigator-config.cmake
   INSTALL_DESTINATION ${package_dir})
+# Before version 1 a minor version may change what clients see.
+if(PROJECT_VERSION_MAJOR EQUAL 0)
+  set(compatibility SameMinorVersion)
+else()
+  set(compatibility SameMajorVersion)
+endif()
 write_basic_package_version_file(${PROJECT_BINARY_DIR}/bdmvnavigator-config-version.cmake
-  COMPATIBILITY SameMajorVersion)
+  COMPATIBILITY ${compatibility})
 install(FILES
   ${PROJECT_BINARY_DIR}/bdmvnavigator-config.cmake
   ${PROJECT_BINARY_DIR}/bdmvnavigator-config-version.cmake

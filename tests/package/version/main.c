@@ -1,0 +1,10 @@
+/* The header says the version that the package was found by. */
+#include <string.h>
+
+#include "bdmvnavigator/version.h"
+
+int main(void)
+{
+    return strcmp(BDMVNAVIGATOR_VERSION_TEXT, EXPECTED) == 0 && strcmp(FOUND, EXPECTED) == 0 ? 0
+                                                                                             : 1;
+}
