@@ -1,5 +1,5 @@
 #!/usr/bin/env python3
-"""Prints the figures of docs/footprint.md, for scripts/footprint.
+"""Prints the figures of measure/footprint/README.md, for scripts/footprint.
 
     report.py BUILD
 
@@ -129,8 +129,8 @@ def print_events(full, quiet):
 
 def main():
     directory = sys.argv[1]
-    full = Footprint(f"{directory}/footprint/footprint")
-    quiet = Footprint(f"{directory}/footprint/footprint_without_log_lines")
+    full = Footprint(f"{directory}/measure/footprint/footprint")
+    quiet = Footprint(f"{directory}/measure/footprint/footprint_without_log_lines")
     count = len(full.code_of)
     print_program((full, quiet), count)
     print_objects(directory)
