@@ -2,8 +2,8 @@
  * @file
  * Running a program and catching what it prints.
  */
-#ifndef DESKPLAYER_PROGRAM_H
-#define DESKPLAYER_PROGRAM_H
+#ifndef TESTS_DESKPLAYER_PROGRAM_H
+#define TESTS_DESKPLAYER_PROGRAM_H
 
 #include <string>
 #include <vector>

@@ -9,7 +9,7 @@
 #include <string>
 #include <vector>
 
-#include "events/allevents.h"
+#include "bdmv/bdmvnavigator/allevents.h"
 #include "support/scriptableplaybackcontext.h"
 
 typedef bdmvtest::ScriptablePlaybackContext Context;

@@ -1,0 +1,90 @@
+#include <atomic>
+#include <thread>
+#include <vector>
+
+#include "allevents.h"
+#include "bdmvnavigator/navigatorlisteneradapter.h"
+#include "eventtest.h"
+
+namespace
+{
+
+const int rounds = 200;
+
+/**
+ * The list must not let two threads in at once: it counts without a lock, and the one atomic orders
+ * nothing, so that a thread checker sees every missing lock.
+ */
+class CountingListener : public bdmv::NavigatorListenerAdapter
+{
+public:
+    void Paused() override
+    {
+        overlaps += m_IsInside.exchange(true, std::memory_order_relaxed) ? 1 : 0;
+        std::this_thread::yield();
+        m_IsInside.store(false, std::memory_order_relaxed);
+        ++pauses;
+    }
+    void CurrentTimePosition(const bd::TimePosition&) override { ++positions; }
+
+    int pauses = 0;
+    int positions = 0;
+    int overlaps = 0;
+
+private:
+    std::atomic<bool> m_IsInside{false};
+};
+
+/** Must not be called while it is not in a list. */
+class VisitingListener : public bdmv::NavigatorListenerAdapter
+{
+public:
+    void Paused() override { callsWhileAbsent += isListed ? 0 : 1; }
+
+    bool isListed = false; ///< changed while the listener is in no list
+    int callsWhileAbsent = 0;
+};
+
+TEST(ConcurrentDispatchTest, DeliversEveryEventOnceWhileListenersComeAndGo)
+{
+    bdmvtest::FakePlatform platform(nullptr);
+    Context context;
+    Listeners listeners;
+    CountingListener permanent;
+    VisitingListener visitors[2];
+    listeners.AddListener(&permanent);
+
+    std::atomic<int> dispatching{2};
+    const auto dispatchAll = [&] {
+        for (int round = 0; round < rounds; ++round) {
+            for (const EventClass& eventClass : AllEvents()) {
+                eventClass.make(context)->Dispatch(listeners);
+            }
+        }
+        --dispatching;
+    };
+    const auto comeAndGo = [&](VisitingListener& visitor) {
+        while (dispatching != 0) {
+            visitor.isListed = true;
+            EXPECT_TRUE(listeners.AddListener(&visitor));
+            EXPECT_TRUE(listeners.ListenerExists(&visitor));
+            EXPECT_TRUE(listeners.RemoveListener(&visitor));
+            visitor.isListed = false;
+        }
+    };
+    std::vector<std::thread> threads;
+    threads.emplace_back(dispatchAll);
+    threads.emplace_back(dispatchAll);
+    threads.emplace_back(comeAndGo, std::ref(visitors[0]));
+    threads.emplace_back(comeAndGo, std::ref(visitors[1]));
+    for (std::thread& thread : threads) {
+        thread.join();
+    }
+
+    EXPECT_EQ(permanent.pauses, 2 * rounds);
+    EXPECT_EQ(permanent.positions, 2 * rounds);
+    EXPECT_EQ(permanent.overlaps, 0);
+    EXPECT_EQ(visitors[0].callsWhileAbsent + visitors[1].callsWhileAbsent, 0);
+}
+
+} // namespace

@@ -1,0 +1,172 @@
+/**
+ * @file
+ * What the tests of all events share.
+ *
+ * Every test states the whole journal of a dispatch. The three shapes that make up most of a
+ * journal have a function each:
+ *
+ *     Queried("GetPlayListId() -> 800")     context.GetPlayListId() -> 800
+ *
+ *     Logged("Sending Paused")              log? 57 5 0 -> on
+ *                                           log 57 5 0: Sending Paused
+ *
+ *     Fired("Paused()")                     A.Paused()
+ *                                           B.Paused()
+ *                                           C.Paused()
+ */
+#ifndef TESTS_BDMV_BDMVNAVIGATOR_EVENTTEST_H
+#define TESTS_BDMV_BDMVNAVIGATOR_EVENTTEST_H
+
+#include <gtest/gtest.h>
+
+#include <functional>
+#include <memory>
+#include <string>
+#include <utility>
+
+#include "bdmvnavigator/navigatorevent.h"
+#include "support/fakeplatform.h"
+#include "support/recordinglistener.h"
+#include "support/scriptableplaybackcontext.h"
+
+typedef bdmvtest::ScriptablePlaybackContext Context;
+typedef bd::EventListenerList<bdmv::INavigatorListener> Listeners;
+
+/** The entry of a call to the context. */
+inline std::string Queried(const std::string& query)
+{
+    return "context." + query + "\n";
+}
+
+/** The entries of a line that is written, and of the look at the log switch before it. */
+inline std::string Logged(const std::string& line, const std::string& tag = "57 5 0")
+{
+    return "log? " + tag + " -> on\nlog " + tag + ": " + line + "\n";
+}
+
+/** The entry of a line that is not written because the log switch is off. */
+inline std::string NotLogged(const std::string& tag = "57 5 0")
+{
+    return "log? " + tag + " -> off\n";
+}
+
+/** The entries of a callback that A, B and C receive, in this order. */
+inline std::string Fired(const std::string& callback)
+{
+    return "A." + callback + "\nB." + callback + "\nC." + callback + "\n";
+}
+
+/** A context, the listeners A, B and C in this order, and the journal of all that happens. */
+class EventTest : public testing::Test
+{
+protected:
+    EventTest()
+    {
+        listeners.AddListener(&a);
+        listeners.AddListener(&b);
+        listeners.AddListener(&c);
+    }
+
+    /** Makes the event, dispatches it to A, B and C, and deletes it. Returns the whole journal. */
+    template <typename Event> std::string Dispatch()
+    {
+        const std::unique_ptr<bdmv::INavigatorEvent> event(new Event(context));
+        event->Dispatch(listeners);
+        return journal.Take();
+    }
+
+    /** Has the log switch do something of the test's own whenever it is asked. */
+    void WhenTheLogSwitchIsAsked(KEVRO_Bool answer, std::function<void()> action)
+    {
+        platform.SetLogSwitch(
+            [answer, action = std::move(action)](KEVRO_UInt32, KEVRO_Int32, KEVRO_Bool) {
+                action();
+                return answer;
+            });
+    }
+
+    bdmvtest::Journal journal;
+    bdmvtest::FakePlatform platform{&journal};
+    Context context{journal};
+    bdmvtest::RecordingListener a{journal, "A"};
+    bdmvtest::RecordingListener b{journal, "B"};
+    bdmvtest::RecordingListener c{journal, "C"};
+    Listeners listeners;
+};
+
+/**
+ * An event, what the context holds when it is dispatched, and all that must happen then.
+ *
+ * A family states its events as scenarios of EventScenarioTest, which dispatches each with and
+ * without listeners, with and without a log, and through every failure of a listener.
+ */
+struct Scenario {
+    std::string name;
+    std::function<bdmv::INavigatorEvent*(bdmv::IPlaybackContext&)> make;
+    std::function<void(Context&)> arrange; ///< may run several times
+    std::string journal;                   ///< with A, B and C in the list and the log on
+};
+
+/** Shows the name where the test program lists its tests. */
+inline void PrintTo(const Scenario& scenario, std::ostream* stream)
+{
+    *stream << scenario.name;
+}
+
+/** Makes an event of a class, with the values that it freezes at its construction. */
+template <typename Event, typename... Frozen>
+std::function<bdmv::INavigatorEvent*(bdmv::IPlaybackContext&)> New(Frozen... frozen)
+{
+    return [=](bdmv::IPlaybackContext& context) { return new Event(context, frozen...); };
+}
+
+/** An event that asks the context nothing: a line and a callback without arguments. */
+template <typename Event>
+Scenario Notification(const std::string& line, const std::string& callback)
+{
+    return {callback.substr(0, callback.find('(')), New<Event>(), [](Context&) {},
+            Logged(line) + Fired(callback)};
+}
+
+/** Runs the scenario that is its parameter. */
+class EventScenarioTest : public EventTest, public testing::WithParamInterface<Scenario>
+{
+public:
+    static std::string Name(const testing::TestParamInfo<Scenario>& info)
+    {
+        return info.param.name;
+    }
+
+protected:
+    /** The event exists before the context holds its values: it must read them later. */
+    void DispatchScenario(Listeners& list)
+    {
+        const std::unique_ptr<bdmv::INavigatorEvent> event(GetParam().make(context));
+        GetParam().arrange(context);
+        event->Dispatch(list);
+    }
+
+    /** Has one callback, counted over all listeners from 0, do something. */
+    void OnCallback(std::size_t number, const std::function<void()>& action)
+    {
+        m_Callbacks = 0;
+        a.onCallback = b.onCallback = c.onCallback = [this, number, action](const std::string&) {
+            if (m_Callbacks++ == number) {
+                action();
+            }
+        };
+    }
+
+    /** Nothing is left behind: the same event reaches the same listeners once more. */
+    void ExpectTheListToBeSound()
+    {
+        a.onCallback = b.onCallback = c.onCallback = nullptr;
+        DispatchScenario(listeners);
+        EXPECT_EQ(journal.Take(), GetParam().journal);
+    }
+
+private:
+    std::size_t m_Callbacks = 0;
+};
+
+#endif

@@ -1,0 +1,162 @@
+#include "eventtest.h"
+
+namespace
+{
+
+void PlaysBackwardWhileItIsSetForward(Context& context)
+{
+    context.playMode = bd::PlayMode(bd::PlayDirectionForward, bd::PlaySpeedSlow5);
+    context.currentPlayMode = bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedFast12);
+}
+
+void SetsBackwardAtPosition(Context& context, bd::TimePosition position)
+{
+    context.currentTimePosition = position;
+    context.playMode = bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedFast2);
+}
+
+std::function<void(Context&)> FinishesFor(int reason)
+{
+    return [reason](Context& context) {
+        context.finishedReason = static_cast<bdstreaming::FinishedReason>(reason);
+    };
+}
+
+const std::string assertion = "assert: false, bdmv/bdmvnavigator/navigatorevent.cpp:885\n";
+
+const Scenario scenarios[] = {
+    Notification<bdmv::PlayStartedEvent>("Sending PlayStarted", "PlayStarted()"),
+    Notification<bdmv::FirstPictureDeliveredEvent>("Sending FirstPictureDeliveredEvent",
+                                                   "FirstPictureDelivered()"),
+    Notification<bdmv::PlayFailedEvent>("Sending PlayFailed", "PlayFailed()"),
+    Notification<bdmv::PausedEvent>("Sending Paused", "Paused()"),
+    Notification<bdmv::StoppedEvent>("Sending Stopped", "Stopped()"),
+    Notification<bdmv::StillOnEvent>("Sending StillOn", "StillOn()"),
+    Notification<bdmv::StillOffEvent>("Sending StillOff", "StillOff()"),
+    Notification<bdmv::SuspendedEvent>("Sending Suspended", "Suspended()"),
+    Notification<bdmv::ResumedEvent>("Sending Resumed", "Resumed()"),
+    Notification<bdmv::ResumeFailedEvent>("Sending ResumeFailed", "ResumeFailed()"),
+    Notification<bdmv::JumpOccurredEvent>("Sending JumpOccurred", "JumpOccurred()"),
+    Notification<bdmv::PreloadFailedEvent>("Sending PreloadFailed", "PreloadFailed()"),
+
+    {"ContinuedBackward", New<bdmv::ContinuedEvent>(),
+     [](Context& context) {
+         context.playMode = bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedFast2);
+     },
+     Queried("GetCurrentPlayMode() -> (0, 5)") + Queried("GetPlayMode() -> (1, 7)") +
+         Logged("Sending Continued with playmode: dir 1, speed 7 (currentplaymode: dir 0, speed "
+                "5)") +
+         Fired("Continued(1, 7)")},
+    {"ContinuedForward", New<bdmv::ContinuedEvent>(), PlaysBackwardWhileItIsSetForward,
+     Queried("GetCurrentPlayMode() -> (1, 17)") + Queried("GetPlayMode() -> (0, 0)") +
+         Logged("Sending Continued with playmode: dir 0, speed 0 (currentplaymode: dir 1, speed "
+                "17)") +
+         Fired("Continued(0, 0)")},
+
+    {"SteppedBackward", New<bdmv::SteppedEvent>(),
+     [](Context& context) { SetsBackwardAtPosition(context, 900000); },
+     Queried("GetCurrentTimePosition() -> 900000") + Queried("GetPlayMode() -> (1, 7)") +
+         Logged("Sending Stepped - position: 900000,dir=1") + Fired("Stepped(900000, 1)")},
+    {"SteppedBeyond32Bits", New<bdmv::SteppedEvent>(),
+     [](Context& context) { SetsBackwardAtPosition(context, 0xFFFFFFFFFFFFFFFEULL); },
+     Queried("GetCurrentTimePosition() -> 18446744073709551614") +
+         Queried("GetPlayMode() -> (1, 7)") +
+         Logged("Sending Stepped - position: 18446744073709551614,dir=1") +
+         Fired("Stepped(18446744073709551614, 1)")},
+    {"SteppedForwardWhilePlayingBackward", New<bdmv::SteppedEvent>(),
+     PlaysBackwardWhileItIsSetForward,
+     Queried("GetCurrentTimePosition() -> 0") + Queried("GetPlayMode() -> (0, 0)") +
+         Logged("Sending Stepped - position: 0,dir=0") + Fired("Stepped(0, 0)")},
+
+    {"FinishedAtTheEnd", New<bdmv::FinishedEvent>(),
+     FinishesFor(bdstreaming::FinishedReasonEndOfMedia),
+     Queried("GetFinishedReason() -> 0") + Logged("Sending Finished - reason: 0") +
+         Fired("Finished(0)")},
+    {"FinishedForLackOfData", New<bdmv::FinishedEvent>(),
+     FinishesFor(bdstreaming::FinishedReasonDataStarvation),
+     Queried("GetFinishedReason() -> 1") + Logged("Sending Finished - reason: 1") +
+         Fired("Finished(1)")},
+    {"FinishedForAnUnknownReason", New<bdmv::FinishedEvent>(), FinishesFor(2),
+     Queried("GetFinishedReason() -> 2") + assertion + Logged("Sending Finished - reason: 0") +
+         Fired("Finished(0)")},
+    {"FinishedForANegativeReason", New<bdmv::FinishedEvent>(), FinishesFor(-1),
+     Queried("GetFinishedReason() -> -1") + assertion + Logged("Sending Finished - reason: 0") +
+         Fired("Finished(0)")},
+};
+
+INSTANTIATE_TEST_SUITE_P(PlaybackState, EventScenarioTest, testing::ValuesIn(scenarios),
+                         EventScenarioTest::Name);
+
+class PlaybackStateEventTest : public EventTest
+{
+};
+
+TEST_F(PlaybackStateEventTest, SteppedWritesThisJournal)
+{
+    context.currentTimePosition = 900000;
+    context.playMode = bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedNormal);
+
+    EXPECT_EQ(Dispatch<bdmv::SteppedEvent>(),
+              "context.GetCurrentTimePosition() -> 900000\n"
+              "context.GetPlayMode() -> (1, 5)\n"
+              "log? 57 5 0 -> on\n"
+              "log 57 5 0: Sending Stepped - position: 900000,dir=1\n"
+              "A.Stepped(900000, 1)\n"
+              "B.Stepped(900000, 1)\n"
+              "C.Stepped(900000, 1)\n");
+}
+
+TEST_F(PlaybackStateEventTest, ContinuedReportsThePlayModesAsTheyWereWhenAskedFor)
+{
+    context.onQuery = [this](const std::string& operation) {
+        if (operation == "GetPlayMode") {
+            context.currentPlayMode = bd::PlayMode(bd::PlayDirectionForward, bd::PlaySpeedSlow1);
+        }
+    };
+    context.currentPlayMode = bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedFast1);
+    context.playMode = bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedFast2);
+    WhenTheLogSwitchIsAsked(1, [this] { context.playMode = bd::PlayMode(); });
+
+    EXPECT_EQ(Dispatch<bdmv::ContinuedEvent>(),
+              Queried("GetCurrentPlayMode() -> (1, 6)") + Queried("GetPlayMode() -> (1, 7)") +
+                  Logged("Sending Continued with playmode: dir 1, speed 7 (currentplaymode: dir "
+                         "1, speed 6)") +
+                  Fired("Continued(1, 7)"));
+}
+
+TEST_F(PlaybackStateEventTest, SteppedReportsTheDirectionAsItWasBeforeTheLogLine)
+{
+    WhenTheLogSwitchIsAsked(1, [this] {
+        context.playMode = bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedNormal);
+    });
+
+    EXPECT_EQ(Dispatch<bdmv::SteppedEvent>(),
+              Queried("GetCurrentTimePosition() -> 0") + Queried("GetPlayMode() -> (0, 5)") +
+                  Logged("Sending Stepped - position: 0,dir=0") + Fired("Stepped(0, 0)"));
+}
+
+TEST_F(PlaybackStateEventTest, AListenerThatChangesTheContextDoesNotChangeWhatTheOthersReceive)
+{
+    a.onCallback = [this](const std::string&) {
+        context.currentTimePosition = 1;
+        context.playMode = bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedFast1);
+    };
+
+    EXPECT_EQ(Dispatch<bdmv::SteppedEvent>(),
+              Queried("GetCurrentTimePosition() -> 0") + Queried("GetPlayMode() -> (0, 5)") +
+                  Logged("Sending Stepped - position: 0,dir=0") + Fired("Stepped(0, 0)"));
+}
+
+TEST_F(PlaybackStateEventTest, AnAssertionThatDoesNotReturnEndsFinished)
+{
+    struct Abandoned {
+    };
+    FinishesFor(2)(context);
+    platform.onAssert = [] { throw Abandoned(); };
+
+    EXPECT_THROW(Dispatch<bdmv::FinishedEvent>(), Abandoned);
+
+    EXPECT_EQ(journal.Take(), Queried("GetFinishedReason() -> 2") + assertion);
+}
+
+} // namespace

@@ -1,0 +1,212 @@
+#include <gtest/gtest.h>
+
+#include "../testdesk.h"
+
+namespace deskplayer
+{
+
+namespace
+{
+
+typedef SimulatedNavigator::Status Status;
+
+/** Two items of ten seconds, with chapters at 0, 5, 10 and 15 s. */
+PlayList FourChapters()
+{
+    return ListOf({Item(10), Item(10)},
+                  {Entry(0, 0), Entry(0, 5 * Second), Entry(1, 0), Entry(1, 5 * Second)});
+}
+
+TEST(Position, JumpsWithinAnItem)
+{
+    TestDesk desk(FourChapters());
+    desk.Start(Second);
+
+    EXPECT_TRUE(desk.navigator.SearchTime(2 * Second + 1).IsDone());
+
+    EXPECT_EQ(desk.Take(), "1 JumpOccurred()\n"
+                           "1 CurrentTimePosition(90001)\n");
+}
+
+TEST(Position, JumpsToAnotherItemAndTellsAllThatIsDifferentThere)
+{
+    TestDesk desk(FourChapters());
+    desk.Start(Second);
+
+    EXPECT_TRUE(desk.navigator.SearchTime(15 * Second).IsDone());
+
+    EXPECT_EQ(desk.Take(), "1 JumpOccurred()\n"
+                           "1 PlayItem(7, 1, 6, 15)\n"
+                           "1 MarkInfo(7, 3, 675000)\n"
+                           "1 ChapterNumber(4)\n"
+                           "1 CurrentTimePosition(675000)\n");
+}
+
+TEST(Position, StaysPausedWhenItJumps)
+{
+    TestDesk desk(FourChapters());
+    desk.Start();
+    desk.Do(desk.navigator.Pause());
+
+    desk.Do(desk.navigator.SearchTime(7 * Second));
+
+    EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Paused);
+    EXPECT_EQ(desk.navigator.GetCurrentTimePosition(), 7 * Second);
+}
+
+TEST(Position, LeavesAStillWhenItJumps)
+{
+    TestDesk desk(ListOf({WithTimedStill(Item(2), 5), Item(2)}));
+    desk.Start(2 * Second);
+
+    EXPECT_TRUE(desk.navigator.SearchTime(Second).IsDone());
+
+    EXPECT_EQ(desk.Take(), "2 StillOff()\n"
+                           "2 JumpOccurred()\n"
+                           "2 CurrentTimePosition(45000)\n");
+    EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Playing);
+    EXPECT_EQ(desk.navigator.TimeToNextChange(), Second);
+}
+
+TEST(Position, ForgetsTheFractionOfATickWhenItJumps)
+{
+    TestDesk desk(ListOf({Item(10)}));
+    desk.Start();
+    desk.Do(desk.navigator.SetPlayMode(bd::PlayMode(bd::PlayDirectionForward, bd::PlaySpeedSlow5)));
+    desk.navigator.Advance(31);
+
+    desk.Do(desk.navigator.SearchTime(0));
+
+    EXPECT_EQ(desk.navigator.TimeToNextChange(), 32 * Second);
+}
+
+TEST(Position, RefusesATimeAtOrBehindTheEnd)
+{
+    TestDesk desk(FourChapters());
+    desk.Start();
+    const std::string before = desk.Snapshot();
+
+    for (const std::uint64_t time : {20 * Second, 1000 * Second}) {
+        EXPECT_EQ(desk.navigator.SearchTime(time).Reason(), "the play list ends at 00:00:20.000");
+    }
+    EXPECT_EQ(desk.Take(), "");
+    EXPECT_EQ(desk.Snapshot(), before);
+
+    EXPECT_TRUE(desk.navigator.SearchTime(20 * Second - 1).IsDone());
+}
+
+TEST(Position, GoesToAChapter)
+{
+    TestDesk desk(FourChapters());
+    desk.Start(Second);
+
+    EXPECT_TRUE(desk.navigator.SearchChapter(2).IsDone());
+
+    EXPECT_EQ(desk.Take(), "1 JumpOccurred()\n"
+                           "1 MarkInfo(7, 1, 225000)\n"
+                           "1 ChapterNumber(2)\n"
+                           "1 CurrentTimePosition(225000)\n");
+}
+
+TEST(Position, TellsNoChapterAgainWhenItJumpsToTheOneInPlayback)
+{
+    TestDesk desk(FourChapters());
+    desk.Start(Second);
+
+    EXPECT_TRUE(desk.navigator.SearchChapter(1).IsDone());
+
+    EXPECT_EQ(desk.Take(), "1 JumpOccurred()\n"
+                           "1 MarkInfo(7, 0, 0)\n"
+                           "1 CurrentTimePosition(0)\n");
+}
+
+TEST(Position, SkipsToTheNextChapter)
+{
+    TestDesk desk(FourChapters());
+    desk.Start(9 * Second);
+
+    EXPECT_TRUE(desk.navigator.SkipToNextChapter().IsDone());
+
+    EXPECT_EQ(desk.Take(), "9 JumpOccurred()\n"
+                           "9 PlayItem(7, 1, 6, 15)\n"
+                           "9 MarkInfo(7, 2, 450000)\n"
+                           "9 ChapterNumber(3)\n"
+                           "9 CurrentTimePosition(450000)\n");
+}
+
+TEST(Position, SkipsFromBeforeTheFirstChapterToIt)
+{
+    TestDesk desk(ListOf({Item(10)}, {Entry(0, 5 * Second)}));
+    desk.Start(Second);
+    EXPECT_EQ(desk.navigator.GetCurrentChapter(), 0);
+
+    EXPECT_TRUE(desk.navigator.SkipToNextChapter().IsDone());
+
+    EXPECT_EQ(desk.navigator.GetCurrentTimePosition(), 5 * Second);
+}
+
+TEST(Position, SkipsBackToTheStartOfTheChapterOnceItHasPlayedThreeSeconds)
+{
+    TestDesk desk(FourChapters());
+    desk.Start(8 * Second);
+
+    EXPECT_TRUE(desk.navigator.SkipToPreviousChapter().IsDone());
+
+    EXPECT_EQ(desk.navigator.GetCurrentTimePosition(), 5 * Second);
+}
+
+TEST(Position, SkipsBackToTheChapterBeforeWithinThreeSeconds)
+{
+    TestDesk desk(FourChapters());
+    desk.Start(8 * Second - 1);
+
+    EXPECT_TRUE(desk.navigator.SkipToPreviousChapter().IsDone());
+
+    EXPECT_EQ(desk.navigator.GetCurrentTimePosition(), 0);
+}
+
+TEST(Position, SkipsBackToTheStartOfTheFirstChapterAtAnyTime)
+{
+    TestDesk desk(ListOf({Item(10)}, {Entry(0, Second)}));
+    desk.Start(Second + 1);
+
+    EXPECT_TRUE(desk.navigator.SkipToPreviousChapter().IsDone());
+
+    EXPECT_EQ(desk.navigator.GetCurrentTimePosition(), Second);
+}
+
+TEST(Position, RefusesChaptersThatAreNotThere)
+{
+    TestDesk desk(FourChapters());
+    desk.Start(16 * Second);
+    const std::string before = desk.Snapshot();
+
+    EXPECT_EQ(desk.navigator.SearchChapter(0).Reason(),
+              "there is no chapter 0, they count from 1 to 4");
+    EXPECT_EQ(desk.navigator.SearchChapter(5).Reason(),
+              "there is no chapter 5, they count from 1 to 4");
+    EXPECT_EQ(desk.navigator.SearchChapter(65537).Reason(),
+              "there is no chapter 65537, they count from 1 to 4");
+    EXPECT_EQ(desk.navigator.SkipToNextChapter().Reason(),
+              "there is no chapter 5, they count from 1 to 4");
+    EXPECT_EQ(desk.Take(), "");
+    EXPECT_EQ(desk.Snapshot(), before);
+}
+
+TEST(Position, RefusesToSkipWhereThereAreNoChapters)
+{
+    TestDesk desk(ListOf({Item(10)}));
+    desk.Start(Second);
+    const std::string before = desk.Snapshot();
+
+    EXPECT_EQ(desk.navigator.SkipToNextChapter().Reason(),
+              "there is no chapter 1, there is none here");
+    EXPECT_EQ(desk.navigator.SkipToPreviousChapter().Reason(),
+              "there is no chapter 0, there is none here");
+    EXPECT_EQ(desk.Take(), "");
+    EXPECT_EQ(desk.Snapshot(), before);
+}
+
+} // namespace
+
+} // namespace deskplayer

@@ -1,0 +1,430 @@
+#include <gtest/gtest.h>
+
+#include <functional>
+#include <sstream>
+
+#include "../testdesk.h"
+
+namespace deskplayer
+{
+
+namespace
+{
+
+/** Numbers of bd::TriggerType, as the listener writes them down. */
+static_assert(bd::TRIGGER_NONE == 4 && bd::TRIGGER_A == 5 && bd::TRIGGER_B == 6 &&
+                  bd::TRIGGER_AB_NONE == 7 && bd::TRIGGER_CHP == 8 && bd::TRIGGER_TITLE == 9 &&
+                  bd::TRIGGER_NOTIFY_FROM_CURPOS == 13,
+              "the numbers in the expected texts");
+
+bd::PlayMode BackwardMode()
+{
+    return bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedNormal);
+}
+
+/** Sets A here and B @p ticks later: playback is at A again. */
+void SetPoints(TestDesk& desk, std::uint64_t ticks)
+{
+    desk.Do(desk.navigator.SetPointA());
+    desk.navigator.Advance(ticks);
+    desk.Do(desk.navigator.SetPointB());
+}
+
+TEST(Repeat, GoesFromBBackToA)
+{
+    TestDesk desk(ListOf({Item(100)}));
+    desk.Start(10 * Second + 5);
+
+    EXPECT_TRUE(desk.navigator.SetPointA().IsDone());
+    EXPECT_EQ(desk.navigator.GetCurrentABRepeatState(), bd::TRIGGER_A);
+    EXPECT_FALSE(desk.navigator.IsRepeating());
+    desk.navigator.Advance(Second / 2);
+    EXPECT_TRUE(desk.navigator.SetPointB().IsDone());
+    EXPECT_EQ(desk.navigator.GetCurrentABRepeatState(), bd::TRIGGER_B);
+    EXPECT_TRUE(desk.navigator.IsRepeating());
+    desk.navigator.Advance(Second);
+
+    EXPECT_EQ(desk.Take(), "10+5 TriggerSet(5, true)\n"
+                           "10+22505 TriggerSet(6, true)\n"
+                           "10+22505 TriggerTimeReached(6, 472505)\n"
+                           "10+22505 JumpOccurred()\n"
+                           "10+22505 CurrentTimePosition(450005)\n"
+                           "11+5 TriggerTimeReached(6, 472505)\n"
+                           "11+5 JumpOccurred()\n"
+                           "11+5 CurrentTimePosition(450005)\n"
+                           "11+22505 TriggerTimeReached(6, 472505)\n"
+                           "11+22505 JumpOccurred()\n"
+                           "11+22505 CurrentTimePosition(450005)\n");
+}
+
+TEST(Repeat, GoesFromBBackToAInAnItemBefore)
+{
+    TestDesk desk(ListOf({Item(2), Item(2)}));
+    desk.Start(Second + 10);
+    SetPoints(desk, 2 * Second);
+
+    desk.navigator.Advance(2 * Second);
+
+    EXPECT_EQ(desk.TakeWithoutPositions(), "4 PlayItem(7, 1, 6, 15)\n"
+                                           "5+10 TriggerTimeReached(6, 135010)\n"
+                                           "5+10 JumpOccurred()\n"
+                                           "5+10 PlayItem(7, 0, 6, 15)\n");
+}
+
+TEST(Repeat, ReportsThatBFailedWhenThereIsNoA)
+{
+    TestDesk desk(ListOf({Item(100)}));
+    desk.Start(Second);
+    const std::string before = desk.Snapshot();
+
+    EXPECT_TRUE(desk.navigator.SetPointB().IsDone());
+
+    EXPECT_EQ(desk.Take(), "1 TriggerSet(6, false)\n");
+    EXPECT_EQ(desk.Snapshot(), before);
+}
+
+TEST(Repeat, ReportsThatBFailedWhenAIsNotBeforeIt)
+{
+    TestDesk desk(ListOf({Item(100)}));
+    desk.Start(Second);
+    desk.Do(desk.navigator.SetPointA());
+    const std::string before = desk.Snapshot();
+
+    EXPECT_TRUE(desk.navigator.SetPointB().IsDone());
+    EXPECT_EQ(desk.Take(), "1 TriggerSet(6, false)\n");
+    EXPECT_EQ(desk.Snapshot(), before);
+
+    desk.Do(desk.navigator.SearchTime(0));
+    desk.Do(desk.navigator.SetPointB());
+    EXPECT_EQ(desk.navigator.GetCurrentABRepeatState(), bd::TRIGGER_A);
+}
+
+TEST(Repeat, StartsOverWithANewA)
+{
+    TestDesk desk(ListOf({Item(100)}));
+    desk.Start(Second);
+    SetPoints(desk, Second);
+
+    desk.Do(desk.navigator.SetPointA());
+
+    EXPECT_EQ(desk.navigator.GetCurrentABRepeatState(), bd::TRIGGER_A);
+    EXPECT_FALSE(desk.navigator.IsRepeating());
+}
+
+TEST(Repeat, GoesOnBehindBOnceTheRepeatHasEnded)
+{
+    TestDesk desk(ListOf({Item(100)}));
+    desk.Start(Second);
+    SetPoints(desk, Second);
+
+    EXPECT_TRUE(desk.navigator.EndABRepeat().IsDone());
+    desk.navigator.Advance(2 * Second);
+
+    EXPECT_EQ(desk.TakeWithoutPositions(), "2 TriggerSet(7, true)\n");
+    EXPECT_EQ(desk.navigator.GetCurrentABRepeatState(), bd::TRIGGER_AB_NONE);
+    EXPECT_FALSE(desk.navigator.IsRepeating());
+    EXPECT_EQ(desk.navigator.GetCurrentTimePosition(), 3 * Second);
+}
+
+TEST(Repeat, IsNoRepeatBehindB)
+{
+    TestDesk desk(ListOf({Item(10)}));
+    desk.Start(Second);
+    SetPoints(desk, Second);
+
+    desk.Do(desk.navigator.SearchTime(2 * Second));
+    EXPECT_FALSE(desk.navigator.IsRepeating());
+    desk.Do(desk.navigator.SetPlayMode(BackwardMode()));
+    EXPECT_TRUE(desk.navigator.IsRepeating());
+    desk.Do(desk.navigator.SetPlayMode(bd::PlayMode()));
+    desk.navigator.Advance(10 * Second);
+
+    EXPECT_EQ(desk.TakeWithoutPositions(), "10 Finished(0)\n");
+}
+
+TEST(Repeat, RepeatsAChapter)
+{
+    TestDesk desk(ListOf({Item(10)}, {Entry(0, 0), Entry(0, 3 * Second), Entry(0, 5 * Second)}));
+    desk.Start(4 * Second);
+
+    EXPECT_TRUE(desk.navigator.RepeatChapter().IsDone());
+    EXPECT_EQ(desk.navigator.GetCurrentChpTitleRepeatState(), bd::TRIGGER_CHP);
+    EXPECT_TRUE(desk.navigator.IsRepeating());
+    desk.navigator.Advance(3 * Second);
+
+    EXPECT_EQ(desk.TakeWithoutPositions(), "4 TriggerSet(8, true)\n"
+                                           "5 TriggerTimeReached(8, 225000)\n"
+                                           "5 JumpOccurred()\n"
+                                           "5 MarkInfo(7, 1, 135000)\n"
+                                           "7 TriggerTimeReached(8, 225000)\n"
+                                           "7 JumpOccurred()\n"
+                                           "7 MarkInfo(7, 1, 135000)\n");
+}
+
+TEST(Repeat, RepeatsTheLastChapterAtTheEndOfThePlayList)
+{
+    TestDesk desk(ListOf({WithEndlessStill(Item(2))}, {Entry(0, 0), Entry(0, Second)}));
+    desk.Start(Second);
+    desk.Do(desk.navigator.RepeatChapter());
+
+    desk.navigator.Advance(Second);
+
+    EXPECT_EQ(desk.TakeWithoutPositions(), "2 TriggerTimeReached(8, 90000)\n"
+                                           "2 JumpOccurred()\n"
+                                           "2 MarkInfo(7, 1, 45000)\n");
+}
+
+TEST(Repeat, RepeatsTheChapterThatTheViewerGoesTo)
+{
+    TestDesk desk(ListOf({Item(10)}, {Entry(0, 0), Entry(0, 3 * Second), Entry(0, 5 * Second)}));
+    desk.Start();
+    desk.Do(desk.navigator.RepeatChapter());
+    desk.Do(desk.navigator.SearchChapter(2));
+
+    desk.navigator.Advance(3 * Second);
+
+    EXPECT_EQ(desk.navigator.GetCurrentTimePosition(), 4 * Second);
+}
+
+TEST(Repeat, PlaysToTheEndWhenThereIsNoChapterToRepeat)
+{
+    TestDesk desk(ListOf({Item(2)}));
+    desk.Start();
+    desk.Do(desk.navigator.RepeatChapter());
+
+    EXPECT_FALSE(desk.navigator.IsRepeating());
+    desk.navigator.Advance(3 * Second);
+
+    EXPECT_EQ(desk.TakeWithoutPositions(), "2 Finished(0)\n");
+}
+
+TEST(Repeat, PlaysPastAnEmptyChapterAndRepeatsTheNext)
+{
+    TestDesk desk(ListOf({Item(3)}, {Entry(0, Second), Entry(0, Second), Entry(0, 2 * Second)}));
+    desk.Start();
+    desk.Do(desk.navigator.RepeatChapter());
+
+    EXPECT_TRUE(desk.navigator.IsRepeating());
+    desk.navigator.Advance(10 * Second);
+
+    EXPECT_EQ(desk.navigator.GetCurrentChapter(), 2);
+    EXPECT_GE(desk.navigator.GetCurrentTimePosition(), Second);
+    EXPECT_LT(desk.navigator.GetCurrentTimePosition(), 2 * Second);
+}
+
+TEST(Repeat, EndsInAnEmptyChapterAtTheEndOfThePlayList)
+{
+    TestDesk desk(ListOf({Item(2)}, {Entry(0, 0), Entry(0, 2 * Second)}));
+    desk.Start();
+    desk.Do(desk.navigator.RepeatChapter());
+    desk.Do(desk.navigator.SearchChapter(2));
+
+    EXPECT_FALSE(desk.navigator.IsRepeating());
+    desk.navigator.Advance(Second);
+
+    EXPECT_EQ(desk.TakeWithoutPositions(), "0 Finished(0)\n");
+}
+
+TEST(Repeat, RepeatsThePlayList)
+{
+    TestDesk desk(ListOf({Item(2), Item(1)}));
+    desk.Start(Second);
+
+    EXPECT_TRUE(desk.navigator.RepeatTitle().IsDone());
+    EXPECT_EQ(desk.navigator.GetCurrentChpTitleRepeatState(), bd::TRIGGER_TITLE);
+    EXPECT_TRUE(desk.navigator.IsRepeating());
+    desk.navigator.Advance(3 * Second);
+
+    EXPECT_EQ(desk.TakeWithoutPositions(), "1 TriggerSet(9, true)\n"
+                                           "2 PlayItem(7, 1, 6, 15)\n"
+                                           "3 TriggerTimeReached(9, 135000)\n"
+                                           "3 JumpOccurred()\n"
+                                           "3 PlayItem(7, 0, 6, 15)\n");
+    EXPECT_EQ(desk.navigator.GetCurrentTimePosition(), Second);
+}
+
+TEST(Repeat, OfAPlayListWithoutLengthEnds)
+{
+    TestDesk desk(ListOf({WithEndlessStill(Item(0)), Item(0)}));
+    desk.Start();
+    desk.navigator.Advance(0);
+    desk.Do(desk.navigator.RepeatTitle());
+
+    EXPECT_FALSE(desk.navigator.IsRepeating());
+    desk.Do(desk.navigator.EndStill());
+    desk.navigator.Advance(Second);
+
+    EXPECT_EQ(desk.Take(), "0 Finished(0)\n");
+}
+
+TEST(Repeat, EndsTheRepeatOfAChapterOrThePlayList)
+{
+    TestDesk desk(ListOf({Item(2)}, {Entry(0, 0)}));
+    for (Outcome (SimulatedNavigator::*repeat)() :
+         {&SimulatedNavigator::RepeatChapter, &SimulatedNavigator::RepeatTitle}) {
+        desk.Start();
+        desk.Do((desk.navigator.*repeat)());
+
+        EXPECT_TRUE(desk.navigator.EndChapterTitleRepeat().IsDone());
+        EXPECT_FALSE(desk.navigator.IsRepeating());
+        EXPECT_EQ(desk.navigator.GetCurrentChpTitleRepeatState(), bd::TRIGGER_NONE);
+        EXPECT_NE(desk.Take().find(" TriggerSet(4, true)\n"), std::string::npos);
+        desk.navigator.Advance(3 * Second);
+        EXPECT_EQ(desk.navigator.CurrentStatus(), SimulatedNavigator::Status::Finished);
+    }
+}
+
+TEST(Repeat, IsOneKindAtATime)
+{
+    TestDesk desk(ListOf({Item(10)}, {Entry(0, 0)}));
+    desk.Start();
+    SetPoints(desk, Second);
+
+    desk.Do(desk.navigator.RepeatTitle());
+    EXPECT_EQ(desk.navigator.GetCurrentABRepeatState(), bd::TRIGGER_AB_NONE);
+    EXPECT_EQ(desk.navigator.GetCurrentChpTitleRepeatState(), bd::TRIGGER_TITLE);
+
+    desk.Do(desk.navigator.SetPointA());
+    EXPECT_EQ(desk.navigator.GetCurrentABRepeatState(), bd::TRIGGER_A);
+    EXPECT_EQ(desk.navigator.GetCurrentChpTitleRepeatState(), bd::TRIGGER_NONE);
+}
+
+TEST(Repeat, RemembersTheTriggerThatWasSetLast)
+{
+    TestDesk desk(ListOf({Item(10)}));
+    desk.Start(Second);
+    EXPECT_EQ(desk.navigator.GetTrigger().triggerType, bd::TRIGGER_NONE);
+
+    desk.Do(desk.navigator.SetTrigger(5 * Second));
+    EXPECT_EQ(desk.navigator.GetTrigger().triggerType, bd::TRIGGER_NOTIFY_FROM_CURPOS);
+    desk.Do(desk.navigator.SetPointB());
+    EXPECT_EQ(desk.navigator.GetTrigger().triggerType, bd::TRIGGER_NOTIFY_FROM_CURPOS)
+        << "that one failed";
+    desk.Do(desk.navigator.SetPointA());
+    EXPECT_EQ(desk.navigator.GetTrigger().triggerType, bd::TRIGGER_A);
+}
+
+TEST(Trigger, IsReachedAtItsTime)
+{
+    TestDesk desk(ListOf({Item(10)}));
+    desk.Start(Second);
+
+    EXPECT_TRUE(desk.navigator.SetTrigger(Second + 100).IsDone());
+    EXPECT_EQ(desk.navigator.TimeToNextChange(), 100);
+    desk.navigator.Advance(Second / 2);
+
+    EXPECT_EQ(desk.Take(), "1 TriggerSet(13, true)\n"
+                           "1+100 TriggerTimeReached(13, 45100)\n");
+}
+
+TEST(Trigger, IsReachedBackwardToo)
+{
+    TestDesk desk(ListOf({Item(10)}));
+    desk.Start(2 * Second);
+    desk.Do(desk.navigator.SetTrigger(Second + 100));
+    desk.Do(desk.navigator.SetPlayMode(BackwardMode()));
+
+    desk.navigator.Advance(Second / 2 + Second / 2 - 100);
+
+    EXPECT_EQ(desk.Take(), "2+44900 TriggerTimeReached(13, 45100)\n");
+}
+
+TEST(Trigger, StaysAndIsReachedAgain)
+{
+    TestDesk desk(ListOf({Item(10)}));
+    desk.Start();
+    desk.Do(desk.navigator.SetTrigger(100));
+    desk.navigator.Advance(200);
+    EXPECT_EQ(desk.Take(), "0+100 TriggerTimeReached(13, 100)\n");
+
+    desk.Do(desk.navigator.SearchTime(0));
+    desk.navigator.Advance(200);
+
+    EXPECT_EQ(desk.Take(), "0+300 TriggerTimeReached(13, 100)\n");
+}
+
+TEST(Trigger, IsANotificationDuringARepeatToo)
+{
+    TestDesk desk(ListOf({Item(10)}));
+    desk.Start();
+    desk.Do(desk.navigator.RepeatTitle());
+    desk.Do(desk.navigator.SetTrigger(100));
+
+    desk.navigator.Advance(200);
+
+    EXPECT_EQ(desk.Take(), "0+100 TriggerTimeReached(13, 100)\n");
+}
+
+TEST(Trigger, IsReachedBesideTheRepeatThatGoesBackThere)
+{
+    TestDesk desk(ListOf({Item(10)}, {Entry(0, 0), Entry(0, 2 * Second)}));
+    const struct {
+        std::function<void()> repeat;
+        std::uint64_t end;
+        std::string heard;
+    } repeats[] = {
+        {[&desk] { SetPoints(desk, Second / 2); }, Second / 2, "TriggerTimeReached(6, 22500)\n"},
+        {[&desk] { desk.Do(desk.navigator.RepeatChapter()); }, 2 * Second,
+         "TriggerTimeReached(8, 90000)\n"},
+        {[&desk] { desk.Do(desk.navigator.RepeatTitle()); }, 10 * Second,
+         "TriggerTimeReached(9, 450000)\n"}};
+    for (const auto& repeat : repeats) {
+        SCOPED_TRACE(repeat.heard);
+        desk.Start();
+        repeat.repeat();
+        desk.Do(desk.navigator.SetTrigger(repeat.end));
+
+        desk.navigator.Advance(repeat.end);
+
+        std::string reached;
+        std::istringstream heard(desk.Take());
+        for (std::string line; std::getline(heard, line);) {
+            if (line.find("TriggerTimeReached") != std::string::npos) {
+                reached += line.substr(line.find(' ') + 1) + "\n";
+            }
+        }
+        EXPECT_EQ(reached,
+                  "TriggerTimeReached(13, " + std::to_string(repeat.end) + ")\n" + repeat.heard);
+        desk.Do(desk.navigator.Stop());
+    }
+}
+
+TEST(Trigger, IsReachedAtTheEndOfThePlayList)
+{
+    TestDesk desk(ListOf({Item(1)}));
+    desk.Start();
+    desk.Do(desk.navigator.SetTrigger(Second));
+
+    desk.navigator.Advance(Second);
+
+    EXPECT_EQ(desk.TakeWithoutPositions(), "1 TriggerTimeReached(13, 45000)\n"
+                                           "1 Finished(0)\n");
+}
+
+TEST(Trigger, IsRefusedBehindTheEndOfThePlayList)
+{
+    TestDesk desk(ListOf({Item(10), Item(10)}));
+    desk.Start();
+    const std::string before = desk.Snapshot();
+
+    EXPECT_EQ(desk.navigator.SetTrigger(20 * Second + 45).Reason(),
+              "00:00:20.001 is behind the end of the play list, which lasts 00:00:20.000");
+
+    EXPECT_EQ(desk.Take(), "");
+    EXPECT_EQ(desk.Snapshot(), before);
+}
+
+TEST(Trigger, LeavesOtherTriggersAlone)
+{
+    TestDesk desk(ListOf({Item(10)}));
+    desk.Start();
+    desk.Do(desk.navigator.RepeatTitle());
+
+    desk.Do(desk.navigator.SetTrigger(100));
+
+    EXPECT_EQ(desk.navigator.GetCurrentChpTitleRepeatState(), bd::TRIGGER_TITLE);
+}
+
+} // namespace
+
+} // namespace deskplayer

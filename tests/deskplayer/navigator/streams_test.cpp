@@ -1,0 +1,326 @@
+#include <gtest/gtest.h>
+
+#include <functional>
+
+#include "../testdesk.h"
+
+namespace deskplayer
+{
+
+namespace
+{
+
+typedef Outcome (SimulatedNavigator::*Select)(std::uint64_t number);
+typedef Outcome (SimulatedNavigator::*Switch)(bool on);
+
+bd::PlayMode Fast()
+{
+    return bd::PlayMode(bd::PlayDirectionForward, bd::PlaySpeedFast1);
+}
+
+/** Operations that select one of two. */
+struct Selection {
+    Select select;
+    const char* what;
+    const char* heard; ///< when the second was selected
+};
+
+const Selection Selections[] = {
+    {&SimulatedNavigator::SelectAudio, "audio stream",
+     "1 AudioInfo(2)\n"
+     "1 AudioInfoChanged(true, (3, 0, 0, 0, 4353, 0))\n"},
+    {&SimulatedNavigator::SelectSubtitle, "subtitle stream",
+     "1 PresentationGraphicsInfo(2, true)\n"},
+    {&SimulatedNavigator::SelectAngle, "angle", "1 AngleInfo(2)\n"},
+    {&SimulatedNavigator::SelectSecondaryVideo, "secondary video stream",
+     "1 SecondaryVideoInfo(2)\n"
+     "1 SecondaryVideoDisplay(2, false)\n"},
+    {&SimulatedNavigator::SelectSecondaryAudio, "secondary audio stream",
+     "1 SecondaryAudioInfo(2)\n"
+     "1 SecondaryAudioDisplay(2, false)\n"
+     "1 AudioInfoChanged(false, (8, 0, 0, 0, 6657, 0))\n"},
+    {&SimulatedNavigator::SelectPipSubtitle, "picture-in-picture subtitle stream",
+     "1 PipPgTextStInfo(2, false)\n"},
+};
+
+TEST(Streams, AreSelectedAndToldOnce)
+{
+    for (const Selection& selection : Selections) {
+        SCOPED_TRACE(selection.what);
+        TestDesk desk(ListOf({RichItem(10)}));
+        desk.Start(Second);
+        const std::string before = desk.Snapshot();
+
+        EXPECT_TRUE((desk.navigator.*selection.select)(2).IsDone());
+        EXPECT_EQ(desk.Take(), selection.heard);
+        EXPECT_NE(desk.Snapshot(), before);
+
+        EXPECT_TRUE((desk.navigator.*selection.select)(2).IsDone());
+        EXPECT_EQ(desk.Take(), "") << "nothing has changed";
+
+        EXPECT_TRUE((desk.navigator.*selection.select)(1).IsDone());
+        EXPECT_EQ(desk.Snapshot(), before);
+    }
+}
+
+TEST(Streams, ThatAreNotThereAreRefused)
+{
+    for (const Selection& selection : Selections) {
+        SCOPED_TRACE(selection.what);
+        TestDesk desk(ListOf({RichItem(10)}));
+        desk.Start(Second);
+        const std::string before = desk.Snapshot();
+
+        for (const std::uint64_t number : std::vector<std::uint64_t>{0, 3, 257, 65537}) {
+            EXPECT_EQ((desk.navigator.*selection.select)(number).Reason(),
+                      "there is no " + std::string(selection.what) + " " + std::to_string(number) +
+                          ", they count from 1 to 2");
+        }
+        EXPECT_EQ(desk.Take(), "");
+        EXPECT_EQ(desk.Snapshot(), before);
+    }
+}
+
+TEST(Streams, CannotBeSelectedWhereThereAreNone)
+{
+    for (const Selection& selection : Selections) {
+        SCOPED_TRACE(selection.what);
+        TestDesk desk(ListOf({Item(10)}));
+        desk.Start(Second);
+
+        const std::string none = selection.select == &SimulatedNavigator::SelectAngle
+                                     ? ", they count from 1 to 1"
+                                     : ", there is none here";
+        EXPECT_EQ((desk.navigator.*selection.select)(2).Reason(),
+                  "there is no " + std::string(selection.what) + " 2" + none);
+        EXPECT_EQ(desk.Take(), "");
+    }
+}
+
+TEST(Streams, AreTheLastWhereTheChosenOneIsMissingAndTheChoiceStays)
+{
+    PlayItem poor = RichItem(1);
+    poor.streams.primaryAudio.pop_back();
+    TestDesk desk(ListOf({RichItem(1), poor, Item(1), RichItem(1)}));
+    desk.Start();
+    desk.Do(desk.navigator.SelectAudio(2));
+
+    desk.navigator.Advance(Second);
+    EXPECT_EQ(desk.TakeWithoutPositions(), "1 PlayItem(7, 1, 6, 15)\n"
+                                           "1 AudioInfo(1)\n"
+                                           "1 AudioInfoChanged(true, (2, 0, 0, 0, 4352, 0))\n");
+    desk.navigator.Advance(Second);
+    EXPECT_NE(desk.Take().find("2 AudioInfo(0)\n"), std::string::npos);
+    desk.navigator.Advance(Second);
+    const std::string heard = desk.Take();
+    EXPECT_NE(heard.find("3 AudioInfo(2)\n"), std::string::npos);
+    EXPECT_NE(heard.find("3 AudioInfoChanged(true, (3, 0, 0, 0, 4353, 0))\n"), std::string::npos);
+}
+
+TEST(Streams, TellTheirAudioAgainOnlyWhenItIsDifferent)
+{
+    PlayItem other = RichItem(1);
+    other.streams.primaryAudio.front().attributes.sampleRate = 1;
+    PlayItem further = other;
+    further.streams.primaryAudio.pop_back();
+    TestDesk desk(ListOf({RichItem(1), other, further}));
+    desk.Start();
+
+    desk.navigator.Advance(2 * Second);
+
+    EXPECT_EQ(desk.TakeWithoutPositions(), "1 PlayItem(7, 1, 6, 15)\n"
+                                           "1 AudioInfoChanged(true, (2, 9, 0, 0, 4352, 0))\n"
+                                           "2 PlayItem(7, 2, 6, 15)\n"
+                                           "2 AudioInfo(1)\n");
+}
+
+TEST(Streams, AreShownAndHidden)
+{
+    const struct {
+        Switch show;
+        bool before;
+        const char* on;
+        const char* off;
+    } switches[] = {
+        {&SimulatedNavigator::ShowSubtitles, true, "1 PresentationGraphicsDisplay(true)\n",
+         "1 PresentationGraphicsDisplay(false)\n"},
+        {&SimulatedNavigator::ShowSecondaryVideo, false, "1 SecondaryVideoDisplay(1, true)\n",
+         "1 SecondaryVideoDisplay(1, false)\n"},
+        {&SimulatedNavigator::ShowSecondaryAudio, false, "1 SecondaryAudioDisplay(1, true)\n",
+         "1 SecondaryAudioDisplay(1, false)\n"},
+        {&SimulatedNavigator::PickPipSubtitle, false, "1 PipPgTextSelect(true)\n",
+         "1 PipPgTextSelect(false)\n"},
+    };
+    for (const auto& item : switches) {
+        SCOPED_TRACE(item.on);
+        TestDesk desk(ListOf({RichItem(10)}));
+        desk.Start(Second);
+        const std::string before = desk.Snapshot();
+
+        EXPECT_TRUE((desk.navigator.*item.show)(!item.before).IsDone());
+        EXPECT_EQ(desk.Take(), item.before ? item.off : item.on);
+        EXPECT_NE(desk.Snapshot(), before);
+        EXPECT_TRUE((desk.navigator.*item.show)(item.before).IsDone());
+        EXPECT_EQ(desk.Take(), item.before ? item.on : item.off);
+        EXPECT_EQ(desk.Snapshot(), before);
+    }
+}
+
+TEST(Streams, HiddenSubtitlesAreNotAvailable)
+{
+    TestDesk desk(ListOf({RichItem(10)}));
+    desk.Start(Second);
+    desk.Do(desk.navigator.ShowSubtitles(false));
+
+    desk.navigator.SelectSubtitle(2);
+
+    EXPECT_EQ(desk.Take(), "1 PresentationGraphicsInfo(2, false)\n");
+}
+
+TEST(Streams, OfTextHaveFourStyles)
+{
+    TestDesk desk(ListOf({RichItem(10)}));
+    desk.Start(Second);
+    const std::string before = desk.Snapshot();
+
+    EXPECT_EQ(desk.navigator.SelectStyle(0).Reason(),
+              "there is no text subtitle style 0, they count from 1 to 4");
+    EXPECT_EQ(desk.navigator.SelectStyle(5).Reason(),
+              "there is no text subtitle style 5, they count from 1 to 4");
+    EXPECT_EQ(desk.Take(), "");
+    EXPECT_EQ(desk.Snapshot(), before);
+
+    EXPECT_TRUE(desk.navigator.SelectStyle(4).IsDone());
+    EXPECT_EQ(desk.Take(), "1 TextSubtitleStyleInfo(4)\n");
+    EXPECT_EQ(desk.navigator.GetCurrentTextSubtitleStyleNumber(), 4);
+}
+
+TEST(Streams, WithoutTextHaveNoStyles)
+{
+    PlayItem item = RichItem(10);
+    item.streams.pg = {StreamOf(CodingGraphics)};
+    TestDesk desk(ListOf({item, RichItem(10), item}));
+    desk.Start();
+
+    EXPECT_EQ(desk.navigator.SelectStyle(1).Reason(),
+              "there is no text subtitle style 1, there is none here");
+
+    desk.navigator.Advance(10 * Second);
+    EXPECT_EQ(desk.TakeWithoutPositions(), "10 PlayItem(7, 1, 6, 15)\n"
+                                           "10 PresentationGraphicsInfo(1, true)\n"
+                                           "10 TextSubtitleStylesAvailable(4)\n"
+                                           "10 TextSubtitleStyleInfo(1)\n");
+    desk.navigator.Advance(10 * Second);
+    EXPECT_EQ(desk.TakeWithoutPositions(), "20 PlayItem(7, 2, 6, 15)\n"
+                                           "20 PresentationGraphicsInfo(1, true)\n"
+                                           "20 TextSubtitleStylesAvailable(0)\n");
+}
+
+TEST(Streams, ZoomIsTold)
+{
+    TestDesk desk(ListOf({Item(10)}));
+    desk.Start(Second);
+
+    EXPECT_TRUE(desk.navigator.Zoom({{1, 2, 3, 4}, {5, 6, 7, 8}, 9}).IsDone());
+
+    EXPECT_EQ(desk.Take(), "1 ZoomModeSet(((1, 2, 3, 4), (5, 6, 7, 8), 9))\n");
+}
+
+/** A play item whose secondary streams come from a sub path of @p type. */
+PlayList WithSecondaryStreamsOf(bd::SubPathType type)
+{
+    PlayItem item = Item(10);
+    item.streams.secondaryVideo = {StreamOfSubPath(0x1B, 0)};
+    item.streams.secondaryAudio = {StreamOfSubPath(CodingEac3Secondary, 0)};
+    PlayList playList = ListOf({item, Item(10)});
+    playList.subPaths.resize(1);
+    playList.subPaths.front().type = static_cast<std::uint8_t>(type);
+    return playList;
+}
+
+constexpr const char* Available = "0 PictureInPictureAvailable()\n"
+                                  "0 SecondaryAudioAvailable()\n";
+constexpr const char* Unavailable = "0 PictureInPictureUnavailable()\n"
+                                    "0 SecondaryAudioUnavailable()\n";
+
+TEST(SecondaryStreams, AreAvailableWithTheItemOnTheirOwnAndBehindItsStreamsInStep)
+{
+    for (const bool inStep : {true, false}) {
+        SCOPED_TRACE(inStep);
+        TestDesk desk(WithSecondaryStreamsOf(inStep
+                                                 ? bd::SubPathOutOfMuxSynchPipPresentationPath
+                                                 : bd::SubPathOutOfMuxASynchPipPresentationPath));
+
+        desk.navigator.Play();
+
+        EXPECT_EQ(desk.Take(), "0 PlayStarted()\n"
+                               "0 Playlist(7)\n"
+                               "0 PlayItem(7, 0, 6, 15)\n" +
+                                   std::string(inStep ? "" : Available) +
+                                   "0 VideoInfo(1)\n"
+                                   "0 AngleInfo(1)\n"
+                                   "0 SecondaryVideoInfo(1)\n"
+                                   "0 SecondaryVideoDisplay(1, false)\n"
+                                   "0 SecondaryAudioInfo(1)\n"
+                                   "0 SecondaryAudioDisplay(1, false)\n"
+                                   "0 AudioInfoChanged(false, (8, 0, 0, 0, 0, 0))\n" +
+                                   (inStep ? Available : "") +
+                                   "0 UOMask(0)\n"
+                                   "0 FirstPictureDelivered()\n"
+                                   "0 CurrentTimePosition(0)\n");
+    }
+}
+
+TEST(SecondaryStreams, AreAvailableAtNormalSpeedOnly)
+{
+    for (const bd::SubPathType type : {bd::SubPathOutOfMuxSynchPipPresentationPath,
+                                       bd::SubPathOutOfMuxASynchPipPresentationPath}) {
+        SCOPED_TRACE(type);
+        TestDesk desk(WithSecondaryStreamsOf(type));
+        desk.Start();
+
+        desk.navigator.SetPlayMode(Fast());
+        EXPECT_EQ(desk.Take(), std::string("0 PlayMode(0, 6)\n") + Unavailable);
+        desk.navigator.SetPlayMode(bd::PlayMode());
+        EXPECT_EQ(desk.Take(), std::string("0 PlayMode(0, 5)\n") + Available);
+    }
+}
+
+TEST(SecondaryStreams, AreUnavailableOnceInTheItemThatLacksThem)
+{
+    for (const bd::SubPathType type : {bd::SubPathOutOfMuxSynchPipPresentationPath,
+                                       bd::SubPathOutOfMuxASynchPipPresentationPath}) {
+        SCOPED_TRACE(type);
+        TestDesk desk(WithSecondaryStreamsOf(type));
+        desk.Start();
+
+        desk.navigator.Advance(10 * Second);
+
+        EXPECT_EQ(desk.TakeWithoutPositions(), "10 PlayItem(7, 1, 6, 15)\n"
+                                               "10 PictureInPictureUnavailable()\n"
+                                               "10 SecondaryAudioUnavailable()\n"
+                                               "10 SecondaryVideoInfo(0)\n"
+                                               "10 SecondaryVideoDisplay(0, false)\n"
+                                               "10 SecondaryAudioInfo(0)\n"
+                                               "10 SecondaryAudioDisplay(0, false)\n");
+    }
+}
+
+TEST(SecondaryStreams, OfASubPathThatIsNotThereAreInStep)
+{
+    PlayItem item = Item(10);
+    item.streams.secondaryVideo = {StreamOfSubPath(0x1B, 3)};
+    TestDesk desk(ListOf({item}));
+    desk.Start();
+    bd::StreamNumberDef number = 0;
+    bd::UInt8 count = 0;
+    bool async = true;
+
+    desk.navigator.GetSecondaryVideoInfo(&number, &count, &async);
+
+    EXPECT_FALSE(async);
+}
+
+} // namespace
+
+} // namespace deskplayer

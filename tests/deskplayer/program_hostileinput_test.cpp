@@ -1,0 +1,176 @@
+#include <gtest/gtest.h>
+#include <sys/resource.h>
+#include <sys/stat.h>
+
+#include <cstdint>
+#include <filesystem>
+#include <string>
+#include <vector>
+
+#include "disc/bytewriter.h"
+#include "programtest.h"
+#include "session/script.h"
+
+namespace
+{
+
+// A sanitizer takes more memory than the program may have.
+#if defined(__SANITIZE_ADDRESS__) || defined(__SANITIZE_THREAD__)
+constexpr bool Sanitized = true;
+#elif !defined(__has_feature)
+constexpr bool Sanitized = false;
+#elif __has_feature(address_sanitizer) || __has_feature(thread_sanitizer)
+constexpr bool Sanitized = true;
+#else
+constexpr bool Sanitized = false;
+#endif
+
+/** How long children of this process have computed. */
+double SecondsOfChildren()
+{
+    rusage usage = {};
+    getrusage(RUSAGE_CHILDREN, &usage);
+    const auto seconds = [](const timeval& time) {
+        return static_cast<double>(time.tv_sec) + 1e-6 * static_cast<double>(time.tv_usec);
+    };
+    return seconds(usage.ru_utime) + seconds(usage.ru_stime);
+}
+
+/** Runs in 64 MiB, and says in one line what is wrong before it has computed for a second. */
+class HostileInput : public ScratchDisc
+{
+protected:
+    void SetUp() override
+    {
+        if (Sanitized) {
+            GTEST_SKIP() << "sanitizers need more memory";
+        }
+    }
+
+    static void ExpectFault(const std::vector<std::string>& arguments, int status,
+                            const std::string& message)
+    {
+        SCOPED_TRACE(testing::PrintToString(arguments));
+        const double before = SecondsOfChildren();
+        const ProgramResult result = RunDeskPlayerInLittleMemory(arguments, 64 * 1024);
+        EXPECT_LT(SecondsOfChildren() - before, 1);
+        EXPECT_EQ(result.status, status);
+        EXPECT_EQ(result.output, "");
+        EXPECT_EQ(LinesOf(result.errors).size(), 1U) << result.errors;
+        EXPECT_NE(result.errors.find(message), std::string::npos) << result.errors;
+    }
+
+    /** Whether the play list is named, looked for or described. */
+    void ExpectRefusedPlayList(const std::string& message) const
+    {
+        ExpectFault({disc}, 3, message);
+        ExpectFault({disc, "--playlist", "1"}, 3, message);
+        ExpectFault({disc, "--describe", "1"}, 3, message);
+    }
+
+    void ExpectRefusedSession(const std::string& session, const std::string& message) const
+    {
+        ExpectFault({disc, "--session", session}, 2, message);
+    }
+
+    static constexpr std::uintmax_t ThreeGibibytes = std::uintmax_t{3} << 30;
+};
+
+TEST_F(HostileInput, MayBeAHugePlayList)
+{
+    fs::resize_file(playList, ThreeGibibytes);
+    ExpectRefusedPlayList("PLAYLIST/00001.mpls: has 3221225472 bytes, expected at most 1048576");
+}
+
+TEST_F(HostileInput, MayBeHugeClipInformation)
+{
+    fs::resize_file(disc / "BDMV/CLIPINF/00002.clpi", ThreeGibibytes);
+    ExpectFault({disc}, 3, "CLIPINF/00002.clpi: has 3221225472 bytes, expected at most 4194304");
+}
+
+TEST_F(HostileInput, MayBeAPipeOrAFolderInsteadOfAPlayList)
+{
+    fs::remove(playList);
+    ASSERT_EQ(mkfifo(playList.c_str(), 0600), 0);
+    ExpectRefusedPlayList("PLAYLIST/00001.mpls: not a regular file, expected one");
+    fs::remove(playList);
+    fs::create_directory(playList);
+    ExpectRefusedPlayList("PLAYLIST/00001.mpls: not a regular file, expected one");
+}
+
+TEST_F(HostileInput, MayClaimMorePlayItemsThanItHas)
+{
+    deskplayer::PlayListBytes bytes = deskplayer::DensePlayList();
+    bytes.itemCount = 20000;
+    deskplayer::WriteBytes(playList, bytes.Make());
+    ExpectRefusedPlayList("PLAYLIST/00001.mpls: offset ");
+}
+
+TEST_F(HostileInput, MayBeThePlayListThatTakesTheMostMemory)
+{
+    const deskplayer::Bytes dense = deskplayer::DensePlayList().Make();
+    deskplayer::WriteBytes(playList, dense);
+    deskplayer::WriteBytes(disc / "BDMV/PLAYLIST/00002.mpls", dense);
+    for (const std::vector<std::string>& option :
+         {std::vector<std::string>{"--list"}, {"--describe", "1"}, {}}) {
+        std::vector<std::string> arguments = {disc};
+        arguments.insert(arguments.end(), option.begin(), option.end());
+        const ProgramResult result = RunDeskPlayerInLittleMemory(arguments, 64 * 1024);
+        EXPECT_EQ(result.status, 0);
+        EXPECT_EQ(result.errors, "");
+    }
+}
+
+TEST_F(HostileInput, MayNameALargeClipInEveryPlayItem)
+{
+    using namespace deskplayer;
+    PlayItemBytes item;
+    item.clip = "00000";
+    item.inTime = item.outTime;
+    item.streamTable =
+        StreamTableBytes({1, 0, 0, 0, 0, 0, 0, 0},
+                         Join({StreamEntry(1), StreamAttributesBytes(0x1B, {0x61, 0, 0, 0})}));
+    PlayListBytes bytes;
+    bytes.itemCount = 1000;
+    bytes.items = Repeat(bytes.itemCount, item.Make());
+    WriteBytes(playList, bytes.Make());
+    const Bytes stream = Join({U16(1), Part8({0x1B, 0x61, 0x30})});
+    WriteBytes(disc / "BDMV/CLIPINF/00000.clpi",
+               ClipInfoOf(255, Repeat(255, ProgramBytes(255, Repeat(255, stream)))));
+
+    const double before = SecondsOfChildren();
+    const ProgramResult result =
+        RunDeskPlayerInLittleMemory({disc, "--only", "Finished"}, 64 * 1024);
+    EXPECT_LT(SecondsOfChildren() - before, 1);
+    EXPECT_EQ(result.status, 0);
+    EXPECT_EQ(result.errors, "");
+}
+
+TEST_F(HostileInput, MayBeAnEndlessOrSilentSession)
+{
+    const std::string tooLong = ": has more than 1048576 bytes, expected a session";
+    ExpectRefusedSession("/dev/zero", "/dev/zero" + tooLong);
+    const std::string huge = WriteFile("huge.session", "");
+    fs::resize_file(huge, ThreeGibibytes);
+    ExpectRefusedSession(huge, huge + tooLong);
+    const std::string silent = folder / "silent.session";
+    ASSERT_EQ(mkfifo(silent.c_str(), 0600), 0);
+    ExpectRefusedSession(silent, silent + ": nothing comes out of it, expected a session");
+}
+
+TEST_F(HostileInput, MayBeASessionOfOneLineOrWord)
+{
+    std::string words;
+    while (words.size() + 2 < deskplayer::LongestScript) {
+        words += "a ";
+    }
+    const std::string line = WriteFile("line.session", words);
+    ExpectRefusedSession(line, line + ":1:1: 'a' is no command here");
+    const std::string word = WriteFile("word.session", std::string(deskplayer::LongestScript, 'a'));
+    ExpectRefusedSession(word, word + ":1:1: 'aaa");
+    const std::string late =
+        WriteFile("late.session", std::string(deskplayer::LongestScript - 1, '\n') + "x");
+    ExpectRefusedSession(late, late + ":1048576:1: 'x' is no command here");
+}
+
+} // namespace

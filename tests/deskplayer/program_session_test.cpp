@@ -1,0 +1,124 @@
+#include <gtest/gtest.h>
+#include <sys/stat.h>
+
+#include <fstream>
+#include <set>
+#include <string>
+#include <thread>
+
+#include "output/callbacks.h"
+#include "programtest.h"
+
+namespace
+{
+
+using DeskPlayerSession = ScratchFolder;
+
+TEST_F(DeskPlayerSession, OfAllEventsCallsEveryCallback)
+{
+    const ProgramResult result = RunDeskPlayer({SampleDisc, "--session", AllEvents});
+
+    EXPECT_EQ(result.status, 0);
+    EXPECT_EQ(result.errors, "bdmv-deskplayer: " + AllEvents +
+                                 ":8: refused at 00:00:02.000: SkipToNextPoint is forbidden by "
+                                 "play item 0\n");
+    std::set<std::string> called;
+    for (const std::string& line : LinesOf(result.output)) {
+        const std::string callback = line.substr(sizeof "hh:mm:ss.mmm ");
+        called.insert(callback.substr(0, callback.find(' ')));
+    }
+    std::set<std::string> all;
+    for (const deskplayer::CallbackInfo& info : deskplayer::AllCallbacks) {
+        all.emplace(info.name);
+    }
+    EXPECT_EQ(all.size(), 56U);
+    EXPECT_EQ(called, all);
+}
+
+TEST_F(DeskPlayerSession, OfAnEveningPlaysToTheEnd)
+{
+    const ProgramResult result = RunDeskPlayer({SampleDisc, "--session", Evening});
+
+    EXPECT_EQ(result.status, 0);
+    EXPECT_EQ(result.errors, "bdmv-deskplayer: " + Evening +
+                                 ":4: refused at 00:00:02.000: SkipToNextPoint is forbidden by "
+                                 "play item 0\n");
+    EXPECT_EQ(LastLine(result.output),
+              "08:03:35.000  Finished                    reason=EndOfMedia");
+}
+
+TEST_F(DeskPlayerSession, HasTheSameOutputEveryTime)
+{
+    for (const char* const format : {"text", "json", "trace"}) {
+        const std::vector<std::string> arguments = {SampleDisc, "--session", AllEvents, "--format",
+                                                    format};
+        const ProgramResult first = RunDeskPlayer(arguments);
+        const ProgramResult second = RunDeskPlayer(arguments);
+        EXPECT_NE(first.output, "");
+        EXPECT_EQ(first.output, second.output);
+        EXPECT_EQ(first.errors, second.errors);
+    }
+}
+
+TEST_F(DeskPlayerSession, ThatCannotBeReadIsRefused)
+{
+    const std::string wrong = WriteFile("wrong.session", "play\n  nxt 3\n");
+    const ProgramResult result = RunDeskPlayer({SampleDisc, "--session", wrong});
+    EXPECT_EQ(result.status, 2);
+    EXPECT_EQ(result.output, "");
+    EXPECT_EQ(result.errors.rfind("bdmv-deskplayer: " + wrong +
+                                      ":2:3: 'nxt' is no command here; expected at, after, play, ",
+                                  0),
+              0U)
+        << result.errors;
+    EXPECT_EQ(LinesOf(result.errors).size(), 1U);
+
+    const std::string noTextFile = ": no session that can be read, expected a text file";
+    ExpectUsageError({SampleDisc, "--session", "no.session"}, "no.session" + noTextFile);
+    ExpectUsageError({SampleDisc, "--session", folder}, folder.string() + noTextFile);
+
+    const std::string tooLong = ": has more than 1048576 bytes, expected a session";
+    const std::string longFile = WriteFile("long.session", std::string(1024 * 1024 + 1, '\n'));
+    ExpectUsageError({SampleDisc, "--session", longFile}, longFile + tooLong);
+    ExpectUsageError({SampleDisc, "--session", "/dev/zero"}, "/dev/zero" + tooLong);
+}
+
+TEST_F(DeskPlayerSession, OfTheLargestSizeIsAccepted)
+{
+    const std::string script = WriteFile("a.session", std::string(1024 * 1024 - 4, '\n') + "play");
+
+    const ProgramResult result =
+        RunDeskPlayer({SampleDisc, "--session", script, "--only", "PlayStarted"});
+
+    EXPECT_EQ(result.status, 0);
+    EXPECT_EQ(result.output, "00:00:00.000  PlayStarted\n");
+}
+
+TEST_F(DeskPlayerSession, OfTwoHoursPlaysToTheEnd)
+{
+    const std::string script =
+        WriteFile("a.session", "play\nrepeat title\nafter 2h repeat off\nafter 1s stop\n");
+
+    const ProgramResult result = RunDeskPlayer(
+        {SampleDisc, "--playlist", "2", "--session", script, "--only", "JumpOccurred,Stopped"});
+
+    EXPECT_EQ(result.status, 0);
+    EXPECT_EQ(LinesOf(result.output).size(), 360U + 1U);
+    EXPECT_EQ(LastLine(result.output), "02:00:01.000  Stopped");
+}
+
+TEST_F(DeskPlayerSession, IsReadFromAPipe)
+{
+    const std::string pipe = folder / "pipe.session";
+    ASSERT_EQ(mkfifo(pipe.c_str(), 0600), 0);
+    std::thread writer([&pipe] { std::ofstream(pipe) << "play\nafter 1s stop\n"; });
+
+    const ProgramResult result =
+        RunDeskPlayer({SampleDisc, "--session", pipe, "--only", "Stopped"});
+
+    writer.join();
+    EXPECT_EQ(result.status, 0);
+    EXPECT_EQ(result.output, "00:00:01.000  Stopped\n");
+}
+
+} // namespace

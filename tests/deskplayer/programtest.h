@@ -1,0 +1,71 @@
+/**
+ * @file
+ * What the tests of the program share: its sample disc and sessions, folders and discs to change,
+ * and the lines it prints.
+ */
+#ifndef TESTS_DESKPLAYER_PROGRAMTEST_H
+#define TESTS_DESKPLAYER_PROGRAMTEST_H
+
+#include <gtest/gtest.h>
+
+#include <cstdint>
+#include <filesystem>
+#include <ios>
+#include <string>
+#include <vector>
+
+#include "program.h"
+
+namespace fs = std::filesystem;
+
+extern const std::string SampleDisc;
+extern const std::string AllEvents;
+extern const std::string Evening;
+
+std::vector<std::string> LinesOf(const std::string& text);
+
+/** The last line of @p text; empty if there is none. */
+std::string LastLine(const std::string& text);
+
+/** The lines of @p text that do not contain @p pattern. */
+std::string Without(const std::string& pattern, const std::string& text);
+
+std::string ContentOf(const fs::path& path);
+
+/** Wrong usage is explained in one line, nothing is played, and the exit status is 2. */
+void ExpectUsageError(const std::vector<std::string>& arguments, const std::string& message);
+
+/** A folder for the files of a test. */
+class ScratchFolder : public testing::Test
+{
+protected:
+    ScratchFolder();
+    ~ScratchFolder() override;
+
+    /** @return its path */
+    std::string WriteFile(const std::string& name, const std::string& content) const;
+
+    const fs::path folder;
+};
+
+/** A copy of the sample disc for each test to change. */
+class ScratchDisc : public ScratchFolder
+{
+protected:
+    ScratchDisc();
+
+    /** Writes over bytes of the play list. */
+    void Patch(std::streamoff offset, const std::string& bytes) const;
+
+    /** Replaces the film by the trailer, shortened or extended to so many ticks of 45 kHz. */
+    void MakeShort(std::uint32_t ticks) const;
+
+    /** The desk player says in one line what is wrong, plays nothing, and exits with status 3. */
+    void ExpectRefused(const std::string& message,
+                       const std::vector<std::string>& furtherArguments = {}) const;
+
+    const fs::path disc = folder / "disc";
+    const fs::path playList = disc / "BDMV/PLAYLIST/00001.mpls";
+};
+
+#endif

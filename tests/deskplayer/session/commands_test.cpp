@@ -1,0 +1,300 @@
+#include "session/commands.h"
+
+#include <gtest/gtest.h>
+
+#include <set>
+
+#include "../testdesk.h"
+
+namespace deskplayer
+{
+
+namespace
+{
+
+/** An item that can do everything, with chapters at 0 and 5 s, and one that ends in a still. */
+PlayList TwoItems()
+{
+    return ListOf({RichItem(10), WithEndlessStill(RichItem(10))},
+                  {Entry(0, 0), Entry(0, 5 * Second)});
+}
+
+/** Carries out a script of one line or several, all of them at once. */
+Outcome Perform(TestDesk& desk, const std::string& script)
+{
+    Outcome outcome = Outcome::Done();
+    for (const ScriptStep& step : ParseScript(script, "a.session", CommandSyntaxes())) {
+        outcome = Commands()[step.command].perform(desk.desk, step.values);
+    }
+    return outcome;
+}
+
+/** What becomes of a command, a second after the preparation. */
+struct Example {
+    const char* pattern; ///< the command it stands for
+    const char* line;
+    const char* preparation;
+    const char* heard;
+};
+
+const Example Examples[] = {
+    {"play", "play", "fail play", "0 PlayFailed()\n"},
+    {"stop", "stop", "play", "1 Stopped()\n"},
+    {"pause", "pause", "play", "1 Paused()\n"},
+    {"continue", "continue", "play\npause", "1 Continued(0, 5)\n"},
+    {"step", "step", "play\npause", "1 Stepped(900, 0)\n"},
+    {"forward", "forward", "play\nforward fast 1",
+     "1 PlayMode(0, 5)\n"
+     "1 PictureInPictureAvailable()\n"
+     "1 SecondaryAudioAvailable()\n"},
+    {"forward fast NUMBER", "forward fast 2", "play\nforward fast 1", "1 PlayMode(0, 7)\n"},
+    {"forward slow NUMBER", "forward slow 2", "play\nforward fast 1", "1 PlayMode(0, 3)\n"},
+    {"backward", "backward", "play", "1 PlayMode(1, 5)\n"},
+    {"backward fast NUMBER", "backward fast 12", "play\nforward fast 1", "1 PlayMode(1, 17)\n"},
+    {"backward slow NUMBER", "backward slow 5", "play\nforward fast 1", "1 PlayMode(1, 0)\n"},
+    {"still off", "still off", "play\nseek 19.5",
+     "1 StillOff()\n"
+     "1 Finished(0)\n"},
+    {"suspend", "suspend", "play", "1 Suspended()\n"},
+    {"resume", "resume", "play\nsuspend", "1 Resumed()\n"},
+    {"seek TIME", "seek 7.5", "play",
+     "1 JumpOccurred()\n"
+     "1 ChapterNumber(2)\n"
+     "1 CurrentTimePosition(337500)\n"},
+    {"chapter next", "chapter next", "play",
+     "1 JumpOccurred()\n"
+     "1 MarkInfo(7, 1, 225000)\n"
+     "1 ChapterNumber(2)\n"
+     "1 CurrentTimePosition(225000)\n"},
+    {"chapter previous", "chapter previous", "play\nseek 8.5",
+     "1 JumpOccurred()\n"
+     "1 MarkInfo(7, 1, 225000)\n"
+     "1 CurrentTimePosition(225000)\n"},
+    {"chapter NUMBER", "chapter 2", "play",
+     "1 JumpOccurred()\n"
+     "1 MarkInfo(7, 1, 225000)\n"
+     "1 ChapterNumber(2)\n"
+     "1 CurrentTimePosition(225000)\n"},
+    {"repeat a", "repeat a", "play", "1 TriggerSet(5, true)\n"},
+    {"repeat b", "repeat b", "play\nrepeat a",
+     "1 TriggerSet(6, true)\n"
+     "1 TriggerTimeReached(6, 45000)\n"
+     "1 JumpOccurred()\n"
+     "1 MarkInfo(7, 0, 0)\n"
+     "1 CurrentTimePosition(0)\n"},
+    {"repeat ab off", "repeat ab off", "play\nrepeat a", "1 TriggerSet(7, true)\n"},
+    {"repeat chapter", "repeat chapter", "play", "1 TriggerSet(8, true)\n"},
+    {"repeat title", "repeat title", "play", "1 TriggerSet(9, true)\n"},
+    {"repeat off", "repeat off", "play\nrepeat title", "1 TriggerSet(4, true)\n"},
+    {"trigger TIME", "trigger 5", "play", "1 TriggerSet(13, true)\n"},
+    {"audio NUMBER", "audio 2", "play",
+     "1 AudioInfo(2)\n"
+     "1 AudioInfoChanged(true, (3, 0, 0, 0, 4353, 0))\n"},
+    {"audio next", "audio next", "play\naudio 2",
+     "1 AudioInfo(1)\n"
+     "1 AudioInfoChanged(true, (2, 0, 0, 0, 4352, 0))\n"},
+    {"subtitle on", "subtitle on", "play", "1 PresentationGraphicsDisplay(true)\n"},
+    {"subtitle off", "subtitle off", "play", "1 PresentationGraphicsDisplay(false)\n"},
+    {"subtitle next", "subtitle next", "play", "1 PresentationGraphicsInfo(2, true)\n"},
+    {"subtitle style NUMBER", "subtitle style 3", "play", "1 TextSubtitleStyleInfo(3)\n"},
+    {"subtitle NUMBER", "subtitle 2", "play", "1 PresentationGraphicsInfo(2, true)\n"},
+    {"angle NUMBER", "angle 2", "play", "1 AngleInfo(2)\n"},
+    {"angle next", "angle next", "play\nangle 2", "1 AngleInfo(1)\n"},
+    {"pip on", "pip on", "play", "1 SecondaryVideoDisplay(1, true)\n"},
+    {"pip off", "pip off", "play\npip on", "1 SecondaryVideoDisplay(1, false)\n"},
+    {"pip audio on", "pip audio on", "play", "1 SecondaryAudioDisplay(1, true)\n"},
+    {"pip audio off", "pip audio off", "play\npip audio on", "1 SecondaryAudioDisplay(1, false)\n"},
+    {"pip audio NUMBER", "pip audio 2", "play",
+     "1 SecondaryAudioInfo(2)\n"
+     "1 SecondaryAudioDisplay(2, false)\n"
+     "1 AudioInfoChanged(false, (8, 0, 0, 0, 6657, 0))\n"},
+    {"pip subtitle on", "pip subtitle on", "play", "1 PipPgTextSelect(true)\n"},
+    {"pip subtitle off", "pip subtitle off", "play\npip subtitle on", "1 PipPgTextSelect(false)\n"},
+    {"pip subtitle NUMBER", "pip subtitle 2", "play", "1 PipPgTextStInfo(2, false)\n"},
+    {"pip NUMBER", "pip 2", "play",
+     "1 SecondaryVideoInfo(2)\n"
+     "1 SecondaryVideoDisplay(2, false)\n"},
+    {"zoom off", "zoom off", "play\nzoom 1 2 3 4",
+     "1 ZoomModeSet(((0, 0, 1920, 1080), (0, 0, 1920, 1080), 0))\n"},
+    {"zoom NUMBER NUMBER NUMBER NUMBER", "zoom 1 2 3 4", "play",
+     "1 ZoomModeSet(((1, 2, 3, 4), (0, 0, 1920, 1080), 0))\n"},
+    {"menu on", "menu on", "play",
+     "1 InteractiveGraphicsActive()\n"
+     "1 InteractiveGraphicsVisible()\n"},
+    {"menu off", "menu off", "play\nmenu on",
+     "1 InteractiveGraphicsInvisible()\n"
+     "1 InteractiveGraphicsInactive()\n"},
+    {"button previous", "button previous\nbutton activate", "play\nmenu on\nbutton 2",
+     "1 ButtonActivationBusy()\n"
+     "1 ExecuteButton(1, 1, program shared by 2)\n"
+     "1 ButtonActivationDone()\n"
+     "1 InteractiveGraphicsInvisible()\n"
+     "1 InteractiveGraphicsInactive()\n"
+     "1 JumpOccurred()\n"
+     "1 MarkInfo(7, 0, 0)\n"
+     "1 CurrentTimePosition(0)\n"},
+    {"button next", "button next\nbutton activate", "play\nmenu on",
+     "1 ButtonActivationBusy()\n"
+     "1 ExecuteButton(1, 2, program shared by 2)\n"
+     "1 ButtonActivationDone()\n"
+     "1 InteractiveGraphicsInvisible()\n"
+     "1 InteractiveGraphicsInactive()\n"
+     "1 JumpOccurred()\n"
+     "1 MarkInfo(7, 1, 225000)\n"
+     "1 ChapterNumber(2)\n"
+     "1 CurrentTimePosition(225000)\n"},
+    {"button activate", "button activate", "play\nmenu on",
+     "1 ButtonActivationBusy()\n"
+     "1 ExecuteButton(1, 1, program shared by 2)\n"
+     "1 ButtonActivationDone()\n"
+     "1 InteractiveGraphicsInvisible()\n"
+     "1 InteractiveGraphicsInactive()\n"
+     "1 JumpOccurred()\n"
+     "1 MarkInfo(7, 0, 0)\n"
+     "1 CurrentTimePosition(0)\n"},
+    {"button activate NUMBER", "button activate 2", "play\nmenu on",
+     "1 ButtonActivationBusy()\n"
+     "1 ExecuteButton(1, 2, program shared by 2)\n"
+     "1 ButtonActivationDone()\n"
+     "1 InteractiveGraphicsInvisible()\n"
+     "1 InteractiveGraphicsInactive()\n"
+     "1 JumpOccurred()\n"
+     "1 MarkInfo(7, 1, 225000)\n"
+     "1 ChapterNumber(2)\n"
+     "1 CurrentTimePosition(225000)\n"},
+    {"button NUMBER", "button 2\nbutton activate", "play\nmenu on",
+     "1 ButtonActivationBusy()\n"
+     "1 ExecuteButton(1, 2, program shared by 2)\n"
+     "1 ButtonActivationDone()\n"
+     "1 InteractiveGraphicsInvisible()\n"
+     "1 InteractiveGraphicsInactive()\n"
+     "1 JumpOccurred()\n"
+     "1 MarkInfo(7, 1, 225000)\n"
+     "1 ChapterNumber(2)\n"
+     "1 CurrentTimePosition(225000)\n"},
+    {"wake without data", "wake without data", "play\nstandby", "1 SystemResumeFailed()\n"},
+    {"fail play", "fail play\nplay", "", "0 PlayFailed()\n"},
+    {"fail resume", "fail resume\nresume", "play\nsuspend", "1 ResumeFailed()\n"},
+    {"fail preload", "fail preload", "play", "1 PreloadFailed()\n"},
+    {"fail stream", "fail stream", "play", "1 Finished(1)\n"},
+};
+
+/** Commands of which a listener hears more than an example wants to hold. */
+const char* const OtherCommands[] = {"standby", "wake"};
+
+TEST(Commands, DoWhatTheySay)
+{
+    for (const Example& example : Examples) {
+        SCOPED_TRACE(example.line);
+        TestDesk desk(TwoItems());
+        Perform(desk, example.preparation);
+        desk.navigator.Advance(Second);
+        desk.Take();
+
+        const Outcome outcome = Perform(desk, example.line);
+
+        EXPECT_TRUE(outcome.IsDone()) << outcome.Reason();
+        EXPECT_EQ(desk.Take(), example.heard);
+    }
+}
+
+TEST(Commands, AreAllWrittenAsTheirExamples)
+{
+    std::set<std::string_view> patterns(std::begin(OtherCommands), std::end(OtherCommands));
+    for (const Example& example : Examples) {
+        patterns.insert(example.pattern);
+        const std::vector<ScriptStep> steps =
+            ParseScript(example.line, "a.session", CommandSyntaxes());
+        EXPECT_EQ(CommandSyntaxes()[steps.front().command].pattern, example.pattern)
+            << example.line;
+    }
+
+    std::set<std::string_view> all;
+    for (const CommandSyntax& syntax : CommandSyntaxes()) {
+        EXPECT_TRUE(all.insert(syntax.pattern).second) << syntax.pattern << " is there twice";
+        EXPECT_FALSE(syntax.help.empty()) << syntax.pattern;
+    }
+    EXPECT_EQ(patterns, all);
+    EXPECT_EQ(Commands().size(), CommandSyntaxes().size());
+}
+
+TEST(Commands, GoToStandbyAndWakeWithTheDataThatWereKept)
+{
+    TestDesk desk(TwoItems());
+    desk.Do(Perform(desk, "play\nseek 12"));
+    const std::string before = desk.Snapshot();
+
+    EXPECT_TRUE(Perform(desk, "standby").IsDone());
+    EXPECT_EQ(desk.navigator.CurrentStatus(), SimulatedNavigator::Status::Standby);
+    EXPECT_TRUE(Perform(desk, "wake").IsDone());
+
+    EXPECT_EQ(desk.Snapshot(), before);
+}
+
+TEST(Commands, PlayAtEveryStepOfSpeedAndNoOther)
+{
+    const struct {
+        const char* words;
+        bd::PlayDirectionDef direction;
+        int towards; ///< +1 fast, -1 slow
+        int steps;
+        const char* refusal;
+    } kinds[] = {
+        {"forward fast ", bd::PlayDirectionForward, 1, 12, "fast play has the steps 1 to 12"},
+        {"forward slow ", bd::PlayDirectionForward, -1, 5, "slow motion has the steps 1 to 5"},
+        {"backward fast ", bd::PlayDirectionBackward, 1, 12, "fast play has the steps 1 to 12"},
+        {"backward slow ", bd::PlayDirectionBackward, -1, 5, "slow motion has the steps 1 to 5"}};
+    for (const auto& kind : kinds) {
+        SCOPED_TRACE(kind.words);
+        TestDesk desk(TwoItems());
+        desk.Start(Second);
+        for (int step = 1; step <= kind.steps; ++step) {
+            desk.Do(Perform(desk, kind.words + std::to_string(step)));
+            const bd::PlayMode& mode = desk.navigator.GetCurrentPlayMode();
+            EXPECT_EQ(mode.Direction(), kind.direction);
+            EXPECT_EQ(mode.Speed(), bd::PlaySpeedNormal + kind.towards * step);
+        }
+        const std::string before = desk.Snapshot();
+        for (const int step : {0, kind.steps + 1, 65535}) {
+            EXPECT_EQ(Perform(desk, kind.words + std::to_string(step)).Reason(), kind.refusal);
+        }
+        EXPECT_EQ(desk.Take(), "");
+        EXPECT_EQ(desk.Snapshot(), before);
+    }
+}
+
+TEST(Commands, GoRoundTheStreams)
+{
+    const struct {
+        const char* line;
+        const char* heard;
+    } kinds[] = {{"audio next", "0 AudioInfo("},
+                 {"subtitle next", "0 PresentationGraphicsInfo("},
+                 {"angle next", "0 AngleInfo("}};
+    for (const auto& kind : kinds) {
+        SCOPED_TRACE(kind.line);
+        TestDesk desk(TwoItems());
+        desk.Start();
+        for (const char number : {'2', '1', '2'}) {
+            EXPECT_TRUE(Perform(desk, kind.line).IsDone());
+            EXPECT_EQ(desk.Take().rfind(std::string(kind.heard) + number, 0), 0);
+        }
+    }
+}
+
+TEST(Commands, RefuseTheNextOfNoStreams)
+{
+    TestDesk desk(ListOf({Item(10)}));
+    desk.Start();
+
+    EXPECT_EQ(Perform(desk, "audio next").Reason(),
+              "there is no audio stream 1, there is none here");
+    EXPECT_EQ(Perform(desk, "subtitle next").Reason(),
+              "there is no subtitle stream 1, there is none here");
+    EXPECT_TRUE(Perform(desk, "angle next").IsDone()) << "there is always one";
+    EXPECT_EQ(desk.Take(), "");
+}
+
+} // namespace
+
+} // namespace deskplayer

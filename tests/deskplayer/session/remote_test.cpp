@@ -1,0 +1,469 @@
+#include "session/remote.h"
+
+#include <fcntl.h>
+#include <gtest/gtest.h>
+#include <pty.h>
+#include <termios.h>
+#include <unistd.h>
+
+#include <csignal>
+#include <cstring>
+#include <functional>
+#include <set>
+#include <sstream>
+
+#include "../testdesk.h"
+
+namespace deskplayer
+{
+
+namespace
+{
+
+typedef SimulatedNavigator::Status Status;
+
+constexpr char ControlC = '\x03';
+
+/** An item of an hour, so that nothing ends by itself, with chapters every ten minutes. */
+PlayList LongPlayList()
+{
+    return ListOf({RichItem(3600), RichItem(10)}, {Entry(0, 0), Entry(0, 600 * Second)});
+}
+
+/** A pipe that keys have been written to. */
+class Keys
+{
+public:
+    explicit Keys(const std::string& keys)
+    {
+        EXPECT_EQ(pipe(m_Ends), 0);
+        EXPECT_EQ(write(m_Ends[1], keys.data(), keys.size()), static_cast<ssize_t>(keys.size()));
+    }
+
+    ~Keys()
+    {
+        close(m_Ends[0]);
+        End();
+    }
+
+    Keys(const Keys&) = delete;
+    Keys& operator=(const Keys&) = delete;
+
+    /** There will be no more. */
+    void End()
+    {
+        if (m_Ends[1] >= 0) {
+            close(m_Ends[1]);
+        }
+        m_Ends[1] = -1;
+    }
+
+    int Descriptor() const { return m_Ends[0]; }
+
+    /** How many were not read. */
+    std::size_t Left() const
+    {
+        fcntl(m_Ends[0], F_SETFL, O_NONBLOCK);
+        char rest[100];
+        const ssize_t size = read(m_Ends[0], rest, sizeof rest);
+        return size > 0 ? static_cast<std::size_t>(size) : 0;
+    }
+
+private:
+    int m_Ends[2] = {-1, -1};
+};
+
+/** Without the times, which are those of the wall clock. */
+std::string WithoutTimes(const std::string& heard)
+{
+    std::istringstream lines(heard);
+    std::string callbacks;
+    for (std::string line; std::getline(lines, line);) {
+        callbacks += line.substr(line.find(' ') + 1) + "\n";
+    }
+    return callbacks;
+}
+
+/** Presses keys one after the other. @return the refusals, one a line */
+std::string Press(TestDesk& desk, const std::string& pressed)
+{
+    std::string refusals;
+    Keys keys(pressed);
+    keys.End();
+    PlayByRemote(desk.desk, desk.clock, keys.Descriptor(),
+                 [&refusals](const std::string& reason) { refusals += reason + "\n"; });
+    return refusals;
+}
+
+/** What a listener hears of keys that are pressed after others, and the refusals. */
+std::string HeardOfKeys(TestDesk& desk, const std::string& before, const std::string& keys)
+{
+    Press(desk, before);
+    desk.Take();
+    const std::string refusals = Press(desk, keys);
+    return WithoutTimes(desk.TakeWithoutPositions()) + refusals;
+}
+
+struct KeyExample {
+    const char* before; ///< keys that prepare for it
+    char key;
+    const char* heard;
+};
+
+TEST(Remote, PerformsTheActionOfEveryKey)
+{
+    const KeyExample examples[] = {
+        {"", ' ', "Paused()\n"},
+        {" ", ' ', "Continued(0, 5)\n"},
+        {"", 'x', "Stopped()\n"},
+        {" ", '.', nullptr}, // tells a position of the wall clock
+        {"", 'f', "PlayMode(0, 6)\nPictureInPictureUnavailable()\nSecondaryAudioUnavailable()\n"},
+        {"f", 'f', "PlayMode(0, 7)\n"},
+        {"nf", 'r', "PlayMode(1, 6)\n"},
+        {"nr", 'r', "PlayMode(1, 7)\n"},
+        {"f", 'w', "PlayMode(0, 5)\nPictureInPictureAvailable()\nSecondaryAudioAvailable()\n"},
+        {"", 'n', "JumpOccurred()\nMarkInfo(7, 1, 27000000)\nChapterNumber(2)\n"},
+        {"n", 'p', "JumpOccurred()\nMarkInfo(7, 0, 0)\nChapterNumber(1)\n"},
+        {"", 'o', "playback is playing, not in a still\n"},
+        {"", 'a', "AudioInfo(2)\nAudioInfoChanged(true, (3, 0, 0, 0, 4353, 0))\n"},
+        {"", 's', "PresentationGraphicsInfo(2, true)\n"},
+        {"", 'g', "AngleInfo(2)\n"},
+        {"", 'm', "InteractiveGraphicsActive()\nInteractiveGraphicsVisible()\n"},
+        {"m", 'c', "InteractiveGraphicsInvisible()\nInteractiveGraphicsInactive()\n"},
+        {"m", 'k', "there is no button 0, they count from 1 to 2\n"},
+        {"mj", 'j', "there is no button 3, they count from 1 to 2\n"},
+        {"mj", 'e',
+         "ButtonActivationBusy()\nExecuteButton(1, 2, program shared by 2)\n"
+         "ButtonActivationDone()\nInteractiveGraphicsInvisible()\nInteractiveGraphicsInactive()\n"
+         "JumpOccurred()\nMarkInfo(7, 1, 27000000)\nChapterNumber(2)\n"},
+        {"", 'z', nullptr}, // tells a position of the wall clock
+        {"", 'Z', "playback is playing, not in standby\n"},
+    };
+    std::set<char> keys;
+    for (const KeyExample& example : examples) {
+        SCOPED_TRACE(example.key);
+        keys.insert(example.key);
+        if (example.heard != nullptr) {
+            TestDesk desk(LongPlayList());
+            EXPECT_EQ(HeardOfKeys(desk, example.before, {example.key}), example.heard);
+        }
+    }
+    for (const RemoteKey& key : RemoteKeys()) {
+        EXPECT_EQ(keys.count(key.key), 1) << key.key << " has no example";
+    }
+    EXPECT_EQ(keys.size(), RemoteKeys().size());
+}
+
+TEST(Remote, StepsWhilePaused)
+{
+    TestDesk desk(LongPlayList());
+
+    const std::string heard = HeardOfKeys(desk, " ", ".");
+
+    EXPECT_EQ(heard.rfind("Stepped(", 0), 0) << heard;
+}
+
+TEST(Remote, PlaysAgainAfterAStop)
+{
+    TestDesk desk(LongPlayList());
+
+    const std::string heard = HeardOfKeys(desk, "", "xx");
+
+    EXPECT_EQ(heard.rfind("Stopped()\nPlayStarted()\n", 0), 0) << heard;
+    EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Playing);
+}
+
+TEST(Remote, GoesToStandbyAndComesBack)
+{
+    TestDesk asleep(LongPlayList());
+    HeardOfKeys(asleep, "", "z");
+    EXPECT_EQ(asleep.navigator.CurrentStatus(), Status::Standby);
+
+    TestDesk awake(LongPlayList());
+    HeardOfKeys(awake, "n", "zZ");
+    EXPECT_EQ(awake.navigator.CurrentStatus(), Status::Playing);
+    EXPECT_GE(awake.navigator.GetCurrentTimePosition(), 600 * Second);
+}
+
+TEST(Remote, PlaysNoFasterThanTheFastest)
+{
+    TestDesk desk(LongPlayList());
+
+    HeardOfKeys(desk, " ", std::string(20, 'f'));
+    EXPECT_EQ(desk.navigator.GetPlayMode(),
+              bd::PlayMode(bd::PlayDirectionForward, bd::PlaySpeedFast12));
+}
+
+TEST(Remote, PlaysFasterBackwardStepByStep)
+{
+    TestDesk desk(LongPlayList());
+
+    HeardOfKeys(desk, " ", "frr");
+    EXPECT_EQ(desk.navigator.GetPlayMode(),
+              bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedFast2));
+}
+
+TEST(Remote, LeavesAStill)
+{
+    TestDesk desk(ListOf({WithEndlessStill(ItemOfTicks(1))}));
+    class Presser : public bdmv::NavigatorListenerAdapter
+    {
+    public:
+        void StillOn() override { onStill(); }
+        std::function<void()> onStill;
+    } presser;
+    desk.delivery.Listeners().AddListener(&presser);
+    int ends[2];
+    ASSERT_EQ(pipe(ends), 0);
+    presser.onStill = [&ends] { EXPECT_EQ(write(ends[1], "o", 1), 1); };
+
+    PlayByRemote(desk.desk, desk.clock, ends[0],
+                 [](const std::string& reason) { ADD_FAILURE() << reason; });
+
+    EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Finished);
+    close(ends[0]);
+    close(ends[1]);
+    desk.delivery.Listeners().RemoveListener(&presser);
+}
+
+TEST(Remote, EndsWithQAndReadsNoFurther)
+{
+    TestDesk desk(LongPlayList());
+    Keys keys(" q  x");
+
+    PlayByRemote(desk.desk, desk.clock, keys.Descriptor(), {});
+
+    EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Paused);
+    EXPECT_EQ(keys.Left(), 3);
+}
+
+TEST(Remote, EndsWithTheInput)
+{
+    TestDesk desk(LongPlayList());
+    Keys keys(" ");
+    keys.End();
+
+    PlayByRemote(desk.desk, desk.clock, keys.Descriptor(), {});
+
+    EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Paused);
+}
+
+TEST(Remote, EndsWithoutAnInput)
+{
+    TestDesk desk(LongPlayList());
+
+    PlayByRemote(desk.desk, desk.clock, 1000000, {});
+
+    EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Playing);
+}
+
+TEST(Remote, EndsWithThePlayback)
+{
+    TestDesk desk(ListOf({ItemOfTicks(Second / 10)}));
+    Keys keys("");
+
+    PlayByRemote(desk.desk, desk.clock, keys.Descriptor(), {});
+
+    EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Finished);
+    EXPECT_GE(desk.clock.Now(), Second / 10) << "on the wall clock";
+}
+
+TEST(Remote, IgnoresKeysThatMeanNothing)
+{
+    std::string others;
+    for (int key = 0; key < 256; ++key) {
+        const auto character = static_cast<char>(key);
+        const auto& known = RemoteKeys();
+        if (character != 'q' && character != ControlC &&
+            std::none_of(known.begin(), known.end(), [character](const RemoteKey& remoteKey) {
+                return remoteKey.key == character;
+            })) {
+            others += character;
+        }
+    }
+    TestDesk desk(LongPlayList());
+
+    EXPECT_EQ(HeardOfKeys(desk, "", others), "");
+}
+
+TEST(Remote, ExplainsEveryKey)
+{
+    const std::string help = RemoteHelp();
+    std::set<char> keys = {'q'};
+    for (const RemoteKey& key : RemoteKeys()) {
+        EXPECT_TRUE(keys.insert(key.key).second) << key.key << " is there twice";
+        const std::string name = key.key == ' ' ? "space" : std::string(1, key.key);
+        EXPECT_NE((" " + help).find(name + " " + key.help), std::string::npos) << key.help;
+    }
+    EXPECT_NE(help.find("q or Ctrl-C quit\n"), std::string::npos);
+}
+
+/** A terminal whose other end the test holds. */
+class Terminal
+{
+public:
+    Terminal() { EXPECT_EQ(openpty(&m_Test, &m_Program, nullptr, nullptr, nullptr), 0); }
+
+    ~Terminal()
+    {
+        close(m_Test);
+        close(m_Program);
+    }
+
+    Terminal(const Terminal&) = delete;
+    Terminal& operator=(const Terminal&) = delete;
+
+    int Descriptor() const { return m_Program; }
+
+    termios Settings() const
+    {
+        termios settings = {};
+        EXPECT_EQ(tcgetattr(m_Program, &settings), 0);
+        return settings;
+    }
+
+    void Press(const std::string& keys) const
+    {
+        EXPECT_EQ(write(m_Test, keys.data(), keys.size()), static_cast<ssize_t>(keys.size()));
+    }
+
+    /** What it shows. */
+    std::string Screen() const
+    {
+        fcntl(m_Test, F_SETFL, O_NONBLOCK);
+        char shown[100];
+        const ssize_t size = read(m_Test, shown, sizeof shown);
+        return size > 0 ? std::string(shown, static_cast<std::size_t>(size)) : "";
+    }
+
+private:
+    int m_Test = -1;
+    int m_Program = -1;
+};
+
+bool SameSettings(const termios& left, const termios& right)
+{
+    return left.c_iflag == right.c_iflag && left.c_oflag == right.c_oflag &&
+           left.c_cflag == right.c_cflag && left.c_lflag == right.c_lflag &&
+           std::memcmp(left.c_cc, right.c_cc, sizeof left.c_cc) == 0;
+}
+
+/** Does something as soon as playback has started. */
+class AtStart : public bdmv::NavigatorListenerAdapter
+{
+public:
+    explicit AtStart(std::function<void()> action) : m_Action(std::move(action)) {}
+    void PlayStarted() override { m_Action(); }
+
+private:
+    std::function<void()> m_Action;
+};
+
+TEST(RemoteTerminal, GivesSingleKeysWithoutShowingThem)
+{
+    TestDesk desk(LongPlayList());
+    const Terminal terminal;
+    const termios before = terminal.Settings();
+    termios meanwhile = {};
+    AtStart presser([&terminal, &meanwhile] {
+        meanwhile = terminal.Settings();
+        terminal.Press(" q");
+    });
+    desk.delivery.Listeners().AddListener(&presser);
+
+    PlayByRemote(desk.desk, desk.clock, terminal.Descriptor(), {});
+
+    EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Paused);
+    EXPECT_EQ(meanwhile.c_lflag & (ICANON | ECHO), 0);
+    EXPECT_EQ(terminal.Screen(), "");
+    EXPECT_NE(before.c_lflag & (ICANON | ECHO), 0) << "there was something to change";
+    EXPECT_TRUE(SameSettings(terminal.Settings(), before));
+    desk.delivery.Listeners().RemoveListener(&presser);
+}
+
+TEST(RemoteTerminal, TakesControlCForAKeyThatQuits)
+{
+    TestDesk desk(LongPlayList());
+    const Terminal terminal;
+    const termios before = terminal.Settings();
+    AtStart presser([&terminal] { terminal.Press({ControlC, ' ', 'q'}); });
+    desk.delivery.Listeners().AddListener(&presser);
+
+    PlayByRemote(desk.desk, desk.clock, terminal.Descriptor(), {});
+
+    EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Playing) << "the key behind it was not read";
+    EXPECT_TRUE(SameSettings(terminal.Settings(), before));
+    desk.delivery.Listeners().RemoveListener(&presser);
+}
+
+TEST(RemoteTerminal, IsPutBackWhenASignalEndsTheProgram)
+{
+    const Terminal terminal;
+    const termios before = terminal.Settings();
+    for (const int signal : {SIGHUP, SIGINT, SIGQUIT, SIGTERM}) {
+        EXPECT_EXIT(
+            {
+                TestDesk desk(LongPlayList());
+                AtStart ender([signal] { kill(getpid(), signal); });
+                desk.delivery.Listeners().AddListener(&ender);
+                PlayByRemote(desk.desk, desk.clock, terminal.Descriptor(), {});
+            },
+            testing::KilledBySignal(signal), "");
+        EXPECT_TRUE(SameSettings(terminal.Settings(), before)) << signal;
+    }
+}
+
+TEST(RemoteTerminal, LeavesSignalsAsItFoundThem)
+{
+    struct sigaction ignore = {};
+    ignore.sa_handler = SIG_IGN;
+    struct sigaction before = {};
+    sigaction(SIGHUP, &ignore, &before);
+    TestDesk desk(LongPlayList());
+    const Terminal terminal;
+    AtStart presser([&terminal] {
+        raise(SIGHUP);
+        terminal.Press("q");
+    });
+    desk.delivery.Listeners().AddListener(&presser);
+
+    PlayByRemote(desk.desk, desk.clock, terminal.Descriptor(), {});
+
+    struct sigaction after = {};
+    sigaction(SIGHUP, &before, &after);
+    EXPECT_EQ(after.sa_handler, SIG_IGN);
+    sigaction(SIGTERM, nullptr, &after);
+    EXPECT_EQ(after.sa_handler, SIG_DFL);
+    desk.delivery.Listeners().RemoveListener(&presser);
+}
+
+TEST(RemoteTerminal, IsPutBackWhenPlaybackEnds)
+{
+    TestDesk desk(ListOf({ItemOfTicks(100)}));
+    const Terminal terminal;
+    const termios before = terminal.Settings();
+
+    PlayByRemote(desk.desk, desk.clock, terminal.Descriptor(), {});
+
+    EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Finished);
+    EXPECT_TRUE(SameSettings(terminal.Settings(), before));
+}
+
+TEST(RemoteTerminal, IsPutBackWhenAListenerThrows)
+{
+    TestDesk desk(LongPlayList());
+    const Terminal terminal;
+    const termios before = terminal.Settings();
+    AtStart thrower([] { throw std::runtime_error("no"); });
+    desk.delivery.Listeners().AddListener(&thrower);
+
+    EXPECT_THROW(PlayByRemote(desk.desk, desk.clock, terminal.Descriptor(), {}),
+                 std::runtime_error);
+
+    EXPECT_TRUE(SameSettings(terminal.Settings(), before));
+    desk.delivery.Listeners().RemoveListener(&thrower);
+}
+
+} // namespace
+
+} // namespace deskplayer

@@ -1,0 +1,255 @@
+#include "session/session.h"
+
+#include <gtest/gtest.h>
+
+#include <algorithm>
+
+#include "../testdesk.h"
+
+namespace deskplayer
+{
+
+namespace
+{
+
+typedef SimulatedNavigator::Status Status;
+
+/** Carries out a script and collects what the hooks are called with. */
+class SessionTest : public testing::Test
+{
+protected:
+    /** @return what the listener heard, and the refusals where they happened */
+    std::string PlayScript(TestDesk& desk, const std::string& script)
+    {
+        std::string heard;
+        SessionHooks hooks;
+        hooks.beforeTimePasses = [this, &desk](std::uint64_t ticks) {
+            timesPassed.emplace_back(desk.clock.Now(), ticks);
+        };
+        hooks.onRefused = [&heard, &desk](std::size_t line, const std::string& reason) {
+            heard += desk.TakeWithoutPositions();
+            heard += "line " + std::to_string(line) + ": " + reason + "\n";
+        };
+        PlaySession(ParseScript(script, "a.session", CommandSyntaxes()), desk.desk, desk.clock,
+                    hooks);
+        return heard + desk.TakeWithoutPositions();
+    }
+
+    std::vector<std::pair<std::uint64_t, std::uint64_t>> timesPassed; ///< from when, how long
+};
+
+const char* const StartOfItem = "0 PlayStarted()\n"
+                                "0 Playlist(7)\n"
+                                "0 PlayItem(7, 0, 6, 15)\n"
+                                "0 VideoInfo(1)\n"
+                                "0 AngleInfo(1)\n"
+                                "0 UOMask(0)\n"
+                                "0 FirstPictureDelivered()\n";
+
+TEST_F(SessionTest, CarriesOutEachStepAtItsTimeAndPlaysToTheEnd)
+{
+    TestDesk desk(ListOf({Item(10)}));
+
+    EXPECT_EQ(PlayScript(desk, "play\n"
+                               "after 2s pause\n"
+                               "step\n"
+                               "at 60 continue\n"),
+              std::string(StartOfItem) + "2 Paused()\n"
+                                         "2 Stepped(90900, 0)\n"
+                                         "60 Continued(0, 5)\n"
+                                         "67+44100 Finished(0)\n");
+}
+
+TEST_F(SessionTest, ReportsWhatIsRefusedWithItsLineAndGoesOn)
+{
+    TestDesk desk(ListOf({Item(10)}));
+
+    EXPECT_EQ(PlayScript(desk, "play\n"
+                               "\n"
+                               "after 1s continue # it does not stand\n"
+                               "pause\n"),
+              std::string(StartOfItem) + "line 3: playback is playing, not paused\n"
+                                         "1 Paused()\n");
+}
+
+TEST_F(SessionTest, NeedsNoHooks)
+{
+    TestDesk desk(ListOf({Item(1)}));
+
+    PlaySession(ParseScript("play\nstep\n", "a.session", CommandSyntaxes()), desk.desk, desk.clock,
+                SessionHooks());
+
+    EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Finished);
+}
+
+TEST_F(SessionTest, HasItsTimeGoOnWhenPlaybackHasEnded)
+{
+    TestDesk desk(ListOf({Item(1)}));
+
+    EXPECT_EQ(PlayScript(desk, "play\nat 1:00:00 fail play\nplay\nafter 3 stop\n"),
+              std::string(StartOfItem) + "1 Finished(0)\n"
+                                         "3600 PlayFailed()\n"
+                                         "line 4: playback is at its end, not playing or paused or "
+                                         "in a still\n");
+    EXPECT_EQ(desk.clock.Now(), 3603 * Second);
+}
+
+TEST_F(SessionTest, DoesNothingWithoutSteps)
+{
+    TestDesk desk(ListOf({Item(1)}));
+
+    EXPECT_EQ(PlayScript(desk, "# nothing\n"), "");
+    EXPECT_EQ(desk.clock.Now(), 0);
+}
+
+TEST_F(SessionTest, EndsWherePlaybackWouldStand)
+{
+    const std::pair<const char*, Status> ends[] = {{"pause", Status::Paused},
+                                                   {"suspend", Status::Suspended},
+                                                   {"standby", Status::Standby},
+                                                   {"stop", Status::Stopped},
+                                                   {"seek 4", Status::Still}};
+    for (const auto& [command, status] : ends) {
+        SCOPED_TRACE(command);
+        TestDesk desk(ListOf({WithEndlessStill(Item(10))}));
+        PlayScript(desk, std::string("play\nafter 2s ") + command + "\n");
+        EXPECT_EQ(desk.navigator.CurrentStatus(), status);
+        EXPECT_EQ(desk.clock.Now(), (status == Status::Still ? 8 : 2) * Second);
+    }
+}
+
+TEST_F(SessionTest, EndsWherePlaybackWouldGoRoundForEver)
+{
+    for (const char* const repeat :
+         {"repeat a\nafter 1s repeat b", "repeat chapter", "repeat title"}) {
+        SCOPED_TRACE(repeat);
+        TestDesk desk(ListOf({Item(10)}, {Entry(0, 0)}));
+        PlayScript(desk, std::string("play\nafter 2s ") + repeat + "\nafter 30s step\n");
+        EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Playing);
+        EXPECT_GE(desk.clock.Now(), 32 * Second);
+        EXPECT_LE(desk.clock.Now(), 33 * Second);
+    }
+}
+
+TEST_F(SessionTest, GoesOnToTheEndWhenPlaybackHasLeftTheRepeat)
+{
+    TestDesk desk(ListOf({Item(10)}));
+
+    PlayScript(desk, "play\nrepeat a\nafter 1s repeat b\nseek 5\n");
+
+    EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Finished);
+    EXPECT_EQ(desk.clock.Now(), 6 * Second);
+}
+
+TEST_F(SessionTest, WaitsBeforeTimePassesChangeByChange)
+{
+    TestDesk desk(ListOf({Item(2)}, {Link(0, 100)}));
+
+    PlayScript(desk, "after 5s play\nafter 1.5s pause\nafter 10s continue\n");
+
+    typedef std::vector<std::pair<std::uint64_t, std::uint64_t>> Times;
+    EXPECT_EQ(timesPassed, (Times{{0, 5 * Second},
+                                  {5 * Second, 100},
+                                  {5 * Second + 100, Second - 100},
+                                  {6 * Second, Second / 2},
+                                  {6 * Second + Second / 2, 10 * Second},
+                                  {16 * Second + Second / 2, Second / 2}}));
+    EXPECT_EQ(desk.clock.Now(), 17 * Second);
+}
+
+TEST_F(SessionTest, HandsOnWhatAListenerThrows)
+{
+    class Thrower : public bdmv::NavigatorListenerAdapter
+    {
+        void Paused() override { throw std::runtime_error("paused"); }
+    };
+    TestDesk desk(ListOf({Item(10)}));
+    Thrower thrower;
+    desk.delivery.Listeners().AddListener(&thrower);
+
+    EXPECT_THROW(PlayScript(desk, "play\npause\n"), std::runtime_error);
+
+    desk.delivery.Listeners().RemoveListener(&thrower);
+}
+
+/** What a listener hears of a play list without a viewer. */
+std::string HeardFromStartToEnd(TestDesk& desk)
+{
+    PlayFromStartToEnd(desk.desk, desk.clock, SessionHooks());
+    return desk.TakeWithoutPositions();
+}
+
+TEST(FromStartToEnd, PlaysAndFinishes)
+{
+    TestDesk desk(ListOf({Item(10)}));
+
+    EXPECT_EQ(HeardFromStartToEnd(desk), std::string(StartOfItem) + "10 Finished(0)\n");
+}
+
+TEST(FromStartToEnd, LeavesEndlessStillsAfterThreeSecondsAndTimedOnesToThemselves)
+{
+    TestDesk desk(ListOf({WithEndlessStill(Item(1)), WithTimedStill(Item(1), 10),
+                          Forbidding(WithEndlessStill(Item(1)), {bd::UserOperationStillOff})}));
+
+    EXPECT_EQ(HeardFromStartToEnd(desk), std::string(StartOfItem) + "1 StillOn()\n"
+                                                                    "4 StillOff()\n"
+                                                                    "4 PlayItem(7, 1, 6, 15)\n"
+                                                                    "5 StillOn()\n"
+                                                                    "15 StillOff()\n"
+                                                                    "15 PlayItem(7, 2, 6, 15)\n"
+                                                                    "15 UOMask(1024)\n"
+                                                                    "16 StillOn()\n"
+                                                                    "19 StillOff()\n"
+                                                                    "19 Finished(0)\n");
+}
+
+TEST(FromStartToEnd, FinishesWhenThereIsNothingToPlay)
+{
+    TestDesk desk(ListOf({}));
+
+    EXPECT_EQ(HeardFromStartToEnd(desk), "0 PlayStarted()\n"
+                                         "0 Playlist(7)\n"
+                                         "0 Finished(0)\n");
+}
+
+TEST(FromStartToEnd, FinishesWhenNothingHasLength)
+{
+    TestDesk desk(ListOf({Item(0), WithTimedStill(Item(0), 0), Item(0)}, {Entry(1, 0)}));
+
+    const std::string heard = HeardFromStartToEnd(desk);
+
+    EXPECT_EQ(heard.substr(heard.size() - 14), "0 Finished(0)\n") << heard;
+}
+
+TEST(FromStartToEnd, WaitsBeforeTimePasses)
+{
+    TestDesk desk(ListOf({WithEndlessStill(Item(2))}));
+    std::uint64_t waited = 0;
+    SessionHooks hooks;
+    hooks.beforeTimePasses = [&waited, &desk](std::uint64_t ticks) {
+        EXPECT_EQ(desk.clock.Now(), waited);
+        waited += ticks;
+    };
+
+    PlayFromStartToEnd(desk.desk, desk.clock, hooks);
+
+    EXPECT_EQ(waited, 5 * Second);
+    EXPECT_EQ(desk.clock.Now(), waited);
+}
+
+TEST(FromStartToEnd, TellsEverySecondOfTwoHours)
+{
+    TestDesk desk(ListOf({Item(7200)}));
+
+    PlayFromStartToEnd(desk.desk, desk.clock, SessionHooks());
+
+    const std::string heard = desk.Take();
+    const std::string others = std::string(StartOfItem) + "7200 Finished(0)\n";
+    EXPECT_EQ(std::count(heard.begin(), heard.end(), '\n'),
+              7201 + std::count(others.begin(), others.end(), '\n'));
+    EXPECT_NE(heard.find("\n3601 CurrentTimePosition(162045000)\n"), std::string::npos);
+}
+
+} // namespace
+
+} // namespace deskplayer
