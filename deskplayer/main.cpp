@@ -25,14 +25,12 @@
 #include "kevro_linux.h"
 #include "listing/description.h"
 #include "listing/listing.h"
-#include "navigator/eventdelivery.h"
-#include "navigator/simulatednavigator.h"
-#include "navigator/virtualclock.h"
+#include "navigator/desk.h"
 #include "output/outputformat.h"
 #include "output/textoutput.h"
-#include "output/timetext.h"
 #include "session/remote.h"
 #include "session/session.h"
+#include "text/timetext.h"
 
 namespace
 {
@@ -217,41 +215,37 @@ void Play(deskplayer::LoadedPlayList playList, const std::vector<deskplayer::Scr
           const Options& options, const deskplayer::OutputOptions& outputOptions,
           std::ostream& stream)
 {
-    deskplayer::VirtualClock clock;
+    deskplayer::Desk desk(std::move(playList));
     const std::unique_ptr<deskplayer::Output> output =
-        deskplayer::MakeOutput(outputOptions, stream, clock);
-    deskplayer::ResumeDataKeeper keeper;
-    deskplayer::EventDelivery delivery;
-    deskplayer::SimulatedNavigator navigator(std::move(playList), clock, delivery);
-    delivery.Listeners().AddListener(&keeper);
-    delivery.Listeners().AddListener(output.get());
-    deskplayer::Desk desk{navigator, keeper};
+        deskplayer::MakeOutput(outputOptions, stream, desk.Clock());
+    desk.Listeners().AddListener(output.get());
 
     if (options.remote) {
         std::cerr << deskplayer::RemoteHelp();
-        deskplayer::PlayByRemote(desk, clock, STDIN_FILENO, Complain);
+        deskplayer::PlayByRemote(desk, STDIN_FILENO, Complain);
         return;
     }
 
-    Progress progress(clock, options);
+    Progress progress(desk.Clock(), options);
     deskplayer::SessionHooks hooks;
     const auto start = std::chrono::steady_clock::now();
-    hooks.beforeTimePasses = [&](std::uint64_t ticks) {
+    hooks.beforeTimePasses = [&](deskplayer::Ticks time) {
         progress.Update();
         if (options.realTime) {
             stream.flush();
-            const std::uint64_t until = clock.Now() + ticks;
-            std::this_thread::sleep_until(start + std::chrono::microseconds(until * 1000 / 45));
+            std::this_thread::sleep_until(
+                start +
+                std::chrono::duration_cast<std::chrono::nanoseconds>(desk.Clock().Now() + time));
         }
     };
-    hooks.onRefused = [&options, &clock](std::size_t line, const std::string& reason) {
+    hooks.onRefused = [&options, &desk](std::size_t line, const std::string& reason) {
         Complain(options.session + ":" + std::to_string(line) + ": refused at " +
-                 deskplayer::TimeText(clock.Now()) + ": " + reason);
+                 deskplayer::TimeText(desk.Clock().Now()) + ": " + reason);
     };
     if (options.session.empty()) {
-        deskplayer::PlayFromStartToEnd(desk, clock, hooks);
+        deskplayer::PlayFromStartToEnd(desk, hooks);
     } else {
-        deskplayer::PlaySession(steps, desk, clock, hooks);
+        deskplayer::PlaySession(steps, desk, hooks);
     }
 }
 

@@ -111,12 +111,12 @@ ClipInfo ParseClipInfo(const Bytes& bytes, const std::string& fileName)
     return clipInfo;
 }
 
-std::uint64_t Duration(const ClipInfo& clipInfo)
+Ticks Duration(const ClipInfo& clipInfo)
 {
-    std::uint64_t duration = 0;
+    Ticks duration(0);
     for (const AtcSequence& atcSequence : clipInfo.atcSequences) {
         for (const StcSequence& sequence : atcSequence.stcSequences) {
-            duration += sequence.presentationEnd - sequence.presentationStart;
+            duration += Ticks(sequence.presentationEnd - sequence.presentationStart);
         }
     }
     return duration;

@@ -12,6 +12,7 @@
 
 #include "disc/bytereader.h"
 #include "disc/streamattributes.h"
+#include "text/ticks.h"
 
 namespace deskplayer
 {
@@ -66,8 +67,8 @@ struct ClipInfo {
  */
 ClipInfo ParseClipInfo(const Bytes& bytes, const std::string& fileName);
 
-/** How long the clip plays, over all its STC sequences, in ticks. */
-std::uint64_t Duration(const ClipInfo& clipInfo);
+/** How long the clip plays, over all its STC sequences. */
+Ticks Duration(const ClipInfo& clipInfo);
 
 /**
  * Aspect ratios of the video streams, by the PID of the stream, in ascending order. Of several

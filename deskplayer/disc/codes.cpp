@@ -1,17 +1,13 @@
 #include "disc/codes.h"
 
-#include "disc/errors.h"
+#include "text/codes.h"
+#include "text/printable.h"
 
 namespace deskplayer
 {
 
 namespace
 {
-
-struct CodeName {
-    std::uint8_t code;
-    const char* name;
-};
 
 struct CodingType {
     std::uint8_t code;
@@ -112,19 +108,9 @@ const Language g_Languages[] = {
     {"vie", "Vietnamese"}, {"zho", "Chinese"},
 };
 
-template <typename Table, typename Code> auto Find(const Table& table, const Code& code)
-{
-    for (const auto& entry : table) {
-        if (entry.code == code) {
-            return &entry;
-        }
-    }
-    return static_cast<decltype(&table[0])>(nullptr);
-}
-
 template <typename Table> std::string NameOf(const Table& table, std::uint8_t code)
 {
-    const auto* const entry = Find(table, code);
+    const auto* const entry = FindCode(table, code);
     return entry ? entry->name : "reserved (" + std::to_string(code) + ")";
 }
 
@@ -132,7 +118,7 @@ template <typename Table> std::string NameOf(const Table& table, std::uint8_t co
 
 StreamKind KindOfStream(std::uint8_t codingType)
 {
-    const CodingType* const entry = Find(g_CodingTypes, codingType);
+    const CodingType* const entry = FindCode(g_CodingTypes, codingType);
     return entry ? entry->kind : StreamKindUnknown;
 }
 
@@ -191,7 +177,7 @@ std::string LanguageName(const std::string& language)
     if (language.empty()) {
         return "no language";
     }
-    const Language* const entry = Find(g_Languages, language);
+    const Language* const entry = FindCode(g_Languages, language);
     return entry ? entry->name : Printable(language);
 }
 

@@ -13,9 +13,6 @@
 namespace deskplayer
 {
 
-/** Times in the files count ticks of this clock. */
-constexpr std::uint32_t TicksPerSecond = 45000;
-
 /** Which attributes a stream has. */
 enum StreamKind {
     StreamKindUnknown,

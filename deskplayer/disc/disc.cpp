@@ -140,11 +140,11 @@ MovieObjects Disc::ReadMovieObjects() const
 LongestPlayList Disc::FindLongestPlayList() const
 {
     std::optional<std::uint32_t> longest;
-    std::uint64_t greatestDuration = 0;
+    Ticks greatestDuration(0);
     std::vector<std::string> unreadable;
     for (const std::uint32_t number : PlayListNumbers()) {
         try {
-            const std::uint64_t duration = BuildTimeLine(ReadPlayList(number)).duration;
+            const Ticks duration = BuildTimeLine(ReadPlayList(number)).duration;
             if (!longest || duration > greatestDuration) {
                 longest = number;
                 greatestDuration = duration;

@@ -55,9 +55,6 @@ private:
     std::string m_Expected;
 };
 
-/** @p text with everything but printable ASCII, and the backslash, as \\xNN: safe to print. */
-std::string Printable(const std::string& text);
-
 } // namespace deskplayer
 
 #endif

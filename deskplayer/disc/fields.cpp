@@ -2,6 +2,7 @@
 
 #include "disc/codes.h"
 #include "disc/errors.h"
+#include "text/printable.h"
 
 namespace deskplayer
 {

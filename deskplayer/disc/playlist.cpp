@@ -5,6 +5,7 @@
 #include "disc/codes.h"
 #include "disc/errors.h"
 #include "disc/fields.h"
+#include "text/printable.h"
 
 namespace deskplayer
 {

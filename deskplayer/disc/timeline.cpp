@@ -8,8 +8,8 @@ namespace deskplayer
 namespace
 {
 
-std::optional<std::uint64_t> PositionOf(const Mark& mark, const PlayList& playList,
-                                        const std::vector<std::uint64_t>& itemStarts)
+std::optional<Ticks> PositionOf(const Mark& mark, const PlayList& playList,
+                                const std::vector<Ticks>& itemStarts)
 {
     if (mark.playItem >= playList.playItems.size()) {
         return std::nullopt;
@@ -18,7 +18,7 @@ std::optional<std::uint64_t> PositionOf(const Mark& mark, const PlayList& playLi
     if (mark.time < item.inTime || mark.time > item.outTime) {
         return std::nullopt;
     }
-    return itemStarts[mark.playItem] + (mark.time - item.inTime);
+    return itemStarts[mark.playItem] + Ticks(mark.time - item.inTime);
 }
 
 } // namespace
@@ -28,7 +28,7 @@ TimeLine BuildTimeLine(const PlayList& playList)
     TimeLine timeLine;
     for (const PlayItem& item : playList.playItems) {
         timeLine.itemStarts.push_back(timeLine.duration);
-        timeLine.duration += item.outTime - item.inTime;
+        timeLine.duration += Ticks(item.outTime - item.inTime);
     }
 
     std::size_t chapterNumber = 0;

@@ -6,11 +6,11 @@
 #define DESKPLAYER_DISC_TIMELINE_H
 
 #include <cstddef>
-#include <cstdint>
 #include <optional>
 #include <vector>
 
 #include "disc/playlist.h"
+#include "text/ticks.h"
 
 namespace deskplayer
 {
@@ -20,23 +20,22 @@ struct Chapter {
     std::size_t number = 0;   ///< from 1; see TimeLine::chapters
     std::size_t mark = 0;     ///< index of its mark
     std::size_t playItem = 0; ///< of its mark
-    std::uint64_t start = 0;
-    std::uint64_t end = 0; ///< not before start
+    Ticks start{0};
+    Ticks end{0}; ///< not before start
 };
 
 /**
- * Positions in ticks of 45 kHz from the start of the play list. They make sense if the play items
- * play in sequence.
+ * Positions from the start of the play list. They make sense if the play items play in sequence.
  */
 struct TimeLine {
-    std::uint64_t duration = 0;
-    std::vector<std::uint64_t> itemStarts;
+    Ticks duration{0};
+    std::vector<Ticks> itemStarts;
 
     /**
      * One for each mark; nothing for a mark whose play item is not there, or that is before IN or
      * after OUT of its play item.
      */
-    std::vector<std::optional<std::uint64_t>> markPositions;
+    std::vector<std::optional<Ticks>> markPositions;
 
     /**
      * In the order of their marks. A mark of type entry that has no position is no chapter here,

@@ -10,8 +10,10 @@
 #include "disc/aspectratios.h"
 #include "disc/codes.h"
 #include "disc/timeline.h"
-#include "output/names.h"
-#include "output/timetext.h"
+#include "text/codes.h"
+#include "text/names.h"
+#include "text/printable.h"
+#include "text/timetext.h"
 
 namespace deskplayer
 {
@@ -27,11 +29,6 @@ struct Field {
 };
 
 using Fields = std::vector<Field>;
-
-struct CodeName {
-    std::uint8_t code;
-    const char* name;
-};
 
 const CodeName g_PlaybackTypes[] = {
     {PlaybackTypeInSequence, "in sequence"},
@@ -65,12 +62,8 @@ const CodeName g_MarkTypes[] = {
 
 template <typename Table> std::string NameIn(const Table& table, std::uint8_t code)
 {
-    for (const CodeName& entry : table) {
-        if (entry.code == code) {
-            return entry.name;
-        }
-    }
-    return "reserved";
+    const CodeName* const entry = FindCode(table, code);
+    return entry == nullptr ? "reserved" : entry->name;
 }
 
 std::string Hex(std::uint64_t value, int digits)
@@ -97,9 +90,15 @@ Field YesNo(const char* name, bool value)
     return {name, value ? "yes" : "no"};
 }
 
-Field Time(const char* name, std::uint64_t ticks)
+Field Time(const char* name, Ticks time)
 {
-    return {name, std::to_string(ticks), TimeText(ticks)};
+    return {name, std::to_string(time.count()), TimeText(time)};
+}
+
+/** @param ticks as in the file */
+Field Time(const char* name, std::uint32_t ticks)
+{
+    return Time(name, Ticks(ticks));
 }
 
 /** @param meaning may name the code again, as codes.h does with reserved ones */
@@ -367,7 +366,7 @@ private:
     void WriteMark(std::size_t number)
     {
         const Mark& mark = m_rPlayList.marks[number];
-        const std::optional<std::uint64_t> position = m_TimeLine.markPositions[number];
+        const std::optional<Ticks> position = m_TimeLine.markPositions[number];
         Line(1, "mark " + std::to_string(number),
              {Code("type", mark.type, NameIn(g_MarkTypes, mark.type)),
               Number("play item", mark.playItem),

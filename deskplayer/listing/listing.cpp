@@ -11,7 +11,8 @@
 #include "disc/aspectratios.h"
 #include "disc/codes.h"
 #include "disc/timeline.h"
-#include "output/timetext.h"
+#include "text/printable.h"
+#include "text/timetext.h"
 
 namespace deskplayer
 {

@@ -4,7 +4,7 @@
 #include <tuple>
 
 #include "disc/aspectratios.h"
-#include "output/timetext.h"
+#include "text/timetext.h"
 
 namespace deskplayer
 {

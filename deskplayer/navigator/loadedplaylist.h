@@ -11,16 +11,16 @@
 #include <utility>
 #include <vector>
 
-#include "disc/codes.h"
 #include "disc/disc.h"
 #include "disc/playlist.h"
 #include "disc/timeline.h"
+#include "text/ticks.h"
 
 namespace deskplayer
 {
 
-/** The longest play list that is played, in ticks of 45 kHz: 100 hours. No disc holds so much. */
-constexpr std::uint64_t LongestDuration = std::uint64_t{100} * 3600 * TicksPerSecond;
+/** The longest play list that is played. No disc holds so much. */
+constexpr Ticks LongestDuration = std::chrono::hours(100);
 
 /** A play list, where its parts lie in time, and what the clips add to it. */
 struct LoadedPlayList {
@@ -29,7 +29,7 @@ struct LoadedPlayList {
     TimeLine timeLine;
 
     /** Positions of the marks that have one, with their indices, in order of position. */
-    std::vector<std::pair<std::uint64_t, std::size_t>> marksByPosition;
+    std::vector<std::pair<Ticks, std::size_t>> marksByPosition;
 
     /** The chapters in order of their start, those at the same position of their play items. */
     std::vector<Chapter> chaptersByStart;

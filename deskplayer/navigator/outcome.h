@@ -5,6 +5,7 @@
 #ifndef DESKPLAYER_NAVIGATOR_OUTCOME_H
 #define DESKPLAYER_NAVIGATOR_OUTCOME_H
 
+#include <cstdint>
 #include <string>
 #include <utility>
 
@@ -19,6 +20,19 @@ public:
 
     /** @param reason why, as a sentence without a full stop; not empty */
     static Outcome Refused(std::string reason) { return Outcome(std::move(reason)); }
+
+    /**
+     * Refused for a number that does not exist, of a stream, a chapter or a button.
+     *
+     * @param what  a word for the thing that is numbered, from 1
+     * @param count the greatest number; 0 if there is nothing
+     */
+    static Outcome NoSuch(const std::string& what, std::uint64_t number, std::uint64_t count)
+    {
+        return Refused("there is no " + what + " " + std::to_string(number) +
+                       (count == 0 ? ", there is none here"
+                                   : ", they count from 1 to " + std::to_string(count)));
+    }
 
     bool IsDone() const { return m_Reason.empty(); }
 

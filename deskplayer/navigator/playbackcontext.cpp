@@ -26,8 +26,6 @@ bool IsTextSubtitle(const Stream& stream)
 
 } // namespace
 
-PlaybackContext::PlaybackContext(LoadedPlayList playList) : m_PlayList(std::move(playList)) {}
-
 const bd::DataBlockDef& PlaybackContext::GetSystemResumeData()
 {
     return m_SystemResumeBlock;
@@ -40,72 +38,75 @@ void PlaybackContext::CleanupSystemResumeData()
 
 bool PlaybackContext::IsPlayingAfterSystemResume()
 {
-    return m_State.playingAfterSystemResume;
+    return m_rState.playingAfterSystemResume;
 }
 
 bd::PlayListIdDef PlaybackContext::GetPlayListId()
 {
-    return m_PlayList.number;
+    return m_rPlayhead.LoadedList().number;
 }
 
 bd::PlayItemIdDef PlaybackContext::GetPlayItemId()
 {
-    return static_cast<bd::PlayItemIdDef>(m_State.item);
+    return static_cast<bd::PlayItemIdDef>(m_rState.item);
 }
 
 const bd::PlayMode& PlaybackContext::GetPlayMode()
 {
-    return m_State.playMode;
+    return m_rState.playMode;
 }
 
 bd::Trigger PlaybackContext::GetTrigger()
 {
-    return {m_State.trigger};
+    return {m_rState.trigger};
 }
 
 bd::TimePosition PlaybackContext::GetTriggerReachedTime()
 {
-    return m_State.triggerReachedTime;
+    return m_rState.triggerReachedTime.count();
 }
 
 bd::TriggerType PlaybackContext::GetCurrentABRepeatState()
 {
-    if (m_State.pointB) {
+    if (m_rState.pointB) {
         return bd::TRIGGER_B;
     }
-    return m_State.pointA ? bd::TRIGGER_A : bd::TRIGGER_AB_NONE;
+    return m_rState.pointA ? bd::TRIGGER_A : bd::TRIGGER_AB_NONE;
 }
 
 bd::TriggerType PlaybackContext::GetCurrentChpTitleRepeatState()
 {
-    return m_State.chapterTitleRepeat;
+    return m_rState.chapterTitleRepeat;
 }
 
 bd::TriggerType PlaybackContext::GetTriggerTypeByTime(bd::TimePosition time)
 {
-    if (m_State.triggerReached && time == m_State.triggerReachedTime) {
-        return *m_State.triggerReached;
+    const Ticks position(time);
+    if (m_rState.triggerReached && position == m_rState.triggerReachedTime) {
+        return *m_rState.triggerReached;
     }
-    if (time == m_State.pointB) {
+    if (position == m_rState.pointB) {
         return bd::TRIGGER_B;
     }
-    // The end of a chapter or title is no point of its own: the repeat state tells.
-    return time == m_State.notifyAt ? bd::TRIGGER_NOTIFY_FROM_CURPOS : bd::TRIGGER_INVALID;
+    // The end of a chapter or title is not a point that was set: the repeat state identifies it.
+    return position == m_rState.notifyAt ? bd::TRIGGER_NOTIFY_FROM_CURPOS : bd::TRIGGER_INVALID;
 }
 
 bd::ChapterNumberDef PlaybackContext::GetCurrentChapter()
 {
-    const Chapter* const chapter = CurrentChapter();
+    const Chapter* const chapter = m_rPlayhead.CurrentChapter();
     return chapter == nullptr ? 0 : static_cast<bd::ChapterNumberDef>(chapter->number);
 }
 
 bd::PlayListMarkIdDef PlaybackContext::GetCurrentPLMarkId(bd::TimePosition& time)
 {
-    if (!m_State.mark) {
+    if (!m_rState.mark) {
         return 0;
     }
-    time = m_PlayList.timeLine.markPositions[*m_State.mark].value_or(bd::TimePositionNone);
-    return static_cast<bd::PlayListMarkIdDef>(*m_State.mark);
+    const std::optional<Ticks> position =
+        m_rPlayhead.LoadedList().timeLine.markPositions[*m_rState.mark];
+    time = position ? position->count() : bd::TimePositionNone;
+    return static_cast<bd::PlayListMarkIdDef>(*m_rState.mark);
 }
 
 void PlaybackContext::GetVideoInfo(bd::StreamNumberDef* number, bd::UInt8* count)
@@ -122,7 +123,8 @@ void PlaybackContext::GetVideoAttributes(bd::VideoFormatType& format,
     if (!videos.empty()) {
         // Both are numbered as on the disc; a number without a name travels as it is.
         format = static_cast<bd::VideoFormatType>(videos.front().attributes.videoFormat);
-        if (const std::optional<std::uint8_t> code = m_PlayList.aspectRatios[m_State.item]) {
+        if (const std::optional<std::uint8_t> code =
+                m_rPlayhead.LoadedList().aspectRatios[m_rState.item]) {
             aspectRatio = static_cast<bd::VideoAspectRatioType>(*code);
         }
     }
@@ -142,7 +144,7 @@ bdmv::IPlaybackContext::ErrCode PlaybackContext::rGetPgTextStInfo(bd::StreamNumb
                                                                   bd::UInt8* count)
 {
     GetPgTextStInfo(number, count);
-    return CurrentItem() == nullptr ? ErrNotAllowed : ErrOk;
+    return m_rPlayhead.CurrentItem() == nullptr ? ErrNotAllowed : ErrOk;
 }
 
 void PlaybackContext::GetPgTextStInfo(bd::StreamNumberDef* number, bd::UInt8* count)
@@ -176,53 +178,53 @@ void PlaybackContext::GetAngleInfo(bd::AngleNumberDef* number, bd::UInt8* count)
 
 bool PlaybackContext::GetPgTextStDisplay()
 {
-    return m_State.selection.pgShown;
+    return m_rState.selection.pgShown;
 }
 
 bool PlaybackContext::GetSecondaryVideoDisplay()
 {
-    return m_State.selection.secondaryVideoShown;
+    return m_rState.selection.secondaryVideoShown;
 }
 
 bool PlaybackContext::GetSecondaryAudioDisplay()
 {
-    return m_State.selection.secondaryAudioShown;
+    return m_rState.selection.secondaryAudioShown;
 }
 
 bool PlaybackContext::GetPipPgTextStSelect()
 {
-    return m_State.selection.pipPgPicked;
+    return m_rState.selection.pipPgPicked;
 }
 
 void PlaybackContext::GetUOMask(bdmv::UOMaskTable& mask)
 {
-    mask = bdmv::UOMaskTable(m_PlayList.playList.applicationInfo.uoMask);
-    if (const PlayItem* const item = CurrentItem()) {
+    mask = bdmv::UOMaskTable(m_rPlayhead.LoadedList().playList.applicationInfo.uoMask);
+    if (const PlayItem* const item = m_rPlayhead.CurrentItem()) {
         mask |= bdmv::UOMaskTable(item->uoMask);
     }
 }
 
 const bd::PlayMode& PlaybackContext::GetCurrentPlayMode()
 {
-    return m_State.currentPlayMode;
+    return m_rState.currentPlayMode;
 }
 
 bd::TimePosition PlaybackContext::GetCurrentTimePosition()
 {
-    return m_State.position;
+    return m_rState.position.count();
 }
 
 void PlaybackContext::GetExecuteButtonData(RefPtr& program, bd::UInt32& ticket,
                                            bd::ButtonId& buttonId)
 {
-    program = m_State.button.program;
-    ticket = m_State.button.ticket;
-    buttonId = m_State.button.id;
+    program = m_rState.button.program;
+    ticket = m_rState.button.ticket;
+    buttonId = m_rState.button.id;
 }
 
 bd::UserStyleNumber PlaybackContext::GetCurrentTextSubtitleStyleNumber()
 {
-    return m_State.selection.style;
+    return m_rState.selection.style;
 }
 
 bd::UInt8 PlaybackContext::GetNumberOfTextSubtitleStyles()
@@ -234,12 +236,12 @@ bd::UInt8 PlaybackContext::GetNumberOfTextSubtitleStyles()
 
 bdstreaming::FinishedReason PlaybackContext::GetFinishedReason()
 {
-    return m_State.finishedReason;
+    return m_rState.finishedReason;
 }
 
 void PlaybackContext::GetZoomScaleInfo(bd::ZOOM_PARAM_Def& zoom)
 {
-    zoom = m_State.zoom;
+    zoom = m_rState.zoom;
 }
 
 void PlaybackContext::IsAsyncPipInCurrentPlayItem(bool& fg2ndVid, bool& fg2ndAud,
@@ -254,35 +256,12 @@ void PlaybackContext::IsAsyncPipInCurrentPlayItem(bool& fg2ndVid, bool& fg2ndAud
     fg2ndAud = anyAsync(streams.secondaryAudio);
 
     // What the previous play item offered becomes unavailable only where this one lacks it.
-    const StreamTable& previous = m_State.previousItem
-                                      ? m_PlayList.playList.playItems[*m_State.previousItem].streams
-                                      : NoStreams;
+    const StreamTable& previous =
+        m_rState.previousItem
+            ? m_rPlayhead.LoadedList().playList.playItems[*m_rState.previousItem].streams
+            : NoStreams;
     fgPrev2ndVid = !previous.secondaryVideo.empty() && streams.secondaryVideo.empty();
     fgPrev2ndAud = !previous.secondaryAudio.empty() && streams.secondaryAudio.empty();
-}
-
-const PlayItem* PlaybackContext::CurrentItem() const
-{
-    const std::vector<PlayItem>& items = m_PlayList.playList.playItems;
-    return m_State.item < items.size() ? &items[m_State.item] : nullptr;
-}
-
-const Chapter* PlaybackContext::CurrentChapter() const
-{
-    // Where one play item ends and the next starts, those of the next one come later.
-    const std::vector<Chapter>& chapters = m_PlayList.chaptersByStart;
-    const auto behind = std::upper_bound(chapters.begin(), chapters.end(), m_State,
-                                         [](const PlaybackState& state, const Chapter& chapter) {
-                                             return std::tie(state.position, state.item) <
-                                                    std::tie(chapter.start, chapter.playItem);
-                                         });
-    return behind == chapters.begin() ? nullptr : &*std::prev(behind);
-}
-
-const StreamTable& PlaybackContext::CurrentStreams() const
-{
-    const PlayItem* const item = CurrentItem();
-    return item == nullptr ? NoStreams : item->streams;
 }
 
 /** The stream that was asked for, or the last where it is not there. */
@@ -295,43 +274,43 @@ PlaybackContext::NumberAndCount PlaybackContext::Choose(bd::StreamNumberDef want
 
 PlaybackContext::NumberAndCount PlaybackContext::ChosenVideo() const
 {
-    return Choose(m_State.selection.video, CurrentStreams().primaryVideo.size());
+    return Choose(m_rState.selection.video, CurrentStreams().primaryVideo.size());
 }
 
 PlaybackContext::NumberAndCount PlaybackContext::ChosenAudio() const
 {
-    return Choose(m_State.selection.audio, CurrentStreams().primaryAudio.size());
+    return Choose(m_rState.selection.audio, CurrentStreams().primaryAudio.size());
 }
 
 PlaybackContext::NumberAndCount PlaybackContext::ChosenPg() const
 {
-    return Choose(m_State.selection.pg, CurrentStreams().pg.size());
+    return Choose(m_rState.selection.pg, CurrentStreams().pg.size());
 }
 
 PlaybackContext::NumberAndCount PlaybackContext::ChosenSecondaryVideo() const
 {
-    return Choose(m_State.selection.secondaryVideo, CurrentStreams().secondaryVideo.size());
+    return Choose(m_rState.selection.secondaryVideo, CurrentStreams().secondaryVideo.size());
 }
 
 PlaybackContext::NumberAndCount PlaybackContext::ChosenSecondaryAudio() const
 {
-    return Choose(m_State.selection.secondaryAudio, CurrentStreams().secondaryAudio.size());
+    return Choose(m_rState.selection.secondaryAudio, CurrentStreams().secondaryAudio.size());
 }
 
 PlaybackContext::NumberAndCount PlaybackContext::ChosenPipPg() const
 {
-    return Choose(m_State.selection.pipPg, CurrentStreams().pipPg.size());
+    return Choose(m_rState.selection.pipPg, CurrentStreams().pipPg.size());
 }
 
 PlaybackContext::NumberAndCount PlaybackContext::ChosenIg() const
 {
-    return Choose(m_State.selection.ig, CurrentStreams().ig.size());
+    return Choose(m_rState.selection.ig, CurrentStreams().ig.size());
 }
 
 PlaybackContext::NumberAndCount PlaybackContext::ChosenAngle() const
 {
-    const PlayItem* const item = CurrentItem();
-    return Choose(m_State.selection.angle, item == nullptr ? 0 : NumberOfAngles(*item));
+    const PlayItem* const item = m_rPlayhead.CurrentItem();
+    return Choose(m_rState.selection.angle, item == nullptr ? 0 : NumberOfAngles(*item));
 }
 
 void PlaybackContext::StoreSystemResumeData(std::vector<bd::UInt8> block)
@@ -344,7 +323,7 @@ void PlaybackContext::StoreSystemResumeData(std::vector<bd::UInt8> block)
 /** A stream runs on its own when the sub path that brings it is not in step with the play item. */
 bool PlaybackContext::IsAsync(const Stream& stream) const
 {
-    const std::vector<SubPath>& subPaths = m_PlayList.playList.subPaths;
+    const std::vector<SubPath>& subPaths = m_rPlayhead.LoadedList().playList.subPaths;
     return stream.entryType == EntryTypeSubPath && stream.subPath < subPaths.size() &&
            subPaths[stream.subPath].type == bd::SubPathOutOfMuxASynchPipPresentationPath;
 }

@@ -11,8 +11,8 @@
 #include <vector>
 
 #include "bdmvnavigator/iplaybackcontext.h"
-#include "navigator/loadedplaylist.h"
 #include "navigator/playbackstate.h"
+#include "navigator/playhead.h"
 
 namespace deskplayer
 {
@@ -26,10 +26,15 @@ namespace deskplayer
  * The navigator's thread changes the state while no event is on its way; the delivering thread only
  * reads it.
  */
-class PlaybackContext : public bdmv::IPlaybackContext
+class PlaybackContext final : public bdmv::IPlaybackContext
 {
 public:
-    explicit PlaybackContext(LoadedPlayList playList);
+    /** @param playhead and @p state must outlive the context */
+    PlaybackContext(const Playhead& playhead, const PlaybackState& state)
+        : m_rPlayhead(playhead), m_rState(state)
+    {
+    }
+
     ~PlaybackContext() override = default;
     PlaybackContext(const PlaybackContext&) = delete;
     PlaybackContext& operator=(const PlaybackContext&) = delete;
@@ -73,21 +78,6 @@ public:
     void IsAsyncPipInCurrentPlayItem(bool& fg2ndVid, bool& fg2ndAud, bool& fgPrev2ndVid,
                                      bool& fgPrev2ndAud) override;
 
-protected:
-    const LoadedPlayList& PlayListInPlayback() const { return m_PlayList; }
-
-    /** The play item in playback; null while there is none. */
-    const PlayItem* CurrentItem() const;
-
-    /** The chapter in playback; null before the first, or when there is none. */
-    const Chapter* CurrentChapter() const;
-
-    /** The streams of the play item in playback; none while there is none. */
-    const StreamTable& CurrentStreams() const;
-
-    PlaybackState& State() { return m_State; }
-    const PlaybackState& State() const { return m_State; }
-
     /** A stream that is selected, from 1, and how many there are of its kind; 0 of 0 for none. */
     typedef std::pair<bd::StreamNumberDef, bd::UInt8> NumberAndCount;
 
@@ -103,14 +93,15 @@ protected:
     /** Stores the block that GetSystemResumeData() gives, until it is cleaned up. */
     void StoreSystemResumeData(std::vector<bd::UInt8> block);
 
-    /** Whether a stream is not in step with the play item. */
+    /** Whether a stream runs on a time base of its own, not on that of the play item. */
     bool IsAsync(const Stream& stream) const;
 
 private:
     static NumberAndCount Choose(bd::StreamNumberDef wanted, std::size_t count);
+    const StreamTable& CurrentStreams() const { return m_rPlayhead.CurrentStreams(); }
 
-    const LoadedPlayList m_PlayList;
-    PlaybackState m_State;
+    const Playhead& m_rPlayhead;
+    const PlaybackState& m_rState;
     std::vector<bd::UInt8> m_SystemResumeData;
     bd::DataBlockDef m_SystemResumeBlock = {nullptr, 0};
 };

@@ -12,6 +12,7 @@
 #include "bd/types.h"
 #include "bdstreaming/types.h"
 #include "database/iprogramdata.h"
+#include "text/ticks.h"
 
 namespace deskplayer
 {
@@ -44,9 +45,23 @@ struct PendingButton {
     bd::ButtonId id = 0;
 };
 
-/** Positions are on the time line of the play list, in ticks of 45 kHz. */
+enum class Status {
+    Stopped, ///< not started yet, stopped on request, or failed
+    Playing,
+    Paused,
+    Still,     ///< holds the last picture of a play item
+    Suspended, ///< holds until it is resumed
+    Standby,   ///< the system is in standby
+    Finished   ///< played to the end, or the stream ran dry
+};
+
+/** Positions are on the time line of the play list. */
 struct PlaybackState {
-    std::uint64_t position = 0;
+    Status status = Status::Stopped;
+    Status statusBeforeSuspend = Status::Stopped; ///< restored when playback resumes
+    std::optional<Ticks> stillLeft;               ///< of a still that ends by itself
+
+    Ticks position{0};
     std::size_t item = 0;                    ///< the play item in playback
     std::optional<std::size_t> previousItem; ///< the one that was in playback before
     std::optional<std::size_t> mark;         ///< index of the mark that was passed last
@@ -55,13 +70,13 @@ struct PlaybackState {
     bd::PlayMode currentPlayMode; ///< what playback does
     StreamSelection selection;
 
-    std::optional<std::uint64_t> pointA;                   ///< of the A-B repeat
-    std::optional<std::uint64_t> pointB;                   ///< set: A to B repeats
-    std::optional<std::uint64_t> notifyAt;                 ///< a time to be told about
+    std::optional<Ticks> pointA;                           ///< of the A-B repeat
+    std::optional<Ticks> pointB;                           ///< set: A to B repeats
+    std::optional<Ticks> notifyAt;                         ///< the position of the trigger
     bd::TriggerType chapterTitleRepeat = bd::TRIGGER_NONE; ///< TRIGGER_CHP, TRIGGER_TITLE
-    bd::TriggerType trigger = bd::TRIGGER_NONE;            ///< what was set last
-    bd::TimePosition triggerReachedTime = 0;
-    std::optional<bd::TriggerType> triggerReached; ///< which one, while the listeners are told
+    bd::TriggerType trigger = bd::TRIGGER_NONE;            ///< the one set last
+    Ticks triggerReachedTime{0};
+    std::optional<bd::TriggerType> triggerReached; ///< while the listeners are notified
 
     bd::ZOOM_PARAM_Def zoom = {};
     bdstreaming::FinishedReason finishedReason = bdstreaming::FinishedReasonEndOfMedia;

@@ -29,6 +29,8 @@ public:
         }
     }
 
+    void operator()(Ticks time) { (*this)(time.count()); }
+
     std::vector<bd::UInt8>& Block() { return m_Block; }
 
 private:
@@ -47,6 +49,13 @@ public:
             number = number << 8 | m_rBlock[m_Next++];
         }
         value = static_cast<Number>(number);
+    }
+
+    void operator()(Ticks& time)
+    {
+        Ticks::rep count = 0;
+        (*this)(count);
+        time = Ticks(count);
     }
 
 private:

@@ -20,7 +20,7 @@ struct ResumePoint {
     bd::PlayListIdDef playList = 0;
     bool playing = false; ///< rather than paused, or stopped
     bd::PlayItemIdDef playItem = 0;
-    std::uint64_t position = 0; ///< can be where the play item ends, and the next one starts
+    Ticks position{0}; ///< can be the end of the play item, where the next one starts
     bd::PlayMode playMode;
     StreamSelection selection;
 };

@@ -5,18 +5,20 @@
 #ifndef DESKPLAYER_NAVIGATOR_SIMULATEDNAVIGATOR_H
 #define DESKPLAYER_NAVIGATOR_SIMULATEDNAVIGATOR_H
 
-#include <array>
+#include <cstddef>
 #include <cstdint>
-#include <initializer_list>
 #include <optional>
-#include <string>
-#include <utility>
 #include <vector>
 
+#include "navigator/announcer.h"
 #include "navigator/eventdelivery.h"
+#include "navigator/eventsender.h"
 #include "navigator/outcome.h"
+#include "navigator/permission.h"
 #include "navigator/playbackcontext.h"
-#include "navigator/resumedata.h"
+#include "navigator/playhead.h"
+#include "navigator/popupmenu.h"
+#include "navigator/transport.h"
 #include "navigator/virtualclock.h"
 
 namespace deskplayer
@@ -31,45 +33,35 @@ namespace deskplayer
  * Every event has been delivered when an operation returns, with the values of its moment. All
  * operations belong to one thread. They throw what a listener threw.
  *
- * Positions are on the time line of the play list, in ticks of 45 kHz. Play items are played in
- * sequence, whatever playback type the play list asks for.
+ * Positions are on the time line of the play list. Play items are played in sequence, whatever
+ * playback type the play list asks for.
  */
-class SimulatedNavigator final : public PlaybackContext
+class SimulatedNavigator
 {
 public:
-    enum class Status {
-        Stopped, ///< not started yet, stopped on request, or failed
-        Playing,
-        Paused,
-        Still,     ///< holds the last picture of a play item
-        Suspended, ///< holds until it is resumed
-        Standby,   ///< the system sleeps
-        Finished   ///< everything has been played
-    };
-
     /** @param clock and @p delivery must outlive the navigator */
     SimulatedNavigator(LoadedPlayList playList, VirtualClock& clock, EventDelivery& delivery);
 
-    Status CurrentStatus() const { return m_Status; }
+    SimulatedNavigator(const SimulatedNavigator&) = delete;
+    SimulatedNavigator& operator=(const SimulatedNavigator&) = delete;
 
-    /** Whether playback goes round and round, so that it never ends by itself. */
-    bool IsRepeating() const;
+    // State.
+
+    Status CurrentStatus() const { return m_State.status; }
+
+    /** Answers the queries of events, and those of a viewer: what plays, which streams, where. */
+    PlaybackContext& Context() { return m_Context; }
+
+    /** Whether playback repeats, so that it never ends by itself. */
+    bool IsRepeating() const { return m_Playhead.IsRepeating(); }
 
     // Time.
 
-    /**
-     * How long it takes until playback changes by itself, in ticks of 45 kHz of the session;
-     * nothing when it waits for an operation, or has ended.
-     */
-    std::optional<std::uint64_t> TimeToNextChange() const;
+    /** @copydoc Transport::TimeToNextChange() */
+    std::optional<Ticks> TimeToNextChange() const { return m_Transport.TimeToNextChange(); }
 
-    /**
-     * Lets time pass, and playback with it.
-     *
-     * @param ticks of the session, 45 kHz
-     * @return how much of it was left when playback ended; the clock stands there
-     */
-    std::uint64_t Advance(std::uint64_t ticks);
+    /** @copydoc Transport::Advance() */
+    Ticks Advance(Ticks time) { return m_Transport.Advance(time); }
 
     // Playback.
 
@@ -94,7 +86,7 @@ public:
     Outcome EndStill();
 
     /** The same, by a program of the disc: no mask forbids it. Does nothing outside of a still. */
-    void LeaveStill();
+    void LeaveStill() { m_Transport.LeaveStill(); }
 
     /** Holds playback until Resume(), as a title does that calls a menu. */
     Outcome Suspend();
@@ -102,7 +94,7 @@ public:
 
     // Position.
 
-    Outcome SearchTime(std::uint64_t position);
+    Outcome SearchTime(Ticks position);
     Outcome SearchChapter(std::uint64_t number);
     Outcome SkipToNextChapter();
 
@@ -122,7 +114,7 @@ public:
     Outcome EndChapterTitleRepeat();
 
     /** Has the listeners told when playback gets to @p position, at most the end. */
-    Outcome SetTrigger(std::uint64_t position);
+    Outcome SetTrigger(Ticks position);
 
     // Streams.
 
@@ -166,10 +158,10 @@ public:
 
     // Failures.
 
-    /** Has the next Play() fail. */
+    /** Makes the next Play() fail. */
     void FailNextPlay() { m_PlayFails = true; }
 
-    /** Has the next Resume() fail. */
+    /** Makes the next Resume() fail. */
     void FailNextResume() { m_ResumeFails = true; }
 
     Outcome FailPreload();
@@ -178,93 +170,45 @@ public:
     Outcome Starve();
 
 private:
-    /** The kinds of streams that events tell number and count of. */
-    static constexpr std::size_t StreamKinds = 8;
+    /** Carries out an operation if it is possible. */
+    template <typename Action> Outcome Operate(const Outcome& possible, Action action)
+    {
+        if (possible.IsDone()) {
+            action();
+        }
+        return possible;
+    }
 
-    /** What the listeners were told last: they are told again only what has changed. */
-    struct Told {
-        std::array<NumberAndCount, StreamKinds> streams;
-        std::optional<bd::AudioInfoType> audio;
-        std::optional<bd::AudioInfoType> secondaryAudio;
-        bool pipInStep = false;            ///< as available
-        bool secondaryAudioInStep = false; ///< as available
-        bd::UInt8 styles = 0;
-        bool popUpMenu = false; ///< as available
-        std::optional<bdmv::UOMaskTable> mask;
-        bd::ChapterNumberDef chapter = 0;
-    };
-
-    template <typename Event, typename... Arguments> void Send(Arguments... arguments);
-
-    // Whether an operation may be carried out now, and carrying it out.
-    Outcome CheckMask(bd::UserOperationMaskDef operation) const;
-    Outcome CheckStatus(std::initializer_list<Status> statuses) const;
-    Outcome CheckActive() const;
-    template <typename Action> Outcome Operate(const Outcome& possible, Action action);
+    /** The same for an operation that a disc can forbid, which takes precedence as the reason. */
     template <typename Action>
-    Outcome Operate(bd::UserOperationMaskDef operation, const Outcome& possible, Action action);
+    Outcome Operate(bd::UserOperationMaskDef operation, const Outcome& possible, Action action)
+    {
+        const Outcome allowed = m_Permission.CheckMask(operation);
+        return Operate(allowed.IsDone() ? possible : allowed, action);
+    }
 
-    // Time.
-    std::uint64_t EndOfItem(std::size_t item) const;
-    bool IsForward() const;
-    std::uint64_t NextStop() const;
-    std::uint64_t NextStopForward() const;
-    std::uint64_t NextStopBackward() const;
-    std::uint64_t DistanceToNextStop() const;
-    void Move(std::uint64_t distance);
-    void ReachPosition();
-    void ReachForward();
-    void ReachBackward();
-    void ReachTrigger(bd::TriggerType type);
-    void ReachEnd();
-    void ReachEndOfItem();
-    void EnterNextItem();
-    void Finish(bdstreaming::FinishedReason reason);
-
-    // What the listeners are told.
-    void StartFresh();
-    void AnnounceItem();
-    void AnnounceStreams();
-    void AnnounceAudioInfo(bool isPrimary, const std::vector<Stream>& streams,
-                           bd::StreamNumberDef number, std::optional<bd::AudioInfoType>& told);
-    void AnnounceStreamsInStep();
-    void AnnounceMask();
-    void AnnounceMenu();
-    void AnnounceChapter();
-    void AnnounceMarks(std::size_t firstItem);
-
-    // Steps of operations.
-    std::size_t ItemAt(std::uint64_t position) const;
-    const Chapter* FindChapter(std::uint64_t number) const;
-    void StepBy(std::uint64_t duration);
-    void JumpTo(std::uint64_t position);
-    void RepeatFrom(std::uint64_t position);
-    void ChangePlayMode(bd::PlayMode mode);
-    Outcome JumpToChapter(bd::UserOperationMaskDef operation, std::uint64_t number);
-    void SetTriggerType(bd::TriggerType type, bool result);
-    Outcome SetChapterTitleRepeat(bd::TriggerType repeat);
     template <typename Number>
     Outcome SelectStream(bd::UserOperationMaskDef operation, std::uint64_t number,
                          std::size_t count, const char* what, Number& selected);
     template <typename Event>
     Outcome Switch(bd::UserOperationMaskDef operation, bool& shown, bool value);
-    bd::ButtonId ButtonOfCurrentChapter();
+    Outcome JumpToChapter(bd::UserOperationMaskDef operation, std::uint64_t number);
+    void SetTriggerType(bd::TriggerType type, bool result);
+    Outcome SetChapterTitleRepeat(bd::TriggerType repeat);
     Outcome CheckMenu() const;
     Outcome CheckButton(std::uint64_t number) const;
-    void CloseMenu();
-    void ExecuteButton();
+    void ActivateSelectedButton();
     bool IsInPlayList(const ResumePoint& point) const;
 
-    VirtualClock& m_rClock;
-    EventDelivery& m_rDelivery;
-    Status m_Status = Status::Stopped;
-    Status m_StatusBefore = Status::Stopped;  ///< the one that Resume() goes back to
-    std::uint64_t m_Carry = 0;                ///< time that passed, too short to move the position
-    std::optional<std::uint64_t> m_StillLeft; ///< of a still that ends by itself, in ticks
-    Told m_Told;
-    bool m_MenuOpen = false;
-    bd::ButtonId m_SelectedButton = 1;
-    bd::UInt32 m_LastTicket = 0;
+    const LoadedPlayList m_PlayList;
+    PlaybackState m_State;
+    Playhead m_Playhead{m_PlayList, m_State};
+    Permission m_Permission{m_Playhead, m_State};
+    PlaybackContext m_Context{m_Playhead, m_State};
+    EventSender m_Sender;
+    PopUpMenu m_Menu{m_Playhead, m_State, m_Sender};
+    Announcer m_Announcer{m_Playhead, m_State, m_Context, m_Sender};
+    Transport m_Transport;
     bool m_PlayFails = false;
     bool m_ResumeFails = false;
 };

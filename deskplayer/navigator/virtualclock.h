@@ -6,24 +6,25 @@
 #define DESKPLAYER_NAVIGATOR_VIRTUALCLOCK_H
 
 #include <atomic>
-#include <cstdint>
+
+#include "text/ticks.h"
 
 namespace deskplayer
 {
 
 /**
- * Counts ticks of 45 kHz since the session began; stands still but for Advance().
+ * The time since the session began; only Advance() changes it.
  *
- * The navigator's thread moves it, any thread reads it.
+ * The navigator's thread advances it, any thread reads it.
  */
 class VirtualClock
 {
 public:
-    std::uint64_t Now() const { return m_Now; }
-    void Advance(std::uint64_t ticks) { m_Now += ticks; }
+    Ticks Now() const { return Ticks(m_Now); }
+    void Advance(Ticks time) { m_Now += time.count(); }
 
 private:
-    std::atomic<std::uint64_t> m_Now{0};
+    std::atomic<Ticks::rep> m_Now{0};
 };
 
 } // namespace deskplayer

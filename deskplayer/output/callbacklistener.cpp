@@ -1,6 +1,6 @@
 #include "output/callbacklistener.h"
 
-#include "output/names.h"
+#include "text/names.h"
 
 namespace deskplayer
 {

@@ -1,7 +1,7 @@
 #include "output/jsonoutput.h"
 
 #include "output/argumentsjson.h"
-#include "output/timetext.h"
+#include "text/timetext.h"
 
 namespace deskplayer
 {
@@ -9,8 +9,8 @@ namespace deskplayer
 void JsonOutput::Write(const Callback& callback)
 {
     const CallbackInfo& info = InfoOf(callback.id);
-    const std::uint64_t now = Now();
-    const nlohmann::ordered_json line = {{"ticks", now},
+    const Ticks now = Now();
+    const nlohmann::ordered_json line = {{"ticks", now.count()},
                                          {"time", TimeText(now)},
                                          {"interface", NameOf(info.interface)},
                                          {"callback", info.name},

@@ -5,7 +5,6 @@
 #ifndef DESKPLAYER_OUTPUT_OUTPUT_H
 #define DESKPLAYER_OUTPUT_OUTPUT_H
 
-#include <cstdint>
 #include <ostream>
 
 #include "navigator/virtualclock.h"
@@ -37,8 +36,8 @@ public:
 protected:
     std::ostream& Stream() { return m_rStream; }
 
-    /** The time of the session in ticks of 45 kHz. */
-    std::uint64_t Now() const { return m_rClock.Now(); }
+    /** The time of the session. */
+    Ticks Now() const { return m_rClock.Now(); }
 
 private:
     /** Called for every callback, for outputs that must know what the filter hides. */

@@ -3,7 +3,7 @@
 #include <algorithm>
 #include <vector>
 
-#include "output/choice.h"
+#include "text/choice.h"
 
 namespace deskplayer
 {

@@ -1,9 +1,9 @@
 #include "output/outputformat.h"
 
-#include "output/choice.h"
 #include "output/jsonoutput.h"
 #include "output/textoutput.h"
 #include "output/traceoutput.h"
+#include "text/choice.h"
 
 namespace deskplayer
 {

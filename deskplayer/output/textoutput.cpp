@@ -3,7 +3,7 @@
 #include <unistd.h>
 
 #include "bd/constants.h"
-#include "output/timetext.h"
+#include "text/timetext.h"
 
 namespace deskplayer
 {
@@ -49,7 +49,7 @@ std::string ValueText(std::uint64_t value)
 
 std::string ValueText(Position position)
 {
-    return position.ticks == bd::TimePositionNone ? "none" : TimeText(position.ticks);
+    return position.ticks == bd::TimePositionNone ? "none" : TimeText(Ticks(position.ticks));
 }
 
 std::string ValueText(const std::string& value)

@@ -67,9 +67,9 @@ ordered_json Metadata(const char* name, std::size_t thread, const char* member, 
 }
 
 /** Whole microseconds, which are enough to tell ticks of 45 kHz apart. */
-std::uint64_t Microseconds(std::uint64_t ticks)
+std::uint64_t Microseconds(Ticks time)
 {
-    return (ticks * 200 + 4) / 9;
+    return (time.count() * 200 + 4) / 9;
 }
 
 /** @param name of an argument that the callback has */

@@ -26,7 +26,7 @@ Outcome PlayFast(Desk& desk, bd::PlayDirectionDef direction, std::uint64_t steps
     if (steps == 0 || steps > FastSteps) {
         return Outcome::Refused("fast play has the steps 1 to " + std::to_string(FastSteps));
     }
-    return desk.navigator.SetPlayMode(ModeOf(direction, static_cast<std::int64_t>(steps)));
+    return desk.Navigator().SetPlayMode(ModeOf(direction, static_cast<std::int64_t>(steps)));
 }
 
 Outcome PlaySlowly(Desk& desk, bd::PlayDirectionDef direction, std::uint64_t steps)
@@ -34,7 +34,7 @@ Outcome PlaySlowly(Desk& desk, bd::PlayDirectionDef direction, std::uint64_t ste
     if (steps == 0 || steps > SlowSteps) {
         return Outcome::Refused("slow motion has the steps 1 to " + std::to_string(SlowSteps));
     }
-    return desk.navigator.SetPlayMode(ModeOf(direction, -static_cast<std::int64_t>(steps)));
+    return desk.Navigator().SetPlayMode(ModeOf(direction, -static_cast<std::int64_t>(steps)));
 }
 
 bd::ZoomRectangleDef RectangleOf(Values values, std::size_t first)
@@ -49,7 +49,7 @@ std::uint64_t NextOf(Desk& desk, void (PlaybackContext::*get)(Number*, bd::UInt8
 {
     Number number = 0;
     bd::UInt8 count = 0;
-    (desk.navigator.*get)(&number, &count);
+    (desk.Navigator().Context().*get)(&number, &count);
     return number < count ? number + 1U : 1U;
 }
 
@@ -62,16 +62,16 @@ const std::vector<Command>& Commands()
     static const std::vector<Command> commands = {
         // Playback
         {{"play", "start at the beginning of the play list"},
-         [](Desk& d, Values) { return d.navigator.Play(); }},
-        {{"stop", "end playback"}, [](Desk& d, Values) { return d.navigator.Stop(); }},
-        {{"pause", "hold playback"}, [](Desk& d, Values) { return d.navigator.Pause(); }},
+         [](Desk& d, Values) { return d.Navigator().Play(); }},
+        {{"stop", "end playback"}, [](Desk& d, Values) { return d.Navigator().Stop(); }},
+        {{"pause", "hold playback"}, [](Desk& d, Values) { return d.Navigator().Pause(); }},
         {{"continue", "go on after a pause"},
-         [](Desk& d, Values) { return d.navigator.Continue(); }},
+         [](Desk& d, Values) { return d.Navigator().Continue(); }},
         {{"step", "show the next picture, while paused"},
-         [](Desk& d, Values) { return d.navigator.Step(); }},
+         [](Desk& d, Values) { return d.Navigator().Step(); }},
         {{"forward", "play forward at normal speed"},
          [](Desk& d, Values) {
-             return d.navigator.SetPlayMode(ModeOf(bd::PlayDirectionForward, 0));
+             return d.Navigator().SetPlayMode(ModeOf(bd::PlayDirectionForward, 0));
          }},
         {{"forward fast NUMBER", "play fast, steps 1 to 12"},
          [](Desk& d, Values v) { return PlayFast(d, bd::PlayDirectionForward, v[0]); }},
@@ -79,134 +79,134 @@ const std::vector<Command>& Commands()
          [](Desk& d, Values v) { return PlaySlowly(d, bd::PlayDirectionForward, v[0]); }},
         {{"backward", "play backward at normal speed"},
          [](Desk& d, Values) {
-             return d.navigator.SetPlayMode(ModeOf(bd::PlayDirectionBackward, 0));
+             return d.Navigator().SetPlayMode(ModeOf(bd::PlayDirectionBackward, 0));
          }},
         {{"backward fast NUMBER", "play backward fast, steps 1 to 12"},
          [](Desk& d, Values v) { return PlayFast(d, bd::PlayDirectionBackward, v[0]); }},
         {{"backward slow NUMBER", "play backward in slow motion, steps 1 to 5"},
          [](Desk& d, Values v) { return PlaySlowly(d, bd::PlayDirectionBackward, v[0]); }},
-        {{"still off", "leave a still"}, [](Desk& d, Values) { return d.navigator.EndStill(); }},
+        {{"still off", "leave a still"}, [](Desk& d, Values) { return d.Navigator().EndStill(); }},
         {{"suspend", "hold playback as a title does that calls a menu"},
-         [](Desk& d, Values) { return d.navigator.Suspend(); }},
-        {{"resume", "go on after suspend"}, [](Desk& d, Values) { return d.navigator.Resume(); }},
+         [](Desk& d, Values) { return d.Navigator().Suspend(); }},
+        {{"resume", "go on after suspend"}, [](Desk& d, Values) { return d.Navigator().Resume(); }},
 
         // Position
         {{"seek TIME", "go to a time of the play list"},
-         [](Desk& d, Values v) { return d.navigator.SearchTime(v[0]); }},
+         [](Desk& d, Values v) { return d.Navigator().SearchTime(Ticks(v[0])); }},
         {{"chapter next", "go to the next chapter"},
-         [](Desk& d, Values) { return d.navigator.SkipToNextChapter(); }},
+         [](Desk& d, Values) { return d.Navigator().SkipToNextChapter(); }},
         {{"chapter previous", "go to the start of the chapter, or to the one before"},
-         [](Desk& d, Values) { return d.navigator.SkipToPreviousChapter(); }},
+         [](Desk& d, Values) { return d.Navigator().SkipToPreviousChapter(); }},
         {{"chapter NUMBER", "go to a chapter"},
-         [](Desk& d, Values v) { return d.navigator.SearchChapter(v[0]); }},
+         [](Desk& d, Values v) { return d.Navigator().SearchChapter(v[0]); }},
 
         // Repeat and triggers
         {{"repeat a", "set the start of an A-B repeat"},
-         [](Desk& d, Values) { return d.navigator.SetPointA(); }},
+         [](Desk& d, Values) { return d.Navigator().SetPointA(); }},
         {{"repeat b", "set its end, and repeat from A to here"},
-         [](Desk& d, Values) { return d.navigator.SetPointB(); }},
+         [](Desk& d, Values) { return d.Navigator().SetPointB(); }},
         {{"repeat ab off", "end the A-B repeat"},
-         [](Desk& d, Values) { return d.navigator.EndABRepeat(); }},
+         [](Desk& d, Values) { return d.Navigator().EndABRepeat(); }},
         {{"repeat chapter", "repeat this chapter"},
-         [](Desk& d, Values) { return d.navigator.RepeatChapter(); }},
+         [](Desk& d, Values) { return d.Navigator().RepeatChapter(); }},
         {{"repeat title", "repeat the play list"},
-         [](Desk& d, Values) { return d.navigator.RepeatTitle(); }},
+         [](Desk& d, Values) { return d.Navigator().RepeatTitle(); }},
         {{"repeat off", "end the repeat of chapter or play list"},
-         [](Desk& d, Values) { return d.navigator.EndChapterTitleRepeat(); }},
+         [](Desk& d, Values) { return d.Navigator().EndChapterTitleRepeat(); }},
         {{"trigger TIME", "be told when playback gets to a time of the play list"},
-         [](Desk& d, Values v) { return d.navigator.SetTrigger(v[0]); }},
+         [](Desk& d, Values v) { return d.Navigator().SetTrigger(Ticks(v[0])); }},
 
         // Streams
         {{"audio NUMBER", "select an audio stream"},
-         [](Desk& d, Values v) { return d.navigator.SelectAudio(v[0]); }},
+         [](Desk& d, Values v) { return d.Navigator().SelectAudio(v[0]); }},
         {{"audio next", "select the next audio stream"},
          [](Desk& d, Values) {
-             return d.navigator.SelectAudio(NextOf(d, &PlaybackContext::GetAudioInfo));
+             return d.Navigator().SelectAudio(NextOf(d, &PlaybackContext::GetAudioInfo));
          }},
         {{"subtitle on", "show subtitles"},
-         [](Desk& d, Values) { return d.navigator.ShowSubtitles(true); }},
+         [](Desk& d, Values) { return d.Navigator().ShowSubtitles(true); }},
         {{"subtitle off", "hide subtitles"},
-         [](Desk& d, Values) { return d.navigator.ShowSubtitles(false); }},
+         [](Desk& d, Values) { return d.Navigator().ShowSubtitles(false); }},
         {{"subtitle next", "select the next subtitle stream"},
          [](Desk& d, Values) {
-             return d.navigator.SelectSubtitle(NextOf(d, &PlaybackContext::GetPgTextStInfo));
+             return d.Navigator().SelectSubtitle(NextOf(d, &PlaybackContext::GetPgTextStInfo));
          }},
         {{"subtitle style NUMBER", "select the style of text subtitles"},
-         [](Desk& d, Values v) { return d.navigator.SelectStyle(v[0]); }},
+         [](Desk& d, Values v) { return d.Navigator().SelectStyle(v[0]); }},
         {{"subtitle NUMBER", "select a subtitle stream"},
-         [](Desk& d, Values v) { return d.navigator.SelectSubtitle(v[0]); }},
+         [](Desk& d, Values v) { return d.Navigator().SelectSubtitle(v[0]); }},
         {{"angle NUMBER", "select an angle"},
-         [](Desk& d, Values v) { return d.navigator.SelectAngle(v[0]); }},
+         [](Desk& d, Values v) { return d.Navigator().SelectAngle(v[0]); }},
         {{"angle next", "select the next angle"},
          [](Desk& d, Values) {
-             return d.navigator.SelectAngle(NextOf(d, &PlaybackContext::GetAngleInfo));
+             return d.Navigator().SelectAngle(NextOf(d, &PlaybackContext::GetAngleInfo));
          }},
         {{"pip on", "show the secondary video"},
-         [](Desk& d, Values) { return d.navigator.ShowSecondaryVideo(true); }},
+         [](Desk& d, Values) { return d.Navigator().ShowSecondaryVideo(true); }},
         {{"pip off", "hide the secondary video"},
-         [](Desk& d, Values) { return d.navigator.ShowSecondaryVideo(false); }},
+         [](Desk& d, Values) { return d.Navigator().ShowSecondaryVideo(false); }},
         {{"pip audio on", "switch the secondary audio on"},
-         [](Desk& d, Values) { return d.navigator.ShowSecondaryAudio(true); }},
+         [](Desk& d, Values) { return d.Navigator().ShowSecondaryAudio(true); }},
         {{"pip audio off", "switch the secondary audio off"},
-         [](Desk& d, Values) { return d.navigator.ShowSecondaryAudio(false); }},
+         [](Desk& d, Values) { return d.Navigator().ShowSecondaryAudio(false); }},
         {{"pip audio NUMBER", "select a secondary audio stream"},
-         [](Desk& d, Values v) { return d.navigator.SelectSecondaryAudio(v[0]); }},
+         [](Desk& d, Values v) { return d.Navigator().SelectSecondaryAudio(v[0]); }},
         {{"pip subtitle on", "take subtitles from the picture-in-picture"},
-         [](Desk& d, Values) { return d.navigator.PickPipSubtitle(true); }},
+         [](Desk& d, Values) { return d.Navigator().PickPipSubtitle(true); }},
         {{"pip subtitle off", "take subtitles from the film"},
-         [](Desk& d, Values) { return d.navigator.PickPipSubtitle(false); }},
+         [](Desk& d, Values) { return d.Navigator().PickPipSubtitle(false); }},
         {{"pip subtitle NUMBER", "select a subtitle stream of the picture-in-picture"},
-         [](Desk& d, Values v) { return d.navigator.SelectPipSubtitle(v[0]); }},
+         [](Desk& d, Values v) { return d.Navigator().SelectPipSubtitle(v[0]); }},
         {{"pip NUMBER", "select a secondary video stream"},
-         [](Desk& d, Values v) { return d.navigator.SelectSecondaryVideo(v[0]); }},
+         [](Desk& d, Values v) { return d.Navigator().SelectSecondaryVideo(v[0]); }},
         {{"zoom off", "show the whole picture"},
          [](Desk& d, Values) {
-             return d.navigator.Zoom({WholePicture, WholePicture, 0});
+             return d.Navigator().Zoom({WholePicture, WholePicture, 0});
          }},
         {{"zoom NUMBER NUMBER NUMBER NUMBER",
           "enlarge a part of the picture: left, top, width, height in pixels"},
          [](Desk& d, Values v) {
-             return d.navigator.Zoom({RectangleOf(v, 0), WholePicture, 0});
+             return d.Navigator().Zoom({RectangleOf(v, 0), WholePicture, 0});
          }},
 
         // The menu
         {{"menu on", "open the pop-up menu"},
-         [](Desk& d, Values) { return d.navigator.OpenPopUpMenu(); }},
-        {{"menu off", "close it"}, [](Desk& d, Values) { return d.navigator.ClosePopUpMenu(); }},
+         [](Desk& d, Values) { return d.Navigator().OpenPopUpMenu(); }},
+        {{"menu off", "close it"}, [](Desk& d, Values) { return d.Navigator().ClosePopUpMenu(); }},
         {{"button previous", "select the button above"},
-         [](Desk& d, Values) { return d.navigator.SelectPreviousButton(); }},
+         [](Desk& d, Values) { return d.Navigator().SelectPreviousButton(); }},
         {{"button next", "select the button below"},
-         [](Desk& d, Values) { return d.navigator.SelectNextButton(); }},
+         [](Desk& d, Values) { return d.Navigator().SelectNextButton(); }},
         {{"button activate", "activate the selected button"},
-         [](Desk& d, Values) { return d.navigator.ActivateButton(); }},
+         [](Desk& d, Values) { return d.Navigator().ActivateButton(); }},
         {{"button activate NUMBER", "select a button and activate it"},
-         [](Desk& d, Values v) { return d.navigator.SelectAndActivateButton(v[0]); }},
+         [](Desk& d, Values v) { return d.Navigator().SelectAndActivateButton(v[0]); }},
         {{"button NUMBER", "select a button"},
-         [](Desk& d, Values v) { return d.navigator.SelectButton(v[0]); }},
+         [](Desk& d, Values v) { return d.Navigator().SelectButton(v[0]); }},
 
         // The system
         {{"standby", "send the system to standby"},
-         [](Desk& d, Values) { return d.navigator.GoToStandby(); }},
+         [](Desk& d, Values) { return d.Navigator().GoToStandby(); }},
         {{"wake", "come back with the resume data that was kept"},
-         [](Desk& d, Values) { return d.navigator.WakeUp(d.keeper.ResumeData()); }},
+         [](Desk& d, Values) { return d.Navigator().WakeUp(d.ResumeData()); }},
         {{"wake without data", "come back without it"},
-         [](Desk& d, Values) { return d.navigator.WakeUp({}); }},
+         [](Desk& d, Values) { return d.Navigator().WakeUp({}); }},
 
         // Failures
         {{"fail play", "have the next play fail"},
          [](Desk& d, Values) {
-             d.navigator.FailNextPlay();
+             d.Navigator().FailNextPlay();
              return Outcome::Done();
          }},
         {{"fail resume", "have the next resume fail"},
          [](Desk& d, Values) {
-             d.navigator.FailNextResume();
+             d.Navigator().FailNextResume();
              return Outcome::Done();
          }},
         {{"fail preload", "have preloading fail"},
-         [](Desk& d, Values) { return d.navigator.FailPreload(); }},
+         [](Desk& d, Values) { return d.Navigator().FailPreload(); }},
         {{"fail stream", "have the stream run dry"},
-         [](Desk& d, Values) { return d.navigator.Starve(); }},
+         [](Desk& d, Values) { return d.Navigator().Starve(); }},
     };
     return commands;
 }

@@ -8,18 +8,12 @@
 #include <cstdint>
 #include <vector>
 
-#include "navigator/resumedatakeeper.h"
-#include "navigator/simulatednavigator.h"
+#include "navigator/desk.h"
+#include "navigator/outcome.h"
 #include "session/script.h"
 
 namespace deskplayer
 {
-
-/** What commands act on. */
-struct Desk {
-    SimulatedNavigator& navigator;
-    ResumeDataKeeper& keeper;
-};
 
 /** A command: how it is written, and what it does with the values of its placeholders. */
 struct Command {

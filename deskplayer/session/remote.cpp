@@ -11,8 +11,6 @@
 #include <cstddef>
 #include <sstream>
 
-#include "disc/codes.h"
-
 namespace deskplayer
 {
 
@@ -23,32 +21,28 @@ typedef std::chrono::steady_clock Clock;
 
 constexpr char QuitKey = 'q';
 constexpr char ControlC = '\x03'; ///< quits as well: as a key, for the terminal must be put back
-constexpr std::int64_t MillisecondsPerHour = std::int64_t{3600} * 1000;
 
 Outcome PauseOrContinue(Desk& desk)
 {
-    return desk.navigator.CurrentStatus() == SimulatedNavigator::Status::Playing
-               ? desk.navigator.Pause()
-               : desk.navigator.Continue();
+    return desk.Navigator().CurrentStatus() == Status::Playing ? desk.Navigator().Pause()
+                                                               : desk.Navigator().Continue();
 }
 
 Outcome PlayOrStop(Desk& desk)
 {
-    const SimulatedNavigator::Status status = desk.navigator.CurrentStatus();
-    return status == SimulatedNavigator::Status::Stopped ||
-                   status == SimulatedNavigator::Status::Finished
-               ? desk.navigator.Play()
-               : desk.navigator.Stop();
+    const Status status = desk.Navigator().CurrentStatus();
+    return status == Status::Stopped || status == Status::Finished ? desk.Navigator().Play()
+                                                                   : desk.Navigator().Stop();
 }
 
 /** One step faster in a direction; the first step from anything else is fast play. */
 Outcome Faster(Desk& desk, bd::PlayDirectionDef direction)
 {
-    const bd::PlayMode& mode = desk.navigator.GetPlayMode();
+    const bd::PlayMode& mode = desk.Navigator().Context().GetPlayMode();
     const bool goesOn = mode.Direction() == direction && mode.Speed() >= bd::PlaySpeedNormal;
     const int speed = goesOn ? std::min<int>(mode.Speed() + 1, bd::PlaySpeedFast12)
                              : static_cast<int>(bd::PlaySpeedFast1);
-    return desk.navigator.SetPlayMode(
+    return desk.Navigator().SetPlayMode(
         bd::PlayMode(direction, static_cast<bd::PlaySpeedDef>(speed)));
 }
 
@@ -126,18 +120,18 @@ private:
 /** Milliseconds until something happens by itself, for poll(). */
 int TimeoutOf(const SimulatedNavigator& navigator)
 {
-    const std::optional<std::uint64_t> next = navigator.TimeToNextChange();
+    const std::optional<Ticks> next = navigator.TimeToNextChange();
     if (!next) {
         return -1;
     }
-    const std::uint64_t milliseconds = (*next * 1000 + TicksPerSecond - 1) / TicksPerSecond;
-    return static_cast<int>(std::min<std::uint64_t>(milliseconds, MillisecondsPerHour));
+    const auto wait = std::min<std::chrono::milliseconds>(
+        std::chrono::ceil<std::chrono::milliseconds>(*next), std::chrono::hours(1));
+    return static_cast<int>(wait.count());
 }
 
-std::uint64_t TicksSince(Clock::time_point start)
+Ticks TimeSince(Clock::time_point start)
 {
-    typedef std::chrono::duration<std::uint64_t, std::ratio<1, TicksPerSecond>> Ticks;
-    return std::chrono::duration_cast<Ticks>(Clock::now() - start).count();
+    return std::chrono::duration_cast<Ticks>(Clock::now() - start);
 }
 
 } // namespace
@@ -188,18 +182,18 @@ std::string RemoteHelp()
     return help.str();
 }
 
-void PlayByRemote(Desk& desk, VirtualClock& clock, int keys,
+void PlayByRemote(Desk& desk, int keys,
                   const std::function<void(const std::string& reason)>& onRefused)
 {
     const SingleKeys singleKeys(keys);
     const Clock::time_point start = Clock::now();
-    desk.navigator.Play();
-    while (desk.navigator.CurrentStatus() != SimulatedNavigator::Status::Finished) {
+    desk.Navigator().Play();
+    while (desk.Navigator().CurrentStatus() != Status::Finished) {
         pollfd input = {keys, POLLIN, 0};
-        const int ready = poll(&input, 1, TimeoutOf(desk.navigator));
-        const std::uint64_t now = TicksSince(start);
-        if (now > clock.Now()) {
-            clock.Advance(desk.navigator.Advance(now - clock.Now()));
+        const int ready = poll(&input, 1, TimeoutOf(desk.Navigator()));
+        const Ticks now = TimeSince(start);
+        if (now > desk.Clock().Now()) {
+            desk.Clock().Advance(desk.Navigator().Advance(now - desk.Clock().Now()));
         }
         if (ready <= 0) {
             continue;

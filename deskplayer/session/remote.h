@@ -38,7 +38,7 @@ std::string RemoteHelp();
  * @param onRefused called when a key could not be obeyed, with the reason
  * @throw what a listener threw
  */
-void PlayByRemote(Desk& desk, VirtualClock& clock, int keys,
+void PlayByRemote(Desk& desk, int keys,
                   const std::function<void(const std::string& reason)>& onRefused);
 
 } // namespace deskplayer

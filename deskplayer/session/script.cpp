@@ -6,8 +6,8 @@
 #include <optional>
 #include <system_error>
 
-#include "disc/errors.h"
-#include "output/timetext.h"
+#include "text/printable.h"
+#include "text/timetext.h"
 
 namespace deskplayer
 {
@@ -192,12 +192,12 @@ Meaning ReadTime(std::string_view word)
     if (*thousandths * *unit % 1000 != 0) {
         return {0, "is finer than a millisecond"};
     }
+    constexpr std::uint64_t ticksPerMillisecond = TicksPerSecond / 1000;
     const std::uint64_t milliseconds = whole * *unit + *thousandths * *unit / 1000;
-    constexpr std::uint64_t ticks = TicksPerSecond / 1000;
-    if (milliseconds > LongestSession / ticks) {
+    if (milliseconds > LongestSession.count() / ticksPerMillisecond) {
         return {0, "is more than 1000 hours"};
     }
-    return {milliseconds * ticks, ""};
+    return {milliseconds * ticksPerMillisecond, ""};
 }
 
 bool IsPlaceholder(std::string_view patternWord)
@@ -319,10 +319,9 @@ const Form& FindForm(const Line& line, const Words& words, Forms forms)
 }
 
 /** When a line is carried out that begins with a time, the word @p word. */
-std::uint64_t TimeOf(const Line& line, Timing timing, std::string_view word,
-                     const ScriptStep& previous)
+Ticks TimeOf(const Line& line, Timing timing, std::string_view word, const ScriptStep& previous)
 {
-    const std::uint64_t time = Read(TimePlaceholder, word).value;
+    const Ticks time(Read(TimePlaceholder, word).value);
     if (timing == TimingAt) {
         if (time < previous.time) {
             line.Fail(word.data(), TimeText(time) + " is before line " +

@@ -25,7 +25,7 @@
 #include <string_view>
 #include <vector>
 
-#include "disc/codes.h"
+#include "text/ticks.h"
 
 namespace deskplayer
 {
@@ -33,8 +33,8 @@ namespace deskplayer
 /** Longest script that is read, in bytes. */
 constexpr std::size_t LongestScript = std::size_t{1024} * 1024;
 
-/** Latest time of a session, and greatest value of a TIME: 1000 hours, in ticks of 45 kHz. */
-constexpr std::uint64_t LongestSession = std::uint64_t(1000) * 3600 * TicksPerSecond;
+/** Latest time of a session, and greatest value of a TIME. */
+constexpr Ticks LongestSession = std::chrono::hours(1000);
 
 /** Greatest value of a NUMBER. */
 constexpr std::uint64_t GreatestNumber = 65535;
@@ -57,7 +57,7 @@ struct CommandSyntax {
 
 /** A command that is to be carried out. */
 struct ScriptStep {
-    std::uint64_t time = 0;            ///< of the session, in ticks of 45 kHz; never decreases
+    Ticks time{0};                     ///< of the session; never decreases
     std::size_t command = 0;           ///< index of its syntax
     std::vector<std::uint64_t> values; ///< of the placeholders, in order
     std::size_t line = 0;              ///< from 1

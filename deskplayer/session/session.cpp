@@ -2,68 +2,64 @@
 
 #include <algorithm>
 
-#include "disc/codes.h"
-
 namespace deskplayer
 {
 
 namespace
 {
 
-constexpr std::uint64_t EndlessStillDuration = 3 * std::uint64_t{TicksPerSecond};
+constexpr Ticks EndlessStillDuration = std::chrono::seconds(3);
 
 /** Lets time pass, change by change, so that a session in real time shows each when it happens. */
-void Pass(std::uint64_t ticks, Desk& desk, VirtualClock& clock, const SessionHooks& hooks)
+void Pass(Ticks time, Desk& desk, const SessionHooks& hooks)
 {
-    while (ticks > 0) {
-        const std::uint64_t next =
-            std::min(ticks, desk.navigator.TimeToNextChange().value_or(ticks));
+    while (time > Ticks(0)) {
+        const Ticks next = std::min(time, desk.Navigator().TimeToNextChange().value_or(time));
         if (hooks.beforeTimePasses) {
             hooks.beforeTimePasses(next);
         }
         // What is left when playback has ended passes all the same.
-        clock.Advance(desk.navigator.Advance(next));
-        ticks -= next;
+        desk.Clock().Advance(desk.Navigator().Advance(next));
+        time -= next;
     }
 }
 
-void PassWhileAnythingHappens(Desk& desk, VirtualClock& clock, const SessionHooks& hooks)
+void PassWhileAnythingHappens(Desk& desk, const SessionHooks& hooks)
 {
-    while (!desk.navigator.IsRepeating()) {
-        const std::optional<std::uint64_t> next = desk.navigator.TimeToNextChange();
+    while (!desk.Navigator().IsRepeating()) {
+        const std::optional<Ticks> next = desk.Navigator().TimeToNextChange();
         if (!next) {
             return;
         }
         // A change that is due at once needs no time to pass.
-        Pass(std::max<std::uint64_t>(*next, 1), desk, clock, hooks);
+        Pass(std::max(*next, Ticks(1)), desk, hooks);
     }
 }
 
 } // namespace
 
-void PlaySession(const std::vector<ScriptStep>& steps, Desk& desk, VirtualClock& clock,
-                 const SessionHooks& hooks)
+void PlaySession(const std::vector<ScriptStep>& steps, Desk& desk, const SessionHooks& hooks)
 {
     for (const ScriptStep& step : steps) {
-        Pass(step.time - clock.Now(), desk, clock, hooks);
+        Pass(step.time - desk.Clock().Now(), desk, hooks);
         const Outcome outcome = Commands()[step.command].perform(desk, step.values);
         if (!outcome.IsDone() && hooks.onRefused) {
             hooks.onRefused(step.line, outcome.Reason());
         }
     }
-    PassWhileAnythingHappens(desk, clock, hooks);
+    PassWhileAnythingHappens(desk, hooks);
 }
 
-void PlayFromStartToEnd(Desk& desk, VirtualClock& clock, const SessionHooks& hooks)
+void PlayFromStartToEnd(Desk& desk, const SessionHooks& hooks)
 {
-    desk.navigator.Play();
+    desk.Navigator().Play();
     for (;;) {
-        PassWhileAnythingHappens(desk, clock, hooks);
-        if (desk.navigator.CurrentStatus() != SimulatedNavigator::Status::Still) {
+        PassWhileAnythingHappens(desk, hooks);
+        if (desk.Navigator().CurrentStatus() != Status::Still) {
             return;
         }
-        Pass(EndlessStillDuration, desk, clock, hooks);
-        desk.navigator.LeaveStill();
+        Pass(EndlessStillDuration, desk, hooks);
+        desk.Navigator().LeaveStill();
     }
 }
 

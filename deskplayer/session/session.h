@@ -17,10 +17,9 @@ namespace deskplayer
 /** How a session goes about its time, and whom it tells what it cannot do. */
 struct SessionHooks {
     /**
-     * Called before the clock moves on by so many ticks of 45 kHz; a session in real time waits
-     * here. May be empty.
+     * Called before the clock advances by @p time; a session in real time waits here. May be empty.
      */
-    std::function<void(std::uint64_t ticks)> beforeTimePasses;
+    std::function<void(Ticks time)> beforeTimePasses;
 
     /** Called when a command was refused, with its line and the reason. */
     std::function<void(std::size_t line, const std::string& reason)> onRefused;
@@ -32,8 +31,7 @@ struct SessionHooks {
  *
  * @throw what a listener threw
  */
-void PlaySession(const std::vector<ScriptStep>& steps, Desk& desk, VirtualClock& clock,
-                 const SessionHooks& hooks);
+void PlaySession(const std::vector<ScriptStep>& steps, Desk& desk, const SessionHooks& hooks);
 
 /**
  * Plays from start to end, without a viewer: a still that would never end is left after three
@@ -41,7 +39,7 @@ void PlaySession(const std::vector<ScriptStep>& steps, Desk& desk, VirtualClock&
  *
  * @throw what a listener threw
  */
-void PlayFromStartToEnd(Desk& desk, VirtualClock& clock, const SessionHooks& hooks);
+void PlayFromStartToEnd(Desk& desk, const SessionHooks& hooks);
 
 } // namespace deskplayer
 

@@ -14,9 +14,7 @@
 
 #include "bdmvnavigator/navigatorlisteneradapter.h"
 #include "kevro_linux.h"
-#include "navigator/eventdelivery.h"
-#include "navigator/simulatednavigator.h"
-#include "navigator/virtualclock.h"
+#include "navigator/desk.h"
 #include "report.h"
 #include "session/session.h"
 
@@ -60,16 +58,11 @@ void PlaySession(benchmark::State& state, int minutes, int listeners)
     std::uint64_t events = 0;
     for (auto _ : state) {
         std::vector<CountingListener> counting(static_cast<std::size_t>(listeners));
-        deskplayer::VirtualClock clock;
-        deskplayer::ResumeDataKeeper keeper;
-        deskplayer::EventDelivery delivery;
-        deskplayer::SimulatedNavigator navigator(PlayListOf(static_cast<std::uint32_t>(minutes)),
-                                                 clock, delivery);
+        deskplayer::Desk desk(PlayListOf(static_cast<std::uint32_t>(minutes)));
         for (CountingListener& listener : counting) {
-            delivery.Listeners().AddListener(&listener);
+            desk.Listeners().AddListener(&listener);
         }
-        deskplayer::Desk desk{navigator, keeper};
-        deskplayer::PlayFromStartToEnd(desk, clock, {});
+        deskplayer::PlayFromStartToEnd(desk, {});
         events += counting.front().count;
     }
     state.counters[EventsCounter] =

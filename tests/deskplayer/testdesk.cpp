@@ -13,10 +13,17 @@ namespace deskplayer
 namespace
 {
 
-std::string TimeOf(std::uint64_t ticks)
+std::string TimeOf(Ticks time)
 {
-    const std::string seconds = std::to_string(ticks / Second);
-    return ticks % Second == 0 ? seconds : seconds + "+" + std::to_string(ticks % Second);
+    const std::string seconds = std::to_string(time / Second);
+    const Ticks rest = time % Second;
+    return rest == Ticks(0) ? seconds : seconds + "+" + std::to_string(rest.count());
+}
+
+/** As in a file, which counts from ten minutes in the clips of these tests. */
+std::uint32_t TimeInClip(Ticks time)
+{
+    return static_cast<std::uint32_t>((600 * Second + time).count());
 }
 
 } // namespace
@@ -38,11 +45,11 @@ Stream StreamOfSubPath(std::uint8_t codingType, std::uint8_t subPath)
     return stream;
 }
 
-PlayItem ItemOfTicks(std::uint32_t ticks)
+PlayItem ItemOfTicks(Ticks duration)
 {
     PlayItem item;
-    item.inTime = 600 * Second;
-    item.outTime = item.inTime + ticks;
+    item.inTime = TimeInClip(Ticks(0));
+    item.outTime = TimeInClip(duration);
     Stream video = StreamOf(0x1B);
     video.attributes.videoFormat = bd::VideoFormatType1080p;
     video.attributes.frameRate = 6;
@@ -52,7 +59,7 @@ PlayItem ItemOfTicks(std::uint32_t ticks)
 
 PlayItem Item(std::uint32_t seconds)
 {
-    return ItemOfTicks(static_cast<std::uint32_t>(seconds * Second));
+    return ItemOfTicks(std::chrono::seconds(seconds));
 }
 
 PlayItem WithTimedStill(PlayItem item, std::uint16_t seconds)
@@ -97,18 +104,18 @@ PlayItem RichItem(std::uint32_t seconds)
     return item;
 }
 
-Mark Entry(std::uint16_t item, std::uint64_t ticks)
+Mark Entry(std::uint16_t item, Ticks time)
 {
     Mark mark;
     mark.type = MarkTypeEntry;
     mark.playItem = item;
-    mark.time = static_cast<std::uint32_t>(600 * Second + ticks);
+    mark.time = TimeInClip(time);
     return mark;
 }
 
-Mark Link(std::uint16_t item, std::uint64_t ticks)
+Mark Link(std::uint16_t item, Ticks time)
 {
-    Mark mark = Entry(item, ticks);
+    Mark mark = Entry(item, time);
     mark.type = MarkTypeLink;
     return mark;
 }
@@ -121,13 +128,12 @@ PlayList ListOf(std::vector<PlayItem> items, std::vector<Mark> marks)
     return playList;
 }
 
-TestDesk::TestDesk(PlayList playList) : navigator(LayOut(7, std::move(playList)), clock, delivery)
+TestDesk::TestDesk(PlayList playList) : desk(LayOut(7, std::move(playList)))
 {
     m_Listener.onCallback = [this](const std::string& callback) {
         m_Heard += TimeOf(clock.Now()) + " " + callback + "\n";
     };
-    delivery.Listeners().AddListener(&keeper);
-    delivery.Listeners().AddListener(&m_Listener);
+    desk.Listeners().AddListener(&m_Listener);
 }
 
 std::string TestDesk::Take()
@@ -147,11 +153,11 @@ std::string TestDesk::TakeWithoutPositions()
     return others;
 }
 
-void TestDesk::Start(std::uint64_t ticks)
+void TestDesk::Start(Ticks time)
 {
     const Outcome outcome = navigator.Play();
-    if (ticks > 0) {
-        navigator.Advance(ticks);
+    if (time > Ticks(0)) {
+        navigator.Advance(time);
     }
     Do(outcome);
 }
@@ -172,13 +178,15 @@ std::string TestDesk::Snapshot()
     };
     std::ostringstream text;
     PrintTo(navigator.CurrentStatus(), &text);
-    text << " item " << navigator.GetPlayItemId() << " position "
-         << navigator.GetCurrentTimePosition() << " chapter " << navigator.GetCurrentChapter()
-         << " mode " << Describe(navigator.GetPlayMode()) << " current mode "
-         << Describe(navigator.GetCurrentPlayMode()) << " repeat "
-         << navigator.GetCurrentABRepeatState() << " " << navigator.GetCurrentChpTitleRepeatState()
-         << " " << navigator.IsRepeating() << " trigger " << Describe(navigator.GetTrigger())
-         << " at " << navigator.TimeToNextChange().value_or(bd::TimePosition(-1));
+    text << " item " << navigator.Context().GetPlayItemId() << " position "
+         << navigator.Context().GetCurrentTimePosition() << " chapter "
+         << navigator.Context().GetCurrentChapter() << " mode "
+         << Describe(navigator.Context().GetPlayMode()) << " current mode "
+         << Describe(navigator.Context().GetCurrentPlayMode()) << " repeat "
+         << navigator.Context().GetCurrentABRepeatState() << " "
+         << navigator.Context().GetCurrentChpTitleRepeatState() << " " << navigator.IsRepeating()
+         << " trigger " << Describe(navigator.Context().GetTrigger()) << " at "
+         << navigator.TimeToNextChange().value_or(Ticks::max()).count();
     for (const Kind& kind : {Kind{"video", &PlaybackContext::GetVideoInfo},
                              Kind{"audio", &PlaybackContext::GetAudioInfo},
                              Kind{"subtitle", &PlaybackContext::GetPgTextStInfo},
@@ -187,23 +195,24 @@ std::string TestDesk::Snapshot()
                              Kind{"pip subtitle", &PlaybackContext::GetPipPgTextStInfo}}) {
         bd::StreamNumberDef number = 0;
         bd::UInt8 count = 0;
-        (navigator.*kind.get)(&number, &count);
+        (navigator.Context().*kind.get)(&number, &count);
         text << " " << kind.name << " " << number << "/" << +count;
     }
     bd::StreamNumberDef number = 0;
     bd::AngleNumberDef angle = 0;
     bd::UInt8 count = 0;
     bool async = false;
-    navigator.GetSecondaryVideoInfo(&number, &count, &async);
+    navigator.Context().GetSecondaryVideoInfo(&number, &count, &async);
     text << " secondary video " << number << "/" << +count << " " << async;
-    navigator.GetAngleInfo(&angle, &count);
+    navigator.Context().GetAngleInfo(&angle, &count);
     text << " angle " << +angle << "/" << +count;
     bd::ZOOM_PARAM_Def zoom;
-    navigator.GetZoomScaleInfo(zoom);
-    text << " style " << +navigator.GetCurrentTextSubtitleStyleNumber() << " shown "
-         << navigator.GetPgTextStDisplay() << navigator.GetSecondaryVideoDisplay()
-         << navigator.GetSecondaryAudioDisplay() << navigator.GetPipPgTextStSelect() << " zoom "
-         << Describe(zoom);
+    navigator.Context().GetZoomScaleInfo(zoom);
+    text << " style " << +navigator.Context().GetCurrentTextSubtitleStyleNumber() << " shown "
+         << navigator.Context().GetPgTextStDisplay()
+         << navigator.Context().GetSecondaryVideoDisplay()
+         << navigator.Context().GetSecondaryAudioDisplay()
+         << navigator.Context().GetPipPgTextStSelect() << " zoom " << Describe(zoom);
     return text.str();
 }
 
@@ -212,7 +221,7 @@ void PrintTo(const Outcome& outcome, std::ostream* stream)
     *stream << (outcome.IsDone() ? "done" : "refused: " + outcome.Reason());
 }
 
-void PrintTo(SimulatedNavigator::Status status, std::ostream* stream)
+void PrintTo(Status status, std::ostream* stream)
 {
     static const char* const names[] = {"stopped",   "playing", "paused",  "still",
                                         "suspended", "standby", "finished"};

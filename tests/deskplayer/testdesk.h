@@ -17,7 +17,7 @@
 namespace deskplayer
 {
 
-constexpr std::uint64_t Second = 45000;
+constexpr Ticks Second = std::chrono::seconds(1);
 
 /** Coding types of streams. */
 constexpr std::uint8_t CodingLpcm = 0x80;
@@ -33,8 +33,8 @@ Stream StreamOf(std::uint8_t codingType, std::uint16_t pid = 0);
 /** A stream that a sub path brings. */
 Stream StreamOfSubPath(std::uint8_t codingType, std::uint8_t subPath);
 
-/** A play item of so many ticks that has one video, of 50 Hz. Its clip starts at ten minutes. */
-PlayItem ItemOfTicks(std::uint32_t ticks);
+/** A play item of this duration that has one video, of 50 Hz. Its clip starts at ten minutes. */
+PlayItem ItemOfTicks(Ticks duration);
 
 /** The same in seconds. */
 PlayItem Item(std::uint32_t seconds);
@@ -53,11 +53,11 @@ std::uint64_t MaskOf(const std::vector<bd::UserOperationMaskDef>& operations);
  */
 PlayItem RichItem(std::uint32_t seconds);
 
-/** A mark of type entry, @p ticks behind the start of the play item. */
-Mark Entry(std::uint16_t item, std::uint64_t ticks);
+/** A mark of type entry, at @p time after the start of the play item. */
+Mark Entry(std::uint16_t item, Ticks time);
 
 /** A mark of type link. */
-Mark Link(std::uint16_t item, std::uint64_t ticks);
+Mark Link(std::uint16_t item, Ticks time);
 
 PlayList ListOf(std::vector<PlayItem> items, std::vector<Mark> marks = {});
 
@@ -80,7 +80,7 @@ public:
     std::string TakeWithoutPositions();
 
     /** Plays from the start, lets so much time pass, and forgets what was heard. */
-    void Start(std::uint64_t ticks = 0);
+    void Start(Ticks time = Ticks(0));
 
     /** Takes an operation to have been carried out, and forgets what was heard of it. */
     void Do(const Outcome& outcome);
@@ -88,11 +88,9 @@ public:
     /** All answers of the navigator that an operation can change, as a text. */
     std::string Snapshot();
 
-    VirtualClock clock;
-    ResumeDataKeeper keeper;
-    EventDelivery delivery;
-    SimulatedNavigator navigator;
-    Desk desk{navigator, keeper};
+    Desk desk;
+    SimulatedNavigator& navigator = desk.Navigator();
+    const VirtualClock& clock = desk.Clock();
 
 private:
     bdmvtest::Journal m_Journal;
@@ -102,7 +100,7 @@ private:
 
 /** Shows outcomes and statuses in the messages of tests. */
 void PrintTo(const Outcome& outcome, std::ostream* stream);
-void PrintTo(SimulatedNavigator::Status status, std::ostream* stream);
+void PrintTo(Status status, std::ostream* stream);
 
 } // namespace deskplayer
 

@@ -36,7 +36,7 @@ void ExpectSteps(const std::vector<ScriptStep>& steps)
         fuzz::Expect(step.time >= before.time && step.time <= LongestSession);
         fuzz::Expect(step.values.size() == ValueCounts.at(step.command));
         for (const std::uint64_t value : step.values) {
-            fuzz::Expect(value <= LongestSession);
+            fuzz::Expect(value <= LongestSession.count());
         }
         before = step;
     }

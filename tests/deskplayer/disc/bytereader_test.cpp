@@ -211,12 +211,6 @@ TEST(FormatError, TellsFileOffsetWhatWasFoundAndWhatWasExpected)
     EXPECT_STREQ(error.what(), "BDMV/index.bdmv: offset 12: length 3, but expected 2");
 }
 
-TEST(Printable, EscapesEverythingThatCouldDisturbALine)
-{
-    EXPECT_EQ(Printable(std::string("a~ \0\n\x1B\x7F\xE9\\", 9)),
-              "a~ \\x00\\x0A\\x1B\\x7F\\xE9\\x5C");
-}
-
 TEST(Bit, CountsFromTheMostSignificantOne)
 {
     EXPECT_TRUE(Bit(std::uint8_t{0x80}, 0));

@@ -216,7 +216,7 @@ TEST(ClipDuration, IsTheSumOverAllStcSequencesInSixtyFourBits)
     const ClipInfo clipInfo = WithSequences(
         Join({U8(2), U32(0), U8(2), U8(0), StcBytes(0, 0, 0, 0xFFFFFFFF), StcBytes(0, 0, 5, 7),
               U32(0), U8(1), U8(2), StcBytes(0, 0, 0, 0xFFFFFFFF)}));
-    EXPECT_EQ(Duration(clipInfo), 2u * 0xFFFFFFFFull + 2u);
+    EXPECT_EQ(Duration(clipInfo), Ticks(2u * 0xFFFFFFFFull + 2u));
 }
 
 TEST(AspectRatiosOf, AreThoseOfTheVideoStreamsOfAllProgramsByPid)

@@ -19,6 +19,11 @@ template <typename Value> json OrNull(const std::optional<Value>& value)
     return value ? json(*value) : json(nullptr);
 }
 
+json OrNull(const std::optional<Ticks>& time)
+{
+    return time ? json(time->count()) : json(nullptr);
+}
+
 json HexDigits(std::uint64_t mask)
 {
     char digits[17];
@@ -239,7 +244,7 @@ json ToJson(const ClipInfo& clipInfo)
             {"ts_recording_rate", clipInfo.greatestDataRate},
             {"source_packets", clipInfo.packets},
             {"atc", atcSequences},
-            {"duration", Duration(clipInfo)},
+            {"duration", Duration(clipInfo).count()},
             {"programs", programs}};
 }
 
@@ -250,7 +255,7 @@ json ToJson(const PlayList& playList, const AspectRatioLookup& aspectRatio)
     for (std::size_t number = 0; number < playList.playItems.size(); ++number) {
         json item = ToJson(playList.playItems[number]);
         item["streams"] = ToJson(playList.playItems[number].streams, number, aspectRatio);
-        item["start"] = timeLine.itemStarts[number];
+        item["start"] = timeLine.itemStarts[number].count();
         items.push_back(item);
     }
     json subPaths = json::array();
@@ -284,7 +289,7 @@ json ToJson(const PlayList& playList, const AspectRatioLookup& aspectRatio)
             {"mvc_base_view_r", int(info.baseViewIsRightEye)},
             {"items", items},
             {"sub_paths", subPaths},
-            {"duration", timeLine.duration},
+            {"duration", timeLine.duration.count()},
             {"marks", marks},
             {"extension", extension}};
 }

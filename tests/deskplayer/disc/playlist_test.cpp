@@ -4,6 +4,7 @@
 #include "disc/errors.h"
 #include "disc/playlist.h"
 #include "expectederror.h"
+#include "text/printable.h"
 
 namespace deskplayer
 {

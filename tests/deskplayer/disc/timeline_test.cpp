@@ -26,7 +26,7 @@ protected:
         m_PlayList.marks.push_back({type, playItem, time, MarkForAllStreams, 0});
     }
 
-    std::optional<std::uint64_t> PositionOfMark(std::uint16_t playItem, std::uint32_t time)
+    std::optional<Ticks> PositionOfMark(std::uint16_t playItem, std::uint32_t time)
     {
         m_PlayList.marks.clear();
         AddMark(MarkTypeLink, playItem, time);
@@ -39,14 +39,14 @@ protected:
 TEST_F(TimeLineTest, PutsItemsBehindEachOther)
 {
     const TimeLine timeLine = BuildTimeLine(m_PlayList);
-    EXPECT_EQ(timeLine.itemStarts, (std::vector<std::uint64_t>{0, 100}));
-    EXPECT_EQ(timeLine.duration, 150u);
+    EXPECT_EQ(timeLine.itemStarts, (std::vector<Ticks>{Ticks(0), Ticks(100)}));
+    EXPECT_EQ(timeLine.duration, Ticks(150u));
 }
 
 TEST_F(TimeLineTest, IsEmptyWithoutItems)
 {
     const TimeLine timeLine = BuildTimeLine(PlayList());
-    EXPECT_EQ(timeLine.duration, 0u);
+    EXPECT_EQ(timeLine.duration, Ticks(0u));
     EXPECT_TRUE(timeLine.itemStarts.empty());
 }
 
@@ -57,8 +57,8 @@ TEST_F(TimeLineTest, HasDurationsThatDoNotFitInThirtyTwoBits)
         item.outTime = 0xFFFFFFFF;
     }
     const TimeLine timeLine = BuildTimeLine(m_PlayList);
-    EXPECT_EQ(timeLine.duration, 65535u * 0xFFFFFFFFull);
-    EXPECT_EQ(timeLine.itemStarts.back(), 65534u * 0xFFFFFFFFull);
+    EXPECT_EQ(timeLine.duration, Ticks(65535u * 0xFFFFFFFFull));
+    EXPECT_EQ(timeLine.itemStarts.back(), Ticks(65534u * 0xFFFFFFFFull));
 }
 
 TEST_F(TimeLineTest, PutsAMarkWhereItsClipTimePlays)
@@ -90,12 +90,12 @@ TEST_F(TimeLineTest, MakesChaptersOfMarksOfTypeEntryOnly)
     ASSERT_EQ(timeLine.chapters.size(), 2u);
     EXPECT_EQ(timeLine.chapters[0].number, 1u);
     EXPECT_EQ(timeLine.chapters[0].mark, 0u);
-    EXPECT_EQ(timeLine.chapters[0].start, 0u);
-    EXPECT_EQ(timeLine.chapters[0].end, 110u);
+    EXPECT_EQ(timeLine.chapters[0].start, Ticks(0u));
+    EXPECT_EQ(timeLine.chapters[0].end, Ticks(110u));
     EXPECT_EQ(timeLine.chapters[1].number, 2u);
     EXPECT_EQ(timeLine.chapters[1].mark, 2u);
-    EXPECT_EQ(timeLine.chapters[1].start, 110u);
-    EXPECT_EQ(timeLine.chapters[1].end, 150u);
+    EXPECT_EQ(timeLine.chapters[1].start, Ticks(110u));
+    EXPECT_EQ(timeLine.chapters[1].end, Ticks(150u));
 }
 
 TEST_F(TimeLineTest, KeepsTheNumberOfAChapterBehindAMarkWithoutPosition)
@@ -105,7 +105,7 @@ TEST_F(TimeLineTest, KeepsTheNumberOfAChapterBehindAMarkWithoutPosition)
     AddMark(MarkTypeEntry, 1, 5000);
     const TimeLine timeLine = BuildTimeLine(m_PlayList);
     ASSERT_EQ(timeLine.chapters.size(), 2u);
-    EXPECT_EQ(timeLine.chapters[0].end, 100u);
+    EXPECT_EQ(timeLine.chapters[0].end, Ticks(100u));
     EXPECT_EQ(timeLine.chapters[1].number, 3u);
 }
 
@@ -115,9 +115,9 @@ TEST_F(TimeLineTest, MakesAChapterEmptyIfTheNextMarkLiesBeforeIt)
     AddMark(MarkTypeEntry, 0, 1000);
     const TimeLine timeLine = BuildTimeLine(m_PlayList);
     ASSERT_EQ(timeLine.chapters.size(), 2u);
-    EXPECT_EQ(timeLine.chapters[0].start, 100u);
-    EXPECT_EQ(timeLine.chapters[0].end, 100u);
-    EXPECT_EQ(timeLine.chapters[1].end, 150u);
+    EXPECT_EQ(timeLine.chapters[0].start, Ticks(100u));
+    EXPECT_EQ(timeLine.chapters[0].end, Ticks(100u));
+    EXPECT_EQ(timeLine.chapters[1].end, Ticks(150u));
 }
 
 } // namespace

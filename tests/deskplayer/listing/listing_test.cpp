@@ -15,8 +15,8 @@
 #include "../disc/testdiscs.h"
 #include "disc/codes.h"
 #include "discardingbuffer.h"
-#include "output/timetext.h"
 #include "scratchdisc.h"
+#include "text/timetext.h"
 
 namespace deskplayer
 {
@@ -243,7 +243,7 @@ std::string ExpectedRows(const std::string& number, const json& playList)
         }
     }
     std::ostringstream rows;
-    rows << number << "   " << TimeText(playList.at("duration"));
+    rows << number << "   " << TimeText(Ticks(playList.at("duration").get<Ticks::rep>()));
     rows.width(7);
     rows << playList.at("items").size();
     rows.width(10);

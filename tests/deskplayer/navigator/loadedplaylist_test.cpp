@@ -20,13 +20,13 @@ Disc SampleDisc()
 TEST(LoadedPlayList, HasMarksAndChaptersInOrderOfTheirPositions)
 {
     const LoadedPlayList loaded =
-        LayOut(5, ListOf({Item(10)}, {Entry(0, 700), Link(0, 300), Entry(3, 0), Entry(0, 300),
-                                      Link(0, 1000 * Second)}));
+        LayOut(5, ListOf({Item(10)}, {Entry(0, Ticks(700)), Link(0, Ticks(300)), Entry(3, Ticks(0)),
+                                      Entry(0, Ticks(300)), Link(0, 1000 * Second)}));
 
     EXPECT_EQ(loaded.number, 5);
     EXPECT_EQ(loaded.timeLine.duration, 10 * Second);
-    typedef std::vector<std::pair<std::uint64_t, std::size_t>> Marks;
-    EXPECT_EQ(loaded.marksByPosition, (Marks{{300, 1}, {300, 3}, {700, 0}}));
+    typedef std::vector<std::pair<Ticks, std::size_t>> Marks;
+    EXPECT_EQ(loaded.marksByPosition, (Marks{{Ticks(300), 1}, {Ticks(300), 3}, {Ticks(700), 0}}));
     ASSERT_EQ(loaded.chaptersByStart.size(), 2);
     EXPECT_EQ(loaded.chaptersByStart[0].number, 3);
     EXPECT_EQ(loaded.chaptersByStart[1].number, 1);
@@ -54,27 +54,27 @@ TEST(LoadedPlayList, NeedsNoClips)
     EXPECT_EQ(loaded.aspectRatios, std::vector<std::optional<std::uint8_t>>(2, std::nullopt));
 }
 
-/** A play list of the longest duration, and so many ticks more. */
-PlayList LongestAnd(std::uint32_t ticks)
+/** A play list of the longest duration and @p more. */
+PlayList LongestAnd(Ticks more)
 {
     std::vector<PlayItem> items(10, Item(10 * 3600));
-    items.push_back(ItemOfTicks(ticks));
+    items.push_back(ItemOfTicks(more));
     return ListOf(items);
 }
 
 TEST(LoadedPlayList, LastsAHundredHoursAtMost)
 {
-    const LoadedPlayList longest = LoadPlayList(SampleDisc(), 1, LongestAnd(0));
+    const LoadedPlayList longest = LoadPlayList(SampleDisc(), 1, LongestAnd(Ticks(0)));
     EXPECT_EQ(longest.timeLine.duration, LongestDuration);
 
     try {
-        LoadPlayList(SampleDisc(), 1, LongestAnd(45));
+        LoadPlayList(SampleDisc(), 1, LongestAnd(Ticks(45)));
         ADD_FAILURE() << "played";
     } catch (const FileError& error) {
         EXPECT_STREQ(error.what(),
                      "play list 1: lasts 100:00:00.001, expected at most 100:00:00.000");
     }
-    EXPECT_THROW(LoadPlayList(SampleDisc(), 1, LongestAnd(1)), FileError);
+    EXPECT_THROW(LoadPlayList(SampleDisc(), 1, LongestAnd(Ticks(1))), FileError);
 }
 
 TEST(AudioInfo, HasTheFormatOfEveryCodingType)

@@ -12,8 +12,8 @@ namespace
 /** A rich item with chapters at 0, 3 and 6 seconds, and one without a menu behind it. */
 PlayList ThreeChapters()
 {
-    return ListOf({RichItem(10), Item(10)},
-                  {Entry(0, 0), Link(0, Second), Entry(0, 3 * Second), Entry(0, 6 * Second)});
+    return ListOf({RichItem(10), Item(10)}, {Entry(0, Ticks(0)), Link(0, Second),
+                                             Entry(0, 3 * Second), Entry(0, 6 * Second)});
 }
 
 /** The callbacks of a button that plays the chapter at @p position from @p mark. */
@@ -160,7 +160,7 @@ TEST(Menu, SelectsAButtonByItsNumber)
     EXPECT_EQ(desk.Take(), "");
 
     desk.Do(desk.navigator.ActivateButton());
-    EXPECT_EQ(desk.navigator.GetCurrentTimePosition(), 6 * Second);
+    EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), 6 * Second);
 }
 
 TEST(Menu, SelectsAButtonAndActivatesIt)
@@ -191,10 +191,10 @@ TEST(Menu, GivesEveryActivationATicketOfItsOwn)
 
 TEST(Menu, HandsOutAProgramThatClosesTheMenuAndPlaysTheMarkOfTheChapter)
 {
-    TestDesk desk(
-        ListOf({RichItem(10)}, {Entry(0, 0), Link(0, 1), Link(0, 2), Entry(0, 3 * Second)}));
+    TestDesk desk(ListOf({RichItem(10)}, {Entry(0, Ticks(0)), Link(0, Ticks(1)), Link(0, Ticks(2)),
+                                          Entry(0, 3 * Second)}));
     ProgramKeeper keeper;
-    desk.delivery.Listeners().AddListener(&keeper);
+    desk.desk.Listeners().AddListener(&keeper);
     desk.Start();
     desk.Do(desk.navigator.OpenPopUpMenu());
     desk.Do(desk.navigator.SelectAndActivateButton(2));
@@ -215,7 +215,7 @@ TEST(Menu, HandsOutAProgramThatClosesTheMenuAndPlaysTheMarkOfTheChapter)
     EXPECT_EQ(playList, 7);
     EXPECT_TRUE(isImmediate2);
     EXPECT_EQ(mark, 3);
-    desk.delivery.Listeners().RemoveListener(&keeper);
+    desk.desk.Listeners().RemoveListener(&keeper);
 }
 
 TEST(Menu, SelectsTheFirstButtonBeforeTheFirstChapter)
@@ -226,21 +226,22 @@ TEST(Menu, SelectsTheFirstButtonBeforeTheFirstChapter)
 
     desk.Do(desk.navigator.ActivateButton());
 
-    EXPECT_EQ(desk.navigator.GetCurrentTimePosition(), 3 * Second);
+    EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), 3 * Second);
 }
 
 TEST(Menu, CountsItsButtonsWithoutGapsWhereChapterNumbersHaveThem)
 {
     // The first mark has no position, so that the chapters are number 2 and 3.
-    TestDesk desk(ListOf({RichItem(10)}, {Entry(9, 0), Entry(0, 0), Entry(0, 6 * Second)}));
+    TestDesk desk(
+        ListOf({RichItem(10)}, {Entry(9, Ticks(0)), Entry(0, Ticks(0)), Entry(0, 6 * Second)}));
     desk.Start();
     desk.Do(desk.navigator.SearchTime(7 * Second));
-    EXPECT_EQ(desk.navigator.GetCurrentChapter(), 3);
+    EXPECT_EQ(desk.navigator.Context().GetCurrentChapter(), 3);
     desk.Do(desk.navigator.OpenPopUpMenu());
 
     desk.Do(desk.navigator.ActivateButton());
 
-    EXPECT_EQ(desk.navigator.GetCurrentTimePosition(), 6 * Second);
+    EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), 6 * Second);
 }
 
 TEST(Menu, HasNoButtonsWhereThereAreNoChapters)

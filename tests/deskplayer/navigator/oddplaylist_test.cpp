@@ -13,15 +13,14 @@ namespace deskplayer
 namespace
 {
 
-typedef SimulatedNavigator::Status Status;
-
 TEST(OddPlayList, PassesItemsWithoutLength)
 {
-    TestDesk desk(ListOf({Item(0), Item(0), ItemOfTicks(100), Item(0)}, {Entry(1, 0)}));
+    TestDesk desk(
+        ListOf({Item(0), Item(0), ItemOfTicks(Ticks(100)), Item(0)}, {Entry(1, Ticks(0))}));
     desk.Start();
 
-    EXPECT_EQ(desk.navigator.TimeToNextChange(), 0);
-    EXPECT_EQ(desk.navigator.Advance(Second), Second - 100);
+    EXPECT_EQ(desk.navigator.TimeToNextChange(), Ticks(0));
+    EXPECT_EQ(desk.navigator.Advance(Second), Second - Ticks(100));
 
     EXPECT_EQ(desk.TakeWithoutPositions(), "0 PlayItem(7, 1, 6, 15)\n"
                                            "0 MarkInfo(7, 0, 0)\n"
@@ -69,7 +68,7 @@ TEST(OddPlayList, TreatsAnUnknownStillModeAsAnEndlessStill)
 
 TEST(OddPlayList, PlaysThroughMarksThatAreNotInOrder)
 {
-    TestDesk desk(ListOf({Item(3)}, {Entry(0, 2 * Second), Entry(0, Second), Entry(0, 0)}));
+    TestDesk desk(ListOf({Item(3)}, {Entry(0, 2 * Second), Entry(0, Second), Entry(0, Ticks(0))}));
     desk.Start();
 
     desk.navigator.Advance(5 * Second);
@@ -83,7 +82,8 @@ TEST(OddPlayList, PlaysThroughMarksThatAreNotInOrder)
 
 TEST(OddPlayList, LeavesOutMarksThatAreNowhere)
 {
-    TestDesk desk(ListOf({Item(1)}, {Entry(5, 0), Link(0, 2 * Second), Entry(0, 10)}));
+    TestDesk desk(
+        ListOf({Item(1)}, {Entry(5, Ticks(0)), Link(0, 2 * Second), Entry(0, Ticks(10))}));
     desk.Start();
 
     desk.navigator.Advance(Second);
@@ -95,8 +95,8 @@ TEST(OddPlayList, LeavesOutMarksThatAreNowhere)
 
 TEST(OddPlayList, TellsTheMarksWhereAnItemEndsAndTheNextStartsEachInItsItem)
 {
-    TestDesk desk(
-        ListOf({WithTimedStill(Item(1), 5), Item(1)}, {Entry(1, 0), Link(0, Second), Link(1, 0)}));
+    TestDesk desk(ListOf({WithTimedStill(Item(1), 5), Item(1)},
+                         {Entry(1, Ticks(0)), Link(0, Second), Link(1, Ticks(0))}));
     desk.Start();
 
     desk.navigator.Advance(6 * Second);
@@ -112,16 +112,16 @@ TEST(OddPlayList, TellsTheMarksWhereAnItemEndsAndTheNextStartsEachInItsItem)
 
 TEST(OddPlayList, TellsAChapterAtTheEndOfAnItemWithItsMark)
 {
-    TestDesk desk(ListOf({Item(1), Item(1)}, {Entry(0, 0), Entry(0, Second)}));
+    TestDesk desk(ListOf({Item(1), Item(1)}, {Entry(0, Ticks(0)), Entry(0, Second)}));
     desk.Start();
 
-    desk.navigator.Advance(Second + 1);
+    desk.navigator.Advance(Second + Ticks(1));
     EXPECT_EQ(desk.TakeWithoutPositions(), "1 MarkInfo(7, 1, 45000)\n"
                                            "1 ChapterNumber(2)\n"
                                            "1 PlayItem(7, 1, 6, 15)\n");
 
     desk.navigator.SetPlayMode(bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedNormal));
-    desk.navigator.Advance(2);
+    desk.navigator.Advance(Ticks(2));
     EXPECT_EQ(desk.TakeWithoutPositions(), "1+1 PlayMode(1, 5)\n"
                                            "1+2 MarkInfo(7, 1, 45000)\n"
                                            "1+3 PlayItem(7, 0, 6, 15)\n"
@@ -136,7 +136,7 @@ TEST(OddPlayList, TellsAChapterAtTheEndOfAnItemWithItsMark)
 
 TEST(OddPlayList, TellsAChapterAtTheEndOfThePlayListOnceWithItsMark)
 {
-    TestDesk desk(ListOf({Item(2)}, {Entry(0, 0), Entry(0, 2 * Second)}));
+    TestDesk desk(ListOf({Item(2)}, {Entry(0, Ticks(0)), Entry(0, 2 * Second)}));
     desk.Start();
 
     desk.navigator.Advance(2 * Second);
@@ -182,7 +182,8 @@ PlayList DrawPlayList(std::mt19937& lot)
         playList.playItems.back().outTime += draw(3);
     }
     for (std::uint32_t mark = draw(8); mark-- > 0;) {
-        playList.marks.push_back(Entry(static_cast<std::uint16_t>(draw(6)), draw(3 * Second)));
+        playList.marks.push_back(
+            Entry(static_cast<std::uint16_t>(draw(6)), Ticks(draw(3 * TicksPerSecond))));
         playList.marks.back().time -= draw(2);
         playList.marks.back().type = static_cast<std::uint8_t>(draw(3));
     }
@@ -211,25 +212,25 @@ TEST(OddPlayList, StaysInOrderUnderAnyOperations)
         desk.navigator.Play();
         for (int operation = 0; operation < 60; ++operation) {
             PerformAny(desk, lot);
-            const std::uint64_t before = desk.clock.Now();
-            const std::uint64_t passes = lot() % (2 * Second);
+            const Ticks before = desk.clock.Now();
+            const Ticks passes(lot() % (2 * Second).count());
 
-            const std::uint64_t left = desk.navigator.Advance(passes);
+            const Ticks left = desk.navigator.Advance(passes);
 
             EXPECT_EQ(desk.clock.Now(), before + passes - left);
             const Status status = desk.navigator.CurrentStatus();
-            if (left != 0) {
+            if (left != Ticks(0)) {
                 EXPECT_TRUE(status == Status::Stopped || status == Status::Finished);
             }
-            const std::uint64_t position = desk.navigator.GetCurrentTimePosition();
+            const Ticks position(desk.navigator.Context().GetCurrentTimePosition());
             EXPECT_LE(position, loaded.timeLine.duration);
-            const std::size_t item = desk.navigator.GetPlayItemId();
+            const std::size_t item = desk.navigator.Context().GetPlayItemId();
             if (!playList.playItems.empty()) {
                 ASSERT_LT(item, playList.playItems.size());
-                const std::uint64_t start = loaded.timeLine.itemStarts[item];
+                const Ticks start = loaded.timeLine.itemStarts[item];
                 const PlayItem& current = playList.playItems[item];
                 EXPECT_GE(position, start);
-                EXPECT_LE(position, start + current.outTime - current.inTime);
+                EXPECT_LE(position, start + Ticks(current.outTime - current.inTime));
             }
         }
     }

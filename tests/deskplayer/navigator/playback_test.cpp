@@ -8,11 +8,9 @@ namespace deskplayer
 namespace
 {
 
-typedef SimulatedNavigator::Status Status;
-
 TEST(Playback, TellsEverythingAboutTheFirstItemWhenItStarts)
 {
-    TestDesk desk(ListOf({RichItem(10)}, {Entry(0, 0)}));
+    TestDesk desk(ListOf({RichItem(10)}, {Entry(0, Ticks(0))}));
 
     EXPECT_TRUE(desk.navigator.Play().IsDone());
 
@@ -108,7 +106,8 @@ TEST(Playback, TellsThePositionAtEveryFullSecondOfIt)
 
 TEST(Playback, TellsMarksAndChaptersWhereTheyLie)
 {
-    TestDesk desk(ListOf({Item(2), Item(2)}, {Entry(0, 0), Link(0, 100), Entry(1, 100)}));
+    TestDesk desk(ListOf({Item(2), Item(2)},
+                         {Entry(0, Ticks(0)), Link(0, Ticks(100)), Entry(1, Ticks(100))}));
     desk.Start();
 
     desk.navigator.Advance(3 * Second);
@@ -121,7 +120,8 @@ TEST(Playback, TellsMarksAndChaptersWhereTheyLie)
 
 TEST(Playback, TellsEveryMarkOfOnePositionInTheOrderOfThePlayList)
 {
-    TestDesk desk(ListOf({Item(2)}, {Link(0, 100), Entry(0, 100), Link(0, 100)}));
+    TestDesk desk(
+        ListOf({Item(2)}, {Link(0, Ticks(100)), Entry(0, Ticks(100)), Link(0, Ticks(100))}));
     desk.Start();
 
     desk.navigator.Advance(Second / 2);
@@ -134,7 +134,7 @@ TEST(Playback, TellsEveryMarkOfOnePositionInTheOrderOfThePlayList)
 
 TEST(Playback, TellsTheMarkAtTheStartOfAnItemWithThatItem)
 {
-    TestDesk desk(ListOf({Item(1), Item(1)}, {Entry(1, 0)}));
+    TestDesk desk(ListOf({Item(1), Item(1)}, {Entry(1, Ticks(0))}));
     desk.Start();
 
     desk.navigator.Advance(Second);
@@ -146,7 +146,7 @@ TEST(Playback, TellsTheMarkAtTheStartOfAnItemWithThatItem)
 
 TEST(Playback, StartsFromTheBeginningAfterAStopAndTellsEverythingAgain)
 {
-    TestDesk desk(ListOf({Item(10)}, {Entry(0, 0)}));
+    TestDesk desk(ListOf({Item(10)}, {Entry(0, Ticks(0))}));
     desk.navigator.Play();
     const std::string firstStart = desk.Take();
     desk.navigator.Advance(4 * Second);
@@ -160,7 +160,7 @@ TEST(Playback, StartsFromTheBeginningAfterAStopAndTellsEverythingAgain)
     EXPECT_EQ(desk.navigator.TimeToNextChange(), std::nullopt);
 
     desk.navigator.Play();
-    EXPECT_EQ(desk.navigator.GetCurrentTimePosition(), 0);
+    EXPECT_EQ(desk.navigator.Context().GetCurrentTimePosition(), 0);
     std::string secondStart = firstStart;
     for (std::size_t at = 0; at < secondStart.size(); at = secondStart.find('\n', at) + 1) {
         secondStart[at] = '4';
@@ -170,7 +170,7 @@ TEST(Playback, StartsFromTheBeginningAfterAStopAndTellsEverythingAgain)
 
 TEST(Playback, StartsAtNormalSpeedAndWithoutRepeatButWithTheStreamsThatWereChosen)
 {
-    TestDesk desk(ListOf({RichItem(10)}, {Entry(0, 0)}));
+    TestDesk desk(ListOf({RichItem(10)}, {Entry(0, Ticks(0))}));
     desk.Start();
     desk.Do(desk.navigator.SelectAudio(2));
     desk.Do(desk.navigator.RepeatTitle());
@@ -180,15 +180,15 @@ TEST(Playback, StartsAtNormalSpeedAndWithoutRepeatButWithTheStreamsThatWereChose
 
     desk.Start();
 
-    EXPECT_EQ(desk.navigator.GetCurrentPlayMode(), bd::PlayMode());
-    EXPECT_EQ(desk.navigator.GetPlayMode(), bd::PlayMode());
+    EXPECT_EQ(desk.navigator.Context().GetCurrentPlayMode(), bd::PlayMode());
+    EXPECT_EQ(desk.navigator.Context().GetPlayMode(), bd::PlayMode());
     EXPECT_FALSE(desk.navigator.IsRepeating());
     bd::ZOOM_PARAM_Def zoom = {{1, 1, 1, 1}, {1, 1, 1, 1}, 1};
-    desk.navigator.GetZoomScaleInfo(zoom);
+    desk.navigator.Context().GetZoomScaleInfo(zoom);
     EXPECT_EQ(zoom.rClipRectangle.Width, 0);
     bd::StreamNumberDef audio = 0;
     bd::UInt8 count = 0;
-    desk.navigator.GetAudioInfo(&audio, &count);
+    desk.navigator.Context().GetAudioInfo(&audio, &count);
     EXPECT_EQ(audio, 2);
 }
 
@@ -225,10 +225,10 @@ TEST(Playback, StandsStillWhilePaused)
 
     EXPECT_TRUE(desk.navigator.Pause().IsDone());
     EXPECT_EQ(desk.navigator.TimeToNextChange(), std::nullopt);
-    EXPECT_EQ(desk.navigator.Advance(100 * Second), 0);
+    EXPECT_EQ(desk.navigator.Advance(100 * Second), Ticks(0));
     EXPECT_TRUE(desk.navigator.Continue().IsDone());
 
-    EXPECT_EQ(desk.navigator.GetCurrentTimePosition(), 4 * Second);
+    EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), 4 * Second);
     EXPECT_EQ(desk.Take(), "4 Paused()\n"
                            "104 Continued(0, 5)\n");
 }
@@ -265,17 +265,18 @@ TEST(Playback, StepsAsLongAsAPictureIsShown)
 
         desk.Do(desk.navigator.Step());
 
-        EXPECT_EQ(desk.navigator.GetCurrentTimePosition(), rate.ticks);
+        EXPECT_EQ(desk.navigator.Context().GetCurrentTimePosition(), rate.ticks);
     }
 }
 
 TEST(Playback, TellsAllThatAStepPasses)
 {
-    TestDesk desk(ListOf({Item(10)}, {Entry(0, 0), Entry(0, Second - 500), Link(0, Second - 300),
-                                      Entry(0, Second + 400)}));
-    desk.Start(Second - 500);
-    desk.Do(desk.navigator.SearchTime(Second - 501));
-    desk.Do(desk.navigator.SetTrigger(Second + 100));
+    TestDesk desk(
+        ListOf({Item(10)}, {Entry(0, Ticks(0)), Entry(0, Second - Ticks(500)),
+                            Link(0, Second - Ticks(300)), Entry(0, Second + Ticks(400))}));
+    desk.Start(Second - Ticks(500));
+    desk.Do(desk.navigator.SearchTime(Second - Ticks(501)));
+    desk.Do(desk.navigator.SetTrigger(Second + Ticks(100)));
     desk.Do(desk.navigator.Pause());
 
     EXPECT_TRUE(desk.navigator.Step().IsDone());
@@ -300,7 +301,7 @@ TEST(Playback, TellsAllThatAStepPasses)
 
 TEST(Playback, TellsWhatLiesWhereAStepEnds)
 {
-    TestDesk desk(ListOf({Item(10)}, {Entry(0, 0), Entry(0, 900)}));
+    TestDesk desk(ListOf({Item(10)}, {Entry(0, Ticks(0)), Entry(0, Ticks(900))}));
     desk.Start();
     desk.Do(desk.navigator.Pause());
 
@@ -314,11 +315,11 @@ TEST(Playback, TellsWhatLiesWhereAStepEnds)
 TEST(Playback, StepsFromTheEndOfARepeatToItsStart)
 {
     TestDesk desk(ListOf({Item(10)}));
-    desk.Start(Second + 1);
+    desk.Start(Second + Ticks(1));
     desk.Do(desk.navigator.SetPointA());
-    desk.navigator.Advance(1000);
+    desk.navigator.Advance(Ticks(1000));
     desk.Do(desk.navigator.SetPointB());
-    desk.navigator.Advance(500);
+    desk.navigator.Advance(Ticks(500));
     desk.Do(desk.navigator.Pause());
 
     EXPECT_TRUE(desk.navigator.Step().IsDone());
@@ -333,7 +334,7 @@ TEST(Playback, StepsFromTheEndOfARepeatToItsStart)
 TEST(Playback, StepsBackToTheStartAndKeepsItsDirection)
 {
     TestDesk desk(ListOf({Item(10)}));
-    desk.Start(900);
+    desk.Start(Ticks(900));
     desk.Do(desk.navigator.Pause());
     desk.Do(
         desk.navigator.SetPlayMode(bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedNormal)));
@@ -348,7 +349,7 @@ TEST(Playback, StepsBackToTheStartAndKeepsItsDirection)
 TEST(Playback, RefusesToStepOutOfAnItem)
 {
     TestDesk desk(ListOf({Item(1), Item(1)}));
-    desk.Start(Second - 900);
+    desk.Start(Second - Ticks(900));
     desk.Do(desk.navigator.Pause());
     const std::string before = desk.Snapshot();
 
@@ -359,12 +360,12 @@ TEST(Playback, RefusesToStepOutOfAnItem)
 
     desk.Do(
         desk.navigator.SetPlayMode(bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedNormal)));
-    desk.Do(desk.navigator.SearchTime(Second + 899));
+    desk.Do(desk.navigator.SearchTime(Second + Ticks(899)));
     EXPECT_EQ(desk.navigator.Step().Reason(),
               "the play item has no further picture in this direction");
-    desk.Do(desk.navigator.SearchTime(Second + 900));
+    desk.Do(desk.navigator.SearchTime(Second + Ticks(900)));
     EXPECT_TRUE(desk.navigator.Step().IsDone());
-    EXPECT_EQ(desk.navigator.GetCurrentTimePosition(), Second);
+    EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), Second);
 }
 
 TEST(Playback, LeavesATimedStillByItself)
@@ -402,7 +403,7 @@ TEST(Playback, HoldsAnEndlessStillUntilItIsEnded)
     TestDesk desk(ListOf({WithEndlessStill(Item(1)), Item(1)}));
     desk.Start();
 
-    EXPECT_EQ(desk.navigator.Advance(1000 * Second), 0);
+    EXPECT_EQ(desk.navigator.Advance(1000 * Second), Ticks(0));
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Still);
     EXPECT_EQ(desk.navigator.TimeToNextChange(), std::nullopt);
     EXPECT_TRUE(desk.navigator.EndStill().IsDone());
@@ -459,13 +460,13 @@ TEST(Playback, GoesOnAfterASuspendWhereItWas)
     EXPECT_TRUE(desk.navigator.Suspend().IsDone());
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Suspended);
     EXPECT_EQ(desk.navigator.TimeToNextChange(), std::nullopt);
-    EXPECT_EQ(desk.navigator.Advance(60 * Second), 0);
+    EXPECT_EQ(desk.navigator.Advance(60 * Second), Ticks(0));
     EXPECT_TRUE(desk.navigator.Resume().IsDone());
 
     EXPECT_EQ(desk.Take(), "2 Suspended()\n"
                            "62 Resumed()\n");
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Playing);
-    EXPECT_EQ(desk.navigator.GetCurrentTimePosition(), 2 * Second);
+    EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), 2 * Second);
 }
 
 TEST(Playback, GoesOnWithAPauseOrAStillAfterASuspend)
@@ -488,7 +489,7 @@ TEST(Playback, GoesOnWithAPauseOrAStillAfterASuspend)
 
 TEST(Playback, StopsWhenToldToFailTheResumeAndClosesTheMenu)
 {
-    TestDesk desk(ListOf({RichItem(10)}, {Entry(0, 0)}));
+    TestDesk desk(ListOf({RichItem(10)}, {Entry(0, Ticks(0))}));
     desk.navigator.FailNextResume();
     desk.Start();
     desk.Do(desk.navigator.OpenPopUpMenu());
@@ -521,7 +522,7 @@ TEST(Playback, GoesOnAfterAPreloadThatFailed)
 
 TEST(Playback, FinishesWhenTheStreamRunsDryAndClosesTheMenu)
 {
-    TestDesk desk(ListOf({RichItem(10)}, {Entry(0, 0)}));
+    TestDesk desk(ListOf({RichItem(10)}, {Entry(0, Ticks(0))}));
     desk.Start(Second);
     desk.Do(desk.navigator.OpenPopUpMenu());
 
@@ -531,7 +532,8 @@ TEST(Playback, FinishesWhenTheStreamRunsDryAndClosesTheMenu)
                            "1 InteractiveGraphicsInactive()\n"
                            "1 Finished(1)\n");
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Finished);
-    EXPECT_EQ(desk.navigator.GetFinishedReason(), bdstreaming::FinishedReasonDataStarvation);
+    EXPECT_EQ(desk.navigator.Context().GetFinishedReason(),
+              bdstreaming::FinishedReasonDataStarvation);
 }
 
 TEST(Playback, FinishesForTheRightReasonAfterAStarvation)
@@ -555,11 +557,11 @@ TEST(Playback, HandsOnWhatAListenerThrows)
     TestDesk desk(ListOf({Item(1)}));
     Thrower thrower;
     desk.Start();
-    desk.delivery.Listeners().AddListener(&thrower);
+    desk.desk.Listeners().AddListener(&thrower);
 
     EXPECT_THROW(desk.navigator.Pause(), std::runtime_error);
 
-    desk.delivery.Listeners().RemoveListener(&thrower);
+    desk.desk.Listeners().RemoveListener(&thrower);
 }
 
 } // namespace

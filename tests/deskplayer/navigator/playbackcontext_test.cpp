@@ -12,15 +12,6 @@ namespace deskplayer
 namespace
 {
 
-/** A context whose state a test writes. */
-class OpenContext : public PlaybackContext
-{
-public:
-    using PlaybackContext::PlaybackContext;
-    using PlaybackContext::State;
-    using PlaybackContext::StoreSystemResumeData;
-};
-
 /** A stream that is selected, and how many there are of its kind. */
 typedef std::pair<int, int> NumberAndCount;
 typedef void (PlaybackContext::*StreamQuery)(bd::StreamNumberDef*, bd::UInt8*);
@@ -38,8 +29,9 @@ LoadedPlayList ThreeItems()
 {
     PlayItem poor = Item(10);
     poor.streams.primaryVideo.clear();
-    LoadedPlayList loaded = LayOut(
-        800, ListOf({RichItem(10), RichItem(10), poor}, {Entry(0, 0), Link(0, 5), Entry(1, 0)}));
+    LoadedPlayList loaded =
+        LayOut(800, ListOf({RichItem(10), RichItem(10), poor},
+                           {Entry(0, Ticks(0)), Link(0, Ticks(5)), Entry(1, Ticks(0))}));
     loaded.aspectRatios[0] = 2;
     return loaded;
 }
@@ -47,9 +39,10 @@ LoadedPlayList ThreeItems()
 class PlaybackContextTest : public testing::Test
 {
 protected:
-    PlaybackState& state() { return context.State(); }
-
-    OpenContext context{ThreeItems()};
+    const LoadedPlayList playList = ThreeItems();
+    PlaybackState state;
+    Playhead playhead{playList, state};
+    PlaybackContext context{playhead, state};
 };
 
 TEST_F(PlaybackContextTest, HasTheResumeDataUntilItIsCleanedUp)
@@ -67,7 +60,7 @@ TEST_F(PlaybackContextTest, HasTheResumeDataUntilItIsCleanedUp)
 TEST_F(PlaybackContextTest, TellsWhetherItPlaysAfterAResume)
 {
     EXPECT_FALSE(context.IsPlayingAfterSystemResume());
-    state().playingAfterSystemResume = true;
+    state.playingAfterSystemResume = true;
     EXPECT_TRUE(context.IsPlayingAfterSystemResume());
 }
 
@@ -75,23 +68,23 @@ TEST_F(PlaybackContextTest, NumbersPlayListAndPlayItem)
 {
     EXPECT_EQ(context.GetPlayListId(), 800);
     EXPECT_EQ(context.GetPlayItemId(), 0);
-    state().item = 2;
+    state.item = 2;
     EXPECT_EQ(context.GetPlayItemId(), 2);
 }
 
 TEST_F(PlaybackContextTest, TellsThePlayModeThatIsSetFromTheOneInForce)
 {
-    state().playMode = bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedFast1);
+    state.playMode = bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedFast1);
 
-    EXPECT_EQ(context.GetPlayMode(), state().playMode);
+    EXPECT_EQ(context.GetPlayMode(), state.playMode);
     EXPECT_EQ(context.GetCurrentPlayMode(), bd::PlayMode());
 }
 
 TEST_F(PlaybackContextTest, TellsTheTriggerAndWhenItWasReached)
 {
     EXPECT_EQ(context.GetTrigger().triggerType, bd::TRIGGER_NONE);
-    state().trigger = bd::TRIGGER_CHP;
-    state().triggerReachedTime = 0x100000000;
+    state.trigger = bd::TRIGGER_CHP;
+    state.triggerReachedTime = Ticks(0x100000000);
 
     EXPECT_EQ(context.GetTrigger().triggerType, bd::TRIGGER_CHP);
     EXPECT_EQ(context.GetTriggerReachedTime(), 0x100000000);
@@ -102,28 +95,28 @@ TEST_F(PlaybackContextTest, TellsTheRepeatStates)
     EXPECT_EQ(context.GetCurrentABRepeatState(), bd::TRIGGER_AB_NONE);
     EXPECT_EQ(context.GetCurrentChpTitleRepeatState(), bd::TRIGGER_NONE);
 
-    state().pointA = 5;
+    state.pointA = Ticks(5);
     EXPECT_EQ(context.GetCurrentABRepeatState(), bd::TRIGGER_A);
-    state().pointB = 10;
+    state.pointB = Ticks(10);
     EXPECT_EQ(context.GetCurrentABRepeatState(), bd::TRIGGER_B);
-    state().chapterTitleRepeat = bd::TRIGGER_TITLE;
+    state.chapterTitleRepeat = bd::TRIGGER_TITLE;
     EXPECT_EQ(context.GetCurrentChpTitleRepeatState(), bd::TRIGGER_TITLE);
 }
 
 TEST_F(PlaybackContextTest, KnowsTheTriggerAtATime)
 {
     EXPECT_EQ(context.GetTriggerTypeByTime(0), bd::TRIGGER_INVALID);
-    state().pointA = 5;
-    state().pointB = 10;
-    state().notifyAt = 20;
+    state.pointA = Ticks(5);
+    state.pointB = Ticks(10);
+    state.notifyAt = Ticks(20);
     EXPECT_EQ(context.GetTriggerTypeByTime(5), bd::TRIGGER_INVALID);
     EXPECT_EQ(context.GetTriggerTypeByTime(10), bd::TRIGGER_B);
     EXPECT_EQ(context.GetTriggerTypeByTime(20), bd::TRIGGER_NOTIFY_FROM_CURPOS);
     EXPECT_EQ(context.GetTriggerTypeByTime(21), bd::TRIGGER_INVALID);
-    state().notifyAt = 10;
+    state.notifyAt = Ticks(10);
     EXPECT_EQ(context.GetTriggerTypeByTime(10), bd::TRIGGER_B);
-    state().triggerReachedTime = 10;
-    state().triggerReached = bd::TRIGGER_NOTIFY_FROM_CURPOS;
+    state.triggerReachedTime = Ticks(10);
+    state.triggerReached = bd::TRIGGER_NOTIFY_FROM_CURPOS;
     EXPECT_EQ(context.GetTriggerTypeByTime(10), bd::TRIGGER_NOTIFY_FROM_CURPOS);
     EXPECT_EQ(context.GetTriggerTypeByTime(20), bd::TRIGGER_INVALID);
 }
@@ -131,13 +124,13 @@ TEST_F(PlaybackContextTest, KnowsTheTriggerAtATime)
 TEST_F(PlaybackContextTest, TellsTheChapterOfThePosition)
 {
     EXPECT_EQ(context.GetCurrentChapter(), 1);
-    state().position = 10 * Second - 1;
+    state.position = 10 * Second - Ticks(1);
     EXPECT_EQ(context.GetCurrentChapter(), 1);
-    state().position = 10 * Second;
+    state.position = 10 * Second;
     EXPECT_EQ(context.GetCurrentChapter(), 1) << "which is where the play item ends";
-    state().item = 1;
+    state.item = 1;
     EXPECT_EQ(context.GetCurrentChapter(), 2);
-    state().position = 30 * Second;
+    state.position = 30 * Second;
     EXPECT_EQ(context.GetCurrentChapter(), 2);
 }
 
@@ -147,9 +140,9 @@ TEST_F(PlaybackContextTest, TellsTheMarkThatWasPassedLast)
     EXPECT_EQ(context.GetCurrentPLMarkId(time), 0);
     EXPECT_EQ(time, bd::TimePositionNone) << "no mark, no time";
 
-    state().mark = 2;
+    state.mark = 2;
     EXPECT_EQ(context.GetCurrentPLMarkId(time), 2);
-    EXPECT_EQ(time, 10 * Second);
+    EXPECT_EQ(Ticks(time), 10 * Second);
 }
 
 TEST_F(PlaybackContextTest, TellsStreamsAndTheirCount)
@@ -166,13 +159,13 @@ TEST_F(PlaybackContextTest, TellsStreamsAndTheirCount)
     for (std::size_t i = 0; i < std::size(queries); ++i) {
         SCOPED_TRACE(i);
         const int count = i == 0 ? 1 : 2; // there is one video
-        state() = PlaybackState();
+        state = PlaybackState();
         EXPECT_EQ(Ask(context, queries[i]), NumberAndCount(1, count));
-        state().selection.*fields[i] = 2;
+        state.selection.*fields[i] = 2;
         EXPECT_EQ(Ask(context, queries[i]), NumberAndCount(count, count));
-        state().selection.*fields[i] = 3;
+        state.selection.*fields[i] = 3;
         EXPECT_EQ(Ask(context, queries[i]), NumberAndCount(count, count)) << "the last instead";
-        state().item = 2;
+        state.item = 2;
         EXPECT_EQ(Ask(context, queries[i]), NumberAndCount(0, 0));
     }
 }
@@ -181,7 +174,7 @@ TEST_F(PlaybackContextTest, TellsSubtitlesWithAResult)
 {
     bd::StreamNumberDef number = 99;
     bd::UInt8 count = 99;
-    state().selection.pg = 2;
+    state.selection.pg = 2;
     EXPECT_EQ(context.rGetPgTextStInfo(&number, &count), bdmv::INavError::ErrOk);
     EXPECT_EQ(number, 2);
     EXPECT_EQ(count, 2);
@@ -197,7 +190,7 @@ TEST_F(PlaybackContextTest, TellsSecondaryVideoAndWhetherItRunsOnItsOwn)
     EXPECT_EQ(count, 2);
     EXPECT_FALSE(async);
 
-    state().item = 2;
+    state.item = 2;
     async = true;
     context.GetSecondaryVideoInfo(&number, &count, &async);
     EXPECT_EQ(number, 0);
@@ -209,12 +202,12 @@ TEST_F(PlaybackContextTest, TellsAnglesOfWhichThereIsAlwaysOne)
 {
     bd::AngleNumberDef number = 99;
     bd::UInt8 count = 99;
-    state().selection.angle = 2;
+    state.selection.angle = 2;
     context.GetAngleInfo(&number, &count);
     EXPECT_EQ(number, 2);
     EXPECT_EQ(count, 2);
 
-    state().item = 2;
+    state.item = 2;
     context.GetAngleInfo(&number, &count);
     EXPECT_EQ(number, 1);
     EXPECT_EQ(count, 1);
@@ -228,12 +221,12 @@ TEST_F(PlaybackContextTest, TellsVideoFormatAndAspectRatioAsTheyAreOnTheDisc)
     EXPECT_EQ(format, bd::VideoFormatType1080p);
     EXPECT_EQ(ratio, bd::VideoAspectRatioType4x3);
 
-    state().item = 1;
+    state.item = 1;
     context.GetVideoAttributes(format, ratio);
     EXPECT_EQ(format, bd::VideoFormatType1080p);
     EXPECT_EQ(ratio, bd::VideoAspectRatioTypeNoInfo) << "no clip tells it";
 
-    state().item = 2;
+    state.item = 2;
     context.GetVideoAttributes(format, ratio);
     EXPECT_EQ(format, bd::VideoFormatTypeNoInfo) << "there is no video";
     EXPECT_EQ(ratio, bd::VideoAspectRatioTypeNoInfo);
@@ -246,15 +239,15 @@ TEST_F(PlaybackContextTest, TellsWhatIsShown)
     EXPECT_FALSE(context.GetSecondaryAudioDisplay());
     EXPECT_FALSE(context.GetPipPgTextStSelect());
 
-    state().selection.pgShown = false;
+    state.selection.pgShown = false;
     EXPECT_FALSE(context.GetPgTextStDisplay());
-    state().selection.secondaryVideoShown = true;
+    state.selection.secondaryVideoShown = true;
     EXPECT_TRUE(context.GetSecondaryVideoDisplay());
     EXPECT_FALSE(context.GetSecondaryAudioDisplay());
-    state().selection.secondaryAudioShown = true;
+    state.selection.secondaryAudioShown = true;
     EXPECT_TRUE(context.GetSecondaryAudioDisplay());
     EXPECT_FALSE(context.GetPipPgTextStSelect());
-    state().selection.pipPgPicked = true;
+    state.selection.pipPgPicked = true;
     EXPECT_TRUE(context.GetPipPgTextStSelect());
 }
 
@@ -262,20 +255,23 @@ TEST(PlaybackContext, JoinsTheMasksOfPlayListAndItem)
 {
     PlayList playList = ListOf({Forbidding(Item(10), {bd::UserOperationStop}), Item(10)});
     playList.applicationInfo.uoMask = MaskOf({bd::UserOperationPauseOn});
-    OpenContext context(LayOut(1, playList));
+    const LoadedPlayList loaded = LayOut(1, playList);
+    PlaybackState state;
+    const Playhead playhead(loaded, state);
+    PlaybackContext context(playhead, state);
     bdmv::UOMaskTable mask;
 
     context.GetUOMask(mask);
     EXPECT_EQ(mask, bdmv::UOMaskTable(MaskOf({bd::UserOperationStop, bd::UserOperationPauseOn})));
 
-    context.State().item = 1;
+    state.item = 1;
     context.GetUOMask(mask);
     EXPECT_EQ(mask, bdmv::UOMaskTable(MaskOf({bd::UserOperationPauseOn})));
 }
 
 TEST_F(PlaybackContextTest, TellsThePosition)
 {
-    state().position = 0x100000000;
+    state.position = Ticks(0x100000000);
     EXPECT_EQ(context.GetCurrentTimePosition(), 0x100000000);
 }
 
@@ -289,7 +285,7 @@ TEST_F(PlaybackContextTest, SharesTheProgramOfTheButton)
     EXPECT_EQ(ticket, 0);
     EXPECT_EQ(button, 0);
 
-    state().button = {new ButtonProgram({}), 5, 6};
+    state.button = {new ButtonProgram({}), 5, 6};
     context.GetExecuteButtonData(program, ticket, button);
     EXPECT_EQ(program.GetCount(), 2);
     EXPECT_EQ(ticket, 5);
@@ -298,23 +294,23 @@ TEST_F(PlaybackContextTest, SharesTheProgramOfTheButton)
 
 TEST_F(PlaybackContextTest, TellsTheStyleAndHowManyThereAre)
 {
-    state().selection.style = 3;
+    state.selection.style = 3;
     EXPECT_EQ(context.GetCurrentTextSubtitleStyleNumber(), 3);
     EXPECT_EQ(context.GetNumberOfTextSubtitleStyles(), 4);
-    state().item = 2;
+    state.item = 2;
     EXPECT_EQ(context.GetNumberOfTextSubtitleStyles(), 0);
 }
 
 TEST_F(PlaybackContextTest, TellsWhyPlaybackFinished)
 {
     EXPECT_EQ(context.GetFinishedReason(), bdstreaming::FinishedReasonEndOfMedia);
-    state().finishedReason = bdstreaming::FinishedReasonDataStarvation;
+    state.finishedReason = bdstreaming::FinishedReasonDataStarvation;
     EXPECT_EQ(context.GetFinishedReason(), bdstreaming::FinishedReasonDataStarvation);
 }
 
 TEST_F(PlaybackContextTest, TellsTheZoom)
 {
-    state().zoom = {{1, 2, 3, 4}, {5, 6, 7, 8}, 9};
+    state.zoom = {{1, 2, 3, 4}, {5, 6, 7, 8}, 9};
     bd::ZOOM_PARAM_Def zoom = {};
     context.GetZoomScaleInfo(zoom);
     EXPECT_EQ(zoom.rClipRectangle.Height, 4);
@@ -344,26 +340,29 @@ TEST(PlaybackContext, TellsWhichSecondaryStreamsRunOnTheirOwn)
     playList.subPaths.resize(2);
     playList.subPaths[0].type = bd::SubPathOutOfMuxASynchPipPresentationPath;
     playList.subPaths[1].type = bd::SubPathOutOfMuxSynchPipPresentationPath;
-    OpenContext context(LayOut(1, playList));
+    const LoadedPlayList loaded = LayOut(1, playList);
+    PlaybackState state;
+    const Playhead playhead(loaded, state);
+    PlaybackContext context(playhead, state);
 
     EXPECT_EQ(AsyncFlagsOf(context), (std::vector<bool>{true, false, false, false}));
 
-    context.State().item = 1;
-    context.State().previousItem = 0;
+    state.item = 1;
+    state.previousItem = 0;
     EXPECT_EQ(AsyncFlagsOf(context), (std::vector<bool>{false, true, false, false}));
 
-    context.State().item = 2;
-    context.State().previousItem = 1;
+    state.item = 2;
+    state.previousItem = 1;
     EXPECT_EQ(AsyncFlagsOf(context), (std::vector<bool>{false, false, true, true}));
 
-    context.State().previousItem = 0;
+    state.previousItem = 0;
     EXPECT_EQ(AsyncFlagsOf(context), (std::vector<bool>{false, false, true, false}));
 
     bd::StreamNumberDef number = 0;
     bd::UInt8 count = 0;
     bool async = false;
-    context.State().item = 0;
-    context.State().selection.secondaryVideo = 2;
+    state.item = 0;
+    state.selection.secondaryVideo = 2;
     context.GetSecondaryVideoInfo(&number, &count, &async);
     EXPECT_TRUE(async) << "the second one";
 }
@@ -372,7 +371,10 @@ TEST(PlaybackContext, HasNothingToTellWithoutPlayItems)
 {
     PlayList playList;
     playList.applicationInfo.uoMask = MaskOf({bd::UserOperationStop});
-    OpenContext context(LayOut(3, playList));
+    const LoadedPlayList loaded = LayOut(3, playList);
+    PlaybackState state;
+    const Playhead playhead(loaded, state);
+    PlaybackContext context(playhead, state);
 
     for (const StreamQuery query :
          {&PlaybackContext::GetVideoInfo, &PlaybackContext::GetAudioInfo,

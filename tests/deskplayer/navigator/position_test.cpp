@@ -8,13 +8,11 @@ namespace deskplayer
 namespace
 {
 
-typedef SimulatedNavigator::Status Status;
-
 /** Two items of ten seconds, with chapters at 0, 5, 10 and 15 s. */
 PlayList FourChapters()
 {
-    return ListOf({Item(10), Item(10)},
-                  {Entry(0, 0), Entry(0, 5 * Second), Entry(1, 0), Entry(1, 5 * Second)});
+    return ListOf({Item(10), Item(10)}, {Entry(0, Ticks(0)), Entry(0, 5 * Second),
+                                         Entry(1, Ticks(0)), Entry(1, 5 * Second)});
 }
 
 TEST(Position, JumpsWithinAnItem)
@@ -22,7 +20,7 @@ TEST(Position, JumpsWithinAnItem)
     TestDesk desk(FourChapters());
     desk.Start(Second);
 
-    EXPECT_TRUE(desk.navigator.SearchTime(2 * Second + 1).IsDone());
+    EXPECT_TRUE(desk.navigator.SearchTime(2 * Second + Ticks(1)).IsDone());
 
     EXPECT_EQ(desk.Take(), "1 JumpOccurred()\n"
                            "1 CurrentTimePosition(90001)\n");
@@ -51,7 +49,7 @@ TEST(Position, StaysPausedWhenItJumps)
     desk.Do(desk.navigator.SearchTime(7 * Second));
 
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Paused);
-    EXPECT_EQ(desk.navigator.GetCurrentTimePosition(), 7 * Second);
+    EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), 7 * Second);
 }
 
 TEST(Position, LeavesAStillWhenItJumps)
@@ -73,9 +71,9 @@ TEST(Position, ForgetsTheFractionOfATickWhenItJumps)
     TestDesk desk(ListOf({Item(10)}));
     desk.Start();
     desk.Do(desk.navigator.SetPlayMode(bd::PlayMode(bd::PlayDirectionForward, bd::PlaySpeedSlow5)));
-    desk.navigator.Advance(31);
+    desk.navigator.Advance(Ticks(31));
 
-    desk.Do(desk.navigator.SearchTime(0));
+    desk.Do(desk.navigator.SearchTime(Ticks(0)));
 
     EXPECT_EQ(desk.navigator.TimeToNextChange(), 32 * Second);
 }
@@ -86,13 +84,13 @@ TEST(Position, RefusesATimeAtOrBehindTheEnd)
     desk.Start();
     const std::string before = desk.Snapshot();
 
-    for (const std::uint64_t time : {20 * Second, 1000 * Second}) {
+    for (const Ticks time : {20 * Second, 1000 * Second}) {
         EXPECT_EQ(desk.navigator.SearchTime(time).Reason(), "the play list ends at 00:00:20.000");
     }
     EXPECT_EQ(desk.Take(), "");
     EXPECT_EQ(desk.Snapshot(), before);
 
-    EXPECT_TRUE(desk.navigator.SearchTime(20 * Second - 1).IsDone());
+    EXPECT_TRUE(desk.navigator.SearchTime(20 * Second - Ticks(1)).IsDone());
 }
 
 TEST(Position, GoesToAChapter)
@@ -138,11 +136,11 @@ TEST(Position, SkipsFromBeforeTheFirstChapterToIt)
 {
     TestDesk desk(ListOf({Item(10)}, {Entry(0, 5 * Second)}));
     desk.Start(Second);
-    EXPECT_EQ(desk.navigator.GetCurrentChapter(), 0);
+    EXPECT_EQ(desk.navigator.Context().GetCurrentChapter(), 0);
 
     EXPECT_TRUE(desk.navigator.SkipToNextChapter().IsDone());
 
-    EXPECT_EQ(desk.navigator.GetCurrentTimePosition(), 5 * Second);
+    EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), 5 * Second);
 }
 
 TEST(Position, SkipsBackToTheStartOfTheChapterOnceItHasPlayedThreeSeconds)
@@ -152,27 +150,27 @@ TEST(Position, SkipsBackToTheStartOfTheChapterOnceItHasPlayedThreeSeconds)
 
     EXPECT_TRUE(desk.navigator.SkipToPreviousChapter().IsDone());
 
-    EXPECT_EQ(desk.navigator.GetCurrentTimePosition(), 5 * Second);
+    EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), 5 * Second);
 }
 
 TEST(Position, SkipsBackToTheChapterBeforeWithinThreeSeconds)
 {
     TestDesk desk(FourChapters());
-    desk.Start(8 * Second - 1);
+    desk.Start(8 * Second - Ticks(1));
 
     EXPECT_TRUE(desk.navigator.SkipToPreviousChapter().IsDone());
 
-    EXPECT_EQ(desk.navigator.GetCurrentTimePosition(), 0);
+    EXPECT_EQ(desk.navigator.Context().GetCurrentTimePosition(), 0);
 }
 
 TEST(Position, SkipsBackToTheStartOfTheFirstChapterAtAnyTime)
 {
     TestDesk desk(ListOf({Item(10)}, {Entry(0, Second)}));
-    desk.Start(Second + 1);
+    desk.Start(Second + Ticks(1));
 
     EXPECT_TRUE(desk.navigator.SkipToPreviousChapter().IsDone());
 
-    EXPECT_EQ(desk.navigator.GetCurrentTimePosition(), Second);
+    EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), Second);
 }
 
 TEST(Position, RefusesChaptersThatAreNotThere)

@@ -11,7 +11,6 @@ namespace deskplayer
 namespace
 {
 
-typedef SimulatedNavigator::Status Status;
 typedef std::function<Outcome(TestDesk&)> Operation;
 
 bd::PlayMode Mode(bd::PlayDirectionDef direction, bd::PlaySpeedDef speed)
@@ -22,8 +21,9 @@ bd::PlayMode Mode(bd::PlayDirectionDef direction, bd::PlaySpeedDef speed)
 /** An item that can do everything and ends in a still, and another one. */
 PlayList Everything()
 {
-    return ListOf({WithEndlessStill(RichItem(10)), RichItem(10)},
-                  {Entry(0, 0), Entry(0, 5 * Second), Entry(1, 0), Entry(1, 5 * Second)});
+    return ListOf(
+        {WithEndlessStill(RichItem(10)), RichItem(10)},
+        {Entry(0, Ticks(0)), Entry(0, 5 * Second), Entry(1, Ticks(0)), Entry(1, 5 * Second)});
 }
 
 /** Brings a navigator over Everything() into a status. */
@@ -128,7 +128,7 @@ std::vector<StatusRule> StatusRules()
          {Status::Suspended},
          "suspended"},
         {"WakeUp",
-         [](TestDesk& d) { return d.navigator.WakeUp(d.keeper.ResumeData()); },
+         [](TestDesk& d) { return d.navigator.WakeUp(d.desk.ResumeData()); },
          {Status::Standby},
          "in standby"},
     };
@@ -225,7 +225,7 @@ std::vector<MaskRule> MaskRules()
         {bd::UserOperationChapterSearch, "ChapterSearch",
          [](TestDesk& d) { return d.navigator.SearchChapter(1); }},
         {bd::UserOperationTimeSearch, "TimeSearch",
-         [](TestDesk& d) { return d.navigator.SearchTime(0); }},
+         [](TestDesk& d) { return d.navigator.SearchTime(Ticks(0)); }},
         {bd::UserOperationSkipToNextPoint, "SkipToNextPoint",
          [](TestDesk& d) { return d.navigator.SkipToNextChapter(); }},
         {bd::UserOperationSkipBackToPreviousPoint, "SkipBackToPreviousPoint",
@@ -368,7 +368,7 @@ TEST(Refusals, DoNotComeFromTheMaskOfAPlaybackThatIsOver)
         playList.applicationInfo.uoMask = MaskOf({bd::UserOperationTimeSearch});
         TestDesk desk(playList);
         Bring(desk, status);
-        EXPECT_EQ(desk.navigator.SearchTime(0).Reason().rfind("playback is ", 0), 0);
+        EXPECT_EQ(desk.navigator.SearchTime(Ticks(0)).Reason().rfind("playback is ", 0), 0);
     }
 }
 

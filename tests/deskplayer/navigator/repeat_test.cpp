@@ -22,25 +22,25 @@ bd::PlayMode BackwardMode()
     return bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedNormal);
 }
 
-/** Sets A here and B @p ticks later: playback is at A again. */
-void SetPoints(TestDesk& desk, std::uint64_t ticks)
+/** Sets A here and B @p later: playback is at A again. */
+void SetPoints(TestDesk& desk, Ticks later)
 {
     desk.Do(desk.navigator.SetPointA());
-    desk.navigator.Advance(ticks);
+    desk.navigator.Advance(later);
     desk.Do(desk.navigator.SetPointB());
 }
 
 TEST(Repeat, GoesFromBBackToA)
 {
     TestDesk desk(ListOf({Item(100)}));
-    desk.Start(10 * Second + 5);
+    desk.Start(10 * Second + Ticks(5));
 
     EXPECT_TRUE(desk.navigator.SetPointA().IsDone());
-    EXPECT_EQ(desk.navigator.GetCurrentABRepeatState(), bd::TRIGGER_A);
+    EXPECT_EQ(desk.navigator.Context().GetCurrentABRepeatState(), bd::TRIGGER_A);
     EXPECT_FALSE(desk.navigator.IsRepeating());
     desk.navigator.Advance(Second / 2);
     EXPECT_TRUE(desk.navigator.SetPointB().IsDone());
-    EXPECT_EQ(desk.navigator.GetCurrentABRepeatState(), bd::TRIGGER_B);
+    EXPECT_EQ(desk.navigator.Context().GetCurrentABRepeatState(), bd::TRIGGER_B);
     EXPECT_TRUE(desk.navigator.IsRepeating());
     desk.navigator.Advance(Second);
 
@@ -60,7 +60,7 @@ TEST(Repeat, GoesFromBBackToA)
 TEST(Repeat, GoesFromBBackToAInAnItemBefore)
 {
     TestDesk desk(ListOf({Item(2), Item(2)}));
-    desk.Start(Second + 10);
+    desk.Start(Second + Ticks(10));
     SetPoints(desk, 2 * Second);
 
     desk.navigator.Advance(2 * Second);
@@ -94,9 +94,9 @@ TEST(Repeat, ReportsThatBFailedWhenAIsNotBeforeIt)
     EXPECT_EQ(desk.Take(), "1 TriggerSet(6, false)\n");
     EXPECT_EQ(desk.Snapshot(), before);
 
-    desk.Do(desk.navigator.SearchTime(0));
+    desk.Do(desk.navigator.SearchTime(Ticks(0)));
     desk.Do(desk.navigator.SetPointB());
-    EXPECT_EQ(desk.navigator.GetCurrentABRepeatState(), bd::TRIGGER_A);
+    EXPECT_EQ(desk.navigator.Context().GetCurrentABRepeatState(), bd::TRIGGER_A);
 }
 
 TEST(Repeat, StartsOverWithANewA)
@@ -107,7 +107,7 @@ TEST(Repeat, StartsOverWithANewA)
 
     desk.Do(desk.navigator.SetPointA());
 
-    EXPECT_EQ(desk.navigator.GetCurrentABRepeatState(), bd::TRIGGER_A);
+    EXPECT_EQ(desk.navigator.Context().GetCurrentABRepeatState(), bd::TRIGGER_A);
     EXPECT_FALSE(desk.navigator.IsRepeating());
 }
 
@@ -121,9 +121,9 @@ TEST(Repeat, GoesOnBehindBOnceTheRepeatHasEnded)
     desk.navigator.Advance(2 * Second);
 
     EXPECT_EQ(desk.TakeWithoutPositions(), "2 TriggerSet(7, true)\n");
-    EXPECT_EQ(desk.navigator.GetCurrentABRepeatState(), bd::TRIGGER_AB_NONE);
+    EXPECT_EQ(desk.navigator.Context().GetCurrentABRepeatState(), bd::TRIGGER_AB_NONE);
     EXPECT_FALSE(desk.navigator.IsRepeating());
-    EXPECT_EQ(desk.navigator.GetCurrentTimePosition(), 3 * Second);
+    EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), 3 * Second);
 }
 
 TEST(Repeat, IsNoRepeatBehindB)
@@ -144,11 +144,12 @@ TEST(Repeat, IsNoRepeatBehindB)
 
 TEST(Repeat, RepeatsAChapter)
 {
-    TestDesk desk(ListOf({Item(10)}, {Entry(0, 0), Entry(0, 3 * Second), Entry(0, 5 * Second)}));
+    TestDesk desk(
+        ListOf({Item(10)}, {Entry(0, Ticks(0)), Entry(0, 3 * Second), Entry(0, 5 * Second)}));
     desk.Start(4 * Second);
 
     EXPECT_TRUE(desk.navigator.RepeatChapter().IsDone());
-    EXPECT_EQ(desk.navigator.GetCurrentChpTitleRepeatState(), bd::TRIGGER_CHP);
+    EXPECT_EQ(desk.navigator.Context().GetCurrentChpTitleRepeatState(), bd::TRIGGER_CHP);
     EXPECT_TRUE(desk.navigator.IsRepeating());
     desk.navigator.Advance(3 * Second);
 
@@ -163,7 +164,7 @@ TEST(Repeat, RepeatsAChapter)
 
 TEST(Repeat, RepeatsTheLastChapterAtTheEndOfThePlayList)
 {
-    TestDesk desk(ListOf({WithEndlessStill(Item(2))}, {Entry(0, 0), Entry(0, Second)}));
+    TestDesk desk(ListOf({WithEndlessStill(Item(2))}, {Entry(0, Ticks(0)), Entry(0, Second)}));
     desk.Start(Second);
     desk.Do(desk.navigator.RepeatChapter());
 
@@ -176,14 +177,15 @@ TEST(Repeat, RepeatsTheLastChapterAtTheEndOfThePlayList)
 
 TEST(Repeat, RepeatsTheChapterThatTheViewerGoesTo)
 {
-    TestDesk desk(ListOf({Item(10)}, {Entry(0, 0), Entry(0, 3 * Second), Entry(0, 5 * Second)}));
+    TestDesk desk(
+        ListOf({Item(10)}, {Entry(0, Ticks(0)), Entry(0, 3 * Second), Entry(0, 5 * Second)}));
     desk.Start();
     desk.Do(desk.navigator.RepeatChapter());
     desk.Do(desk.navigator.SearchChapter(2));
 
     desk.navigator.Advance(3 * Second);
 
-    EXPECT_EQ(desk.navigator.GetCurrentTimePosition(), 4 * Second);
+    EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), 4 * Second);
 }
 
 TEST(Repeat, PlaysToTheEndWhenThereIsNoChapterToRepeat)
@@ -207,14 +209,14 @@ TEST(Repeat, PlaysPastAnEmptyChapterAndRepeatsTheNext)
     EXPECT_TRUE(desk.navigator.IsRepeating());
     desk.navigator.Advance(10 * Second);
 
-    EXPECT_EQ(desk.navigator.GetCurrentChapter(), 2);
-    EXPECT_GE(desk.navigator.GetCurrentTimePosition(), Second);
-    EXPECT_LT(desk.navigator.GetCurrentTimePosition(), 2 * Second);
+    EXPECT_EQ(desk.navigator.Context().GetCurrentChapter(), 2);
+    EXPECT_GE(Ticks(desk.navigator.Context().GetCurrentTimePosition()), Second);
+    EXPECT_LT(Ticks(desk.navigator.Context().GetCurrentTimePosition()), 2 * Second);
 }
 
 TEST(Repeat, EndsInAnEmptyChapterAtTheEndOfThePlayList)
 {
-    TestDesk desk(ListOf({Item(2)}, {Entry(0, 0), Entry(0, 2 * Second)}));
+    TestDesk desk(ListOf({Item(2)}, {Entry(0, Ticks(0)), Entry(0, 2 * Second)}));
     desk.Start();
     desk.Do(desk.navigator.RepeatChapter());
     desk.Do(desk.navigator.SearchChapter(2));
@@ -231,7 +233,7 @@ TEST(Repeat, RepeatsThePlayList)
     desk.Start(Second);
 
     EXPECT_TRUE(desk.navigator.RepeatTitle().IsDone());
-    EXPECT_EQ(desk.navigator.GetCurrentChpTitleRepeatState(), bd::TRIGGER_TITLE);
+    EXPECT_EQ(desk.navigator.Context().GetCurrentChpTitleRepeatState(), bd::TRIGGER_TITLE);
     EXPECT_TRUE(desk.navigator.IsRepeating());
     desk.navigator.Advance(3 * Second);
 
@@ -240,14 +242,14 @@ TEST(Repeat, RepeatsThePlayList)
                                            "3 TriggerTimeReached(9, 135000)\n"
                                            "3 JumpOccurred()\n"
                                            "3 PlayItem(7, 0, 6, 15)\n");
-    EXPECT_EQ(desk.navigator.GetCurrentTimePosition(), Second);
+    EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), Second);
 }
 
 TEST(Repeat, OfAPlayListWithoutLengthEnds)
 {
     TestDesk desk(ListOf({WithEndlessStill(Item(0)), Item(0)}));
     desk.Start();
-    desk.navigator.Advance(0);
+    desk.navigator.Advance(Ticks(0));
     desk.Do(desk.navigator.RepeatTitle());
 
     EXPECT_FALSE(desk.navigator.IsRepeating());
@@ -259,7 +261,7 @@ TEST(Repeat, OfAPlayListWithoutLengthEnds)
 
 TEST(Repeat, EndsTheRepeatOfAChapterOrThePlayList)
 {
-    TestDesk desk(ListOf({Item(2)}, {Entry(0, 0)}));
+    TestDesk desk(ListOf({Item(2)}, {Entry(0, Ticks(0))}));
     for (Outcome (SimulatedNavigator::*repeat)() :
          {&SimulatedNavigator::RepeatChapter, &SimulatedNavigator::RepeatTitle}) {
         desk.Start();
@@ -267,41 +269,41 @@ TEST(Repeat, EndsTheRepeatOfAChapterOrThePlayList)
 
         EXPECT_TRUE(desk.navigator.EndChapterTitleRepeat().IsDone());
         EXPECT_FALSE(desk.navigator.IsRepeating());
-        EXPECT_EQ(desk.navigator.GetCurrentChpTitleRepeatState(), bd::TRIGGER_NONE);
+        EXPECT_EQ(desk.navigator.Context().GetCurrentChpTitleRepeatState(), bd::TRIGGER_NONE);
         EXPECT_NE(desk.Take().find(" TriggerSet(4, true)\n"), std::string::npos);
         desk.navigator.Advance(3 * Second);
-        EXPECT_EQ(desk.navigator.CurrentStatus(), SimulatedNavigator::Status::Finished);
+        EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Finished);
     }
 }
 
 TEST(Repeat, IsOneKindAtATime)
 {
-    TestDesk desk(ListOf({Item(10)}, {Entry(0, 0)}));
+    TestDesk desk(ListOf({Item(10)}, {Entry(0, Ticks(0))}));
     desk.Start();
     SetPoints(desk, Second);
 
     desk.Do(desk.navigator.RepeatTitle());
-    EXPECT_EQ(desk.navigator.GetCurrentABRepeatState(), bd::TRIGGER_AB_NONE);
-    EXPECT_EQ(desk.navigator.GetCurrentChpTitleRepeatState(), bd::TRIGGER_TITLE);
+    EXPECT_EQ(desk.navigator.Context().GetCurrentABRepeatState(), bd::TRIGGER_AB_NONE);
+    EXPECT_EQ(desk.navigator.Context().GetCurrentChpTitleRepeatState(), bd::TRIGGER_TITLE);
 
     desk.Do(desk.navigator.SetPointA());
-    EXPECT_EQ(desk.navigator.GetCurrentABRepeatState(), bd::TRIGGER_A);
-    EXPECT_EQ(desk.navigator.GetCurrentChpTitleRepeatState(), bd::TRIGGER_NONE);
+    EXPECT_EQ(desk.navigator.Context().GetCurrentABRepeatState(), bd::TRIGGER_A);
+    EXPECT_EQ(desk.navigator.Context().GetCurrentChpTitleRepeatState(), bd::TRIGGER_NONE);
 }
 
 TEST(Repeat, RemembersTheTriggerThatWasSetLast)
 {
     TestDesk desk(ListOf({Item(10)}));
     desk.Start(Second);
-    EXPECT_EQ(desk.navigator.GetTrigger().triggerType, bd::TRIGGER_NONE);
+    EXPECT_EQ(desk.navigator.Context().GetTrigger().triggerType, bd::TRIGGER_NONE);
 
     desk.Do(desk.navigator.SetTrigger(5 * Second));
-    EXPECT_EQ(desk.navigator.GetTrigger().triggerType, bd::TRIGGER_NOTIFY_FROM_CURPOS);
+    EXPECT_EQ(desk.navigator.Context().GetTrigger().triggerType, bd::TRIGGER_NOTIFY_FROM_CURPOS);
     desk.Do(desk.navigator.SetPointB());
-    EXPECT_EQ(desk.navigator.GetTrigger().triggerType, bd::TRIGGER_NOTIFY_FROM_CURPOS)
+    EXPECT_EQ(desk.navigator.Context().GetTrigger().triggerType, bd::TRIGGER_NOTIFY_FROM_CURPOS)
         << "that one failed";
     desk.Do(desk.navigator.SetPointA());
-    EXPECT_EQ(desk.navigator.GetTrigger().triggerType, bd::TRIGGER_A);
+    EXPECT_EQ(desk.navigator.Context().GetTrigger().triggerType, bd::TRIGGER_A);
 }
 
 TEST(Trigger, IsReachedAtItsTime)
@@ -309,8 +311,8 @@ TEST(Trigger, IsReachedAtItsTime)
     TestDesk desk(ListOf({Item(10)}));
     desk.Start(Second);
 
-    EXPECT_TRUE(desk.navigator.SetTrigger(Second + 100).IsDone());
-    EXPECT_EQ(desk.navigator.TimeToNextChange(), 100);
+    EXPECT_TRUE(desk.navigator.SetTrigger(Second + Ticks(100)).IsDone());
+    EXPECT_EQ(desk.navigator.TimeToNextChange(), Ticks(100));
     desk.navigator.Advance(Second / 2);
 
     EXPECT_EQ(desk.Take(), "1 TriggerSet(13, true)\n"
@@ -321,10 +323,10 @@ TEST(Trigger, IsReachedBackwardToo)
 {
     TestDesk desk(ListOf({Item(10)}));
     desk.Start(2 * Second);
-    desk.Do(desk.navigator.SetTrigger(Second + 100));
+    desk.Do(desk.navigator.SetTrigger(Second + Ticks(100)));
     desk.Do(desk.navigator.SetPlayMode(BackwardMode()));
 
-    desk.navigator.Advance(Second / 2 + Second / 2 - 100);
+    desk.navigator.Advance(Second - Ticks(100));
 
     EXPECT_EQ(desk.Take(), "2+44900 TriggerTimeReached(13, 45100)\n");
 }
@@ -333,12 +335,12 @@ TEST(Trigger, StaysAndIsReachedAgain)
 {
     TestDesk desk(ListOf({Item(10)}));
     desk.Start();
-    desk.Do(desk.navigator.SetTrigger(100));
-    desk.navigator.Advance(200);
+    desk.Do(desk.navigator.SetTrigger(Ticks(100)));
+    desk.navigator.Advance(Ticks(200));
     EXPECT_EQ(desk.Take(), "0+100 TriggerTimeReached(13, 100)\n");
 
-    desk.Do(desk.navigator.SearchTime(0));
-    desk.navigator.Advance(200);
+    desk.Do(desk.navigator.SearchTime(Ticks(0)));
+    desk.navigator.Advance(Ticks(200));
 
     EXPECT_EQ(desk.Take(), "0+300 TriggerTimeReached(13, 100)\n");
 }
@@ -348,19 +350,19 @@ TEST(Trigger, IsANotificationDuringARepeatToo)
     TestDesk desk(ListOf({Item(10)}));
     desk.Start();
     desk.Do(desk.navigator.RepeatTitle());
-    desk.Do(desk.navigator.SetTrigger(100));
+    desk.Do(desk.navigator.SetTrigger(Ticks(100)));
 
-    desk.navigator.Advance(200);
+    desk.navigator.Advance(Ticks(200));
 
     EXPECT_EQ(desk.Take(), "0+100 TriggerTimeReached(13, 100)\n");
 }
 
 TEST(Trigger, IsReachedBesideTheRepeatThatGoesBackThere)
 {
-    TestDesk desk(ListOf({Item(10)}, {Entry(0, 0), Entry(0, 2 * Second)}));
+    TestDesk desk(ListOf({Item(10)}, {Entry(0, Ticks(0)), Entry(0, 2 * Second)}));
     const struct {
         std::function<void()> repeat;
-        std::uint64_t end;
+        Ticks end;
         std::string heard;
     } repeats[] = {
         {[&desk] { SetPoints(desk, Second / 2); }, Second / 2, "TriggerTimeReached(6, 22500)\n"},
@@ -383,8 +385,8 @@ TEST(Trigger, IsReachedBesideTheRepeatThatGoesBackThere)
                 reached += line.substr(line.find(' ') + 1) + "\n";
             }
         }
-        EXPECT_EQ(reached,
-                  "TriggerTimeReached(13, " + std::to_string(repeat.end) + ")\n" + repeat.heard);
+        EXPECT_EQ(reached, "TriggerTimeReached(13, " + std::to_string(repeat.end.count()) + ")\n" +
+                               repeat.heard);
         desk.Do(desk.navigator.Stop());
     }
 }
@@ -407,7 +409,7 @@ TEST(Trigger, IsRefusedBehindTheEndOfThePlayList)
     desk.Start();
     const std::string before = desk.Snapshot();
 
-    EXPECT_EQ(desk.navigator.SetTrigger(20 * Second + 45).Reason(),
+    EXPECT_EQ(desk.navigator.SetTrigger(20 * Second + Ticks(45)).Reason(),
               "00:00:20.001 is behind the end of the play list, which lasts 00:00:20.000");
 
     EXPECT_EQ(desk.Take(), "");
@@ -420,9 +422,9 @@ TEST(Trigger, LeavesOtherTriggersAlone)
     desk.Start();
     desk.Do(desk.navigator.RepeatTitle());
 
-    desk.Do(desk.navigator.SetTrigger(100));
+    desk.Do(desk.navigator.SetTrigger(Ticks(100)));
 
-    EXPECT_EQ(desk.navigator.GetCurrentChpTitleRepeatState(), bd::TRIGGER_TITLE);
+    EXPECT_EQ(desk.navigator.Context().GetCurrentChpTitleRepeatState(), bd::TRIGGER_TITLE);
 }
 
 } // namespace

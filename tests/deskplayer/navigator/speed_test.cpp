@@ -77,13 +77,13 @@ TEST(Speed, TakesEffectWithContinueWhilePaused)
 
     EXPECT_TRUE(desk.navigator.SetPlayMode(Forward(bd::PlaySpeedSlow1)).IsDone());
     EXPECT_EQ(desk.Take(), "");
-    EXPECT_EQ(desk.navigator.GetPlayMode(), Forward(bd::PlaySpeedSlow1));
-    EXPECT_EQ(desk.navigator.GetCurrentPlayMode(), bd::PlayMode());
+    EXPECT_EQ(desk.navigator.Context().GetPlayMode(), Forward(bd::PlaySpeedSlow1));
+    EXPECT_EQ(desk.navigator.Context().GetCurrentPlayMode(), bd::PlayMode());
 
     desk.navigator.Continue();
     EXPECT_EQ(desk.Take(), "0 Continued(0, 4)\n"
                            "0 PlayMode(0, 4)\n");
-    EXPECT_EQ(desk.navigator.GetCurrentPlayMode(), Forward(bd::PlaySpeedSlow1));
+    EXPECT_EQ(desk.navigator.Context().GetCurrentPlayMode(), Forward(bd::PlaySpeedSlow1));
 }
 
 /** Every speed gets as far in so many short times as in a long one, and exactly as far as it says.
@@ -98,17 +98,17 @@ TEST(Speed, DoesNotDrift)
         TestDesk once(ListOf({Item(3600)}));
         TestDesk often(ListOf({Item(3600)}));
         for (TestDesk* const desk : {&once, &often}) {
-            desk->Start(12345);
+            desk->Start(Ticks(12345));
             desk->Do(desk->navigator.SetPlayMode(Forward(speed)));
         }
 
-        once.navigator.Advance(passed);
+        once.navigator.Advance(Ticks(passed));
         for (int i = 0; i < 997; ++i) {
-            often.navigator.Advance(101);
+            often.navigator.Advance(Ticks(101));
         }
 
         const std::uint64_t played = passed * ratio.played / ratio.passed;
-        EXPECT_EQ(once.navigator.GetCurrentTimePosition(), 12345 + played);
+        EXPECT_EQ(once.navigator.Context().GetCurrentTimePosition(), 12345 + played);
         EXPECT_EQ(often.Snapshot(), once.Snapshot());
         EXPECT_EQ(often.Take(), once.Take());
     }
@@ -120,18 +120,18 @@ TEST(Speed, ReachesTheNextChangeWhenTimeToNextChangeSaysSo)
          {bd::PlaySpeedSlow5, bd::PlaySpeedSlow2, bd::PlaySpeedNormal, bd::PlaySpeedFast1,
           bd::PlaySpeedFast6, bd::PlaySpeedFast12}) {
         SCOPED_TRACE(speed);
-        TestDesk desk(ListOf({Item(100)}, {Link(0, 1), Link(0, 12347)}));
+        TestDesk desk(ListOf({Item(100)}, {Link(0, Ticks(1)), Link(0, Ticks(12347))}));
         desk.Start();
         desk.Do(desk.navigator.SetPlayMode(Forward(speed)));
         for (int change = 0; change < 3; ++change) {
-            const std::optional<std::uint64_t> next = desk.navigator.TimeToNextChange();
+            const std::optional<Ticks> next = desk.navigator.TimeToNextChange();
             ASSERT_TRUE(next);
-            if (*next > 0) {
-                desk.navigator.Advance(*next - 1);
+            if (*next > Ticks(0)) {
+                desk.navigator.Advance(*next - Ticks(1));
                 EXPECT_EQ(desk.Take(), "");
-                desk.navigator.Advance(1);
+                desk.navigator.Advance(Ticks(1));
             } else {
-                desk.navigator.Advance(0);
+                desk.navigator.Advance(Ticks(0));
             }
             EXPECT_NE(desk.Take(), "");
         }
@@ -143,14 +143,14 @@ TEST(Speed, OfAPlaybackThatWasStoppedLeavesNothingToTheNext)
     TestDesk desk(ListOf({Item(10)}));
     desk.Start();
     desk.Do(desk.navigator.SetPlayMode(Forward(bd::PlaySpeedSlow5)));
-    desk.navigator.Advance(31);
+    desk.navigator.Advance(Ticks(31));
     desk.Do(desk.navigator.Stop());
 
     desk.Start();
 
     EXPECT_EQ(desk.navigator.TimeToNextChange(), Second);
-    desk.navigator.Advance(100);
-    EXPECT_EQ(desk.navigator.GetCurrentTimePosition(), 100);
+    desk.navigator.Advance(Ticks(100));
+    EXPECT_EQ(desk.navigator.Context().GetCurrentTimePosition(), 100);
 }
 
 TEST(Speed, IsKeptIntoTheNextItem)
@@ -167,12 +167,12 @@ TEST(Speed, IsKeptIntoTheNextItem)
 
 TEST(Backward, PassesItemsChaptersAndMarksTheOtherWayRound)
 {
-    TestDesk desk(ListOf({Item(2), Item(2)},
-                         {Entry(0, 0), Entry(0, Second), Link(1, 100), Entry(1, Second)}));
-    desk.Start(3 * Second + 10);
+    TestDesk desk(ListOf({Item(2), Item(2)}, {Entry(0, Ticks(0)), Entry(0, Second),
+                                              Link(1, Ticks(100)), Entry(1, Second)}));
+    desk.Start(3 * Second + Ticks(10));
 
     EXPECT_TRUE(desk.navigator.SetPlayMode(Backward(bd::PlaySpeedNormal)).IsDone());
-    desk.navigator.Advance(2 * Second + 100);
+    desk.navigator.Advance(2 * Second + Ticks(100));
 
     EXPECT_EQ(desk.Take(), "3+10 PlayMode(1, 5)\n"
                            "3+20 CurrentTimePosition(135000)\n"
@@ -184,22 +184,22 @@ TEST(Backward, PassesItemsChaptersAndMarksTheOtherWayRound)
                            "5+20 CurrentTimePosition(45000)\n"
                            "5+20 MarkInfo(7, 1, 45000)\n"
                            "5+21 ChapterNumber(1)\n");
-    EXPECT_EQ(desk.navigator.GetCurrentTimePosition(), Second - 90);
+    EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), Second - Ticks(90));
 }
 
 TEST(Backward, TurnsAroundAtTheStart)
 {
-    TestDesk desk(ListOf({Item(10)}, {Entry(0, 0)}));
+    TestDesk desk(ListOf({Item(10)}, {Entry(0, Ticks(0))}));
     desk.Start(Second / 2);
     desk.Do(desk.navigator.SetPlayMode(Backward(bd::PlaySpeedFast1)));
 
-    desk.navigator.Advance(Second + 11250);
+    desk.navigator.Advance(Second + Ticks(11250));
 
     EXPECT_EQ(desk.Take(), "0+33750 CurrentTimePosition(0)\n"
                            "0+33750 MarkInfo(7, 0, 0)\n"
                            "0+33750 PlayMode(0, 5)\n"
                            "1+33750 CurrentTimePosition(45000)\n");
-    EXPECT_EQ(desk.navigator.GetPlayMode(), bd::PlayMode());
+    EXPECT_EQ(desk.navigator.Context().GetPlayMode(), bd::PlayMode());
 }
 
 TEST(Backward, TurnsAroundAtOnceAtTheStart)
@@ -208,7 +208,7 @@ TEST(Backward, TurnsAroundAtOnceAtTheStart)
     desk.Start();
     desk.Do(desk.navigator.SetPlayMode(Backward(bd::PlaySpeedNormal)));
 
-    EXPECT_EQ(desk.navigator.TimeToNextChange(), 0);
+    EXPECT_EQ(desk.navigator.TimeToNextChange(), Ticks(0));
     desk.navigator.Advance(Second);
 
     EXPECT_EQ(desk.Take(), "0 PlayMode(0, 5)\n"
@@ -217,11 +217,12 @@ TEST(Backward, TurnsAroundAtOnceAtTheStart)
 
 TEST(Backward, EntersAnItemOfOneTickBeforeItTurnsAround)
 {
-    TestDesk desk(ListOf({ItemOfTicks(1), Item(10)}, {Entry(0, 0), Entry(1, 0)}));
-    desk.Start(10);
+    TestDesk desk(
+        ListOf({ItemOfTicks(Ticks(1)), Item(10)}, {Entry(0, Ticks(0)), Entry(1, Ticks(0))}));
+    desk.Start(Ticks(10));
     desk.Do(desk.navigator.SetPlayMode(Backward(bd::PlaySpeedNormal)));
 
-    desk.navigator.Advance(11);
+    desk.navigator.Advance(Ticks(11));
 
     EXPECT_EQ(desk.Take(), "0+19 MarkInfo(7, 1, 1)\n"
                            "0+20 CurrentTimePosition(0)\n"
@@ -252,10 +253,10 @@ TEST(Backward, TellsTheStreamsOfTheItemItGetsTo)
     PlayItem withAudio = Item(1);
     withAudio.streams.primaryAudio = {StreamOf(CodingAc3, 0x1100)};
     TestDesk desk(ListOf({withAudio, Item(1)}));
-    desk.Start(Second + 10);
+    desk.Start(Second + Ticks(10));
     desk.Do(desk.navigator.SetPlayMode(Backward(bd::PlaySpeedNormal)));
 
-    desk.navigator.Advance(11);
+    desk.navigator.Advance(Ticks(11));
 
     EXPECT_EQ(desk.Take(), "1+20 CurrentTimePosition(45000)\n"
                            "1+21 PlayItem(7, 0, 6, 15)\n"

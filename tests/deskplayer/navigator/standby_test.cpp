@@ -9,8 +9,6 @@ namespace deskplayer
 namespace
 {
 
-typedef SimulatedNavigator::Status Status;
-
 /** A resume point in which no two numbers are alike. */
 ResumePoint UnusualPoint()
 {
@@ -18,7 +16,7 @@ ResumePoint UnusualPoint()
     point.playList = 99999;
     point.playing = true;
     point.playItem = 0x090A;
-    point.position = 0x0102030405060708;
+    point.position = Ticks(0x0102030405060708);
     point.playMode = bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedFast12);
     point.selection.video = 11;
     point.selection.audio = 12;
@@ -169,8 +167,8 @@ TEST(Standby, GivesOutTheResumeDataAndForgetsIt)
     EXPECT_EQ(heard.rfind("4 SystemSuspended(bytes 66 68 82 49 ", 0), 0) << heard;
     EXPECT_EQ(std::count(heard.begin(), heard.end(), '\n'), 1);
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Standby);
-    EXPECT_EQ(desk.navigator.GetSystemResumeData().size, 0);
-    const std::optional<ResumePoint> point = ReadResumeData(desk.keeper.ResumeData());
+    EXPECT_EQ(desk.navigator.Context().GetSystemResumeData().size, 0);
+    const std::optional<ResumePoint> point = ReadResumeData(desk.desk.ResumeData());
     ASSERT_TRUE(point);
     EXPECT_EQ(point->playList, 7);
     EXPECT_EQ(point->position, 4 * Second);
@@ -184,7 +182,7 @@ TEST(Standby, LastsAsLongAsItLasts)
     desk.Do(desk.navigator.GoToStandby());
 
     EXPECT_EQ(desk.navigator.TimeToNextChange(), std::nullopt);
-    EXPECT_EQ(desk.navigator.Advance(1000000 * Second), 0);
+    EXPECT_EQ(desk.navigator.Advance(1000000 * Second), Ticks(0));
 
     EXPECT_EQ(desk.Take(), "");
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Standby);
@@ -207,9 +205,9 @@ TEST(Standby, ClosesTheMenuAndEndsAStill)
 
 TEST(Standby, IsLeftWithPositionStreamsAndPlayMode)
 {
-    PlayList playList = ListOf({Item(2), RichItem(10)}, {Entry(0, 0), Entry(1, 0)});
+    PlayList playList = ListOf({Item(2), RichItem(10)}, {Entry(0, Ticks(0)), Entry(1, Ticks(0))});
     TestDesk desk(playList);
-    desk.Start(5 * Second + 7);
+    desk.Start(5 * Second + Ticks(7));
     desk.Do(desk.navigator.SelectAudio(2));
     desk.Do(desk.navigator.ShowSubtitles(false));
     desk.Do(desk.navigator.SetPlayMode(bd::PlayMode(bd::PlayDirectionForward, bd::PlaySpeedSlow1)));
@@ -217,7 +215,7 @@ TEST(Standby, IsLeftWithPositionStreamsAndPlayMode)
     desk.Do(desk.navigator.GoToStandby());
     desk.navigator.Advance(60 * Second);
 
-    EXPECT_TRUE(desk.navigator.WakeUp(desk.keeper.ResumeData()).IsDone());
+    EXPECT_TRUE(desk.navigator.WakeUp(desk.desk.ResumeData()).IsDone());
 
     EXPECT_EQ(desk.Take(), "65+7 SystemResumed(true)\n"
                            "65+7 Playlist(7)\n"
@@ -246,7 +244,7 @@ TEST(Standby, IsLeftWithPositionStreamsAndPlayMode)
     TestDesk restarted(playList);
     restarted.Start();
     restarted.Do(restarted.navigator.GoToStandby());
-    restarted.Do(restarted.navigator.WakeUp(desk.keeper.ResumeData()));
+    restarted.Do(restarted.navigator.WakeUp(desk.desk.ResumeData()));
     EXPECT_EQ(restarted.Snapshot(), before) << "in another navigator over the same play list";
 }
 
@@ -257,11 +255,11 @@ TEST(Standby, IsLeftPausedWhenItWasEnteredSo)
     desk.Do(desk.navigator.Pause());
     desk.Do(desk.navigator.GoToStandby());
 
-    desk.navigator.WakeUp(desk.keeper.ResumeData());
+    desk.navigator.WakeUp(desk.desk.ResumeData());
 
     EXPECT_EQ(desk.Take().rfind("4 SystemResumed(false)\n", 0), 0);
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Paused);
-    EXPECT_EQ(desk.navigator.GetCurrentTimePosition(), 4 * Second);
+    EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), 4 * Second);
 }
 
 TEST(Standby, IsLeftIntoTheStillAtTheEndAgain)
@@ -269,7 +267,7 @@ TEST(Standby, IsLeftIntoTheStillAtTheEndAgain)
     TestDesk desk(ListOf({WithTimedStill(Item(1), 5)}));
     desk.Start(2 * Second);
     desk.Do(desk.navigator.GoToStandby());
-    desk.Do(desk.navigator.WakeUp(desk.keeper.ResumeData()));
+    desk.Do(desk.navigator.WakeUp(desk.desk.ResumeData()));
 
     desk.navigator.Advance(10 * Second);
 
@@ -282,18 +280,18 @@ TEST(Standby, IsLeftWhereItWasEnteredInEveryItem)
 {
     const PlayList playList = ListOf(
         {Item(2), Item(0), WithTimedStill(Item(2), 5), WithTimedStill(Item(0), 5), RichItem(2)},
-        {Entry(0, 0), Entry(2, 0), Entry(4, 0)});
+        {Entry(0, Ticks(0)), Entry(2, Ticks(0)), Entry(4, Ticks(0))});
     for (std::uint64_t time = 0; time < 16; ++time) {
         SCOPED_TRACE(time);
         TestDesk desk(playList);
-        desk.Start(time * Second + 22500);
+        desk.Start(time * Second + Ticks(22500));
         const std::string before = desk.Snapshot();
         const std::size_t size = // a still is shown anew, and takes its time again
             desk.navigator.CurrentStatus() == Status::Still ? before.find(" at ") : before.size();
         desk.Do(desk.navigator.GoToStandby());
 
-        desk.Do(desk.navigator.WakeUp(desk.keeper.ResumeData()));
-        desk.navigator.Advance(0);
+        desk.Do(desk.navigator.WakeUp(desk.desk.ResumeData()));
+        desk.navigator.Advance(Ticks(0));
 
         EXPECT_EQ(desk.Snapshot().substr(0, size), before.substr(0, size));
     }
@@ -306,7 +304,7 @@ TEST(Standby, TellsThePlayModeThatWasAskedForWhilePaused)
     desk.Do(desk.navigator.Pause());
     desk.Do(desk.navigator.SetPlayMode(bd::PlayMode(bd::PlayDirectionForward, bd::PlaySpeedSlow1)));
     desk.Do(desk.navigator.GoToStandby());
-    desk.Do(desk.navigator.WakeUp(desk.keeper.ResumeData()));
+    desk.Do(desk.navigator.WakeUp(desk.desk.ResumeData()));
 
     desk.navigator.Continue();
 
@@ -320,7 +318,7 @@ TEST(Standby, EndsARepeat)
     desk.Start();
     desk.Do(desk.navigator.RepeatTitle());
     desk.Do(desk.navigator.GoToStandby());
-    desk.Do(desk.navigator.WakeUp(desk.keeper.ResumeData()));
+    desk.Do(desk.navigator.WakeUp(desk.desk.ResumeData()));
 
     EXPECT_FALSE(desk.navigator.IsRepeating());
 }
@@ -332,14 +330,14 @@ TEST(Standby, EndsInAStopWhenTheResumeDataIsNoGood)
     ResumePoint behindTheEnd;
     behindTheEnd.playList = 7;
     behindTheEnd.playItem = 1;
-    behindTheEnd.position = 10 * Second + 1;
+    behindTheEnd.position = 10 * Second + Ticks(1);
     ResumePoint beforeItsItem;
     beforeItsItem.playList = 7;
     beforeItsItem.playItem = 1;
-    beforeItsItem.position = 5 * Second - 1;
+    beforeItsItem.position = 5 * Second - Ticks(1);
     ResumePoint behindItsItem;
     behindItsItem.playList = 7;
-    behindItsItem.position = 5 * Second + 1;
+    behindItsItem.position = 5 * Second + Ticks(1);
     ResumePoint inNoItem = beforeItsItem;
     inNoItem.playItem = 2;
     std::vector<bd::UInt8> damaged = MakeResumeData(ResumePoint());

@@ -192,7 +192,7 @@ TEST(Streams, OfTextHaveFourStyles)
 
     EXPECT_TRUE(desk.navigator.SelectStyle(4).IsDone());
     EXPECT_EQ(desk.Take(), "1 TextSubtitleStyleInfo(4)\n");
-    EXPECT_EQ(desk.navigator.GetCurrentTextSubtitleStyleNumber(), 4);
+    EXPECT_EQ(desk.navigator.Context().GetCurrentTextSubtitleStyleNumber(), 4);
 }
 
 TEST(Streams, WithoutTextHaveNoStyles)
@@ -316,7 +316,7 @@ TEST(SecondaryStreams, OfASubPathThatIsNotThereAreInStep)
     bd::UInt8 count = 0;
     bool async = true;
 
-    desk.navigator.GetSecondaryVideoInfo(&number, &count, &async);
+    desk.navigator.Context().GetSecondaryVideoInfo(&number, &count, &async);
 
     EXPECT_FALSE(async);
 }

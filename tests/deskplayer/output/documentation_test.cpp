@@ -32,9 +32,9 @@ std::string Example(OutputFormat format)
         const std::unique_ptr<Output> output = MakeOutput(options, stream, clock);
         output->PlayStarted();
         output->PlayItem(800, 0, bd::VideoFormatType1080p, bd::VideoAspectRatioType16x9);
-        clock.Advance(45000 * 58);
+        clock.Advance(Ticks(45000 * 58));
         output->Paused();
-        clock.Advance(45000 * 2);
+        clock.Advance(Ticks(45000 * 2));
         output->Stepped(45000 * 58 + 1877, bd::PlayDirectionForward);
         output->Finished(bdmv::INavControlListener::EndOfMedia);
     }

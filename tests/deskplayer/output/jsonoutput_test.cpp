@@ -39,7 +39,7 @@ protected:
 
 TEST_F(JsonOutputTest, WritesAnObjectALineWithMembersInAFixedOrder)
 {
-    clock.Advance(45000 * 27 + 22500);
+    clock.Advance(Ticks(45000 * 27 + 22500));
 
     listener.Paused();
     listener.AngleInfo(1);

@@ -26,7 +26,7 @@ protected:
 
 TEST_F(TextOutputTest, PrintsTheTimeAndTheCallback)
 {
-    clock.Advance(((1 * 60 + 2) * 60 + 3) * 45000ULL + 45 * 4 + 44);
+    clock.Advance(Ticks(((1 * 60 + 2) * 60 + 3) * 45000ULL + 45 * 4 + 44));
 
     listener.PlayStarted();
 

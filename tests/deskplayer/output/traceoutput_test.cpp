@@ -67,8 +67,8 @@ public:
 
     bdmv::INavigatorListener* operator->() { return &*m_Output; }
 
-    void Pass(std::uint64_t ticks) { m_Clock.Advance(ticks); }
-    void PassSecond() { Pass(45000); }
+    void Pass(Ticks time) { m_Clock.Advance(time); }
+    void PassSecond() { Pass(std::chrono::seconds(1)); }
 
     /** Ends the session. */
     json Trace()
@@ -224,9 +224,9 @@ TEST(TraceOutput, HasOnlyTracksWithSomethingOnThem)
 TEST(TraceOutput, GivesTimesInMicrosecondsRoundedToTheNearest)
 {
     TracedSession session;
-    session.Pass(2); // 44.44 microseconds
+    session.Pass(Ticks(2)); // 44.44 microseconds
     session->JumpOccurred();
-    session.Pass(2); // 88.89 microseconds
+    session.Pass(Ticks(2)); // 88.89 microseconds
     session->JumpOccurred();
 
     const ReadTrace trace(session.Trace());

@@ -16,7 +16,7 @@ namespace
 PlayList TwoItems()
 {
     return ListOf({RichItem(10), WithEndlessStill(RichItem(10))},
-                  {Entry(0, 0), Entry(0, 5 * Second)});
+                  {Entry(0, Ticks(0)), Entry(0, 5 * Second)});
 }
 
 /** Carries out a script of one line or several, all of them at once. */
@@ -225,7 +225,7 @@ TEST(Commands, GoToStandbyAndWakeWithTheDataThatWereKept)
     const std::string before = desk.Snapshot();
 
     EXPECT_TRUE(Perform(desk, "standby").IsDone());
-    EXPECT_EQ(desk.navigator.CurrentStatus(), SimulatedNavigator::Status::Standby);
+    EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Standby);
     EXPECT_TRUE(Perform(desk, "wake").IsDone());
 
     EXPECT_EQ(desk.Snapshot(), before);
@@ -250,7 +250,7 @@ TEST(Commands, PlayAtEveryStepOfSpeedAndNoOther)
         desk.Start(Second);
         for (int step = 1; step <= kind.steps; ++step) {
             desk.Do(Perform(desk, kind.words + std::to_string(step)));
-            const bd::PlayMode& mode = desk.navigator.GetCurrentPlayMode();
+            const bd::PlayMode& mode = desk.navigator.Context().GetCurrentPlayMode();
             EXPECT_EQ(mode.Direction(), kind.direction);
             EXPECT_EQ(mode.Speed(), bd::PlaySpeedNormal + kind.towards * step);
         }

@@ -20,14 +20,12 @@ namespace deskplayer
 namespace
 {
 
-typedef SimulatedNavigator::Status Status;
-
 constexpr char ControlC = '\x03';
 
 /** An item of an hour, so that nothing ends by itself, with chapters every ten minutes. */
 PlayList LongPlayList()
 {
-    return ListOf({RichItem(3600), RichItem(10)}, {Entry(0, 0), Entry(0, 600 * Second)});
+    return ListOf({RichItem(3600), RichItem(10)}, {Entry(0, Ticks(0)), Entry(0, 600 * Second)});
 }
 
 /** A pipe that keys have been written to. */
@@ -90,7 +88,7 @@ std::string Press(TestDesk& desk, const std::string& pressed)
     std::string refusals;
     Keys keys(pressed);
     keys.End();
-    PlayByRemote(desk.desk, desk.clock, keys.Descriptor(),
+    PlayByRemote(desk.desk, keys.Descriptor(),
                  [&refusals](const std::string& reason) { refusals += reason + "\n"; });
     return refusals;
 }
@@ -182,7 +180,7 @@ TEST(Remote, GoesToStandbyAndComesBack)
     TestDesk awake(LongPlayList());
     HeardOfKeys(awake, "n", "zZ");
     EXPECT_EQ(awake.navigator.CurrentStatus(), Status::Playing);
-    EXPECT_GE(awake.navigator.GetCurrentTimePosition(), 600 * Second);
+    EXPECT_GE(Ticks(awake.navigator.Context().GetCurrentTimePosition()), 600 * Second);
 }
 
 TEST(Remote, PlaysNoFasterThanTheFastest)
@@ -190,7 +188,7 @@ TEST(Remote, PlaysNoFasterThanTheFastest)
     TestDesk desk(LongPlayList());
 
     HeardOfKeys(desk, " ", std::string(20, 'f'));
-    EXPECT_EQ(desk.navigator.GetPlayMode(),
+    EXPECT_EQ(desk.navigator.Context().GetPlayMode(),
               bd::PlayMode(bd::PlayDirectionForward, bd::PlaySpeedFast12));
 }
 
@@ -199,31 +197,30 @@ TEST(Remote, PlaysFasterBackwardStepByStep)
     TestDesk desk(LongPlayList());
 
     HeardOfKeys(desk, " ", "frr");
-    EXPECT_EQ(desk.navigator.GetPlayMode(),
+    EXPECT_EQ(desk.navigator.Context().GetPlayMode(),
               bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedFast2));
 }
 
 TEST(Remote, LeavesAStill)
 {
-    TestDesk desk(ListOf({WithEndlessStill(ItemOfTicks(1))}));
+    TestDesk desk(ListOf({WithEndlessStill(ItemOfTicks(Ticks(1)))}));
     class Presser : public bdmv::NavigatorListenerAdapter
     {
     public:
         void StillOn() override { onStill(); }
         std::function<void()> onStill;
     } presser;
-    desk.delivery.Listeners().AddListener(&presser);
+    desk.desk.Listeners().AddListener(&presser);
     int ends[2];
     ASSERT_EQ(pipe(ends), 0);
     presser.onStill = [&ends] { EXPECT_EQ(write(ends[1], "o", 1), 1); };
 
-    PlayByRemote(desk.desk, desk.clock, ends[0],
-                 [](const std::string& reason) { ADD_FAILURE() << reason; });
+    PlayByRemote(desk.desk, ends[0], [](const std::string& reason) { ADD_FAILURE() << reason; });
 
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Finished);
     close(ends[0]);
     close(ends[1]);
-    desk.delivery.Listeners().RemoveListener(&presser);
+    desk.desk.Listeners().RemoveListener(&presser);
 }
 
 TEST(Remote, EndsWithQAndReadsNoFurther)
@@ -231,7 +228,7 @@ TEST(Remote, EndsWithQAndReadsNoFurther)
     TestDesk desk(LongPlayList());
     Keys keys(" q  x");
 
-    PlayByRemote(desk.desk, desk.clock, keys.Descriptor(), {});
+    PlayByRemote(desk.desk, keys.Descriptor(), {});
 
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Paused);
     EXPECT_EQ(keys.Left(), 3);
@@ -243,7 +240,7 @@ TEST(Remote, EndsWithTheInput)
     Keys keys(" ");
     keys.End();
 
-    PlayByRemote(desk.desk, desk.clock, keys.Descriptor(), {});
+    PlayByRemote(desk.desk, keys.Descriptor(), {});
 
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Paused);
 }
@@ -252,7 +249,7 @@ TEST(Remote, EndsWithoutAnInput)
 {
     TestDesk desk(LongPlayList());
 
-    PlayByRemote(desk.desk, desk.clock, 1000000, {});
+    PlayByRemote(desk.desk, 1000000, {});
 
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Playing);
 }
@@ -262,7 +259,7 @@ TEST(Remote, EndsWithThePlayback)
     TestDesk desk(ListOf({ItemOfTicks(Second / 10)}));
     Keys keys("");
 
-    PlayByRemote(desk.desk, desk.clock, keys.Descriptor(), {});
+    PlayByRemote(desk.desk, keys.Descriptor(), {});
 
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Finished);
     EXPECT_GE(desk.clock.Now(), Second / 10) << "on the wall clock";
@@ -369,16 +366,16 @@ TEST(RemoteTerminal, GivesSingleKeysWithoutShowingThem)
         meanwhile = terminal.Settings();
         terminal.Press(" q");
     });
-    desk.delivery.Listeners().AddListener(&presser);
+    desk.desk.Listeners().AddListener(&presser);
 
-    PlayByRemote(desk.desk, desk.clock, terminal.Descriptor(), {});
+    PlayByRemote(desk.desk, terminal.Descriptor(), {});
 
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Paused);
     EXPECT_EQ(meanwhile.c_lflag & (ICANON | ECHO), 0);
     EXPECT_EQ(terminal.Screen(), "");
     EXPECT_NE(before.c_lflag & (ICANON | ECHO), 0) << "there was something to change";
     EXPECT_TRUE(SameSettings(terminal.Settings(), before));
-    desk.delivery.Listeners().RemoveListener(&presser);
+    desk.desk.Listeners().RemoveListener(&presser);
 }
 
 TEST(RemoteTerminal, TakesControlCForAKeyThatQuits)
@@ -387,13 +384,13 @@ TEST(RemoteTerminal, TakesControlCForAKeyThatQuits)
     const Terminal terminal;
     const termios before = terminal.Settings();
     AtStart presser([&terminal] { terminal.Press({ControlC, ' ', 'q'}); });
-    desk.delivery.Listeners().AddListener(&presser);
+    desk.desk.Listeners().AddListener(&presser);
 
-    PlayByRemote(desk.desk, desk.clock, terminal.Descriptor(), {});
+    PlayByRemote(desk.desk, terminal.Descriptor(), {});
 
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Playing) << "the key behind it was not read";
     EXPECT_TRUE(SameSettings(terminal.Settings(), before));
-    desk.delivery.Listeners().RemoveListener(&presser);
+    desk.desk.Listeners().RemoveListener(&presser);
 }
 
 TEST(RemoteTerminal, IsPutBackWhenASignalEndsTheProgram)
@@ -405,8 +402,8 @@ TEST(RemoteTerminal, IsPutBackWhenASignalEndsTheProgram)
             {
                 TestDesk desk(LongPlayList());
                 AtStart ender([signal] { kill(getpid(), signal); });
-                desk.delivery.Listeners().AddListener(&ender);
-                PlayByRemote(desk.desk, desk.clock, terminal.Descriptor(), {});
+                desk.desk.Listeners().AddListener(&ender);
+                PlayByRemote(desk.desk, terminal.Descriptor(), {});
             },
             testing::KilledBySignal(signal), "");
         EXPECT_TRUE(SameSettings(terminal.Settings(), before)) << signal;
@@ -425,25 +422,25 @@ TEST(RemoteTerminal, LeavesSignalsAsItFoundThem)
         raise(SIGHUP);
         terminal.Press("q");
     });
-    desk.delivery.Listeners().AddListener(&presser);
+    desk.desk.Listeners().AddListener(&presser);
 
-    PlayByRemote(desk.desk, desk.clock, terminal.Descriptor(), {});
+    PlayByRemote(desk.desk, terminal.Descriptor(), {});
 
     struct sigaction after = {};
     sigaction(SIGHUP, &before, &after);
     EXPECT_EQ(after.sa_handler, SIG_IGN);
     sigaction(SIGTERM, nullptr, &after);
     EXPECT_EQ(after.sa_handler, SIG_DFL);
-    desk.delivery.Listeners().RemoveListener(&presser);
+    desk.desk.Listeners().RemoveListener(&presser);
 }
 
 TEST(RemoteTerminal, IsPutBackWhenPlaybackEnds)
 {
-    TestDesk desk(ListOf({ItemOfTicks(100)}));
+    TestDesk desk(ListOf({ItemOfTicks(Ticks(100))}));
     const Terminal terminal;
     const termios before = terminal.Settings();
 
-    PlayByRemote(desk.desk, desk.clock, terminal.Descriptor(), {});
+    PlayByRemote(desk.desk, terminal.Descriptor(), {});
 
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Finished);
     EXPECT_TRUE(SameSettings(terminal.Settings(), before));
@@ -455,13 +452,12 @@ TEST(RemoteTerminal, IsPutBackWhenAListenerThrows)
     const Terminal terminal;
     const termios before = terminal.Settings();
     AtStart thrower([] { throw std::runtime_error("no"); });
-    desk.delivery.Listeners().AddListener(&thrower);
+    desk.desk.Listeners().AddListener(&thrower);
 
-    EXPECT_THROW(PlayByRemote(desk.desk, desk.clock, terminal.Descriptor(), {}),
-                 std::runtime_error);
+    EXPECT_THROW(PlayByRemote(desk.desk, terminal.Descriptor(), {}), std::runtime_error);
 
     EXPECT_TRUE(SameSettings(terminal.Settings(), before));
-    desk.delivery.Listeners().RemoveListener(&thrower);
+    desk.desk.Listeners().RemoveListener(&thrower);
 }
 
 } // namespace

@@ -14,9 +14,9 @@ namespace
 
 using Values = std::vector<std::uint64_t>;
 
-constexpr std::uint64_t Millisecond = 45;
-constexpr std::uint64_t Second = 1000 * Millisecond;
-constexpr std::uint64_t Hour = 3600 * Second;
+constexpr Ticks Millisecond = std::chrono::milliseconds(1);
+constexpr Ticks Second = std::chrono::seconds(1);
+constexpr Ticks Hour = std::chrono::hours(1);
 
 enum Command : std::size_t {
     CommandPlay,
@@ -76,11 +76,11 @@ std::string ErrorOf(std::string_view text, const std::vector<CommandSyntax>& syn
 }
 
 /** The value of the TIME @p time. */
-std::uint64_t Ticks(const std::string& time)
+Ticks TimeOf(const std::string& time)
 {
     const ScriptStep step = ParseLine("seek " + time);
     EXPECT_EQ(step.values.size(), 1u);
-    return step.values.empty() ? 0 : step.values.front();
+    return Ticks(step.values.empty() ? 0 : step.values.front());
 }
 
 /** What is said of @p time, up to what was expected in its place. */
@@ -165,7 +165,7 @@ TEST(ParseScript, GivesTheValuesOfPlaceholdersInOrder)
 {
     const ScriptStep step = ParseLine("loop 1s to 2s times 3");
     EXPECT_EQ(step.command, CommandLoop);
-    EXPECT_EQ(step.values, (Values{Second, 2 * Second, 3}));
+    EXPECT_EQ(step.values, (Values{Second.count(), (2 * Second).count(), 3}));
 }
 
 TEST(ParseScript, LeavesTheTimeOfALineOutOfTheValues)
@@ -192,7 +192,7 @@ TEST(ParseScript, ChoosesTheFirstOfPatternsThatFit)
     const auto steps = ParseScript("go 5\n", "file", {{"go TIME", ""}, {"go NUMBER", ""}});
     ASSERT_EQ(steps.size(), 1u);
     EXPECT_EQ(steps[0].command, 0u);
-    EXPECT_EQ(steps[0].values, Values{5 * Second});
+    EXPECT_EQ(steps[0].values, Values{(5 * Second).count()});
 }
 
 TEST(ParseScript, ReadsNumbersUpToTheGreatest)
@@ -204,7 +204,7 @@ TEST(ParseScript, ReadsNumbersUpToTheGreatest)
 
 TEST(ParseScript, StartsAtTheStartOfTheSession)
 {
-    EXPECT_EQ(ParseLine("play").time, 0u);
+    EXPECT_EQ(ParseLine("play").time, Ticks(0));
 }
 
 TEST(ParseScript, CarriesOutALineAtTheTimeItNames)
@@ -234,47 +234,47 @@ TEST(ParseScript, AcceptsTheTimeOfTheLineBefore)
 
 TEST(ParseScript, ReadsTimesWithColons)
 {
-    EXPECT_EQ(Ticks("1:02:03.5"), Hour + 123 * Second + 500 * Millisecond);
-    EXPECT_EQ(Ticks("00:01:30.500"), 90 * Second + 500 * Millisecond);
-    EXPECT_EQ(Ticks("02:03"), 123 * Second);
-    EXPECT_EQ(Ticks("59:59"), 3599 * Second);
+    EXPECT_EQ(TimeOf("1:02:03.5"), Hour + 123 * Second + 500 * Millisecond);
+    EXPECT_EQ(TimeOf("00:01:30.500"), 90 * Second + 500 * Millisecond);
+    EXPECT_EQ(TimeOf("02:03"), 123 * Second);
+    EXPECT_EQ(TimeOf("59:59"), 3599 * Second);
 }
 
 TEST(ParseScript, ReadsSecondsWithoutAUnit)
 {
-    EXPECT_EQ(Ticks("3.25"), 3250 * Millisecond);
-    EXPECT_EQ(Ticks("0"), 0u);
+    EXPECT_EQ(TimeOf("3.25"), 3250 * Millisecond);
+    EXPECT_EQ(TimeOf("0"), 0u);
 }
 
 TEST(ParseScript, ReadsTimesWithAUnit)
 {
-    EXPECT_EQ(Ticks("2s"), 2 * Second);
-    EXPECT_EQ(Ticks("500ms"), 500 * Millisecond);
-    EXPECT_EQ(Ticks("1.5m"), 90 * Second);
-    EXPECT_EQ(Ticks("1h"), Hour);
+    EXPECT_EQ(TimeOf("2s"), 2 * Second);
+    EXPECT_EQ(TimeOf("500ms"), 500 * Millisecond);
+    EXPECT_EQ(TimeOf("1.5m"), 90 * Second);
+    EXPECT_EQ(TimeOf("1h"), Hour);
 }
 
 TEST(ParseScript, ReadsUpToThreeDecimals)
 {
-    EXPECT_EQ(Ticks("0.1"), 100 * Millisecond);
-    EXPECT_EQ(Ticks("0.02"), 20 * Millisecond);
-    EXPECT_EQ(Ticks("0.003s"), 3 * Millisecond);
-    EXPECT_EQ(Ticks("0.001h"), 3600 * Millisecond);
-    EXPECT_EQ(Ticks("2.000ms"), 2 * Millisecond);
+    EXPECT_EQ(TimeOf("0.1"), 100 * Millisecond);
+    EXPECT_EQ(TimeOf("0.02"), 20 * Millisecond);
+    EXPECT_EQ(TimeOf("0.003s"), 3 * Millisecond);
+    EXPECT_EQ(TimeOf("0.001h"), 3600 * Millisecond);
+    EXPECT_EQ(TimeOf("2.000ms"), 2 * Millisecond);
 }
 
 TEST(ParseScript, LetsTheGreatestUnitOfATimeGoBeyondTheNext)
 {
-    EXPECT_EQ(Ticks("75:00"), 75 * 60 * Second);
-    EXPECT_EQ(Ticks("90"), 90 * Second);
-    EXPECT_EQ(Ticks("90m"), 90 * 60 * Second);
-    EXPECT_EQ(Ticks("100:00:00"), 100 * Hour);
+    EXPECT_EQ(TimeOf("75:00"), 75 * 60 * Second);
+    EXPECT_EQ(TimeOf("90"), 90 * Second);
+    EXPECT_EQ(TimeOf("90m"), 90 * 60 * Second);
+    EXPECT_EQ(TimeOf("100:00:00"), 100 * Hour);
 }
 
 TEST(ParseScript, ReadsTimesUpToTheLongestSession)
 {
-    EXPECT_EQ(Ticks("1000h"), LongestSession);
-    EXPECT_EQ(Ticks("1000:00:00.000"), LongestSession);
+    EXPECT_EQ(TimeOf("1000h"), LongestSession);
+    EXPECT_EQ(TimeOf("1000:00:00.000"), LongestSession);
     EXPECT_EQ(Parse("at 999h play\nafter 1h play\n")[1].time, LongestSession);
 }
 

@@ -12,8 +12,6 @@ namespace deskplayer
 namespace
 {
 
-typedef SimulatedNavigator::Status Status;
-
 /** Carries out a script and collects what the hooks are called with. */
 class SessionTest : public testing::Test
 {
@@ -23,19 +21,18 @@ protected:
     {
         std::string heard;
         SessionHooks hooks;
-        hooks.beforeTimePasses = [this, &desk](std::uint64_t ticks) {
-            timesPassed.emplace_back(desk.clock.Now(), ticks);
+        hooks.beforeTimePasses = [this, &desk](Ticks time) {
+            timesPassed.emplace_back(desk.clock.Now(), time);
         };
         hooks.onRefused = [&heard, &desk](std::size_t line, const std::string& reason) {
             heard += desk.TakeWithoutPositions();
             heard += "line " + std::to_string(line) + ": " + reason + "\n";
         };
-        PlaySession(ParseScript(script, "a.session", CommandSyntaxes()), desk.desk, desk.clock,
-                    hooks);
+        PlaySession(ParseScript(script, "a.session", CommandSyntaxes()), desk.desk, hooks);
         return heard + desk.TakeWithoutPositions();
     }
 
-    std::vector<std::pair<std::uint64_t, std::uint64_t>> timesPassed; ///< from when, how long
+    std::vector<std::pair<Ticks, Ticks>> timesPassed; ///< from when, how long
 };
 
 const char* const StartOfItem = "0 PlayStarted()\n"
@@ -76,7 +73,7 @@ TEST_F(SessionTest, NeedsNoHooks)
 {
     TestDesk desk(ListOf({Item(1)}));
 
-    PlaySession(ParseScript("play\nstep\n", "a.session", CommandSyntaxes()), desk.desk, desk.clock,
+    PlaySession(ParseScript("play\nstep\n", "a.session", CommandSyntaxes()), desk.desk,
                 SessionHooks());
 
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Finished);
@@ -99,7 +96,7 @@ TEST_F(SessionTest, DoesNothingWithoutSteps)
     TestDesk desk(ListOf({Item(1)}));
 
     EXPECT_EQ(PlayScript(desk, "# nothing\n"), "");
-    EXPECT_EQ(desk.clock.Now(), 0);
+    EXPECT_EQ(desk.clock.Now(), Ticks(0));
 }
 
 TEST_F(SessionTest, EndsWherePlaybackWouldStand)
@@ -123,7 +120,7 @@ TEST_F(SessionTest, EndsWherePlaybackWouldGoRoundForEver)
     for (const char* const repeat :
          {"repeat a\nafter 1s repeat b", "repeat chapter", "repeat title"}) {
         SCOPED_TRACE(repeat);
-        TestDesk desk(ListOf({Item(10)}, {Entry(0, 0)}));
+        TestDesk desk(ListOf({Item(10)}, {Entry(0, Ticks(0))}));
         PlayScript(desk, std::string("play\nafter 2s ") + repeat + "\nafter 30s step\n");
         EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Playing);
         EXPECT_GE(desk.clock.Now(), 32 * Second);
@@ -143,14 +140,14 @@ TEST_F(SessionTest, GoesOnToTheEndWhenPlaybackHasLeftTheRepeat)
 
 TEST_F(SessionTest, WaitsBeforeTimePassesChangeByChange)
 {
-    TestDesk desk(ListOf({Item(2)}, {Link(0, 100)}));
+    TestDesk desk(ListOf({Item(2)}, {Link(0, Ticks(100))}));
 
     PlayScript(desk, "after 5s play\nafter 1.5s pause\nafter 10s continue\n");
 
-    typedef std::vector<std::pair<std::uint64_t, std::uint64_t>> Times;
-    EXPECT_EQ(timesPassed, (Times{{0, 5 * Second},
-                                  {5 * Second, 100},
-                                  {5 * Second + 100, Second - 100},
+    typedef std::vector<std::pair<Ticks, Ticks>> Times;
+    EXPECT_EQ(timesPassed, (Times{{Ticks(0), 5 * Second},
+                                  {5 * Second, Ticks(100)},
+                                  {5 * Second + Ticks(100), Second - Ticks(100)},
                                   {6 * Second, Second / 2},
                                   {6 * Second + Second / 2, 10 * Second},
                                   {16 * Second + Second / 2, Second / 2}}));
@@ -165,17 +162,17 @@ TEST_F(SessionTest, HandsOnWhatAListenerThrows)
     };
     TestDesk desk(ListOf({Item(10)}));
     Thrower thrower;
-    desk.delivery.Listeners().AddListener(&thrower);
+    desk.desk.Listeners().AddListener(&thrower);
 
     EXPECT_THROW(PlayScript(desk, "play\npause\n"), std::runtime_error);
 
-    desk.delivery.Listeners().RemoveListener(&thrower);
+    desk.desk.Listeners().RemoveListener(&thrower);
 }
 
 /** What a listener hears of a play list without a viewer. */
 std::string HeardFromStartToEnd(TestDesk& desk)
 {
-    PlayFromStartToEnd(desk.desk, desk.clock, SessionHooks());
+    PlayFromStartToEnd(desk.desk, SessionHooks());
     return desk.TakeWithoutPositions();
 }
 
@@ -214,7 +211,7 @@ TEST(FromStartToEnd, FinishesWhenThereIsNothingToPlay)
 
 TEST(FromStartToEnd, FinishesWhenNothingHasLength)
 {
-    TestDesk desk(ListOf({Item(0), WithTimedStill(Item(0), 0), Item(0)}, {Entry(1, 0)}));
+    TestDesk desk(ListOf({Item(0), WithTimedStill(Item(0), 0), Item(0)}, {Entry(1, Ticks(0))}));
 
     const std::string heard = HeardFromStartToEnd(desk);
 
@@ -224,14 +221,14 @@ TEST(FromStartToEnd, FinishesWhenNothingHasLength)
 TEST(FromStartToEnd, WaitsBeforeTimePasses)
 {
     TestDesk desk(ListOf({WithEndlessStill(Item(2))}));
-    std::uint64_t waited = 0;
+    Ticks waited(0);
     SessionHooks hooks;
-    hooks.beforeTimePasses = [&waited, &desk](std::uint64_t ticks) {
+    hooks.beforeTimePasses = [&waited, &desk](Ticks time) {
         EXPECT_EQ(desk.clock.Now(), waited);
-        waited += ticks;
+        waited += time;
     };
 
-    PlayFromStartToEnd(desk.desk, desk.clock, hooks);
+    PlayFromStartToEnd(desk.desk, hooks);
 
     EXPECT_EQ(waited, 5 * Second);
     EXPECT_EQ(desk.clock.Now(), waited);
@@ -241,7 +238,7 @@ TEST(FromStartToEnd, TellsEverySecondOfTwoHours)
 {
     TestDesk desk(ListOf({Item(7200)}));
 
-    PlayFromStartToEnd(desk.desk, desk.clock, SessionHooks());
+    PlayFromStartToEnd(desk.desk, SessionHooks());
 
     const std::string heard = desk.Take();
     const std::string others = std::string(StartOfItem) + "7200 Finished(0)\n";

@@ -2,8 +2,8 @@
  * @file
  * Words of which a user writes one or several.
  */
-#ifndef DESKPLAYER_OUTPUT_CHOICE_H
-#define DESKPLAYER_OUTPUT_CHOICE_H
+#ifndef DESKPLAYER_TEXT_CHOICE_H
+#define DESKPLAYER_TEXT_CHOICE_H
 
 #include <cstddef>
 #include <string>

@@ -1,4 +1,4 @@
-#include "output/timetext.h"
+#include "text/timetext.h"
 
 #include <array>
 #include <cinttypes>
@@ -7,9 +7,9 @@
 namespace deskplayer
 {
 
-std::string TimeText(std::uint64_t ticks)
+std::string TimeText(Ticks time)
 {
-    const std::uint64_t milliseconds = ticks / 45;
+    const std::uint64_t milliseconds = time.count() / (TicksPerSecond / 1000);
     const std::uint64_t seconds = milliseconds / 1000;
     std::array<char, 32> text{};
     std::snprintf(text.data(), text.size(), "%02" PRIu64 ":%02" PRIu64 ":%02" PRIu64 ".%03" PRIu64,

@@ -1,9 +1,9 @@
-#include "output/choice.h"
+#include "text/choice.h"
 
 #include <algorithm>
 #include <stdexcept>
 
-#include "disc/errors.h"
+#include "text/printable.h"
 
 namespace deskplayer
 {

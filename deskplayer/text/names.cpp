@@ -1,4 +1,4 @@
-#include "output/names.h"
+#include "text/names.h"
 
 namespace deskplayer
 {

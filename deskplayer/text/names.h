@@ -2,8 +2,8 @@
  * @file
  * Values as a person reads them. A value without a name gives its number.
  */
-#ifndef DESKPLAYER_OUTPUT_NAMES_H
-#define DESKPLAYER_OUTPUT_NAMES_H
+#ifndef DESKPLAYER_TEXT_NAMES_H
+#define DESKPLAYER_TEXT_NAMES_H
 
 #include <string>
 #include <vector>

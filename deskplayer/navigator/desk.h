@@ -1,0 +1,65 @@
+/**
+ * @file
+ * A navigator on a desk: what a program makes first.
+ *
+ * @code
+ * Desk desk(LoadPlayList(disc, 800, disc.ReadPlayList(800)));
+ * desk.Listeners().AddListener(&listener);
+ * PlayFromStartToEnd(desk, {});
+ * @endcode
+ */
+#ifndef DESKPLAYER_NAVIGATOR_DESK_H
+#define DESKPLAYER_NAVIGATOR_DESK_H
+
+#include <utility>
+#include <vector>
+
+#include "navigator/eventdelivery.h"
+#include "navigator/resumedatakeeper.h"
+#include "navigator/simulatednavigator.h"
+#include "navigator/virtualclock.h"
+
+namespace deskplayer
+{
+
+/**
+ * Owns a clock, a delivering thread, a navigator, and the listener that keeps its resume data, which
+ * is registered before all others.
+ *
+ * All operations but Listeners() belong to one thread. Every event has been delivered when an
+ * operation of the navigator returns, so a listener may be destroyed before the desk once it has
+ * been removed, or once no more operations follow.
+ */
+class Desk
+{
+public:
+    /** Starts the delivering thread. */
+    explicit Desk(LoadedPlayList playList) : m_Navigator(std::move(playList), m_Clock, m_Delivery)
+    {
+        Listeners().AddListener(&m_Keeper);
+    }
+
+    Desk(const Desk&) = delete;
+    Desk& operator=(const Desk&) = delete;
+
+    /** Where clients register. Any thread. */
+    bdmv::INavigatorEvent::Listeners& Listeners() { return m_Delivery.Listeners(); }
+
+    SimulatedNavigator& Navigator() { return m_Navigator; }
+
+    /** The time of the session. Any thread may read it. */
+    VirtualClock& Clock() { return m_Clock; }
+
+    /** The data that the last standby handed to listeners; empty before. */
+    const std::vector<bd::UInt8>& ResumeData() const { return m_Keeper.ResumeData(); }
+
+private:
+    VirtualClock m_Clock;
+    ResumeDataKeeper m_Keeper;
+    EventDelivery m_Delivery; ///< ends before what its thread uses
+    SimulatedNavigator m_Navigator;
+};
+
+} // namespace deskplayer
+
+#endif

@@ -1,0 +1,78 @@
+#include "navigator/permission.h"
+
+#include <algorithm>
+#include <string>
+
+#include "database/uomasktable.h"
+#include "text/names.h"
+
+namespace deskplayer
+{
+
+namespace
+{
+
+const char* NameOf(Status status)
+{
+    switch (status) {
+    case Status::Stopped:
+        return "stopped";
+    case Status::Playing:
+        return "playing";
+    case Status::Paused:
+        return "paused";
+    case Status::Still:
+        return "in a still";
+    case Status::Suspended:
+        return "suspended";
+    case Status::Standby:
+        return "in standby";
+    case Status::Finished:
+        return "at its end";
+    }
+    return "";
+}
+
+} // namespace
+
+Outcome Permission::CheckMask(bd::UserOperationMaskDef operation) const
+{
+    if (m_rState.status == Status::Stopped || m_rState.status == Status::Standby ||
+        m_rState.status == Status::Finished) {
+        return Outcome::Done(); // no mask is in force
+    }
+    const LoadedPlayList& loaded = m_rPlayhead.LoadedList();
+    const PlayItem* const item = m_rPlayhead.CurrentItem();
+    const bool byPlayList =
+        bdmv::UOMaskTable(loaded.playList.applicationInfo.uoMask).IsSet(operation);
+    const bool byItem = item != nullptr && bdmv::UOMaskTable(item->uoMask).IsSet(operation);
+    if (!byPlayList && !byItem) {
+        return Outcome::Done();
+    }
+    const std::string list = "play list " + std::to_string(loaded.number);
+    const std::string who = "play item " + std::to_string(m_rState.item);
+    return Outcome::Refused(deskplayer::NameOf(operation) + " is forbidden by " +
+                            (!byItem       ? list
+                             : !byPlayList ? who
+                                           : list + " and its " + who));
+}
+
+Outcome Permission::CheckStatus(std::initializer_list<Status> statuses) const
+{
+    if (std::find(statuses.begin(), statuses.end(), m_rState.status) != statuses.end()) {
+        return Outcome::Done();
+    }
+    std::string expected;
+    for (const Status status : statuses) {
+        expected += (expected.empty() ? "" : " or ") + std::string(NameOf(status));
+    }
+    return Outcome::Refused(std::string("playback is ") + NameOf(m_rState.status) + ", not " +
+                            expected);
+}
+
+Outcome Permission::CheckActive() const
+{
+    return CheckStatus({Status::Playing, Status::Paused, Status::Still});
+}
+
+} // namespace deskplayer

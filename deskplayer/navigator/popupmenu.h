@@ -1,0 +1,66 @@
+/**
+ * @file
+ * The pop-up menu of a play item.
+ */
+#ifndef DESKPLAYER_NAVIGATOR_POPUPMENU_H
+#define DESKPLAYER_NAVIGATOR_POPUPMENU_H
+
+#include <cstddef>
+
+#include "navigator/eventsender.h"
+#include "navigator/playbackstate.h"
+#include "navigator/playhead.h"
+
+namespace deskplayer
+{
+
+/**
+ * A menu with a button for each chapter, in the order of the chapters. Buttons are numbered from 1.
+ *
+ * The stream that draws it is not read: the menu is made up from the chapters.
+ */
+class PopUpMenu
+{
+public:
+    /** @param playhead, @p state and @p sender must outlive the menu */
+    PopUpMenu(const Playhead& playhead, PlaybackState& state, EventSender& sender)
+        : m_rPlayhead(playhead), m_rState(state), m_rSender(sender)
+    {
+    }
+
+    PopUpMenu(const PopUpMenu&) = delete;
+    PopUpMenu& operator=(const PopUpMenu&) = delete;
+
+    bool IsOpen() const { return m_Open; }
+
+    /** Opens the menu and selects the button of the current chapter; the first before any. */
+    void Open();
+
+    /** Closes the menu; does nothing while it is closed. */
+    void Close();
+
+    std::size_t NumberOfButtons() const;
+    bd::ButtonId SelectedButton() const { return m_SelectedButton; }
+
+    /** @param button must exist */
+    void Select(bd::ButtonId button) { m_SelectedButton = button; }
+
+    /**
+     * Hands the program of the selected button to the listeners and closes the menu.
+     *
+     * @return the chapter to play from its start, as the program says
+     */
+    const Chapter& ExecuteSelectedButton();
+
+private:
+    const Playhead& m_rPlayhead;
+    PlaybackState& m_rState;
+    EventSender& m_rSender;
+    bool m_Open = false;
+    bd::ButtonId m_SelectedButton = 1;
+    bd::UInt32 m_LastTicket = 0;
+};
+
+} // namespace deskplayer
+
+#endif

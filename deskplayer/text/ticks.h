@@ -1,0 +1,26 @@
+/**
+ * @file
+ * The unit of time of a disc.
+ */
+#ifndef DESKPLAYER_TEXT_TICKS_H
+#define DESKPLAYER_TEXT_TICKS_H
+
+#include <chrono>
+#include <cstdint>
+#include <ratio>
+
+namespace deskplayer
+{
+
+/** Frequency of the clock in which the files of a disc give times, in hertz. */
+constexpr std::uint32_t TicksPerSecond = 45000;
+
+/**
+ * A duration, or a position as its distance from the start of a play list or session, in ticks of
+ * 45 kHz. Whole seconds and milliseconds convert implicitly.
+ */
+using Ticks = std::chrono::duration<std::uint64_t, std::ratio<1, TicksPerSecond>>;
+
+} // namespace deskplayer
+
+#endif

@@ -1,0 +1,79 @@
+#include "navigator/permission.h"
+
+#include <gtest/gtest.h>
+
+#include "rooms.h"
+
+namespace deskplayer
+{
+
+namespace
+{
+
+PlayList ForbiddingList()
+{
+    PlayList list = ListOf({Forbidding(Item(10), {bd::UserOperationStop, bd::UserOperationPauseOn})});
+    list.applicationInfo.uoMask = MaskOf({bd::UserOperationStop, bd::UserOperationTimeSearch});
+    return list;
+}
+
+class PermissionWhilePlaying : public testing::Test
+{
+protected:
+    PermissionWhilePlaying() { rooms.state.status = Status::Playing; }
+
+    StateRooms rooms{ForbiddingList()};
+    const Permission permission{rooms.playhead, rooms.state};
+};
+
+TEST_F(PermissionWhilePlaying, IsGivenForWhatNothingForbids)
+{
+    EXPECT_TRUE(permission.CheckMask(bd::UserOperationChapterSearch).IsDone());
+}
+
+TEST_F(PermissionWhilePlaying, NamesWhatForbidsAnOperation)
+{
+    EXPECT_EQ(permission.CheckMask(bd::UserOperationTimeSearch).Reason(),
+              "TimeSearch is forbidden by play list 7");
+    EXPECT_EQ(permission.CheckMask(bd::UserOperationPauseOn).Reason(),
+              "PauseOn is forbidden by play item 0");
+    EXPECT_EQ(permission.CheckMask(bd::UserOperationStop).Reason(),
+              "Stop is forbidden by play list 7 and its play item 0");
+}
+
+TEST_F(PermissionWhilePlaying, IsGivenWhileNothingPlays)
+{
+    for (const Status status : {Status::Stopped, Status::Standby, Status::Finished}) {
+        rooms.state.status = status;
+        EXPECT_TRUE(permission.CheckMask(bd::UserOperationStop).IsDone());
+    }
+    for (const Status status : {Status::Paused, Status::Still, Status::Suspended}) {
+        rooms.state.status = status;
+        EXPECT_FALSE(permission.CheckMask(bd::UserOperationStop).IsDone());
+    }
+}
+
+TEST_F(PermissionWhilePlaying, DependsOnTheStatus)
+{
+    EXPECT_TRUE(permission.CheckStatus({Status::Playing}).IsDone());
+    EXPECT_TRUE(permission.CheckStatus({Status::Paused, Status::Playing}).IsDone());
+    EXPECT_EQ(permission.CheckStatus({Status::Paused, Status::Still}).Reason(),
+              "playback is playing, not paused or in a still");
+}
+
+TEST_F(PermissionWhilePlaying, IsActiveWhileThereIsAPicture)
+{
+    for (const Status status : {Status::Playing, Status::Paused, Status::Still}) {
+        rooms.state.status = status;
+        EXPECT_TRUE(permission.CheckActive().IsDone());
+    }
+    for (const Status status :
+         {Status::Stopped, Status::Suspended, Status::Standby, Status::Finished}) {
+        rooms.state.status = status;
+        EXPECT_FALSE(permission.CheckActive().IsDone());
+    }
+}
+
+} // namespace
+
+} // namespace deskplayer
