@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 
 #include <sstream>
+#include <stdexcept>
 #include <utility>
 
 #include "support/describe.h"
@@ -12,6 +13,9 @@ namespace deskplayer
 
 namespace
 {
+
+/** A session of two hours, second by second, takes half of it. */
+constexpr int MostSteps = 30000;
 
 std::string TimeOf(std::uint64_t ticks)
 {
@@ -124,10 +128,28 @@ PlayList ListOf(std::vector<PlayItem> items, std::vector<Mark> marks)
 TestDesk::TestDesk(PlayList playList) : navigator(LayOut(7, std::move(playList)), clock, delivery)
 {
     m_Listener.onCallback = [this](const std::string& callback) {
+        CountStep(callback);
         m_Heard += TimeOf(clock.Now()) + " " + callback + "\n";
     };
     delivery.Listeners().AddListener(&keeper);
     delivery.Listeners().AddListener(&m_Listener);
+}
+
+void TestDesk::CountStep(const std::string& step)
+{
+    if (++m_Steps > MostSteps) {
+        throw std::runtime_error("playback may never end: " + std::to_string(m_Steps) +
+                                 " steps, the last at " + TimeOf(clock.Now()) + " s: " + step);
+    }
+}
+
+SessionHooks TestDesk::Hooks()
+{
+    SessionHooks hooks;
+    hooks.beforeTimePasses = [this](std::uint64_t ticks) {
+        CountStep("pass " + TimeOf(ticks) + " s");
+    };
+    return hooks;
 }
 
 std::string TestDesk::Take()
@@ -176,9 +198,10 @@ std::string TestDesk::Snapshot()
          << navigator.GetCurrentTimePosition() << " chapter " << navigator.GetCurrentChapter()
          << " mode " << Describe(navigator.GetPlayMode()) << " current mode "
          << Describe(navigator.GetCurrentPlayMode()) << " repeat "
-         << navigator.GetCurrentABRepeatState() << " " << navigator.GetCurrentChpTitleRepeatState()
-         << " " << navigator.IsRepeating() << " trigger " << Describe(navigator.GetTrigger())
-         << " at " << navigator.TimeToNextChange().value_or(bd::TimePosition(-1));
+         << Describe(navigator.GetCurrentABRepeatState()) << " "
+         << Describe(navigator.GetCurrentChpTitleRepeatState()) << " " << navigator.IsRepeating()
+         << " trigger " << Describe(navigator.GetTrigger()) << " at "
+         << navigator.TimeToNextChange().value_or(bd::TimePosition(-1));
     for (const Kind& kind : {Kind{"video", &PlaybackContext::GetVideoInfo},
                              Kind{"audio", &PlaybackContext::GetAudioInfo},
                              Kind{"subtitle", &PlaybackContext::GetPgTextStInfo},
