@@ -8,6 +8,7 @@
 #include <vector>
 
 #include "disc/bytewriter.h"
+#include "disc/testdiscs.h"
 #include "programtest.h"
 #include "session/script.h"
 
