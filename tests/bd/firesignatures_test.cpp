@@ -193,7 +193,7 @@ TEST_F(FireSignatures, FinishedReason)
 {
     Fire1<bdmv::INavControlListener::FinishedReason>(&Listener::Finished,
                                                      bdmv::INavControlListener::DataStarvation);
-    ExpectTwice("Finished(1)");
+    ExpectTwice("Finished(DataStarvation)");
 }
 
 TEST_F(FireSignatures, ReferenceToUOMaskTable)
@@ -207,14 +207,14 @@ TEST_F(FireSignatures, DirectionAndSpeed)
 {
     Fire2<bd::PlayDirectionDef, bd::PlaySpeedDef>(&Listener::Continued, bd::PlayDirectionBackward,
                                                   bd::PlaySpeedFast1);
-    ExpectTwice("Continued(1, 6)");
+    ExpectTwice("Continued(PlayDirectionBackward, PlaySpeedFast1)");
 }
 
 TEST_F(FireSignatures, ConstDirectionAndConstSpeed)
 {
     Fire2<const bd::PlayDirectionDef, const bd::PlaySpeedDef>(
         &Listener::PlayMode, bd::PlayDirectionBackward, bd::PlaySpeedFast1);
-    ExpectTwice("PlayMode(1, 6)");
+    ExpectTwice("PlayMode(PlayDirectionBackward, PlaySpeedFast1)");
 }
 
 TEST_F(FireSignatures, ReferenceToSixtyFourBitsAndDirection)
@@ -222,20 +222,20 @@ TEST_F(FireSignatures, ReferenceToSixtyFourBitsAndDirection)
     const bd::TimePosition position = 90000;
     Fire2<const bd::UInt64&, bd::PlayDirectionDef>(&Listener::Stepped, position,
                                                    bd::PlayDirectionBackward);
-    ExpectTwice("Stepped(90000, 1)");
+    ExpectTwice("Stepped(90000, PlayDirectionBackward)");
 }
 
 TEST_F(FireSignatures, TriggerTypeAndReferenceToSixtyFourBits)
 {
     const bd::TimePosition time = 90000;
     Fire2<bd::TriggerType, const bd::UInt64&>(&Listener::TriggerTimeReached, bd::TRIGGER_CHP, time);
-    ExpectTwice("TriggerTimeReached(8, 90000)");
+    ExpectTwice("TriggerTimeReached(TRIGGER_CHP, 90000)");
 }
 
 TEST_F(FireSignatures, TriggerTypeAndFlag)
 {
     Fire2<bd::TriggerType, bool>(&Listener::TriggerSet, bd::TRIGGER_A, true);
-    ExpectTwice("TriggerSet(5, true)");
+    ExpectTwice("TriggerSet(TRIGGER_A, true)");
 }
 
 TEST_F(FireSignatures, ConstSixteenBitsAndFlag)
@@ -263,7 +263,8 @@ TEST_F(FireSignatures, FlagAndAudioInfo)
     info.format = bd::AudioFormatEac3;
     info.pid = 0x1100;
     Fire2<bool, bd::AudioInfoType>(&Listener::AudioInfoChanged, true, info);
-    ExpectTwice("AudioInfoChanged(true, (7, 0, 0, 0, 4352, 0))");
+    ExpectTwice("AudioInfoChanged(true, (AudioFormatEac3, AudioSampleRateUnknown, "
+                "AudioBitsPerSamplingTypeInvalid, AudioChannelTypeUnknown, 4352, 0))");
 }
 
 TEST_F(FireSignatures, ThirtyTwoBitsAndReferencesToSixteenAndSixtyFourBits)
@@ -286,5 +287,5 @@ TEST_F(FireSignatures, ThirtyTwoAndSixteenBitsAndVideoAttributes)
 {
     Fire4<bd::UInt32, bd::UInt16, bd::VideoFormatType, bd::VideoAspectRatioType>(
         &Listener::PlayItem, 800, 1, bd::VideoFormatType1080p, bd::VideoAspectRatioType16x9);
-    ExpectTwice("PlayItem(800, 1, 6, 3)");
+    ExpectTwice("PlayItem(800, 1, VideoFormatType1080p, VideoAspectRatioType16x9)");
 }

@@ -8,6 +8,7 @@
 #include <filesystem>
 #include <fstream>
 #include <sstream>
+#include <utility>
 
 #include <unistd.h>
 
@@ -30,6 +31,24 @@ std::string Quoted(const std::string& word)
     return quoted + "'";
 }
 
+/** More than any run takes, on a slow machine and in an emulator. */
+const char* const SecondsOfARun = "30";
+
+/** What coreutils' timeout exits with when it had to end the program. */
+constexpr int TimedOut = 124;
+
+ProgramResult ResultOf(int status, std::string output, std::string errors)
+{
+    ProgramResult result;
+    result.status = WIFEXITED(status) ? WEXITSTATUS(status) : -1;
+    result.output = std::move(output);
+    result.errors = std::move(errors);
+    if (result.status == TimedOut) {
+        result.errors += "\nended by the test after " + std::string(SecondsOfARun) + " s\n";
+    }
+    return result;
+}
+
 /** @param preparation a command of the shell that comes first */
 ProgramResult Run(const std::string& preparation, const std::vector<std::string>& arguments,
                   const std::string& output)
@@ -37,7 +56,8 @@ ProgramResult Run(const std::string& preparation, const std::vector<std::string>
     const std::filesystem::path folder =
         std::filesystem::temp_directory_path() / ("deskplayer-" + std::to_string(getpid()));
     std::filesystem::create_directories(folder);
-    std::string command = preparation + "exec " + Quoted(BDMVNAVIGATOR_DESKPLAYER);
+    std::string command =
+        preparation + "exec timeout " + SecondsOfARun + " " + Quoted(BDMVNAVIGATOR_DESKPLAYER);
     for (const std::string& argument : arguments) {
         command += ' ' + Quoted(argument);
     }
@@ -45,10 +65,8 @@ ProgramResult Run(const std::string& preparation, const std::vector<std::string>
                Quoted(folder / "errors");
     const int status = std::system(command.c_str());
 
-    ProgramResult result;
-    result.status = WIFEXITED(status) ? WEXITSTATUS(status) : -1;
-    result.output = output.empty() ? ReadWhole(folder / "output") : "";
-    result.errors = ReadWhole(folder / "errors");
+    ProgramResult result = ResultOf(status, output.empty() ? ReadWhole(folder / "output") : "",
+                                    ReadWhole(folder / "errors"));
     std::filesystem::remove_all(folder);
     return result;
 }
@@ -65,26 +83,27 @@ ProgramResult RunDeskPlayerOnTerminal(const std::vector<std::string>& arguments)
     int screen = -1;
     const pid_t program = forkpty(&screen, nullptr, nullptr, nullptr);
     if (program == 0) {
-        std::string name = BDMVNAVIGATOR_DESKPLAYER;
-        std::vector<std::string> words = arguments;
-        std::vector<char*> pointers = {name.data()};
+        // In the foreground, so that the program may use the terminal.
+        std::vector<std::string> words = {"timeout", "--foreground", SecondsOfARun,
+                                          BDMVNAVIGATOR_DESKPLAYER};
+        words.insert(words.end(), arguments.begin(), arguments.end());
+        std::vector<char*> pointers;
         for (std::string& word : words) {
             pointers.push_back(word.data());
         }
         pointers.push_back(nullptr);
-        execv(name.c_str(), pointers.data());
+        execvp(pointers.front(), pointers.data());
         _exit(127);
     }
-    ProgramResult result;
+    std::string output;
     char piece[1000];
     for (ssize_t size = 0; (size = read(screen, piece, sizeof piece)) > 0;) {
-        result.output.append(piece, static_cast<std::size_t>(size));
+        output.append(piece, static_cast<std::size_t>(size));
     }
     close(screen);
     int status = 0;
     waitpid(program, &status, 0);
-    result.status = WIFEXITED(status) ? WEXITSTATUS(status) : -1;
-    return result;
+    return ResultOf(status, output, "");
 }
 
 ProgramResult RunDeskPlayerInLittleMemory(const std::vector<std::string>& arguments,

@@ -8,9 +8,9 @@
 #include <string>
 #include <vector>
 
-/** What a program left behind. */
+/** What a program left behind. One that does not end within 30 s is ended. */
 struct ProgramResult {
-    int status = -1; ///< exit status; -1 when a signal ended it
+    int status = -1; ///< exit status; -1 when a signal ended it, 124 when the test did
     std::string output;
     std::string errors;
 };

@@ -52,7 +52,7 @@ TEST_F(FaultyDisc, IsRefusedWhenThePlayListIsEmpty)
 
 TEST_F(FaultyDisc, IsRefusedWhenThePlayListIsTooLarge)
 {
-    fs::resize_file(playList, std::uintmax_t{1} << 40);
+    ResizeSparsely(playList, std::uintmax_t{1} << 40);
     ExpectRefused("PLAYLIST/00001\\.mpls: .*expected");
 }
 

@@ -8,6 +8,7 @@
 #include <vector>
 
 #include "disc/bytewriter.h"
+#include "disc/testdiscs.h"
 #include "programtest.h"
 #include "session/script.h"
 
@@ -78,13 +79,13 @@ protected:
 
 TEST_F(HostileInput, MayBeAHugePlayList)
 {
-    fs::resize_file(playList, ThreeGibibytes);
+    ResizeSparsely(playList, ThreeGibibytes);
     ExpectRefusedPlayList("PLAYLIST/00001.mpls: has 3221225472 bytes, expected at most 1048576");
 }
 
 TEST_F(HostileInput, MayBeHugeClipInformation)
 {
-    fs::resize_file(disc / "BDMV/CLIPINF/00002.clpi", ThreeGibibytes);
+    ResizeSparsely(disc / "BDMV/CLIPINF/00002.clpi", ThreeGibibytes);
     ExpectFault({disc}, 3, "CLIPINF/00002.clpi: has 3221225472 bytes, expected at most 4194304");
 }
 
@@ -151,7 +152,7 @@ TEST_F(HostileInput, MayBeAnEndlessOrSilentSession)
     const std::string tooLong = ": has more than 1048576 bytes, expected a session";
     ExpectRefusedSession("/dev/zero", "/dev/zero" + tooLong);
     const std::string huge = WriteFile("huge.session", "");
-    fs::resize_file(huge, ThreeGibibytes);
+    ResizeSparsely(huge, ThreeGibibytes);
     ExpectRefusedSession(huge, huge + tooLong);
     const std::string silent = folder / "silent.session";
     ASSERT_EQ(mkfifo(silent.c_str(), 0600), 0);

@@ -81,10 +81,11 @@ TEST_F(DeskPlayerOutput, IsATraceWhoseSlicesPairAndWhoseTimesNeverDecrease)
 
 TEST_F(DeskPlayerOutput, IsAValidTraceOfEveryDisc)
 {
-    for (const fs::directory_entry& disc : fs::directory_iterator(BDMVNAVIGATOR_TEST_DISCS)) {
-        if (fs::is_directory(disc.path() / "BDMV")) {
-            SCOPED_TRACE(disc.path().filename());
-            ExpectTraceThatAViewerCanShow(RunDeskPlayer({disc.path(), "--format", "trace"}).output);
+    for (const fs::directory_entry& entry : fs::directory_iterator(BDMVNAVIGATOR_TEST_DISCS)) {
+        if (fs::is_directory(entry.path() / "BDMV")) {
+            SCOPED_TRACE(entry.path().filename());
+            ExpectTraceThatAViewerCanShow(
+                RunDeskPlayer({entry.path(), "--format", "trace"}).output);
         }
     }
 }

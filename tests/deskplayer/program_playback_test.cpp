@@ -61,18 +61,18 @@ TEST_F(DeskPlayerPlayback, AcceptsTheBdmvFolderItself)
 
 TEST_F(DeskPlayerPlayback, PlaysEveryDiscToTheEndOfItsMedia)
 {
-    std::vector<fs::path> folders = {BDMVNAVIGATOR_TEST_DISCS};
+    std::vector<fs::path> collections = {BDMVNAVIGATOR_TEST_DISCS};
     if (const char* const more = std::getenv("BDMVNAVIGATOR_DISCS")) {
-        folders.emplace_back(more);
+        collections.emplace_back(more);
     }
     int discs = 0;
-    for (const fs::path& folder : folders) {
-        for (const fs::directory_entry& disc : fs::directory_iterator(folder)) {
-            if (!fs::is_directory(disc.path() / "BDMV")) {
+    for (const fs::path& collection : collections) {
+        for (const fs::directory_entry& entry : fs::directory_iterator(collection)) {
+            if (!fs::is_directory(entry.path() / "BDMV")) {
                 continue;
             }
-            SCOPED_TRACE(disc.path().filename());
-            const ProgramResult result = RunDeskPlayer({disc.path()});
+            SCOPED_TRACE(entry.path().filename());
+            const ProgramResult result = RunDeskPlayer({entry.path()});
             EXPECT_EQ(result.status, 0);
             EXPECT_EQ(result.errors, "");
             EXPECT_EQ(LastLine(result.output).substr(sizeof "hh:mm:ss.mmm"),

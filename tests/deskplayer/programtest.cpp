@@ -1,5 +1,6 @@
 #include "programtest.h"
 
+#include <sys/resource.h>
 #include <unistd.h>
 
 #include <algorithm>
@@ -43,6 +44,16 @@ std::string ContentOf(const fs::path& path)
 {
     std::ifstream file(path, std::ios::binary);
     return {std::istreambuf_iterator<char>(file), {}};
+}
+
+void ResizeSparsely(const fs::path& file, std::uintmax_t size)
+{
+    rlimit limit = {};
+    getrlimit(RLIMIT_FSIZE, &limit);
+    const rlimit none = {limit.rlim_max, limit.rlim_max};
+    setrlimit(RLIMIT_FSIZE, &none);
+    fs::resize_file(file, size);
+    setrlimit(RLIMIT_FSIZE, &limit);
 }
 
 void ExpectUsageError(const std::vector<std::string>& arguments, const std::string& message)

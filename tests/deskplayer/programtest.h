@@ -35,6 +35,9 @@ std::string ContentOf(const fs::path& path);
 /** Wrong usage is explained in one line, nothing is played, and the exit status is 2. */
 void ExpectUsageError(const std::vector<std::string>& arguments, const std::string& message);
 
+/** Gives a file a size without filling it; it may be larger than what a test may write. */
+void ResizeSparsely(const fs::path& file, std::uintmax_t size);
+
 /** A folder for the files of a test. */
 class ScratchFolder : public testing::Test
 {

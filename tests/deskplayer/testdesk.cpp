@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 
 #include <sstream>
+#include <stdexcept>
 #include <utility>
 
 #include "support/describe.h"
@@ -12,6 +13,9 @@ namespace deskplayer
 
 namespace
 {
+
+/** A session of two hours, second by second, takes half of it. */
+constexpr int MostSteps = 30000;
 
 std::string TimeOf(Ticks time)
 {
@@ -131,9 +135,27 @@ PlayList ListOf(std::vector<PlayItem> items, std::vector<Mark> marks)
 TestDesk::TestDesk(PlayList playList) : desk(LayOut(7, std::move(playList)))
 {
     m_Listener.onCallback = [this](const std::string& callback) {
+        CountStep(callback);
         m_Heard += TimeOf(clock.Now()) + " " + callback + "\n";
     };
     desk.Listeners().AddListener(&m_Listener);
+}
+
+void TestDesk::CountStep(const std::string& step)
+{
+    if (++m_Steps > MostSteps) {
+        throw std::runtime_error("playback may never end: " + std::to_string(m_Steps) +
+                                 " steps, the last at " + TimeOf(clock.Now()) + " s: " + step);
+    }
+}
+
+SessionHooks TestDesk::Hooks()
+{
+    SessionHooks hooks;
+    hooks.beforeTimePasses = [this](Ticks time) {
+        CountStep("pass " + TimeOf(time) + " s");
+    };
+    return hooks;
 }
 
 std::string TestDesk::Take()
@@ -179,12 +201,11 @@ std::string TestDesk::Snapshot()
     std::ostringstream text;
     PrintTo(navigator.CurrentStatus(), &text);
     text << " item " << navigator.Context().GetPlayItemId() << " position "
-         << navigator.Context().GetCurrentTimePosition() << " chapter "
-         << navigator.Context().GetCurrentChapter() << " mode "
-         << Describe(navigator.Context().GetPlayMode()) << " current mode "
+         << navigator.Context().GetCurrentTimePosition() << " chapter " << navigator.Context().GetCurrentChapter()
+         << " mode " << Describe(navigator.Context().GetPlayMode()) << " current mode "
          << Describe(navigator.Context().GetCurrentPlayMode()) << " repeat "
-         << navigator.Context().GetCurrentABRepeatState() << " "
-         << navigator.Context().GetCurrentChpTitleRepeatState() << " " << navigator.IsRepeating()
+         << Describe(navigator.Context().GetCurrentABRepeatState()) << " "
+         << Describe(navigator.Context().GetCurrentChpTitleRepeatState()) << " " << navigator.IsRepeating()
          << " trigger " << Describe(navigator.Context().GetTrigger()) << " at "
          << navigator.TimeToNextChange().value_or(Ticks::max()).count();
     for (const Kind& kind : {Kind{"video", &PlaybackContext::GetVideoInfo},

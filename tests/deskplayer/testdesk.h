@@ -12,6 +12,7 @@
 #include <vector>
 
 #include "session/commands.h"
+#include "session/session.h"
 #include "support/recordinglistener.h"
 
 namespace deskplayer
@@ -61,7 +62,11 @@ Mark Link(std::uint16_t item, Ticks time);
 
 PlayList ListOf(std::vector<PlayItem> items, std::vector<Mark> marks = {});
 
-/** A navigator over a play list, number 7, on a clock of its own, and what its listener hears. */
+/**
+ * A navigator over a play list, number 7, on a clock of its own, and what its listener receives.
+ *
+ * Throws out of playback that does not end: after many times the callbacks of the longest test.
+ */
 class TestDesk
 {
 public:
@@ -72,12 +77,15 @@ public:
 
     /**
      * The callbacks since the last call, one a line, each behind the second of the session it came
-     * at and the ticks beyond it, if there are any: "0+900 Stepped(900, 0)".
+     * at and the ticks beyond it, if there are any: "0+900 Stepped(900, PlayDirectionForward)".
      */
     std::string Take();
 
     /** The same without CurrentTimePosition(). */
     std::string TakeWithoutPositions();
+
+    /** Hooks for a session on this desk; they throw out of one that does not end. */
+    SessionHooks Hooks();
 
     /** Plays from the start, lets so much time pass, and forgets what was heard. */
     void Start(Ticks time = Ticks(0));
@@ -93,9 +101,13 @@ public:
     const VirtualClock& clock = desk.Clock();
 
 private:
+    /** @throw std::runtime_error when there have been too many */
+    void CountStep(const std::string& step);
+
     bdmvtest::Journal m_Journal;
     bdmvtest::RecordingListener m_Listener{m_Journal, "A"};
     std::string m_Heard;
+    int m_Steps = 0; ///< callbacks and passes of time
 };
 
 /** Shows outcomes and statuses in the messages of tests. */

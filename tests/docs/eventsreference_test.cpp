@@ -94,15 +94,19 @@ std::string DescribePreset(const std::string& wording)
     if (wording == "TimePositionNone") {
         return "18446744073709551615";
     }
-    return wording == "0" || wording == "false" ? wording : std::to_string(NumberOf(wording));
+    return wording;
 }
 
-/** Lines and journals write the same flag differently. */
-std::string WithFlagAsNumber(const std::string& value)
+/** Lines and journals write the same flag differently, and journals name enumerators. */
+std::string AsNumber(const std::string& value)
 {
     const std::set<std::string> on = {"TRUE", "true"};
     const std::set<std::string> off = {"FALSE", "false"};
-    return on.count(value) != 0 ? "1" : off.count(value) != 0 ? "0" : value;
+    static const std::regex name("[A-Za-z]\\w*");
+    return on.count(value) != 0            ? "1"
+           : off.count(value) != 0         ? "0"
+           : std::regex_match(value, name) ? std::to_string(NumberOf(value))
+                                           : value;
 }
 
 /** What stands behind the conversions of a line in its explanation. */
@@ -194,7 +198,7 @@ std::vector<std::size_t> StepsMade(const EventSection& section, const Situation&
 
 } // namespace
 
-class EventsReferenceTest : public testing::Test
+class EventsDocument : public testing::Test
 {
 protected:
     static const EventsReference& Reference()
@@ -206,7 +210,7 @@ protected:
     const EventsReference& reference = Reference();
 };
 
-TEST_F(EventsReferenceTest, HasASectionForEveryEventInTheOrderOfDeclaration)
+TEST_F(EventsDocument, HasASectionForEveryEventInTheOrderOfDeclaration)
 {
     std::vector<std::string> expected;
     for (const std::string& event : DeclaredEvents()) {
@@ -222,7 +226,7 @@ TEST_F(EventsReferenceTest, HasASectionForEveryEventInTheOrderOfDeclaration)
     EXPECT_EQ(titles.size(), 56U);
 }
 
-TEST_F(EventsReferenceTest, SendsEveryCallbackThereIs)
+TEST_F(EventsDocument, SendsEveryCallbackThereIs)
 {
     std::set<std::string> sent;
     for (const EventSection& section : reference.sections) {
@@ -238,7 +242,7 @@ TEST_F(EventsReferenceTest, SendsEveryCallbackThereIs)
     EXPECT_EQ(sent, declared);
 }
 
-TEST_F(EventsReferenceTest, ListsEventsAndCallbacksAsTheSectionsHaveThem)
+TEST_F(EventsDocument, ListsEventsAndCallbacksAsTheSectionsHaveThem)
 {
     std::vector<TableRow> expected;
     std::map<std::string, std::vector<std::string>> senders;
@@ -264,7 +268,7 @@ TEST_F(EventsReferenceTest, ListsEventsAndCallbacksAsTheSectionsHaveThem)
     EXPECT_EQ(rows, expected);
 }
 
-TEST_F(EventsReferenceTest, ListsLinesAsTheSectionsHaveThemInTheOrderOfTheirBytes)
+TEST_F(EventsDocument, ListsLinesAsTheSectionsHaveThemInTheOrderOfTheirBytes)
 {
     std::vector<TableRow> expected;
     for (const EventSection& section : reference.sections) {
@@ -281,7 +285,7 @@ TEST_F(EventsReferenceTest, ListsLinesAsTheSectionsHaveThemInTheOrderOfTheirByte
     EXPECT_EQ(reference.ChapterOf("Log lines").TableRows(), expected);
 }
 
-TEST_F(EventsReferenceTest, GivesNumbersTheNamesThatTheyHave)
+TEST_F(EventsDocument, GivesNumbersTheNamesThatTheyHave)
 {
     const std::map<std::string, std::vector<Enumerator>> declared = DeclaredEnumerations();
     std::set<std::string> told;
@@ -302,7 +306,7 @@ TEST_F(EventsReferenceTest, GivesNumbersTheNamesThatTheyHave)
                                      "TriggerType", "VideoAspectRatioType", "VideoFormatType"}));
 }
 
-TEST_F(EventsReferenceTest, LinksToWhatThereIs)
+TEST_F(EventsDocument, LinksToWhatThereIs)
 {
     std::set<std::string> anchors;
     for (const Chapter& chapter : reference.chapters) {
@@ -321,7 +325,7 @@ TEST_F(EventsReferenceTest, LinksToWhatThereIs)
     }
 }
 
-TEST_F(EventsReferenceTest, DecidesAboutEveryTriggerAsItsTableSays)
+TEST_F(EventsDocument, DecidesAboutEveryTriggerAsItsTableSays)
 {
     const EventSection& section = reference.SectionOf("TriggerReachedEvent");
     const auto fits = [](const std::string& cell, int value) {
@@ -361,7 +365,8 @@ TEST_F(EventsReferenceTest, DecidesAboutEveryTriggerAsItsTableSays)
 
                 const Happening callback = WhatHappens(ClassOf(section.event), situation).back();
 
-                EXPECT_EQ(callback.values.at(0), std::to_string(toNumber(row->at(3), context)));
+                EXPECT_EQ(AsNumber(callback.values.at(0)),
+                          std::to_string(toNumber(row->at(3), context)));
             }
         }
     }
@@ -369,7 +374,7 @@ TEST_F(EventsReferenceTest, DecidesAboutEveryTriggerAsItsTableSays)
 }
 
 /** The section about the event that is the parameter. */
-class EventSectionTest : public EventsReferenceTest, public testing::WithParamInterface<std::string>
+class EventsDocumentSection : public EventsDocument, public testing::WithParamInterface<std::string>
 {
 public:
     static std::string Name(const testing::TestParamInfo<std::string>& info) { return info.param; }
@@ -426,12 +431,12 @@ protected:
     }
 };
 
-TEST_P(EventSectionTest, BeginsWithWhatHasHappened)
+TEST_P(EventsDocumentSection, BeginsWithWhatHasHappened)
 {
     EXPECT_TRUE(std::regex_search(section.firstSentence, std::regex("^[A-Z]"))) << "no sentence";
 }
 
-TEST_P(EventSectionTest, StatesWhatHappensInEverySituation)
+TEST_P(EventsDocumentSection, StatesWhatHappensInEverySituation)
 {
     for (const Situation& situation : AllSituations()) {
         SCOPED_TRACE(situation.name);
@@ -451,7 +456,7 @@ TEST_P(EventSectionTest, StatesWhatHappensInEverySituation)
     }
 }
 
-TEST_P(EventSectionTest, HasNoStepThatIsNeverMadeAndNoConditionThatAlwaysHolds)
+TEST_P(EventsDocumentSection, HasNoStepThatIsNeverMadeAndNoConditionThatAlwaysHolds)
 {
     std::vector<std::size_t> times(section.steps.size());
     const std::vector<Situation> situations = AllSituations();
@@ -469,7 +474,7 @@ TEST_P(EventSectionTest, HasNoStepThatIsNeverMadeAndNoConditionThatAlwaysHolds)
     }
 }
 
-TEST_P(EventSectionTest, HasTheSignaturesOfTheListenerAndExplainsEveryArgument)
+TEST_P(EventsDocumentSection, HasTheSignaturesOfTheListenerAndExplainsEveryArgument)
 {
     const std::map<std::string, std::string> declared = DeclaredCallbacks();
     for (const Step& step : section.steps) {
@@ -486,7 +491,7 @@ TEST_P(EventSectionTest, HasTheSignaturesOfTheListenerAndExplainsEveryArgument)
     }
 }
 
-TEST_P(EventSectionTest, TellsWhatEveryConversionShows)
+TEST_P(EventsDocumentSection, TellsWhatEveryConversionShows)
 {
     for (const Step& step : section.steps) {
         if (IsLog(step)) {
@@ -505,8 +510,8 @@ TEST_P(EventSectionTest, TellsWhatEveryConversionShows)
                 ASSERT_EQ(explained.size(), happenings[i].values.size());
                 for (std::size_t j = 0; j < explained.size(); ++j) {
                     if (!explained[j].name.empty()) {
-                        EXPECT_EQ(WithFlagAsNumber(happenings[i].values[j]),
-                                  WithFlagAsNumber(ValueOf(explained[j].name, happenings, i)))
+                        EXPECT_EQ(AsNumber(happenings[i].values[j]),
+                                  AsNumber(ValueOf(explained[j].name, happenings, i)))
                             << explained[j].name;
                     }
                 }
@@ -514,7 +519,7 @@ TEST_P(EventSectionTest, TellsWhatEveryConversionShows)
         });
 }
 
-TEST_P(EventSectionTest, TellsWhatVariablesArePresetTo)
+TEST_P(EventsDocumentSection, TellsWhatVariablesArePresetTo)
 {
     ForEachStepMade([](const Step& step, const std::vector<Happening>& happenings, std::size_t i) {
         if (step.action == "query") {
@@ -530,5 +535,5 @@ TEST_P(EventSectionTest, TellsWhatVariablesArePresetTo)
     });
 }
 
-INSTANTIATE_TEST_SUITE_P(Events, EventSectionTest, testing::ValuesIn(DeclaredEvents()),
-                         EventSectionTest::Name);
+INSTANTIATE_TEST_SUITE_P(Events, EventsDocumentSection, testing::ValuesIn(DeclaredEvents()),
+                         EventsDocumentSection::Name);

@@ -1,22 +1,32 @@
 /**
  * @file
- * Values and calls as they stand in a journal.
+ * Values and calls as they appear in a journal.
  */
 #ifndef SUPPORT_DESCRIBE_H
 #define SUPPORT_DESCRIBE_H
 
 #include <string>
+#include <string_view>
 
 #include "bd/types.h"
 #include "database/iprogramdata.h"
 #include "database/uomasktable.h"
+#include "support/enumerators.h"
 
 namespace bdmvtest
 {
 
-/** Integers and enumerations in decimal. */
-template <typename Number> std::string Describe(Number value)
+/**
+ * Enumerators of the library by name; integers, and values that no enumerator has, in decimal.
+ */
+template <typename Value> std::string Describe(Value value)
 {
+    if constexpr (IsFixedEnumeration<Value>) {
+        const std::string_view name = EnumeratorName(value);
+        if (!name.empty()) {
+            return std::string(name);
+        }
+    }
     return std::to_string(+value);
 }
 

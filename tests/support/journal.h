@@ -14,10 +14,10 @@
  * ...
  * journal.Take() ==
  *     "context.GetCurrentTimePosition() -> 900000\n"
- *     "context.GetPlayMode() -> (1, 7)\n"
+ *     "context.GetPlayMode() -> (PlayDirectionBackward, PlaySpeedFast2)\n"
  *     "log? 57 5 0 -> on\n"
  *     "log 57 5 0: Sending Stepped - position: 900000,dir=1\n"
- *     "A.Stepped(900000, 1)\n"
+ *     "A.Stepped(900000, PlayDirectionBackward)\n"
  * @endcode
  */
 #ifndef SUPPORT_JOURNAL_H

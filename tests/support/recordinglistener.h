@@ -2,9 +2,10 @@
  * @file
  * A listener that writes every callback into the journal.
  *
- * Entries in the journal: the listener's name, the callback, and its arguments in decimal:
+ * Entries in the journal: the listener's name, the callback, and its arguments, enumerators by name
+ * and numbers in decimal:
  *
- *     A.PlayItem(800, 0, 6, 3)
+ *     A.PlayItem(800, 0, VideoFormatType1080p, VideoAspectRatioType16x9)
  *     B.SystemSuspended(bytes 1 2 3, 3)
  */
 #ifndef SUPPORT_RECORDINGLISTENER_H

@@ -44,16 +44,16 @@ static_assert(sizeof(bdmv::TriggerSetEvent) == sizeof(TriggerSetSized), "");
 static_assert(sizeof(bdmv::MarkInfoEvent) == sizeof(MarkInfoSized), "");
 static_assert(sizeof(bdmv::AudioInfoChangedEvent) == sizeof(AudioInfoChangedSized), "");
 
-class AllEventsTest : public EventTest
+class AllEventClasses : public EventTest
 {
 };
 
-TEST_F(AllEventsTest, AreFiftySix)
+TEST_F(AllEventClasses, AreFiftySix)
 {
     EXPECT_EQ(AllEvents().size(), 56u);
 }
 
-TEST_F(AllEventsTest, FireTheirCallbacksAndNoOthers)
+TEST_F(AllEventClasses, FireTheirCallbacksAndNoOthers)
 {
     for (const EventClass& eventClass : AllEvents()) {
         std::set<std::string> fired;
@@ -77,7 +77,7 @@ TEST_F(AllEventsTest, FireTheirCallbacksAndNoOthers)
     }
 }
 
-TEST_F(AllEventsTest, TakeAnyNonZeroAnswerOfTheLogSwitchForOn)
+TEST_F(AllEventClasses, TakeAnyNonZeroAnswerOfTheLogSwitchForOn)
 {
     for (const EventClass& eventClass : AllEvents()) {
         WhenTheLogSwitchIsAsked(1, [] {});
@@ -118,7 +118,7 @@ public:
     std::vector<const void*> addresses;
 };
 
-TEST_F(AllEventsTest, ShowEveryListenerTheSameObjectsByReference)
+TEST_F(AllEventClasses, ShowEveryListenerTheSameObjectsByReference)
 {
     const std::set<std::string> byReference = {
         "SteppedEvent",  "TriggerReachedEvent",      "UOMaskEvent",       "ChapterEvent",

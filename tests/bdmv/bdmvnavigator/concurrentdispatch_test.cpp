@@ -45,7 +45,7 @@ public:
     int callsWhileAbsent = 0;
 };
 
-TEST(ConcurrentDispatchTest, DeliversEveryEventOnceWhileListenersComeAndGo)
+TEST(ConcurrentDispatch, DeliversEveryEventOnceWhileListenersComeAndGo)
 {
     bdmvtest::FakePlatform platform(nullptr);
     Context context;

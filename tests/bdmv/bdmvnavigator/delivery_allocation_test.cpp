@@ -21,10 +21,10 @@ public:
 };
 
 /** A parameter that is true has every event take its longest way. */
-class DeliveryAllocationTest : public testing::TestWithParam<bool>
+class DeliveryAllocation : public testing::TestWithParam<bool>
 {
 protected:
-    DeliveryAllocationTest()
+    DeliveryAllocation()
     {
         context.executeButtonProgram = bdmv::IProgramData::RefPtr(new Program);
         context.async2ndVid = context.async2ndAud = GetParam();
@@ -53,21 +53,21 @@ protected:
     bd::EventListenerList<bdmv::INavigatorListener> listeners;
 };
 
-INSTANTIATE_TEST_SUITE_P(Ways, DeliveryAllocationTest, testing::Bool());
+INSTANTIATE_TEST_SUITE_P(Ways, DeliveryAllocation, testing::Bool());
 
-TEST_P(DeliveryAllocationTest, NoEventAllocatesWithTheLogOn)
+TEST_P(DeliveryAllocation, NoEventAllocatesWithTheLogOn)
 {
     ExpectNoAllocation();
 }
 
-TEST_P(DeliveryAllocationTest, NoEventAllocatesWithTheLogOff)
+TEST_P(DeliveryAllocation, NoEventAllocatesWithTheLogOff)
 {
     platform.DisableLog();
 
     ExpectNoAllocation();
 }
 
-TEST_P(DeliveryAllocationTest, DeletingAnEventThroughItsInterfaceFreesWhatMakingItTook)
+TEST_P(DeliveryAllocation, DeletingAnEventThroughItsInterfaceFreesWhatMakingItTook)
 {
     for (const EventClass& eventClass : AllEvents()) {
         const long before = bdmvtest::CountLiveBlocks();
@@ -80,7 +80,7 @@ TEST_P(DeliveryAllocationTest, DeletingAnEventThroughItsInterfaceFreesWhatMaking
     }
 }
 
-TEST_P(DeliveryAllocationTest, AnAllocationInACallbackIsNoticed)
+TEST_P(DeliveryAllocation, AnAllocationInACallbackIsNoticed)
 {
     struct AllocatingListener : bdmv::NavigatorListenerAdapter {
         void Paused() override { block.reset(new int); }

@@ -92,8 +92,8 @@ const Scenario displayScenarios[] = {
          Fired("SecondaryAudioDisplay(0, true)")},
 };
 
-INSTANTIATE_TEST_SUITE_P(Display, EventScenarioTest, testing::ValuesIn(displayScenarios),
-                         EventScenarioTest::Name);
+INSTANTIATE_TEST_SUITE_P(Display, EventScenario, testing::ValuesIn(displayScenarios),
+                         EventScenario::Name);
 
 void HasNoAsyncStream(Context& context)
 {
@@ -165,10 +165,10 @@ const Scenario availabilityScenarios[] = {
      LeavesAsyncFlags, audioLine + AsyncFlags("untouched") + Fired("SecondaryAudioUnavailable()")},
 };
 
-INSTANTIATE_TEST_SUITE_P(Availability, EventScenarioTest, testing::ValuesIn(availabilityScenarios),
-                         EventScenarioTest::Name);
+INSTANTIATE_TEST_SUITE_P(Availability, EventScenario, testing::ValuesIn(availabilityScenarios),
+                         EventScenario::Name);
 
-class SuppressedEventTest : public EventTest
+class SuppressedEvents : public EventTest
 {
 protected:
     /** Has A dispatch an event on the list while the list is held for another one. */
@@ -189,7 +189,7 @@ private:
     std::string m_Inner;
 };
 
-TEST_F(SuppressedEventTest, PipUnavailableDoesNotTouchTheLock)
+TEST_F(SuppressedEvents, PipUnavailableDoesNotTouchTheLock)
 {
     HasAsyncVideo(context);
 
@@ -198,7 +198,7 @@ TEST_F(SuppressedEventTest, PipUnavailableDoesNotTouchTheLock)
                   Logged("Not send unavailable for async 2nd video"));
 }
 
-TEST_F(SuppressedEventTest, SecondaryAudioUnavailableDoesNotTouchTheLock)
+TEST_F(SuppressedEvents, SecondaryAudioUnavailableDoesNotTouchTheLock)
 {
     HasAsyncAudio(context);
 
@@ -207,12 +207,13 @@ TEST_F(SuppressedEventTest, SecondaryAudioUnavailableDoesNotTouchTheLock)
                   Logged("Not send unavailable for async 2nd audio"));
 }
 
-TEST_F(SuppressedEventTest, PresentationGraphicsInfoDoesNotTouchTheLock)
+TEST_F(SuppressedEvents, PresentationGraphicsInfoDoesNotTouchTheLock)
 {
     context.rPgTextStResult = bdmv::INavError::ErrNotAllowed;
 
     EXPECT_EQ(DispatchWhileTheListIsHeld<bdmv::PresentationGraphicsInfoEvent>(),
-              Queried("rGetPgTextStInfo(0, 0) -> 0, 0") + Queried("rGetPgTextStInfo returned 7"));
+              Queried("rGetPgTextStInfo(0, 0) -> 0, 0") +
+                  Queried("rGetPgTextStInfo returned ErrNotAllowed"));
 }
 
 } // namespace

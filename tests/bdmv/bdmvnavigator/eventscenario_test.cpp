@@ -83,14 +83,14 @@ const Reentry reentries[] = {
 
 } // namespace
 
-TEST_P(EventScenarioTest, HappensInThisOrder)
+TEST_P(EventScenario, HappensInThisOrder)
 {
     DispatchScenario(listeners);
 
     EXPECT_EQ(journal.Take(), GetParam().journal);
 }
 
-TEST_P(EventScenarioTest, DiffersOnlyInTheCallbacksWhenNobodyListens)
+TEST_P(EventScenario, DiffersOnlyInTheCallbacksWhenNobodyListens)
 {
     Listeners nobody;
 
@@ -99,7 +99,7 @@ TEST_P(EventScenarioTest, DiffersOnlyInTheCallbacksWhenNobodyListens)
     EXPECT_EQ(journal.Take(), WithoutCallbacks(GetParam().journal));
 }
 
-TEST_P(EventScenarioTest, DiffersOnlyInTheLinesWhenTheLogIsOff)
+TEST_P(EventScenario, DiffersOnlyInTheLinesWhenTheLogIsOff)
 {
     platform.DisableLog();
 
@@ -108,7 +108,7 @@ TEST_P(EventScenarioTest, DiffersOnlyInTheLinesWhenTheLogIsOff)
     EXPECT_EQ(journal.Take(), WithTheLogOff(GetParam().journal));
 }
 
-TEST_P(EventScenarioTest, TouchesNothingWhenItIsMadeAndDeleted)
+TEST_P(EventScenario, TouchesNothingWhenItIsMadeAndDeleted)
 {
     GetParam().arrange(context);
     platform.RecordAtomicAdds();
@@ -118,7 +118,7 @@ TEST_P(EventScenarioTest, TouchesNothingWhenItIsMadeAndDeleted)
     EXPECT_EQ(journal.Take(), "");
 }
 
-TEST_P(EventScenarioTest, QueriesLogsAndAssertsWhileTheListIsFree)
+TEST_P(EventScenario, QueriesLogsAndAssertsWhileTheListIsFree)
 {
     const auto useTheList = [this] { EXPECT_TRUE(listeners.ListenerExists(&a)); };
     context.onQuery = [useTheList](const std::string&) { useTheList(); };
@@ -130,7 +130,7 @@ TEST_P(EventScenarioTest, QueriesLogsAndAssertsWhileTheListIsFree)
     EXPECT_EQ(journal.Take(), GetParam().journal);
 }
 
-TEST_P(EventScenarioTest, EndsAtTheCallbackThatThrows)
+TEST_P(EventScenario, EndsAtTheCallbackThatThrows)
 {
     const std::vector<std::string> prefixes = UpToEachCallback(GetParam().journal);
     for (std::size_t i = 0; i < prefixes.size(); ++i) {
@@ -149,7 +149,7 @@ TEST_P(EventScenarioTest, EndsAtTheCallbackThatThrows)
     ExpectTheListToBeSound();
 }
 
-TEST_P(EventScenarioTest, EndsAtTheCallbackThatReentersTheList)
+TEST_P(EventScenario, EndsAtTheCallbackThatReentersTheList)
 {
     bdmvtest::RecordingListener late(journal, "late");
     const std::vector<std::string> prefixes = UpToEachCallback(GetParam().journal);
@@ -171,7 +171,7 @@ TEST_P(EventScenarioTest, EndsAtTheCallbackThatReentersTheList)
     ExpectTheListToBeSound();
 }
 
-TEST_P(EventScenarioTest, GoesOnWhenTheCallbackHandlesTheRefusal)
+TEST_P(EventScenario, GoesOnWhenTheCallbackHandlesTheRefusal)
 {
     const std::size_t callbacks = UpToEachCallback(GetParam().journal).size();
     for (std::size_t i = 0; i < callbacks; ++i) {

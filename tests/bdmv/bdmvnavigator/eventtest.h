@@ -97,7 +97,7 @@ protected:
 /**
  * An event, what the context holds when it is dispatched, and all that must happen then.
  *
- * A family states its events as scenarios of EventScenarioTest, which dispatches each with and
+ * A family states its events as scenarios of EventScenario, which dispatches each with and
  * without listeners, with and without a log, and through every failure of a listener.
  */
 struct Scenario {
@@ -129,7 +129,7 @@ Scenario Notification(const std::string& line, const std::string& callback)
 }
 
 /** Runs the scenario that is its parameter. */
-class EventScenarioTest : public EventTest, public testing::WithParamInterface<Scenario>
+class EventScenario : public EventTest, public testing::WithParamInterface<Scenario>
 {
 public:
     static std::string Name(const testing::TestParamInfo<Scenario>& info)

@@ -75,10 +75,10 @@ const Scenario scenarios[] = {
          Fired("ExecuteButton(0, 0, no program)")},
 };
 
-INSTANTIATE_TEST_SUITE_P(InteractiveGraphics, EventScenarioTest, testing::ValuesIn(scenarios),
-                         EventScenarioTest::Name);
+INSTANTIATE_TEST_SUITE_P(InteractiveGraphics, EventScenario, testing::ValuesIn(scenarios),
+                         EventScenario::Name);
 
-class ExecuteButtonEventTest : public EventTest
+class ButtonExecution : public EventTest
 {
 protected:
     /** Does something of the test's own with the program that it receives. */
@@ -90,7 +90,7 @@ protected:
         std::function<void(ProgramPtr&)> onProgram;
     };
 
-    ExecuteButtonEventTest()
+    ButtonExecution()
     {
         HoldAProgram([this] { journal.Add("gone"); });
     }
@@ -116,7 +116,7 @@ protected:
         Logged("Sending ExecuteButton - ticket: 0, buttonId: 0");
 };
 
-TEST_F(ExecuteButtonEventTest, TakesOneReferenceAndReleasesItAfterTheLastListener)
+TEST_F(ButtonExecution, TakesOneReferenceAndReleasesItAfterTheLastListener)
 {
     platform.RecordAtomicAdds();
 
@@ -125,7 +125,7 @@ TEST_F(ExecuteButtonEventTest, TakesOneReferenceAndReleasesItAfterTheLastListene
                   Fired("ExecuteButton(0, 0, program shared by 2)") + "atomic add -1 -> 1\n");
 }
 
-TEST_F(ExecuteButtonEventTest, TakesNoReferenceWhenTheContextLeavesTheProgram)
+TEST_F(ButtonExecution, TakesNoReferenceWhenTheContextLeavesTheProgram)
 {
     platform.RecordAtomicAdds();
     context.untouched = {"GetExecuteButtonData"};
@@ -136,7 +136,7 @@ TEST_F(ExecuteButtonEventTest, TakesNoReferenceWhenTheContextLeavesTheProgram)
                   Fired("ExecuteButton(0, 0, no program)"));
 }
 
-TEST_F(ExecuteButtonEventTest, ReleasesTheProgramWithoutListeners)
+TEST_F(ButtonExecution, ReleasesTheProgramWithoutListeners)
 {
     Listeners nobody;
     platform.RecordAtomicAdds();
@@ -146,7 +146,7 @@ TEST_F(ExecuteButtonEventTest, ReleasesTheProgramWithoutListeners)
     EXPECT_EQ(journal.Take(), "atomic add 1 -> 2\n" + m_QueriedAndLogged + "atomic add -1 -> 1\n");
 }
 
-TEST_F(ExecuteButtonEventTest, ReleasesTheProgramWhenAListenerThrows)
+TEST_F(ButtonExecution, ReleasesTheProgramWhenAListenerThrows)
 {
     struct Failure {
     };
@@ -161,7 +161,7 @@ TEST_F(ExecuteButtonEventTest, ReleasesTheProgramWhenAListenerThrows)
                                   "atomic add -1 -> 1\n");
 }
 
-TEST_F(ExecuteButtonEventTest, DestroysTheProgramAtTheEndWhenTheContextLetsGoOfIt)
+TEST_F(ButtonExecution, DestroysTheProgramAtTheEndWhenTheContextLetsGoOfIt)
 {
     a.onCallback = [this](const std::string&) { context.executeButtonProgram.Release(); };
 
@@ -172,7 +172,7 @@ TEST_F(ExecuteButtonEventTest, DestroysTheProgramAtTheEndWhenTheContextLetsGoOfI
                                    "gone\n");
 }
 
-TEST_F(ExecuteButtonEventTest, LeavesTheProgramToAListenerThatCopiesTheHandle)
+TEST_F(ButtonExecution, LeavesTheProgramToAListenerThatCopiesTheHandle)
 {
     ProgramListener keeper;
     ProgramPtr kept;
@@ -190,7 +190,7 @@ TEST_F(ExecuteButtonEventTest, LeavesTheProgramToAListenerThatCopiesTheHandle)
     EXPECT_EQ(journal.Take(), "gone\n");
 }
 
-TEST_F(ExecuteButtonEventTest, ShowsTheListenersBehindThatOneResetTheHandle)
+TEST_F(ButtonExecution, ShowsTheListenersBehindThatOneResetTheHandle)
 {
     ProgramListener resetter;
     resetter.onProgram = [](ProgramPtr& program) { program.Release(); };
@@ -204,7 +204,7 @@ TEST_F(ExecuteButtonEventTest, ShowsTheListenersBehindThatOneResetTheHandle)
     EXPECT_TRUE(context.executeButtonProgram.IsUnique());
 }
 
-TEST_F(ExecuteButtonEventTest, ReleasesTheProgramThatAListenerPutInPlace)
+TEST_F(ButtonExecution, ReleasesTheProgramThatAListenerPutInPlace)
 {
     ProgramListener replacer;
     replacer.onProgram = [this](ProgramPtr& program) {
@@ -220,7 +220,7 @@ TEST_F(ExecuteButtonEventTest, ReleasesTheProgramThatAListenerPutInPlace)
     EXPECT_TRUE(context.executeButtonProgram.IsUnique());
 }
 
-TEST_F(ExecuteButtonEventTest, LetsTheProgramUseTheListWhenItGoes)
+TEST_F(ButtonExecution, LetsTheProgramUseTheListWhenItGoes)
 {
     HoldAProgram([this] {
         listeners.RemoveListener(&b);
@@ -237,7 +237,7 @@ TEST_F(ExecuteButtonEventTest, LetsTheProgramUseTheListWhenItGoes)
                   "A.ButtonActivationDone()\nC.ButtonActivationDone()\n");
 }
 
-TEST_F(ExecuteButtonEventTest, RefusesTheListToAProgramThatGoesInsideACallback)
+TEST_F(ButtonExecution, RefusesTheListToAProgramThatGoesInsideACallback)
 {
     HoldAProgram([this] {
         EXPECT_THROW(listeners.RemoveListener(&a), std::system_error);

@@ -43,70 +43,75 @@ const Scenario scenarios[] = {
      [](Context& context) {
          context.playMode = bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedFast2);
      },
-     Queried("GetCurrentPlayMode() -> (0, 5)") + Queried("GetPlayMode() -> (1, 7)") +
+     Queried("GetCurrentPlayMode() -> (PlayDirectionForward, PlaySpeedNormal)") +
+         Queried("GetPlayMode() -> (PlayDirectionBackward, PlaySpeedFast2)") +
          Logged("Sending Continued with playmode: dir 1, speed 7 (currentplaymode: dir 0, speed "
                 "5)") +
-         Fired("Continued(1, 7)")},
+         Fired("Continued(PlayDirectionBackward, PlaySpeedFast2)")},
     {"ContinuedForward", New<bdmv::ContinuedEvent>(), PlaysBackwardWhileItIsSetForward,
-     Queried("GetCurrentPlayMode() -> (1, 17)") + Queried("GetPlayMode() -> (0, 0)") +
+     Queried("GetCurrentPlayMode() -> (PlayDirectionBackward, PlaySpeedFast12)") +
+         Queried("GetPlayMode() -> (PlayDirectionForward, PlaySpeedSlow5)") +
          Logged("Sending Continued with playmode: dir 0, speed 0 (currentplaymode: dir 1, speed "
                 "17)") +
-         Fired("Continued(0, 0)")},
+         Fired("Continued(PlayDirectionForward, PlaySpeedSlow5)")},
 
     {"SteppedBackward", New<bdmv::SteppedEvent>(),
      [](Context& context) { SetsBackwardAtPosition(context, 900000); },
-     Queried("GetCurrentTimePosition() -> 900000") + Queried("GetPlayMode() -> (1, 7)") +
-         Logged("Sending Stepped - position: 900000,dir=1") + Fired("Stepped(900000, 1)")},
+     Queried("GetCurrentTimePosition() -> 900000") +
+         Queried("GetPlayMode() -> (PlayDirectionBackward, PlaySpeedFast2)") +
+         Logged("Sending Stepped - position: 900000,dir=1") +
+         Fired("Stepped(900000, PlayDirectionBackward)")},
     {"SteppedBeyond32Bits", New<bdmv::SteppedEvent>(),
      [](Context& context) { SetsBackwardAtPosition(context, 0xFFFFFFFFFFFFFFFEULL); },
      Queried("GetCurrentTimePosition() -> 18446744073709551614") +
-         Queried("GetPlayMode() -> (1, 7)") +
+         Queried("GetPlayMode() -> (PlayDirectionBackward, PlaySpeedFast2)") +
          Logged("Sending Stepped - position: 18446744073709551614,dir=1") +
-         Fired("Stepped(18446744073709551614, 1)")},
+         Fired("Stepped(18446744073709551614, PlayDirectionBackward)")},
     {"SteppedForwardWhilePlayingBackward", New<bdmv::SteppedEvent>(),
      PlaysBackwardWhileItIsSetForward,
-     Queried("GetCurrentTimePosition() -> 0") + Queried("GetPlayMode() -> (0, 0)") +
-         Logged("Sending Stepped - position: 0,dir=0") + Fired("Stepped(0, 0)")},
+     Queried("GetCurrentTimePosition() -> 0") +
+         Queried("GetPlayMode() -> (PlayDirectionForward, PlaySpeedSlow5)") +
+         Logged("Sending Stepped - position: 0,dir=0") + Fired("Stepped(0, PlayDirectionForward)")},
 
     {"FinishedAtTheEnd", New<bdmv::FinishedEvent>(),
      FinishesFor(bdstreaming::FinishedReasonEndOfMedia),
-     Queried("GetFinishedReason() -> 0") + Logged("Sending Finished - reason: 0") +
-         Fired("Finished(0)")},
+     Queried("GetFinishedReason() -> FinishedReasonEndOfMedia") +
+         Logged("Sending Finished - reason: 0") + Fired("Finished(EndOfMedia)")},
     {"FinishedForLackOfData", New<bdmv::FinishedEvent>(),
      FinishesFor(bdstreaming::FinishedReasonDataStarvation),
-     Queried("GetFinishedReason() -> 1") + Logged("Sending Finished - reason: 1") +
-         Fired("Finished(1)")},
+     Queried("GetFinishedReason() -> FinishedReasonDataStarvation") +
+         Logged("Sending Finished - reason: 1") + Fired("Finished(DataStarvation)")},
     {"FinishedForAnUnknownReason", New<bdmv::FinishedEvent>(), FinishesFor(2),
      Queried("GetFinishedReason() -> 2") + assertion + Logged("Sending Finished - reason: 0") +
-         Fired("Finished(0)")},
+         Fired("Finished(EndOfMedia)")},
     {"FinishedForANegativeReason", New<bdmv::FinishedEvent>(), FinishesFor(-1),
      Queried("GetFinishedReason() -> -1") + assertion + Logged("Sending Finished - reason: 0") +
-         Fired("Finished(0)")},
+         Fired("Finished(EndOfMedia)")},
 };
 
-INSTANTIATE_TEST_SUITE_P(PlaybackState, EventScenarioTest, testing::ValuesIn(scenarios),
-                         EventScenarioTest::Name);
+INSTANTIATE_TEST_SUITE_P(PlaybackState, EventScenario, testing::ValuesIn(scenarios),
+                         EventScenario::Name);
 
-class PlaybackStateEventTest : public EventTest
+class PlaybackStateEvents : public EventTest
 {
 };
 
-TEST_F(PlaybackStateEventTest, SteppedWritesThisJournal)
+TEST_F(PlaybackStateEvents, SteppedWritesThisJournal)
 {
     context.currentTimePosition = 900000;
     context.playMode = bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedNormal);
 
     EXPECT_EQ(Dispatch<bdmv::SteppedEvent>(),
               "context.GetCurrentTimePosition() -> 900000\n"
-              "context.GetPlayMode() -> (1, 5)\n"
+              "context.GetPlayMode() -> (PlayDirectionBackward, PlaySpeedNormal)\n"
               "log? 57 5 0 -> on\n"
               "log 57 5 0: Sending Stepped - position: 900000,dir=1\n"
-              "A.Stepped(900000, 1)\n"
-              "B.Stepped(900000, 1)\n"
-              "C.Stepped(900000, 1)\n");
+              "A.Stepped(900000, PlayDirectionBackward)\n"
+              "B.Stepped(900000, PlayDirectionBackward)\n"
+              "C.Stepped(900000, PlayDirectionBackward)\n");
 }
 
-TEST_F(PlaybackStateEventTest, ContinuedReportsThePlayModesAsTheyWereWhenAskedFor)
+TEST_F(PlaybackStateEvents, ContinuedReportsThePlayModesAsTheyWereWhenAskedFor)
 {
     context.onQuery = [this](const std::string& operation) {
         if (operation == "GetPlayMode") {
@@ -118,24 +123,27 @@ TEST_F(PlaybackStateEventTest, ContinuedReportsThePlayModesAsTheyWereWhenAskedFo
     WhenTheLogSwitchIsAsked(1, [this] { context.playMode = bd::PlayMode(); });
 
     EXPECT_EQ(Dispatch<bdmv::ContinuedEvent>(),
-              Queried("GetCurrentPlayMode() -> (1, 6)") + Queried("GetPlayMode() -> (1, 7)") +
+              Queried("GetCurrentPlayMode() -> (PlayDirectionBackward, PlaySpeedFast1)") +
+                  Queried("GetPlayMode() -> (PlayDirectionBackward, PlaySpeedFast2)") +
                   Logged("Sending Continued with playmode: dir 1, speed 7 (currentplaymode: dir "
                          "1, speed 6)") +
-                  Fired("Continued(1, 7)"));
+                  Fired("Continued(PlayDirectionBackward, PlaySpeedFast2)"));
 }
 
-TEST_F(PlaybackStateEventTest, SteppedReportsTheDirectionAsItWasBeforeTheLogLine)
+TEST_F(PlaybackStateEvents, SteppedReportsTheDirectionAsItWasBeforeTheLogLine)
 {
     WhenTheLogSwitchIsAsked(1, [this] {
         context.playMode = bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedNormal);
     });
 
     EXPECT_EQ(Dispatch<bdmv::SteppedEvent>(),
-              Queried("GetCurrentTimePosition() -> 0") + Queried("GetPlayMode() -> (0, 5)") +
-                  Logged("Sending Stepped - position: 0,dir=0") + Fired("Stepped(0, 0)"));
+              Queried("GetCurrentTimePosition() -> 0") +
+                  Queried("GetPlayMode() -> (PlayDirectionForward, PlaySpeedNormal)") +
+                  Logged("Sending Stepped - position: 0,dir=0") +
+                  Fired("Stepped(0, PlayDirectionForward)"));
 }
 
-TEST_F(PlaybackStateEventTest, AListenerThatChangesTheContextDoesNotChangeWhatTheOthersReceive)
+TEST_F(PlaybackStateEvents, AListenerThatChangesTheContextDoesNotChangeWhatTheOthersReceive)
 {
     a.onCallback = [this](const std::string&) {
         context.currentTimePosition = 1;
@@ -143,11 +151,13 @@ TEST_F(PlaybackStateEventTest, AListenerThatChangesTheContextDoesNotChangeWhatTh
     };
 
     EXPECT_EQ(Dispatch<bdmv::SteppedEvent>(),
-              Queried("GetCurrentTimePosition() -> 0") + Queried("GetPlayMode() -> (0, 5)") +
-                  Logged("Sending Stepped - position: 0,dir=0") + Fired("Stepped(0, 0)"));
+              Queried("GetCurrentTimePosition() -> 0") +
+                  Queried("GetPlayMode() -> (PlayDirectionForward, PlaySpeedNormal)") +
+                  Logged("Sending Stepped - position: 0,dir=0") +
+                  Fired("Stepped(0, PlayDirectionForward)"));
 }
 
-TEST_F(PlaybackStateEventTest, AnAssertionThatDoesNotReturnEndsFinished)
+TEST_F(PlaybackStateEvents, AnAssertionThatDoesNotReturnEndsFinished)
 {
     struct Abandoned {
     };

@@ -79,8 +79,8 @@ const Scenario plainScenarios[] = {
          Fired("TextSubtitleStylesAvailable(255)")},
 };
 
-INSTANTIATE_TEST_SUITE_P(PlainStreams, EventScenarioTest, testing::ValuesIn(plainScenarios),
-                         EventScenarioTest::Name);
+INSTANTIATE_TEST_SUITE_P(PlainStreams, EventScenario, testing::ValuesIn(plainScenarios),
+                         EventScenario::Name);
 
 /** A subtitle selection, differing between the two queries for it. */
 std::function<void(Context&)> Subtitles(bdmv::INavError::ErrCode result, bool shown, Stream stream)
@@ -146,14 +146,14 @@ const Scenario presentationGraphicsScenarios[] = {
          Subtitles(bdmv::INavError::ErrOk, true, {4, 3})(context);
          context.untouched = {"rGetPgTextStInfo", "GetPgTextStInfo"};
      },
-     Queried("rGetPgTextStInfo(0, 0) -> untouched") + Queried("rGetPgTextStInfo returned 0") +
+     Queried("rGetPgTextStInfo(0, 0) -> untouched") + Queried("rGetPgTextStInfo returned ErrOk") +
          Queried("GetPgTextStInfo(0, 0) -> untouched") + Queried("GetPgTextStDisplay() -> true") +
          Logged("Sending PresentationGraphicsInfo - pgTextStNr: 0, available: FALSE") +
          Fired("PresentationGraphicsInfo(0, false)")},
 };
 
-INSTANTIATE_TEST_SUITE_P(PresentationGraphicsInfo, EventScenarioTest,
-                         testing::ValuesIn(presentationGraphicsScenarios), EventScenarioTest::Name);
+INSTANTIATE_TEST_SUITE_P(PresentationGraphicsInfo, EventScenario,
+                         testing::ValuesIn(presentationGraphicsScenarios), EventScenario::Name);
 
 /** The picture-in-picture subtitle selection beside the primary one. */
 struct PipSubtitle {
@@ -234,8 +234,8 @@ std::vector<Scenario> PipPgTextStInfoScenarios()
     return scenarios;
 }
 
-INSTANTIATE_TEST_SUITE_P(PipPgTextStInfo, EventScenarioTest,
-                         testing::ValuesIn(PipPgTextStInfoScenarios()), EventScenarioTest::Name);
+INSTANTIATE_TEST_SUITE_P(PipPgTextStInfo, EventScenario,
+                         testing::ValuesIn(PipPgTextStInfoScenarios()), EventScenario::Name);
 
 const Scenario secondaryScenarios[] = {
     {"AudioShown", New<bdmv::SecondaryAudioInfoEvent>(),
@@ -318,8 +318,8 @@ const Scenario secondaryScenarios[] = {
          Fired("SecondaryVideoDisplay(0, false)")},
 };
 
-INSTANTIATE_TEST_SUITE_P(SecondaryStreams, EventScenarioTest, testing::ValuesIn(secondaryScenarios),
-                         EventScenarioTest::Name);
+INSTANTIATE_TEST_SUITE_P(SecondaryStreams, EventScenario, testing::ValuesIn(secondaryScenarios),
+                         EventScenario::Name);
 
 bd::AudioInfoType AudioAttributes()
 {
@@ -341,22 +341,26 @@ void HoldsOtherAudio(Context& context)
 const Scenario audioInfoChangedScenarios[] = {
     {"Primary", New<bdmv::AudioInfoChangedEvent>(true, AudioAttributes()), HoldsOtherAudio,
      Logged("Sending AudioChannelsChanged") +
-         Fired("AudioInfoChanged(true, (7, 14, 4, 43, 65535, 4294967294))")},
+         Fired("AudioInfoChanged(true, (AudioFormatEac3, AudioSampleRate_192000, "
+               "AudioBitsPerSamplingType24, AudioChannelTypeOthers, 65535, 4294967294))")},
     {"Secondary", New<bdmv::AudioInfoChangedEvent>(false, AudioAttributes()), HoldsOtherAudio,
      Logged("Sending AudioChannelsChanged") +
-         Fired("AudioInfoChanged(false, (7, 14, 4, 43, 65535, 4294967294))")},
+         Fired("AudioInfoChanged(false, (AudioFormatEac3, AudioSampleRate_192000, "
+               "AudioBitsPerSamplingType24, AudioChannelTypeOthers, 65535, 4294967294))")},
     {"Unknown", New<bdmv::AudioInfoChangedEvent>(true, bd::AudioInfoType()), HoldsOtherAudio,
-     Logged("Sending AudioChannelsChanged") + Fired("AudioInfoChanged(true, (0, 0, 0, 0, 0, 0))")},
+     Logged("Sending AudioChannelsChanged") +
+         Fired("AudioInfoChanged(true, (AudioFormatUnknown, AudioSampleRateUnknown, "
+               "AudioBitsPerSamplingTypeInvalid, AudioChannelTypeUnknown, 0, 0))")},
 };
 
-INSTANTIATE_TEST_SUITE_P(AudioInfoChanged, EventScenarioTest,
-                         testing::ValuesIn(audioInfoChangedScenarios), EventScenarioTest::Name);
+INSTANTIATE_TEST_SUITE_P(AudioInfoChanged, EventScenario,
+                         testing::ValuesIn(audioInfoChangedScenarios), EventScenario::Name);
 
-class StreamInfoEventTest : public EventTest
+class StreamInfoEvents : public EventTest
 {
 };
 
-TEST_F(StreamInfoEventTest, PresentationGraphicsInfoGoesOnAfterEveryResultButNotAllowed)
+TEST_F(StreamInfoEvents, PresentationGraphicsInfoGoesOnAfterEveryResultButNotAllowed)
 {
     for (const int result : {0, 1, 2, 3, 4, 5, 6, 8, -1}) {
         Subtitles(static_cast<bdmv::INavError::ErrCode>(result), true, {4, 3})(context);
@@ -370,7 +374,7 @@ TEST_F(StreamInfoEventTest, PresentationGraphicsInfoGoesOnAfterEveryResultButNot
     }
 }
 
-TEST_F(StreamInfoEventTest, SecondaryAudioInfoAsksForTheDisplayAfterTheLastListenerHasTheStream)
+TEST_F(StreamInfoEvents, SecondaryAudioInfoAsksForTheDisplayAfterTheLastListenerHasTheStream)
 {
     context.secondaryAudio = Stream{2, 3};
     c.onCallback = [this](const std::string&) {
@@ -387,7 +391,7 @@ TEST_F(StreamInfoEventTest, SecondaryAudioInfoAsksForTheDisplayAfterTheLastListe
                   Fired("SecondaryAudioDisplay(2, true)"));
 }
 
-TEST_F(StreamInfoEventTest, SecondaryVideoInfoAsksForTheDisplayAfterTheLastListenerHasTheStream)
+TEST_F(StreamInfoEvents, SecondaryVideoInfoAsksForTheDisplayAfterTheLastListenerHasTheStream)
 {
     context.secondaryVideo = Stream{2, 3};
     c.onCallback = [this](const std::string&) {
@@ -405,7 +409,7 @@ TEST_F(StreamInfoEventTest, SecondaryVideoInfoAsksForTheDisplayAfterTheLastListe
                   Fired("SecondaryVideoDisplay(2, true)"));
 }
 
-TEST_F(StreamInfoEventTest, SecondaryStreamsLeaveTheListFreeForChangesBetweenTheirCallbacks)
+TEST_F(StreamInfoEvents, SecondaryStreamsLeaveTheListFreeForChangesBetweenTheirCallbacks)
 {
     context.onQuery = [this](const std::string& operation) {
         if (operation == "GetSecondaryAudioDisplay") {
@@ -434,7 +438,7 @@ TEST_F(StreamInfoEventTest, SecondaryStreamsLeaveTheListFreeForChangesBetweenThe
                   "B.SecondaryVideoDisplay(0, false)\n");
 }
 
-TEST_F(StreamInfoEventTest, AudioInfoChangedKeepsItsOwnCopyOfTheAttributes)
+TEST_F(StreamInfoEvents, AudioInfoChangedKeepsItsOwnCopyOfTheAttributes)
 {
     bd::AudioInfoType info = AudioAttributes();
     bdmv::AudioInfoChangedEvent event(context, true, info);

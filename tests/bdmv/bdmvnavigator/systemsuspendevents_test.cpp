@@ -46,17 +46,17 @@ const Scenario scenarios[] = {
          Queried("CleanupSystemResumeData()")},
 };
 
-INSTANTIATE_TEST_SUITE_P(SystemSuspend, EventScenarioTest, testing::ValuesIn(scenarios),
-                         EventScenarioTest::Name);
+INSTANTIATE_TEST_SUITE_P(SystemSuspend, EventScenario, testing::ValuesIn(scenarios),
+                         EventScenario::Name);
 
-class SystemSuspendedEventTest : public EventTest
+class SystemSuspension : public EventTest
 {
 protected:
     bd::UInt8 m_First[2] = {1, 2};
     bd::UInt8 m_Second[1] = {9};
 };
 
-TEST_F(SystemSuspendedEventTest, LogsTheSizeThatTheDescriptorHoldsOnceTheSwitchIsOn)
+TEST_F(SystemSuspension, LogsTheSizeThatTheDescriptorHoldsOnceTheSwitchIsOn)
 {
     context.systemResumeData = {m_First, 2};
     WhenTheLogSwitchIsAsked(1, [this] { context.systemResumeData = {m_Second, 1}; });
@@ -67,7 +67,7 @@ TEST_F(SystemSuspendedEventTest, LogsTheSizeThatTheDescriptorHoldsOnceTheSwitchI
                   Fired("SystemSuspended(bytes 9, 1)") + Queried("CleanupSystemResumeData()"));
 }
 
-TEST_F(SystemSuspendedEventTest, FiresWhatTheDescriptorHoldsAfterTheLogCheck)
+TEST_F(SystemSuspension, FiresWhatTheDescriptorHoldsAfterTheLogCheck)
 {
     context.systemResumeData = {m_First, 2};
     WhenTheLogSwitchIsAsked(0, [this] { context.systemResumeData = {m_Second, 1}; });
@@ -77,7 +77,7 @@ TEST_F(SystemSuspendedEventTest, FiresWhatTheDescriptorHoldsAfterTheLogCheck)
                   Fired("SystemSuspended(bytes 9, 1)") + Queried("CleanupSystemResumeData()"));
 }
 
-TEST_F(SystemSuspendedEventTest, TellsEveryListenerTheSameWhenOneChangesTheDescriptor)
+TEST_F(SystemSuspension, TellsEveryListenerTheSameWhenOneChangesTheDescriptor)
 {
     context.systemResumeData = {m_First, 2};
     a.onCallback = [this](const std::string&) { context.systemResumeData = {m_Second, 1}; };
@@ -88,7 +88,7 @@ TEST_F(SystemSuspendedEventTest, TellsEveryListenerTheSameWhenOneChangesTheDescr
                   Fired("SystemSuspended(bytes 1 2, 2)") + Queried("CleanupSystemResumeData()"));
 }
 
-TEST_F(SystemSuspendedEventTest, HandsEveryListenerTheBlockOfTheContextItself)
+TEST_F(SystemSuspension, HandsEveryListenerTheBlockOfTheContextItself)
 {
     struct Keeper : bdmv::NavigatorListenerAdapter {
         void SystemSuspended(const void* data, bd::UInt32 size) override

@@ -74,8 +74,8 @@ const Scenario scenarios[] = {
          Fired("MarkInfo(800, 65535, 18446744073709551615)")},
 };
 
-INSTANTIATE_TEST_SUITE_P(TitlePosition, EventScenarioTest, testing::ValuesIn(scenarios),
-                         EventScenarioTest::Name);
+INSTANTIATE_TEST_SUITE_P(TitlePosition, EventScenario, testing::ValuesIn(scenarios),
+                         EventScenario::Name);
 
 /** What the current and the previous play item have of a secondary stream, and what is sent. */
 struct Secondary {
@@ -118,10 +118,11 @@ void PlaysItem(Context& context)
 
 const std::string itemPlayed =
     Queried("GetPlayListId() -> 4294967295") + Queried("GetPlayItemId() -> 65535") +
-    Queried("GetVideoAttributes(15, 15) -> 5, 4") +
+    Queried("GetVideoAttributes(VideoFormatTypeNoInfo, VideoAspectRatioTypeNoInfo) -> "
+            "VideoFormatType720p, VideoAspectRatioType2_21x1") +
     Logged("Sending PlayItem - playListId: 4294967295, playItemId: 65535, videoFormat 5, "
            "aspectRatio 4") +
-    Fired("PlayItem(4294967295, 65535, 5, 4)");
+    Fired("PlayItem(4294967295, 65535, VideoFormatType720p, VideoAspectRatioType2_21x1)");
 
 std::string Flag(bool value)
 {
@@ -149,31 +150,33 @@ std::vector<Scenario> PlayItemScenarios()
                                video.sent + audio.sent});
         }
     }
-    all.push_back({"Untouched", New<bdmv::PlayItemEvent>(),
-                   [](Context& context) {
-                       context.playListId = 800;
-                       context.playItemId = 1;
-                       context.async2ndVid = context.prev2ndAud = true;
-                       context.untouched = {"GetVideoAttributes", "IsAsyncPipInCurrentPlayItem"};
-                   },
-                   Queried("GetPlayListId() -> 800") + Queried("GetPlayItemId() -> 1") +
-                       Queried("GetVideoAttributes(15, 15) -> untouched") +
-                       Logged("Sending PlayItem - playListId: 800, playItemId: 1, videoFormat 15, "
-                              "aspectRatio 15") +
-                       Fired("PlayItem(800, 1, 15, 15)") +
-                       Queried("IsAsyncPipInCurrentPlayItem(false, false, false, false) -> "
-                               "untouched")});
+    all.push_back(
+        {"Untouched", New<bdmv::PlayItemEvent>(),
+         [](Context& context) {
+             context.playListId = 800;
+             context.playItemId = 1;
+             context.async2ndVid = context.prev2ndAud = true;
+             context.untouched = {"GetVideoAttributes", "IsAsyncPipInCurrentPlayItem"};
+         },
+         Queried("GetPlayListId() -> 800") + Queried("GetPlayItemId() -> 1") +
+             Queried("GetVideoAttributes(VideoFormatTypeNoInfo, VideoAspectRatioTypeNoInfo) -> "
+                     "untouched") +
+             Logged("Sending PlayItem - playListId: 800, playItemId: 1, videoFormat 15, "
+                    "aspectRatio 15") +
+             Fired("PlayItem(800, 1, VideoFormatTypeNoInfo, VideoAspectRatioTypeNoInfo)") +
+             Queried("IsAsyncPipInCurrentPlayItem(false, false, false, false) -> "
+                     "untouched")});
     return all;
 }
 
-INSTANTIATE_TEST_SUITE_P(PlayItem, EventScenarioTest, testing::ValuesIn(PlayItemScenarios()),
-                         EventScenarioTest::Name);
+INSTANTIATE_TEST_SUITE_P(PlayItem, EventScenario, testing::ValuesIn(PlayItemScenarios()),
+                         EventScenario::Name);
 
-class TitlePositionEventTest : public EventTest
+class TitlePositionEvents : public EventTest
 {
 };
 
-TEST_F(TitlePositionEventTest, PlayItemAsksForTheFlagsAfterTheLastListenerHasThePlayItem)
+TEST_F(TitlePositionEvents, PlayItemAsksForTheFlagsAfterTheLastListenerHasThePlayItem)
 {
     PlaysItem(context);
     c.onCallback = [this](const std::string&) { context.async2ndAud = true; };
@@ -185,7 +188,7 @@ TEST_F(TitlePositionEventTest, PlayItemAsksForTheFlagsAfterTheLastListenerHasThe
                   audioAvailable);
 }
 
-TEST_F(TitlePositionEventTest, PlayItemAsksForTheFlagsOnce)
+TEST_F(TitlePositionEvents, PlayItemAsksForTheFlagsOnce)
 {
     PlaysItem(context);
     context.prev2ndVid = context.prev2ndAud = true;
@@ -202,7 +205,7 @@ TEST_F(TitlePositionEventTest, PlayItemAsksForTheFlagsOnce)
                   pipUnavailable + audioUnavailable);
 }
 
-TEST_F(TitlePositionEventTest, PlayItemLeavesTheListFreeForChangesBetweenItsCallbacks)
+TEST_F(TitlePositionEvents, PlayItemLeavesTheListFreeForChangesBetweenItsCallbacks)
 {
     PlaysItem(context);
     context.prev2ndVid = true;
@@ -223,7 +226,7 @@ TEST_F(TitlePositionEventTest, PlayItemLeavesTheListFreeForChangesBetweenItsCall
                   "A.PictureInPictureUnavailable()\n");
 }
 
-TEST_F(TitlePositionEventTest, UOMaskComputesTheReportedFormOnceTheSwitchIsOn)
+TEST_F(TitlePositionEvents, UOMaskComputesTheReportedFormOnceTheSwitchIsOn)
 {
     Masks(context, 1);
     WhenTheLogSwitchIsAsked(1, [] { g_u1Bduopmask = 2; });
@@ -234,7 +237,7 @@ TEST_F(TitlePositionEventTest, UOMaskComputesTheReportedFormOnceTheSwitchIsOn)
                   Fired("UOMask(18446744073709551615)"));
 }
 
-TEST_F(TitlePositionEventTest, UOMaskHandsOutTheStoredMaskWhateverTheOverrideReports)
+TEST_F(TitlePositionEvents, UOMaskHandsOutTheStoredMaskWhateverTheOverrideReports)
 {
     struct Keeper : bdmv::NavigatorListenerAdapter {
         void UOMask(const bdmv::UOMaskTable& mask) override { masks.push_back(mask); }

@@ -1,11 +1,13 @@
 #include <vector>
 
 #include "eventtest.h"
+#include "support/describe.h"
 
 namespace
 {
 
 using namespace bd;
+using bdmvtest::Describe;
 
 enum Asked { Nothing, States, StatesAndTrigger };
 
@@ -67,32 +69,32 @@ std::string QueriesFor(const Reached& reached)
     std::string queries;
     if (reached.asked != Nothing) {
         queries +=
-            Queried("GetCurrentABRepeatState() -> " + std::to_string(reached.abRepeat)) +
-            Queried("GetCurrentChpTitleRepeatState() -> " + std::to_string(reached.chpTitleRepeat));
+            Queried("GetCurrentABRepeatState() -> " + Describe(reached.abRepeat)) +
+            Queried("GetCurrentChpTitleRepeatState() -> " + Describe(reached.chpTitleRepeat));
     }
     if (reached.asked == StatesAndTrigger) {
-        queries += Queried("GetTrigger() -> (" + std::to_string(reached.set) + ")");
+        queries += Queried("GetTrigger() -> (" + Describe(reached.set) + ")");
     }
     return queries;
 }
 
 Scenario TriggerReached(const Reached& reached)
 {
-    const std::string reported = std::to_string(reached.reported);
-    return {
-        reached.name, New<bdmv::TriggerReachedEvent>(),
-        [reached](Context& context) {
-            context.triggerReachedTime = 6000000000;
-            context.triggerTypeByTime = reached.typeByTime;
-            context.currentABRepeatState = reached.abRepeat;
-            context.currentChpTitleRepeatState = reached.chpTitleRepeat;
-            context.trigger.triggerType = reached.set;
-        },
-        Logged("Sending Trigger Reached") + Queried("GetTriggerReachedTime() -> 6000000000") +
-            Queried("GetTriggerTypeByTime(6000000000) -> " + std::to_string(reached.typeByTime)) +
-            QueriesFor(reached) +
-            Logged("TriggerRead time type=" + reported + ",time = 6000000000", "57 3 0") +
-            Fired("TriggerTimeReached(" + reported + ", 6000000000)")};
+    return {reached.name, New<bdmv::TriggerReachedEvent>(),
+            [reached](Context& context) {
+                context.triggerReachedTime = 6000000000;
+                context.triggerTypeByTime = reached.typeByTime;
+                context.currentABRepeatState = reached.abRepeat;
+                context.currentChpTitleRepeatState = reached.chpTitleRepeat;
+                context.trigger.triggerType = reached.set;
+            },
+            Logged("Sending Trigger Reached") + Queried("GetTriggerReachedTime() -> 6000000000") +
+                Queried("GetTriggerTypeByTime(6000000000) -> " + Describe(reached.typeByTime)) +
+                QueriesFor(reached) +
+                Logged("TriggerRead time type=" + std::to_string(reached.reported) +
+                           ",time = 6000000000",
+                       "57 3 0") +
+                Fired("TriggerTimeReached(" + Describe(reached.reported) + ", 6000000000)")};
 }
 
 std::vector<Scenario> TriggerReachedScenarios()
@@ -119,13 +121,12 @@ std::vector<Scenario> OtherTriggerReachedScenarios()
     return scenarios;
 }
 
-INSTANTIATE_TEST_SUITE_P(TriggerReached, EventScenarioTest,
-                         testing::ValuesIn(TriggerReachedScenarios()), EventScenarioTest::Name);
-INSTANTIATE_TEST_SUITE_P(OtherTriggerReached, EventScenarioTest,
-                         testing::ValuesIn(OtherTriggerReachedScenarios()),
-                         EventScenarioTest::Name);
+INSTANTIATE_TEST_SUITE_P(TriggerReached, EventScenario,
+                         testing::ValuesIn(TriggerReachedScenarios()), EventScenario::Name);
+INSTANTIATE_TEST_SUITE_P(OtherTriggerReached, EventScenario,
+                         testing::ValuesIn(OtherTriggerReachedScenarios()), EventScenario::Name);
 
-class TriggerReachedEventTest : public EventTest
+class TriggerReachedEvents : public EventTest
 {
 protected:
     /** Switches the log on for one level, without high-frequency lines. */
@@ -139,39 +140,40 @@ protected:
 
     static std::string Queries()
     {
-        return Queried("GetTriggerReachedTime() -> 0") + Queried("GetTriggerTypeByTime(0) -> 4");
+        return Queried("GetTriggerReachedTime() -> 0") +
+               Queried("GetTriggerTypeByTime(0) -> TRIGGER_NONE");
     }
 };
 
-TEST_F(TriggerReachedEventTest, WritesOnlyTheDiagnosticWhenOnlyWarningsAreOn)
+TEST_F(TriggerReachedEvents, WritesOnlyTheDiagnosticWhenOnlyWarningsAreOn)
 {
     EnableLevel(KEVRO_Log_LevelWarning);
 
     EXPECT_EQ(Dispatch<bdmv::TriggerReachedEvent>(),
               NotLogged() + Queries() + Logged("TriggerRead time type=4,time = 0", "57 3 0") +
-                  Fired("TriggerTimeReached(4, 0)"));
+                  Fired("TriggerTimeReached(TRIGGER_NONE, 0)"));
 }
 
-TEST_F(TriggerReachedEventTest, WritesOnlyTheNotificationWhenOnlyEventsAreOn)
+TEST_F(TriggerReachedEvents, WritesOnlyTheNotificationWhenOnlyEventsAreOn)
 {
     EnableLevel(KEVRO_Log_LevelEvent);
 
-    EXPECT_EQ(Dispatch<bdmv::TriggerReachedEvent>(), Logged("Sending Trigger Reached") + Queries() +
-                                                         NotLogged("57 3 0") +
-                                                         Fired("TriggerTimeReached(4, 0)"));
+    EXPECT_EQ(Dispatch<bdmv::TriggerReachedEvent>(),
+              Logged("Sending Trigger Reached") + Queries() + NotLogged("57 3 0") +
+                  Fired("TriggerTimeReached(TRIGGER_NONE, 0)"));
 }
 
 const Scenario triggerSetScenarios[] = {
     {"TriggerSetFailed", New<bdmv::TriggerSetEvent>(TRIGGER_A, false),
      [](Context& context) { context.trigger.triggerType = TRIGGER_TITLE; },
-     Logged("Sending Trigger Set") + Fired("TriggerSet(5, false)")},
+     Logged("Sending Trigger Set") + Fired("TriggerSet(TRIGGER_A, false)")},
     {"TriggerSetDone", New<bdmv::TriggerSetEvent>(TRIGGER_NOTIFY_FROM_CURPOS, true),
      [](Context& context) { context.trigger.triggerType = TRIGGER_TITLE; },
-     Logged("Sending Trigger Set") + Fired("TriggerSet(13, true)")},
+     Logged("Sending Trigger Set") + Fired("TriggerSet(TRIGGER_NOTIFY_FROM_CURPOS, true)")},
 };
 
-INSTANTIATE_TEST_SUITE_P(TriggerSet, EventScenarioTest, testing::ValuesIn(triggerSetScenarios),
-                         EventScenarioTest::Name);
+INSTANTIATE_TEST_SUITE_P(TriggerSet, EventScenario, testing::ValuesIn(triggerSetScenarios),
+                         EventScenario::Name);
 
 const Scenario currentTimePositionScenarios[] = {
     {"CurrentTimePosition", New<bdmv::CurrentTimePositionEvent>(),
@@ -186,8 +188,8 @@ const Scenario currentTimePositionScenarios[] = {
          Fired("CurrentTimePosition(18446744073709551615)")},
 };
 
-INSTANTIATE_TEST_SUITE_P(CurrentTimePosition, EventScenarioTest,
-                         testing::ValuesIn(currentTimePositionScenarios), EventScenarioTest::Name);
+INSTANTIATE_TEST_SUITE_P(CurrentTimePosition, EventScenario,
+                         testing::ValuesIn(currentTimePositionScenarios), EventScenario::Name);
 
 const ZOOM_PARAM_Def zoom = {{1, 2, 3, 4}, {5, 6, 7, 65535}, 4294967295};
 
@@ -205,8 +207,8 @@ const Scenario zoomModeSetScenarios[] = {
          Fired("ZoomModeSet(((0, 0, 0, 0), (0, 0, 0, 0), 0))")},
 };
 
-INSTANTIATE_TEST_SUITE_P(ZoomModeSet, EventScenarioTest, testing::ValuesIn(zoomModeSetScenarios),
-                         EventScenarioTest::Name);
+INSTANTIATE_TEST_SUITE_P(ZoomModeSet, EventScenario, testing::ValuesIn(zoomModeSetScenarios),
+                         EventScenario::Name);
 
 std::function<void(Context&)> Plays(PlayDirectionDef direction, PlaySpeedDef speed,
                                     bool async2ndVid, bool async2ndAud, bool previous = false)
@@ -230,12 +232,14 @@ const std::string pipUnavailable =
 const std::string audioUnavailable =
     Logged("For speed play notify async 2ndaud unavailable") + Fired("SecondaryAudioUnavailable()");
 
-const std::string normalPlay = Queried("GetCurrentPlayMode() -> (0, 5)") +
-                               Logged("Sending PlayMode - direction: 0, speedIndex: 5") +
-                               Fired("PlayMode(0, 5)");
-const std::string fastPlay = Queried("GetCurrentPlayMode() -> (0, 6)") +
-                             Logged("Sending PlayMode - direction: 0, speedIndex: 6") +
-                             Fired("PlayMode(0, 6)");
+const std::string normalPlay =
+    Queried("GetCurrentPlayMode() -> (PlayDirectionForward, PlaySpeedNormal)") +
+    Logged("Sending PlayMode - direction: 0, speedIndex: 5") +
+    Fired("PlayMode(PlayDirectionForward, PlaySpeedNormal)");
+const std::string fastPlay =
+    Queried("GetCurrentPlayMode() -> (PlayDirectionForward, PlaySpeedFast1)") +
+    Logged("Sending PlayMode - direction: 0, speedIndex: 6") +
+    Fired("PlayMode(PlayDirectionForward, PlaySpeedFast1)");
 
 std::string AsyncFlags(const std::string& flags)
 {
@@ -275,8 +279,9 @@ const Scenario playModeScenarios[] = {
      fastPlay + AsyncFlags("false, false, true, true")},
     {"NormalPlayBackward", New<bdmv::PlayModeEvent>(),
      Plays(PlayDirectionBackward, PlaySpeedNormal, true, true),
-     Queried("GetCurrentPlayMode() -> (1, 5)") +
-         Logged("Sending PlayMode - direction: 1, speedIndex: 5") + Fired("PlayMode(1, 5)") +
+     Queried("GetCurrentPlayMode() -> (PlayDirectionBackward, PlaySpeedNormal)") +
+         Logged("Sending PlayMode - direction: 1, speedIndex: 5") +
+         Fired("PlayMode(PlayDirectionBackward, PlaySpeedNormal)") +
          AsyncFlags("true, true, false, false") + pipAvailable + audioAvailable},
     {"AsyncFlagsUntouched", New<bdmv::PlayModeEvent>(),
      [](Context& context) {
@@ -286,34 +291,33 @@ const Scenario playModeScenarios[] = {
      normalPlay + AsyncFlags("untouched")},
 };
 
-INSTANTIATE_TEST_SUITE_P(PlayMode, EventScenarioTest, testing::ValuesIn(playModeScenarios),
-                         EventScenarioTest::Name);
+INSTANTIATE_TEST_SUITE_P(PlayMode, EventScenario, testing::ValuesIn(playModeScenarios),
+                         EventScenario::Name);
 
-class PlayModeEventTest : public EventTest
+class PlayModeEvents : public EventTest
 {
 };
 
-TEST_F(PlayModeEventTest, WithdrawsAsyncStreamsAtEverySpeedButTheNormalOne)
+TEST_F(PlayModeEvents, WithdrawsAsyncStreamsAtEverySpeedButTheNormalOne)
 {
     for (int speed = PlaySpeedSlow5; speed <= PlaySpeedFast12; ++speed) {
         for (const PlayDirectionDef direction : {PlayDirectionForward, PlayDirectionBackward}) {
-            const std::string dir = std::to_string(direction);
-            const std::string index = std::to_string(speed);
-            Plays(direction, static_cast<PlaySpeedDef>(speed), true, true)(context);
+            const PlayMode mode(direction, static_cast<PlaySpeedDef>(speed));
+            Plays(mode.Direction(), mode.Speed(), true, true)(context);
 
-            EXPECT_EQ(
-                Dispatch<bdmv::PlayModeEvent>(),
-                Queried("GetCurrentPlayMode() -> (" + dir + ", " + index + ")") +
-                    Logged("Sending PlayMode - direction: " + dir + ", speedIndex: " + index) +
-                    Fired("PlayMode(" + dir + ", " + index + ")") +
-                    AsyncFlags("true, true, false, false") +
-                    (index == "5" ? pipAvailable + audioAvailable
-                                  : pipUnavailable + audioUnavailable));
+            EXPECT_EQ(Dispatch<bdmv::PlayModeEvent>(),
+                      Queried("GetCurrentPlayMode() -> " + Describe(mode)) +
+                          Logged("Sending PlayMode - direction: " + std::to_string(direction) +
+                                 ", speedIndex: " + std::to_string(speed)) +
+                          Fired("PlayMode" + Describe(mode)) +
+                          AsyncFlags("true, true, false, false") +
+                          (speed == PlaySpeedNormal ? pipAvailable + audioAvailable
+                                                    : pipUnavailable + audioUnavailable));
         }
     }
 }
 
-TEST_F(PlayModeEventTest, DecidesByTheSpeedItReportedAndTheFlagsOfAfterwards)
+TEST_F(PlayModeEvents, DecidesByTheSpeedItReportedAndTheFlagsOfAfterwards)
 {
     WhenTheLogSwitchIsAsked(
         1, [this] { context.currentPlayMode = PlayMode(PlayDirectionBackward, PlaySpeedFast1); });
@@ -323,7 +327,7 @@ TEST_F(PlayModeEventTest, DecidesByTheSpeedItReportedAndTheFlagsOfAfterwards)
               normalPlay + AsyncFlags("true, false, false, false") + pipAvailable);
 }
 
-TEST_F(PlayModeEventTest, AsksForTheFlagsOnce)
+TEST_F(PlayModeEvents, AsksForTheFlagsOnce)
 {
     Plays(PlayDirectionForward, PlaySpeedNormal, true, true)(context);
     b.onCallback = [this](const std::string& callback) {
@@ -336,7 +340,7 @@ TEST_F(PlayModeEventTest, AsksForTheFlagsOnce)
               normalPlay + AsyncFlags("true, true, false, false") + pipAvailable + audioAvailable);
 }
 
-TEST_F(PlayModeEventTest, LeavesTheListFreeForChangesBetweenItsCallbacks)
+TEST_F(PlayModeEvents, LeavesTheListFreeForChangesBetweenItsCallbacks)
 {
     Plays(PlayDirectionForward, PlaySpeedNormal, true, false)(context);
     context.onQuery = [this](const std::string& operation) {

@@ -17,10 +17,10 @@ namespace
 namespace fs = std::filesystem;
 
 /** A folder of its own for each test, with an empty disc in it. */
-class DiscTest : public testing::Test
+class DiscFiles : public testing::Test
 {
 protected:
-    DiscTest()
+    DiscFiles()
     {
         std::string pattern = (fs::temp_directory_path() / "disc_test_XXXXXX").string();
         m_Folder = mkdtemp(pattern.data());
@@ -28,7 +28,7 @@ protected:
         fs::create_directories(m_Folder / "BDMV" / "CLIPINF");
     }
 
-    ~DiscTest() override { fs::remove_all(m_Folder); }
+    ~DiscFiles() override { fs::remove_all(m_Folder); }
 
     fs::path PathOf(const std::string& name) const { return m_Folder / "BDMV" / name; }
 
@@ -51,14 +51,14 @@ protected:
     fs::path m_Folder;
 };
 
-TEST_F(DiscTest, IsFoundFromTheFolderThatHoldsBdmvAndFromBdmvItself)
+TEST_F(DiscFiles, IsFoundFromTheFolderThatHoldsBdmvAndFromBdmvItself)
 {
     EXPECT_EQ(Disc(TestDisc("titles")).PlayListNumbers().size(), 5u);
     EXPECT_EQ(Disc(TestDisc("titles") / "BDMV").PlayListNumbers().size(), 5u);
     EXPECT_EQ(Disc(TestDisc("titles") / "BDMV" / "").PlayListNumbers().size(), 5u);
 }
 
-TEST_F(DiscTest, IsNotFoundInAFolderWithoutBdmv)
+TEST_F(DiscFiles, IsNotFoundInAFolderWithoutBdmv)
 {
     const fs::path folder = m_Folder / "else\nwhere";
     EXPECT_EQ(FileErrorOf([&] { Disc disc(folder); }),
@@ -66,7 +66,7 @@ TEST_F(DiscTest, IsNotFoundInAFolderWithoutBdmv)
                   "\\x0Awhere: no disc, expected a folder that holds BDMV or is it");
 }
 
-TEST_F(DiscTest, ListsPlayListsOfFiveDigitsInOrder)
+TEST_F(DiscFiles, ListsPlayListsOfFiveDigitsInOrder)
 {
     for (const char* const name : {"00800.mpls", "00001.mpls", "99999.mpls", "00000.mpls",
                                    "0001.mpls", "000010.mpls", "0000a.mpls", "00002.MPLS",
@@ -76,7 +76,7 @@ TEST_F(DiscTest, ListsPlayListsOfFiveDigitsInOrder)
     EXPECT_EQ(MakeDisc().PlayListNumbers(), (std::vector<std::uint32_t>{0, 1, 800, 99999}));
 }
 
-TEST_F(DiscTest, ReportsAMissingPlayListFolder)
+TEST_F(DiscFiles, ReportsAMissingPlayListFolder)
 {
     fs::remove(PathOf("PLAYLIST"));
     EXPECT_EQ(FileErrorOf([&] { MakeDisc().PlayListNumbers(); }),
@@ -84,7 +84,7 @@ TEST_F(DiscTest, ReportsAMissingPlayListFolder)
                   ": No such file or directory, expected a folder of play lists");
 }
 
-TEST_F(DiscTest, ReportsAMissingFile)
+TEST_F(DiscFiles, ReportsAMissingFile)
 {
     EXPECT_EQ(FileErrorOf([&] { MakeDisc().ReadPlayList(7); }),
               PathOf("PLAYLIST/00007.mpls").string() +
@@ -94,7 +94,7 @@ TEST_F(DiscTest, ReportsAMissingFile)
                   ": No such file or directory, expected a file");
 }
 
-TEST_F(DiscTest, ReportsWhatIsNotARegularFile)
+TEST_F(DiscFiles, ReportsWhatIsNotARegularFile)
 {
     fs::create_directory(PathOf("index.bdmv"));
     EXPECT_EQ(FileErrorOf([&] { MakeDisc().ReadIndex(); }),
@@ -104,7 +104,7 @@ TEST_F(DiscTest, ReportsWhatIsNotARegularFile)
               PathOf("MovieObject.bdmv").string() + ": not a regular file, expected one");
 }
 
-TEST_F(DiscTest, RefusesAFileThatIsTooLarge)
+TEST_F(DiscFiles, RefusesAFileThatIsTooLarge)
 {
     Write("index.bdmv", {});
     fs::resize_file(PathOf("index.bdmv"), LargestFile + 1);
@@ -118,7 +118,7 @@ TEST_F(DiscTest, RefusesAFileThatIsTooLarge)
                   ": has 1048577 bytes, expected at most 1048576");
 }
 
-TEST_F(DiscTest, ReadsAFileOfTheGreatestSize)
+TEST_F(DiscFiles, ReadsAFileOfTheGreatestSize)
 {
     Write("PLAYLIST/00000.mpls", WithItem(PlayItemBytes()).Make());
     fs::resize_file(PathOf("PLAYLIST/00000.mpls"), LargestPlayListFile);
@@ -133,7 +133,7 @@ TEST_F(DiscTest, ReadsAFileOfTheGreatestSize)
 #endif
 
 #if !UNDEFINED_BEHAVIOR_SANITIZER
-TEST_F(DiscTest, ReportsAFileThatCannotBeOpened)
+TEST_F(DiscFiles, ReportsAFileThatCannotBeOpened)
 {
     WritePlayList("00000", 1);
     const Disc disc = MakeDisc();
@@ -149,7 +149,7 @@ TEST_F(DiscTest, ReportsAFileThatCannotBeOpened)
 }
 #endif
 
-TEST_F(DiscTest, NamesAFileWithinTheDiscWhenItsContentIsWrong)
+TEST_F(DiscFiles, NamesAFileWithinTheDiscWhenItsContentIsWrong)
 {
     Write("index.bdmv", Ascii("nonsense"));
     EXPECT_EQ(FormatErrorOf([&] { MakeDisc().ReadIndex(); }),
@@ -168,10 +168,10 @@ TEST_F(DiscTest, NamesAFileWithinTheDiscWhenItsContentIsWrong)
 }
 
 /** Looks up the aspect ratio of the first video stream of the disc "ntsc43", which is 4:3. */
-class AspectRatioTest : public DiscTest
+class AspectRatioLookup : public DiscFiles
 {
 protected:
-    AspectRatioTest() : m_PlayList(Disc(TestDisc("ntsc43")).ReadPlayList(0))
+    AspectRatioLookup() : m_PlayList(Disc(TestDisc("ntsc43")).ReadPlayList(0))
     {
         fs::copy_file(TestDisc("ntsc43") / "BDMV" / "CLIPINF" / "00000.clpi",
                       PathOf("CLIPINF/00000.clpi"));
@@ -192,12 +192,12 @@ protected:
     PlayList m_PlayList;
 };
 
-TEST_F(AspectRatioTest, ComesFromTheClipInformation)
+TEST_F(AspectRatioLookup, ComesFromTheClipInformation)
 {
     EXPECT_EQ(Find().code, 2);
 }
 
-TEST_F(AspectRatioTest, ComesFromTheClipThatTheSubPathNames)
+TEST_F(AspectRatioLookup, ComesFromTheClipThatTheSubPathNames)
 {
     SubPlayItem subItem;
     subItem.clip.name = "00000";
@@ -207,13 +207,13 @@ TEST_F(AspectRatioTest, ComesFromTheClipThatTheSubPathNames)
     EXPECT_EQ(Find().code, 2);
 }
 
-TEST_F(AspectRatioTest, IsNotKnownWithoutClipInformation)
+TEST_F(AspectRatioLookup, IsNotKnownWithoutClipInformation)
 {
     fs::remove(PathOf("CLIPINF/00000.clpi"));
     ExpectNotKnown("00000.clpi: No such file or directory", false);
 }
 
-TEST_F(AspectRatioTest, IsNotKnownIfTheClipHasNoSuchStream)
+TEST_F(AspectRatioLookup, IsNotKnownIfTheClipHasNoSuchStream)
 {
     Video().pid = 1;
     ExpectNotKnown("not in the clip information", false);
@@ -221,19 +221,19 @@ TEST_F(AspectRatioTest, IsNotKnownIfTheClipHasNoSuchStream)
     ExpectNotKnown("not in the clip information", false);
 }
 
-TEST_F(AspectRatioTest, IsNotKnownIfNoClipIsNamed)
+TEST_F(AspectRatioLookup, IsNotKnownIfNoClipIsNamed)
 {
     Video().entryType = EntryTypeSubPath;
     ExpectNotKnown("its clip is not known", false);
 }
 
-TEST_F(AspectRatioTest, IsNotKnownIfTheClipInformationIsDamaged)
+TEST_F(AspectRatioLookup, IsNotKnownIfTheClipInformationIsDamaged)
 {
     fs::resize_file(PathOf("CLIPINF/00000.clpi"), 50);
     ExpectNotKnown("BDMV/CLIPINF/00000.clpi: offset ", true);
 }
 
-TEST_F(AspectRatioTest, IsReadOncePerClip)
+TEST_F(AspectRatioLookup, IsReadOncePerClip)
 {
     const Disc disc = MakeDisc();
     AspectRatios ratios(disc);
@@ -242,7 +242,7 @@ TEST_F(AspectRatioTest, IsReadOncePerClip)
     EXPECT_EQ(ratios.Find(m_PlayList, 0, Video()).code, 2);
 }
 
-TEST_F(DiscTest, FindsThePlayListThatPlaysLongest)
+TEST_F(DiscFiles, FindsThePlayListThatPlaysLongest)
 {
     WritePlayList("00000", 10);
     WritePlayList("00001", 30);
@@ -253,7 +253,7 @@ TEST_F(DiscTest, FindsThePlayListThatPlaysLongest)
     EXPECT_TRUE(longest.unreadable.empty());
 }
 
-TEST_F(DiscTest, FindsTheLowestOfThePlayListsThatPlayLongest)
+TEST_F(DiscFiles, FindsTheLowestOfThePlayListsThatPlayLongest)
 {
     WritePlayList("00002", 20);
     WritePlayList("00001", 20);
@@ -261,13 +261,13 @@ TEST_F(DiscTest, FindsTheLowestOfThePlayListsThatPlayLongest)
     EXPECT_EQ(MakeDisc().FindLongestPlayList().number, 1u);
 }
 
-TEST_F(DiscTest, FindsAPlayListThatPlaysNothingIfThereIsNoOther)
+TEST_F(DiscFiles, FindsAPlayListThatPlaysNothingIfThereIsNoOther)
 {
     Write("PLAYLIST/00003.mpls", PlayListBytes().Make());
     EXPECT_EQ(MakeDisc().FindLongestPlayList().number, 3u);
 }
 
-TEST_F(DiscTest, SaysWhichPlayListsWereLeftOutOfTheSearch)
+TEST_F(DiscFiles, SaysWhichPlayListsWereLeftOutOfTheSearch)
 {
     Write("PLAYLIST/00000.mpls", Ascii("damaged"));
     WritePlayList("00001", 10);
@@ -281,13 +281,13 @@ TEST_F(DiscTest, SaysWhichPlayListsWereLeftOutOfTheSearch)
                   PathOf("PLAYLIST/00002.mpls").string() + ": not a regular file, expected one"}));
 }
 
-TEST_F(DiscTest, ReportsThatThereIsNoPlayList)
+TEST_F(DiscFiles, ReportsThatThereIsNoPlayList)
 {
     EXPECT_EQ(FileErrorOf([&] { MakeDisc().FindLongestPlayList(); }),
               PathOf("PLAYLIST").string() + ": no play list, expected files like 00000.mpls");
 }
 
-TEST_F(DiscTest, ReportsThatNoPlayListCanBeRead)
+TEST_F(DiscFiles, ReportsThatNoPlayListCanBeRead)
 {
     Write("PLAYLIST/00000.mpls", {});
     EXPECT_EQ(FileErrorOf([&] { MakeDisc().FindLongestPlayList(); }),

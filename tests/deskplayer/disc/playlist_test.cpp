@@ -676,10 +676,10 @@ TEST(ParsePlayList, RefusesMoreExtensionBlocksThanThereAre)
 }
 
 /** A play list whose streams come from all the places there are. */
-class ClipOfStreamTest : public testing::Test
+class ClipLookup : public testing::Test
 {
 protected:
-    ClipOfStreamTest()
+    ClipLookup()
     {
         m_PlayList.playItems.resize(2);
         m_PlayList.playItems[0].clip.name = "00000";
@@ -714,30 +714,30 @@ protected:
     PlayList m_PlayList;
 };
 
-TEST_F(ClipOfStreamTest, IsTheClipOfThePlayItemForTypesOneThreeAndFour)
+TEST_F(ClipLookup, IsTheClipOfThePlayItemForTypesOneThreeAndFour)
 {
     EXPECT_EQ(Clip(0, EntryTypePlayItem), "00000");
     EXPECT_EQ(Clip(1, EntryTypePlayItemSubPath3), "00001");
     EXPECT_EQ(Clip(1, EntryTypePlayItemSubPath4), "00001");
 }
 
-TEST_F(ClipOfStreamTest, IsTheClipOfTheFirstSubPlayItemThatStartsInThePlayItem)
+TEST_F(ClipLookup, IsTheClipOfTheFirstSubPlayItemThatStartsInThePlayItem)
 {
     EXPECT_EQ(Clip(1, EntryTypeSubPath), "00010");
 }
 
-TEST_F(ClipOfStreamTest, IsTheClipOfTheOnlySubPlayItemWhereverThatStarts)
+TEST_F(ClipLookup, IsTheClipOfTheOnlySubPlayItemWhereverThatStarts)
 {
     EXPECT_EQ(Clip(1, EntryTypeSubPath, 1), "00020");
 }
 
-TEST_F(ClipOfStreamTest, IsTheClipOfTheSubPlayItemThatTheStreamNames)
+TEST_F(ClipLookup, IsTheClipOfTheSubPlayItemThatTheStreamNames)
 {
     EXPECT_EQ(Clip(0, EntryTypeSubPath, 1, 1), "00021");
     EXPECT_EQ(Clip(0, EntryTypeSubPath, 1, 2), "00022");
 }
 
-TEST_F(ClipOfStreamTest, IsNothingIfThereIsNoSuchThing)
+TEST_F(ClipLookup, IsNothingIfThereIsNoSuchThing)
 {
     EXPECT_EQ(Clip(2, EntryTypePlayItem), std::nullopt) << "no such play item";
     EXPECT_EQ(Clip(0, EntryTypeSubPath), std::nullopt) << "none of the sub play items starts there";

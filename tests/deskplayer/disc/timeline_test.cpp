@@ -9,10 +9,10 @@ namespace
 {
 
 /** A play list of two items of 100 and 50 ticks, whose clips start at 1000 and 5000. */
-class TimeLineTest : public testing::Test
+class TimeLines : public testing::Test
 {
 protected:
-    TimeLineTest()
+    TimeLines()
     {
         m_PlayList.playItems.resize(2);
         m_PlayList.playItems[0].inTime = 1000;
@@ -36,21 +36,21 @@ protected:
     PlayList m_PlayList;
 };
 
-TEST_F(TimeLineTest, PutsItemsBehindEachOther)
+TEST_F(TimeLines, PutsItemsBehindEachOther)
 {
     const TimeLine timeLine = BuildTimeLine(m_PlayList);
     EXPECT_EQ(timeLine.itemStarts, (std::vector<Ticks>{Ticks(0), Ticks(100)}));
     EXPECT_EQ(timeLine.duration, Ticks(150u));
 }
 
-TEST_F(TimeLineTest, IsEmptyWithoutItems)
+TEST_F(TimeLines, IsEmptyWithoutItems)
 {
     const TimeLine timeLine = BuildTimeLine(PlayList());
     EXPECT_EQ(timeLine.duration, Ticks(0u));
     EXPECT_TRUE(timeLine.itemStarts.empty());
 }
 
-TEST_F(TimeLineTest, HasDurationsThatDoNotFitInThirtyTwoBits)
+TEST_F(TimeLines, HasDurationsThatDoNotFitInThirtyTwoBits)
 {
     m_PlayList.playItems.assign(65535, PlayItem());
     for (PlayItem& item : m_PlayList.playItems) {
@@ -61,27 +61,27 @@ TEST_F(TimeLineTest, HasDurationsThatDoNotFitInThirtyTwoBits)
     EXPECT_EQ(timeLine.itemStarts.back(), Ticks(65534u * 0xFFFFFFFFull));
 }
 
-TEST_F(TimeLineTest, PutsAMarkWhereItsClipTimePlays)
+TEST_F(TimeLines, PutsAMarkWhereItsClipTimePlays)
 {
-    EXPECT_EQ(PositionOfMark(0, 1000), 0u);
-    EXPECT_EQ(PositionOfMark(0, 1099), 99u);
-    EXPECT_EQ(PositionOfMark(1, 5020), 120u);
+    EXPECT_EQ(PositionOfMark(0, 1000), Ticks(0));
+    EXPECT_EQ(PositionOfMark(0, 1099), Ticks(99));
+    EXPECT_EQ(PositionOfMark(1, 5020), Ticks(120));
 }
 
-TEST_F(TimeLineTest, CountsOutAsPartOfTheItem)
+TEST_F(TimeLines, CountsOutAsPartOfTheItem)
 {
-    EXPECT_EQ(PositionOfMark(0, 1100), 100u);
-    EXPECT_EQ(PositionOfMark(1, 5050), 150u);
+    EXPECT_EQ(PositionOfMark(0, 1100), Ticks(100));
+    EXPECT_EQ(PositionOfMark(1, 5050), Ticks(150));
 }
 
-TEST_F(TimeLineTest, HasNoPositionForAMarkOutsideOfItsItem)
+TEST_F(TimeLines, HasNoPositionForAMarkOutsideOfItsItem)
 {
     EXPECT_EQ(PositionOfMark(0, 999), std::nullopt);
     EXPECT_EQ(PositionOfMark(0, 1101), std::nullopt);
     EXPECT_EQ(PositionOfMark(2, 1000), std::nullopt) << "no such play item";
 }
 
-TEST_F(TimeLineTest, MakesChaptersOfMarksOfTypeEntryOnly)
+TEST_F(TimeLines, MakesChaptersOfMarksOfTypeEntryOnly)
 {
     AddMark(MarkTypeEntry, 0, 1000);
     AddMark(MarkTypeLink, 0, 1030);
@@ -98,7 +98,7 @@ TEST_F(TimeLineTest, MakesChaptersOfMarksOfTypeEntryOnly)
     EXPECT_EQ(timeLine.chapters[1].end, Ticks(150u));
 }
 
-TEST_F(TimeLineTest, KeepsTheNumberOfAChapterBehindAMarkWithoutPosition)
+TEST_F(TimeLines, KeepsTheNumberOfAChapterBehindAMarkWithoutPosition)
 {
     AddMark(MarkTypeEntry, 0, 1000);
     AddMark(MarkTypeEntry, 0, 0);
@@ -109,7 +109,7 @@ TEST_F(TimeLineTest, KeepsTheNumberOfAChapterBehindAMarkWithoutPosition)
     EXPECT_EQ(timeLine.chapters[1].number, 3u);
 }
 
-TEST_F(TimeLineTest, MakesAChapterEmptyIfTheNextMarkLiesBeforeIt)
+TEST_F(TimeLines, MakesAChapterEmptyIfTheNextMarkLiesBeforeIt)
 {
     AddMark(MarkTypeEntry, 1, 5000);
     AddMark(MarkTypeEntry, 0, 1000);

@@ -13,7 +13,7 @@
 namespace
 {
 
-class EventDeliveryTest : public testing::Test
+class DeliveryThread : public testing::Test
 {
 protected:
     template <typename Event> void Post() { delivery->Post(std::make_unique<Event>(context)); }
@@ -25,14 +25,14 @@ protected:
     std::unique_ptr<deskplayer::EventDelivery> delivery =
         std::make_unique<deskplayer::EventDelivery>();
 
-    EventDeliveryTest()
+    DeliveryThread()
     {
         platform.DisableLog();
         delivery->Listeners().AddListener(&listener);
     }
 };
 
-TEST_F(EventDeliveryTest, DeliversInOrderOnAThreadOfItsOwn)
+TEST_F(DeliveryThread, DeliversInOrderOnAThreadOfItsOwn)
 {
     std::thread::id thread;
     listener.onCallback = [&thread](const std::string&) { thread = std::this_thread::get_id(); };
@@ -48,14 +48,14 @@ TEST_F(EventDeliveryTest, DeliversInOrderOnAThreadOfItsOwn)
     EXPECT_NE(thread, std::this_thread::get_id());
 }
 
-TEST_F(EventDeliveryTest, SettlesAtOnceWhenNothingIsUnderWay)
+TEST_F(DeliveryThread, SettlesAtOnceWhenNothingIsUnderWay)
 {
     delivery->Settle();
 
     EXPECT_EQ(journal.Take(), "");
 }
 
-TEST_F(EventDeliveryTest, HandsOnWhatAListenerThrewAndGoesOnDelivering)
+TEST_F(DeliveryThread, HandsOnWhatAListenerThrewAndGoesOnDelivering)
 {
     listener.onCallback = [](const std::string& callback) {
         if (callback == "Paused()") {
@@ -74,7 +74,7 @@ TEST_F(EventDeliveryTest, HandsOnWhatAListenerThrewAndGoesOnDelivering)
     EXPECT_NO_THROW(delivery->Settle());
 }
 
-TEST_F(EventDeliveryTest, DeliversWhatIsQueuedBeforeItEnds)
+TEST_F(DeliveryThread, DeliversWhatIsQueuedBeforeItEnds)
 {
     for (int i = 0; i < 100; ++i) {
         Post<bdmv::PausedEvent>();

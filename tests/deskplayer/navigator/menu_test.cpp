@@ -93,7 +93,8 @@ TEST(Menu, StaysOpenInTheNextItemThatHasOne)
 
     desk.navigator.Advance(Second);
 
-    EXPECT_EQ(desk.TakeWithoutPositions(), "1 PlayItem(7, 1, 6, 15)\n");
+    EXPECT_EQ(desk.TakeWithoutPositions(),
+              "1 PlayItem(7, 1, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n");
     EXPECT_TRUE(desk.navigator.ClosePopUpMenu().IsDone());
 }
 

@@ -22,12 +22,13 @@ TEST(OddPlayList, PassesItemsWithoutLength)
     EXPECT_EQ(desk.navigator.TimeToNextChange(), Ticks(0));
     EXPECT_EQ(desk.navigator.Advance(Second), Second - Ticks(100));
 
-    EXPECT_EQ(desk.TakeWithoutPositions(), "0 PlayItem(7, 1, 6, 15)\n"
-                                           "0 MarkInfo(7, 0, 0)\n"
-                                           "0 ChapterNumber(1)\n"
-                                           "0 PlayItem(7, 2, 6, 15)\n"
-                                           "0+100 PlayItem(7, 3, 6, 15)\n"
-                                           "0+100 Finished(0)\n");
+    EXPECT_EQ(desk.TakeWithoutPositions(),
+              "0 PlayItem(7, 1, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
+              "0 MarkInfo(7, 0, 0)\n"
+              "0 ChapterNumber(1)\n"
+              "0 PlayItem(7, 2, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
+              "0+100 PlayItem(7, 3, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
+              "0+100 Finished(EndOfMedia)\n");
 }
 
 TEST(OddPlayList, ShowsTheStillOfAnItemWithoutLength)
@@ -39,7 +40,7 @@ TEST(OddPlayList, ShowsTheStillOfAnItemWithoutLength)
 
     EXPECT_EQ(desk.TakeWithoutPositions(), "0 StillOn()\n"
                                            "5 StillOff()\n"
-                                           "5 Finished(0)\n");
+                                           "5 Finished(EndOfMedia)\n");
 }
 
 TEST(OddPlayList, PassesAStillWithoutLength)
@@ -49,9 +50,10 @@ TEST(OddPlayList, PassesAStillWithoutLength)
 
     desk.navigator.Advance(Second);
 
-    EXPECT_EQ(desk.TakeWithoutPositions(), "1 StillOn()\n"
-                                           "1 StillOff()\n"
-                                           "1 PlayItem(7, 1, 6, 15)\n");
+    EXPECT_EQ(desk.TakeWithoutPositions(),
+              "1 StillOn()\n"
+              "1 StillOff()\n"
+              "1 PlayItem(7, 1, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n");
 }
 
 TEST(OddPlayList, TreatsAnUnknownStillModeAsAnEndlessStill)
@@ -77,7 +79,7 @@ TEST(OddPlayList, PlaysThroughMarksThatAreNotInOrder)
                                            "1 ChapterNumber(2)\n"
                                            "2 MarkInfo(7, 0, 90000)\n"
                                            "2 ChapterNumber(1)\n"
-                                           "3 Finished(0)\n");
+                                           "3 Finished(EndOfMedia)\n");
 }
 
 TEST(OddPlayList, LeavesOutMarksThatAreNowhere)
@@ -90,7 +92,7 @@ TEST(OddPlayList, LeavesOutMarksThatAreNowhere)
 
     EXPECT_EQ(desk.TakeWithoutPositions(), "0+10 MarkInfo(7, 2, 10)\n"
                                            "0+10 ChapterNumber(2)\n"
-                                           "1 Finished(0)\n");
+                                           "1 Finished(EndOfMedia)\n");
 }
 
 TEST(OddPlayList, TellsTheMarksWhereAnItemEndsAndTheNextStartsEachInItsItem)
@@ -101,13 +103,14 @@ TEST(OddPlayList, TellsTheMarksWhereAnItemEndsAndTheNextStartsEachInItsItem)
 
     desk.navigator.Advance(6 * Second);
 
-    EXPECT_EQ(desk.TakeWithoutPositions(), "1 MarkInfo(7, 1, 45000)\n"
-                                           "1 StillOn()\n"
-                                           "6 StillOff()\n"
-                                           "6 PlayItem(7, 1, 6, 15)\n"
-                                           "6 MarkInfo(7, 0, 45000)\n"
-                                           "6 MarkInfo(7, 2, 45000)\n"
-                                           "6 ChapterNumber(1)\n");
+    EXPECT_EQ(desk.TakeWithoutPositions(),
+              "1 MarkInfo(7, 1, 45000)\n"
+              "1 StillOn()\n"
+              "6 StillOff()\n"
+              "6 PlayItem(7, 1, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
+              "6 MarkInfo(7, 0, 45000)\n"
+              "6 MarkInfo(7, 2, 45000)\n"
+              "6 ChapterNumber(1)\n");
 }
 
 TEST(OddPlayList, TellsAChapterAtTheEndOfAnItemWithItsMark)
@@ -116,22 +119,25 @@ TEST(OddPlayList, TellsAChapterAtTheEndOfAnItemWithItsMark)
     desk.Start();
 
     desk.navigator.Advance(Second + Ticks(1));
-    EXPECT_EQ(desk.TakeWithoutPositions(), "1 MarkInfo(7, 1, 45000)\n"
-                                           "1 ChapterNumber(2)\n"
-                                           "1 PlayItem(7, 1, 6, 15)\n");
+    EXPECT_EQ(desk.TakeWithoutPositions(),
+              "1 MarkInfo(7, 1, 45000)\n"
+              "1 ChapterNumber(2)\n"
+              "1 PlayItem(7, 1, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n");
 
     desk.navigator.SetPlayMode(bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedNormal));
     desk.navigator.Advance(Ticks(2));
-    EXPECT_EQ(desk.TakeWithoutPositions(), "1+1 PlayMode(1, 5)\n"
-                                           "1+2 MarkInfo(7, 1, 45000)\n"
-                                           "1+3 PlayItem(7, 0, 6, 15)\n"
-                                           "1+3 ChapterNumber(1)\n");
+    EXPECT_EQ(desk.TakeWithoutPositions(),
+              "1+1 PlayMode(PlayDirectionBackward, PlaySpeedNormal)\n"
+              "1+2 MarkInfo(7, 1, 45000)\n"
+              "1+3 PlayItem(7, 0, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
+              "1+3 ChapterNumber(1)\n");
 
     desk.navigator.SearchChapter(2);
-    EXPECT_EQ(desk.TakeWithoutPositions(), "1+3 JumpOccurred()\n"
-                                           "1+3 PlayItem(7, 1, 6, 15)\n"
-                                           "1+3 MarkInfo(7, 1, 45000)\n"
-                                           "1+3 ChapterNumber(2)\n");
+    EXPECT_EQ(desk.TakeWithoutPositions(),
+              "1+3 JumpOccurred()\n"
+              "1+3 PlayItem(7, 1, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
+              "1+3 MarkInfo(7, 1, 45000)\n"
+              "1+3 ChapterNumber(2)\n");
 }
 
 TEST(OddPlayList, TellsAChapterAtTheEndOfThePlayListOnceWithItsMark)
@@ -142,7 +148,7 @@ TEST(OddPlayList, TellsAChapterAtTheEndOfThePlayListOnceWithItsMark)
     desk.navigator.Advance(2 * Second);
     EXPECT_EQ(desk.TakeWithoutPositions(), "2 MarkInfo(7, 1, 90000)\n"
                                            "2 ChapterNumber(2)\n"
-                                           "2 Finished(0)\n");
+                                           "2 Finished(EndOfMedia)\n");
 
     desk.Start();
     desk.navigator.SearchChapter(2);
@@ -151,7 +157,7 @@ TEST(OddPlayList, TellsAChapterAtTheEndOfThePlayListOnceWithItsMark)
                            "2 MarkInfo(7, 1, 90000)\n"
                            "2 ChapterNumber(2)\n"
                            "2 CurrentTimePosition(90000)\n"
-                           "2 Finished(0)\n");
+                           "2 Finished(EndOfMedia)\n");
 }
 
 TEST(OddPlayList, HasAllStreamsThereCanBe)

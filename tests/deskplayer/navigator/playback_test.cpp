@@ -16,7 +16,7 @@ TEST(Playback, TellsEverythingAboutTheFirstItemWhenItStarts)
 
     EXPECT_EQ(desk.Take(), "0 PlayStarted()\n"
                            "0 Playlist(7)\n"
-                           "0 PlayItem(7, 0, 6, 15)\n"
+                           "0 PlayItem(7, 0, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
                            "0 VideoInfo(1)\n"
                            "0 AudioInfo(1)\n"
                            "0 AngleInfo(1)\n"
@@ -27,8 +27,10 @@ TEST(Playback, TellsEverythingAboutTheFirstItemWhenItStarts)
                            "0 SecondaryAudioDisplay(1, false)\n"
                            "0 PipPgTextStInfo(1, false)\n"
                            "0 InteractiveGraphicsInfo(1)\n"
-                           "0 AudioInfoChanged(true, (2, 0, 0, 0, 4352, 0))\n"
-                           "0 AudioInfoChanged(false, (8, 0, 0, 0, 6656, 0))\n"
+                           "0 AudioInfoChanged(true, (AudioFormatAc3, AudioSampleRateUnknown, "
+                           "AudioBitsPerSamplingTypeInvalid, AudioChannelTypeUnknown, 4352, 0))\n"
+                           "0 AudioInfoChanged(false, (AudioFormatEac3Sec, AudioSampleRateUnknown, "
+                           "AudioBitsPerSamplingTypeInvalid, AudioChannelTypeUnknown, 6656, 0))\n"
                            "0 TextSubtitleStylesAvailable(4)\n"
                            "0 TextSubtitleStyleInfo(1)\n"
                            "0 PictureInPictureAvailable()\n"
@@ -50,7 +52,7 @@ TEST(Playback, LeavesOutWhatThePlayListDoesNotHave)
 
     EXPECT_EQ(desk.Take(), "0 PlayStarted()\n"
                            "0 Playlist(7)\n"
-                           "0 PlayItem(7, 0, 6, 15)\n"
+                           "0 PlayItem(7, 0, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
                            "0 VideoInfo(1)\n"
                            "0 AngleInfo(1)\n"
                            "0 UOMask(0)\n"
@@ -67,9 +69,9 @@ TEST(Playback, PlaysItsItemsOneAfterTheOtherAndFinishes)
 
     EXPECT_EQ(desk.Take(), "1 CurrentTimePosition(45000)\n"
                            "2 CurrentTimePosition(90000)\n"
-                           "2 PlayItem(7, 1, 6, 15)\n"
+                           "2 PlayItem(7, 1, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
                            "3 CurrentTimePosition(135000)\n"
-                           "3 Finished(0)\n");
+                           "3 Finished(EndOfMedia)\n");
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Finished);
     EXPECT_EQ(desk.clock.Now(), 3 * Second);
 }
@@ -84,12 +86,13 @@ TEST(Playback, TellsAtTheNextItemOnlyWhatIsDifferentThere)
 
     desk.navigator.Advance(2 * Second);
 
-    EXPECT_EQ(desk.TakeWithoutPositions(), "1 PlayItem(7, 1, 6, 15)\n"
-                                           "2 PlayItem(7, 2, 6, 15)\n"
-                                           "2 AudioInfo(1)\n"
-                                           "2 InteractiveGraphicsInfo(0)\n"
-                                           "2 UOMask(128)\n"
-                                           "2 PopUpMenuUnavailable()\n");
+    EXPECT_EQ(desk.TakeWithoutPositions(),
+              "1 PlayItem(7, 1, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
+              "2 PlayItem(7, 2, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
+              "2 AudioInfo(1)\n"
+              "2 InteractiveGraphicsInfo(0)\n"
+              "2 UOMask(128)\n"
+              "2 PopUpMenuUnavailable()\n");
 }
 
 TEST(Playback, TellsThePositionAtEveryFullSecondOfIt)
@@ -112,10 +115,11 @@ TEST(Playback, TellsMarksAndChaptersWhereTheyLie)
 
     desk.navigator.Advance(3 * Second);
 
-    EXPECT_EQ(desk.TakeWithoutPositions(), "0+100 MarkInfo(7, 1, 100)\n"
-                                           "2 PlayItem(7, 1, 6, 15)\n"
-                                           "2+100 MarkInfo(7, 2, 90100)\n"
-                                           "2+100 ChapterNumber(2)\n");
+    EXPECT_EQ(desk.TakeWithoutPositions(),
+              "0+100 MarkInfo(7, 1, 100)\n"
+              "2 PlayItem(7, 1, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
+              "2+100 MarkInfo(7, 2, 90100)\n"
+              "2+100 ChapterNumber(2)\n");
 }
 
 TEST(Playback, TellsEveryMarkOfOnePositionInTheOrderOfThePlayList)
@@ -139,9 +143,10 @@ TEST(Playback, TellsTheMarkAtTheStartOfAnItemWithThatItem)
 
     desk.navigator.Advance(Second);
 
-    EXPECT_EQ(desk.TakeWithoutPositions(), "1 PlayItem(7, 1, 6, 15)\n"
-                                           "1 MarkInfo(7, 0, 45000)\n"
-                                           "1 ChapterNumber(1)\n");
+    EXPECT_EQ(desk.TakeWithoutPositions(),
+              "1 PlayItem(7, 1, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
+              "1 MarkInfo(7, 0, 45000)\n"
+              "1 ChapterNumber(1)\n");
 }
 
 TEST(Playback, StartsFromTheBeginningAfterAStopAndTellsEverythingAgain)
@@ -200,7 +205,7 @@ TEST(Playback, FinishesAtOnceWhenThereIsNothingToPlay)
 
     EXPECT_EQ(desk.Take(), "0 PlayStarted()\n"
                            "0 Playlist(7)\n"
-                           "0 Finished(0)\n");
+                           "0 Finished(EndOfMedia)\n");
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Finished);
     EXPECT_EQ(desk.navigator.Advance(Second), Second);
 }
@@ -230,7 +235,7 @@ TEST(Playback, StandsStillWhilePaused)
 
     EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), 4 * Second);
     EXPECT_EQ(desk.Take(), "4 Paused()\n"
-                           "104 Continued(0, 5)\n");
+                           "104 Continued(PlayDirectionForward, PlaySpeedNormal)\n");
 }
 
 TEST(Playback, StepsByOnePictureInTheDirectionOfPlay)
@@ -244,9 +249,9 @@ TEST(Playback, StepsByOnePictureInTheDirectionOfPlay)
     desk.navigator.SetPlayMode(bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedNormal));
     EXPECT_TRUE(desk.navigator.Step().IsDone());
 
-    EXPECT_EQ(desk.Take(), "1 Stepped(45900, 0)\n"
-                           "1 Stepped(46800, 0)\n"
-                           "1 Stepped(45900, 1)\n");
+    EXPECT_EQ(desk.Take(), "1 Stepped(45900, PlayDirectionForward)\n"
+                           "1 Stepped(46800, PlayDirectionForward)\n"
+                           "1 Stepped(45900, PlayDirectionBackward)\n");
 }
 
 TEST(Playback, StepsAsLongAsAPictureIsShown)
@@ -284,19 +289,19 @@ TEST(Playback, TellsAllThatAStepPasses)
                            "0+44500 ChapterNumber(2)\n"
                            "0+44500 MarkInfo(7, 2, 44700)\n"
                            "0+44500 CurrentTimePosition(45000)\n"
-                           "0+44500 TriggerTimeReached(13, 45100)\n"
-                           "0+44500 Stepped(45399, 0)\n");
+                           "0+44500 TriggerTimeReached(TRIGGER_NOTIFY_FROM_CURPOS, 45100)\n"
+                           "0+44500 Stepped(45399, PlayDirectionForward)\n");
 
     EXPECT_TRUE(desk.navigator.Step().IsDone());
     EXPECT_EQ(desk.Take(), "0+44500 MarkInfo(7, 3, 45400)\n"
                            "0+44500 ChapterNumber(3)\n"
-                           "0+44500 Stepped(46299, 0)\n");
+                           "0+44500 Stepped(46299, PlayDirectionForward)\n");
 
     desk.navigator.SetPlayMode(bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedNormal));
     EXPECT_TRUE(desk.navigator.Step().IsDone());
     EXPECT_EQ(desk.Take(), "0+44500 MarkInfo(7, 3, 45400)\n"
                            "0+44500 ChapterNumber(2)\n"
-                           "0+44500 Stepped(45399, 1)\n");
+                           "0+44500 Stepped(45399, PlayDirectionBackward)\n");
 }
 
 TEST(Playback, TellsWhatLiesWhereAStepEnds)
@@ -309,7 +314,7 @@ TEST(Playback, TellsWhatLiesWhereAStepEnds)
 
     EXPECT_EQ(desk.Take(), "0 MarkInfo(7, 1, 900)\n"
                            "0 ChapterNumber(2)\n"
-                           "0 Stepped(900, 0)\n");
+                           "0 Stepped(900, PlayDirectionForward)\n");
 }
 
 TEST(Playback, StepsFromTheEndOfARepeatToItsStart)
@@ -324,10 +329,10 @@ TEST(Playback, StepsFromTheEndOfARepeatToItsStart)
 
     EXPECT_TRUE(desk.navigator.Step().IsDone());
 
-    EXPECT_EQ(desk.Take(), "1+1501 TriggerTimeReached(6, 46001)\n"
+    EXPECT_EQ(desk.Take(), "1+1501 TriggerTimeReached(TRIGGER_B, 46001)\n"
                            "1+1501 JumpOccurred()\n"
                            "1+1501 CurrentTimePosition(45001)\n"
-                           "1+1501 Stepped(45001, 0)\n");
+                           "1+1501 Stepped(45001, PlayDirectionForward)\n");
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Paused);
 }
 
@@ -342,7 +347,7 @@ TEST(Playback, StepsBackToTheStartAndKeepsItsDirection)
     EXPECT_TRUE(desk.navigator.Step().IsDone());
 
     EXPECT_EQ(desk.Take(), "0+900 CurrentTimePosition(0)\n"
-                           "0+900 Stepped(0, 1)\n");
+                           "0+900 Stepped(0, PlayDirectionBackward)\n");
     EXPECT_FALSE(desk.navigator.Step().IsDone());
 }
 
@@ -375,10 +380,11 @@ TEST(Playback, LeavesATimedStillByItself)
 
     EXPECT_EQ(desk.navigator.Advance(10 * Second), 3 * Second);
 
-    EXPECT_EQ(desk.TakeWithoutPositions(), "1 StillOn()\n"
-                                           "6 StillOff()\n"
-                                           "6 PlayItem(7, 1, 6, 15)\n"
-                                           "7 Finished(0)\n");
+    EXPECT_EQ(desk.TakeWithoutPositions(),
+              "1 StillOn()\n"
+              "6 StillOff()\n"
+              "6 PlayItem(7, 1, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
+              "7 Finished(EndOfMedia)\n");
 }
 
 TEST(Playback, CountsATimedStillInTimeOfTheSessionAtAnySpeed)
@@ -395,7 +401,7 @@ TEST(Playback, CountsATimedStillInTimeOfTheSessionAtAnySpeed)
 
     EXPECT_EQ(desk.TakeWithoutPositions(), "1 StillOn()\n"
                                            "6 StillOff()\n"
-                                           "6 Finished(0)\n");
+                                           "6 Finished(EndOfMedia)\n");
 }
 
 TEST(Playback, HoldsAnEndlessStillUntilItIsEnded)
@@ -408,9 +414,10 @@ TEST(Playback, HoldsAnEndlessStillUntilItIsEnded)
     EXPECT_EQ(desk.navigator.TimeToNextChange(), std::nullopt);
     EXPECT_TRUE(desk.navigator.EndStill().IsDone());
 
-    EXPECT_EQ(desk.TakeWithoutPositions(), "1 StillOn()\n"
-                                           "1000 StillOff()\n"
-                                           "1000 PlayItem(7, 1, 6, 15)\n");
+    EXPECT_EQ(desk.TakeWithoutPositions(),
+              "1 StillOn()\n"
+              "1000 StillOff()\n"
+              "1000 PlayItem(7, 1, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n");
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Playing);
 }
 
@@ -422,9 +429,10 @@ TEST(Playback, EndsATimedStillEarly)
     EXPECT_TRUE(desk.navigator.EndStill().IsDone());
     desk.navigator.Advance(Second);
 
-    EXPECT_EQ(desk.TakeWithoutPositions(), "2 StillOff()\n"
-                                           "2 PlayItem(7, 1, 6, 15)\n"
-                                           "3 Finished(0)\n");
+    EXPECT_EQ(desk.TakeWithoutPositions(),
+              "2 StillOff()\n"
+              "2 PlayItem(7, 1, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
+              "3 Finished(EndOfMedia)\n");
 }
 
 TEST(Playback, LeavesAStillByProgramEvenWhereTheViewerMayNot)
@@ -436,7 +444,7 @@ TEST(Playback, LeavesAStillByProgramEvenWhereTheViewerMayNot)
     desk.navigator.LeaveStill();
 
     EXPECT_EQ(desk.Take(), "1 StillOff()\n"
-                           "1 PlayItem(7, 1, 6, 15)\n"
+                           "1 PlayItem(7, 1, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
                            "1 UOMask(0)\n");
 }
 
@@ -530,7 +538,7 @@ TEST(Playback, FinishesWhenTheStreamRunsDryAndClosesTheMenu)
 
     EXPECT_EQ(desk.Take(), "1 InteractiveGraphicsInvisible()\n"
                            "1 InteractiveGraphicsInactive()\n"
-                           "1 Finished(1)\n");
+                           "1 Finished(DataStarvation)\n");
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Finished);
     EXPECT_EQ(desk.navigator.Context().GetFinishedReason(),
               bdstreaming::FinishedReasonDataStarvation);
@@ -545,7 +553,7 @@ TEST(Playback, FinishesForTheRightReasonAfterAStarvation)
     desk.Start();
     desk.navigator.Advance(Second);
 
-    EXPECT_EQ(desk.TakeWithoutPositions(), "1 Finished(0)\n");
+    EXPECT_EQ(desk.TakeWithoutPositions(), "1 Finished(EndOfMedia)\n");
 }
 
 TEST(Playback, HandsOnWhatAListenerThrows)

@@ -36,7 +36,7 @@ LoadedPlayList ThreeItems()
     return loaded;
 }
 
-class PlaybackContextTest : public testing::Test
+class PlaybackContextQueries : public testing::Test
 {
 protected:
     const LoadedPlayList playList = ThreeItems();
@@ -45,7 +45,7 @@ protected:
     PlaybackContext context{playhead, state};
 };
 
-TEST_F(PlaybackContextTest, HasTheResumeDataUntilItIsCleanedUp)
+TEST_F(PlaybackContextQueries, HasTheResumeDataUntilItIsCleanedUp)
 {
     EXPECT_EQ(context.GetSystemResumeData().size, 0);
 
@@ -57,14 +57,14 @@ TEST_F(PlaybackContextTest, HasTheResumeDataUntilItIsCleanedUp)
     EXPECT_EQ(context.GetSystemResumeData().size, 0);
 }
 
-TEST_F(PlaybackContextTest, TellsWhetherItPlaysAfterAResume)
+TEST_F(PlaybackContextQueries, TellsWhetherItPlaysAfterAResume)
 {
     EXPECT_FALSE(context.IsPlayingAfterSystemResume());
     state.playingAfterSystemResume = true;
     EXPECT_TRUE(context.IsPlayingAfterSystemResume());
 }
 
-TEST_F(PlaybackContextTest, NumbersPlayListAndPlayItem)
+TEST_F(PlaybackContextQueries, NumbersPlayListAndPlayItem)
 {
     EXPECT_EQ(context.GetPlayListId(), 800);
     EXPECT_EQ(context.GetPlayItemId(), 0);
@@ -72,7 +72,7 @@ TEST_F(PlaybackContextTest, NumbersPlayListAndPlayItem)
     EXPECT_EQ(context.GetPlayItemId(), 2);
 }
 
-TEST_F(PlaybackContextTest, TellsThePlayModeThatIsSetFromTheOneInForce)
+TEST_F(PlaybackContextQueries, TellsThePlayModeThatIsSetFromTheOneInForce)
 {
     state.playMode = bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedFast1);
 
@@ -80,7 +80,7 @@ TEST_F(PlaybackContextTest, TellsThePlayModeThatIsSetFromTheOneInForce)
     EXPECT_EQ(context.GetCurrentPlayMode(), bd::PlayMode());
 }
 
-TEST_F(PlaybackContextTest, TellsTheTriggerAndWhenItWasReached)
+TEST_F(PlaybackContextQueries, TellsTheTriggerAndWhenItWasReached)
 {
     EXPECT_EQ(context.GetTrigger().triggerType, bd::TRIGGER_NONE);
     state.trigger = bd::TRIGGER_CHP;
@@ -90,7 +90,7 @@ TEST_F(PlaybackContextTest, TellsTheTriggerAndWhenItWasReached)
     EXPECT_EQ(context.GetTriggerReachedTime(), 0x100000000);
 }
 
-TEST_F(PlaybackContextTest, TellsTheRepeatStates)
+TEST_F(PlaybackContextQueries, TellsTheRepeatStates)
 {
     EXPECT_EQ(context.GetCurrentABRepeatState(), bd::TRIGGER_AB_NONE);
     EXPECT_EQ(context.GetCurrentChpTitleRepeatState(), bd::TRIGGER_NONE);
@@ -103,7 +103,7 @@ TEST_F(PlaybackContextTest, TellsTheRepeatStates)
     EXPECT_EQ(context.GetCurrentChpTitleRepeatState(), bd::TRIGGER_TITLE);
 }
 
-TEST_F(PlaybackContextTest, KnowsTheTriggerAtATime)
+TEST_F(PlaybackContextQueries, KnowsTheTriggerAtATime)
 {
     EXPECT_EQ(context.GetTriggerTypeByTime(0), bd::TRIGGER_INVALID);
     state.pointA = Ticks(5);
@@ -121,7 +121,7 @@ TEST_F(PlaybackContextTest, KnowsTheTriggerAtATime)
     EXPECT_EQ(context.GetTriggerTypeByTime(20), bd::TRIGGER_INVALID);
 }
 
-TEST_F(PlaybackContextTest, TellsTheChapterOfThePosition)
+TEST_F(PlaybackContextQueries, TellsTheChapterOfThePosition)
 {
     EXPECT_EQ(context.GetCurrentChapter(), 1);
     state.position = 10 * Second - Ticks(1);
@@ -134,7 +134,7 @@ TEST_F(PlaybackContextTest, TellsTheChapterOfThePosition)
     EXPECT_EQ(context.GetCurrentChapter(), 2);
 }
 
-TEST_F(PlaybackContextTest, TellsTheMarkThatWasPassedLast)
+TEST_F(PlaybackContextQueries, TellsTheMarkThatWasPassedLast)
 {
     bd::TimePosition time = bd::TimePositionNone;
     EXPECT_EQ(context.GetCurrentPLMarkId(time), 0);
@@ -145,7 +145,7 @@ TEST_F(PlaybackContextTest, TellsTheMarkThatWasPassedLast)
     EXPECT_EQ(Ticks(time), 10 * Second);
 }
 
-TEST_F(PlaybackContextTest, TellsStreamsAndTheirCount)
+TEST_F(PlaybackContextQueries, TellsStreamsAndTheirCount)
 {
     const StreamQuery queries[] = {&PlaybackContext::GetVideoInfo,
                                    &PlaybackContext::GetAudioInfo,
@@ -170,7 +170,7 @@ TEST_F(PlaybackContextTest, TellsStreamsAndTheirCount)
     }
 }
 
-TEST_F(PlaybackContextTest, TellsSubtitlesWithAResult)
+TEST_F(PlaybackContextQueries, TellsSubtitlesWithAResult)
 {
     bd::StreamNumberDef number = 99;
     bd::UInt8 count = 99;
@@ -180,7 +180,7 @@ TEST_F(PlaybackContextTest, TellsSubtitlesWithAResult)
     EXPECT_EQ(count, 2);
 }
 
-TEST_F(PlaybackContextTest, TellsSecondaryVideoAndWhetherItRunsOnItsOwn)
+TEST_F(PlaybackContextQueries, TellsSecondaryVideoAndWhetherItRunsOnItsOwn)
 {
     bd::StreamNumberDef number = 99;
     bd::UInt8 count = 99;
@@ -198,7 +198,7 @@ TEST_F(PlaybackContextTest, TellsSecondaryVideoAndWhetherItRunsOnItsOwn)
     EXPECT_FALSE(async);
 }
 
-TEST_F(PlaybackContextTest, TellsAnglesOfWhichThereIsAlwaysOne)
+TEST_F(PlaybackContextQueries, TellsAnglesOfWhichThereIsAlwaysOne)
 {
     bd::AngleNumberDef number = 99;
     bd::UInt8 count = 99;
@@ -213,7 +213,7 @@ TEST_F(PlaybackContextTest, TellsAnglesOfWhichThereIsAlwaysOne)
     EXPECT_EQ(count, 1);
 }
 
-TEST_F(PlaybackContextTest, TellsVideoFormatAndAspectRatioAsTheyAreOnTheDisc)
+TEST_F(PlaybackContextQueries, TellsVideoFormatAndAspectRatioAsTheyAreOnTheDisc)
 {
     bd::VideoFormatType format = bd::VideoFormatType480i;
     bd::VideoAspectRatioType ratio = bd::VideoAspectRatioType16x9;
@@ -232,7 +232,7 @@ TEST_F(PlaybackContextTest, TellsVideoFormatAndAspectRatioAsTheyAreOnTheDisc)
     EXPECT_EQ(ratio, bd::VideoAspectRatioTypeNoInfo);
 }
 
-TEST_F(PlaybackContextTest, TellsWhatIsShown)
+TEST_F(PlaybackContextQueries, TellsWhatIsShown)
 {
     EXPECT_TRUE(context.GetPgTextStDisplay());
     EXPECT_FALSE(context.GetSecondaryVideoDisplay());
@@ -269,13 +269,13 @@ TEST(PlaybackContext, JoinsTheMasksOfPlayListAndItem)
     EXPECT_EQ(mask, bdmv::UOMaskTable(MaskOf({bd::UserOperationPauseOn})));
 }
 
-TEST_F(PlaybackContextTest, TellsThePosition)
+TEST_F(PlaybackContextQueries, TellsThePosition)
 {
     state.position = Ticks(0x100000000);
     EXPECT_EQ(context.GetCurrentTimePosition(), 0x100000000);
 }
 
-TEST_F(PlaybackContextTest, SharesTheProgramOfTheButton)
+TEST_F(PlaybackContextQueries, SharesTheProgramOfTheButton)
 {
     bdmv::IProgramData::RefPtr program;
     bd::UInt32 ticket = 99;
@@ -292,7 +292,7 @@ TEST_F(PlaybackContextTest, SharesTheProgramOfTheButton)
     EXPECT_EQ(button, 6);
 }
 
-TEST_F(PlaybackContextTest, TellsTheStyleAndHowManyThereAre)
+TEST_F(PlaybackContextQueries, TellsTheStyleAndHowManyThereAre)
 {
     state.selection.style = 3;
     EXPECT_EQ(context.GetCurrentTextSubtitleStyleNumber(), 3);
@@ -301,14 +301,14 @@ TEST_F(PlaybackContextTest, TellsTheStyleAndHowManyThereAre)
     EXPECT_EQ(context.GetNumberOfTextSubtitleStyles(), 0);
 }
 
-TEST_F(PlaybackContextTest, TellsWhyPlaybackFinished)
+TEST_F(PlaybackContextQueries, TellsWhyPlaybackFinished)
 {
     EXPECT_EQ(context.GetFinishedReason(), bdstreaming::FinishedReasonEndOfMedia);
     state.finishedReason = bdstreaming::FinishedReasonDataStarvation;
     EXPECT_EQ(context.GetFinishedReason(), bdstreaming::FinishedReasonDataStarvation);
 }
 
-TEST_F(PlaybackContextTest, TellsTheZoom)
+TEST_F(PlaybackContextQueries, TellsTheZoom)
 {
     state.zoom = {{1, 2, 3, 4}, {5, 6, 7, 8}, 9};
     bd::ZOOM_PARAM_Def zoom = {};

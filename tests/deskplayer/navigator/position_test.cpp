@@ -34,7 +34,7 @@ TEST(Position, JumpsToAnotherItemAndTellsAllThatIsDifferentThere)
     EXPECT_TRUE(desk.navigator.SearchTime(15 * Second).IsDone());
 
     EXPECT_EQ(desk.Take(), "1 JumpOccurred()\n"
-                           "1 PlayItem(7, 1, 6, 15)\n"
+                           "1 PlayItem(7, 1, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
                            "1 MarkInfo(7, 3, 675000)\n"
                            "1 ChapterNumber(4)\n"
                            "1 CurrentTimePosition(675000)\n");
@@ -126,7 +126,7 @@ TEST(Position, SkipsToTheNextChapter)
     EXPECT_TRUE(desk.navigator.SkipToNextChapter().IsDone());
 
     EXPECT_EQ(desk.Take(), "9 JumpOccurred()\n"
-                           "9 PlayItem(7, 1, 6, 15)\n"
+                           "9 PlayItem(7, 1, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
                            "9 MarkInfo(7, 2, 450000)\n"
                            "9 ChapterNumber(3)\n"
                            "9 CurrentTimePosition(450000)\n");

@@ -44,15 +44,15 @@ TEST(Repeat, GoesFromBBackToA)
     EXPECT_TRUE(desk.navigator.IsRepeating());
     desk.navigator.Advance(Second);
 
-    EXPECT_EQ(desk.Take(), "10+5 TriggerSet(5, true)\n"
-                           "10+22505 TriggerSet(6, true)\n"
-                           "10+22505 TriggerTimeReached(6, 472505)\n"
+    EXPECT_EQ(desk.Take(), "10+5 TriggerSet(TRIGGER_A, true)\n"
+                           "10+22505 TriggerSet(TRIGGER_B, true)\n"
+                           "10+22505 TriggerTimeReached(TRIGGER_B, 472505)\n"
                            "10+22505 JumpOccurred()\n"
                            "10+22505 CurrentTimePosition(450005)\n"
-                           "11+5 TriggerTimeReached(6, 472505)\n"
+                           "11+5 TriggerTimeReached(TRIGGER_B, 472505)\n"
                            "11+5 JumpOccurred()\n"
                            "11+5 CurrentTimePosition(450005)\n"
-                           "11+22505 TriggerTimeReached(6, 472505)\n"
+                           "11+22505 TriggerTimeReached(TRIGGER_B, 472505)\n"
                            "11+22505 JumpOccurred()\n"
                            "11+22505 CurrentTimePosition(450005)\n");
 }
@@ -65,10 +65,11 @@ TEST(Repeat, GoesFromBBackToAInAnItemBefore)
 
     desk.navigator.Advance(2 * Second);
 
-    EXPECT_EQ(desk.TakeWithoutPositions(), "4 PlayItem(7, 1, 6, 15)\n"
-                                           "5+10 TriggerTimeReached(6, 135010)\n"
-                                           "5+10 JumpOccurred()\n"
-                                           "5+10 PlayItem(7, 0, 6, 15)\n");
+    EXPECT_EQ(desk.TakeWithoutPositions(),
+              "4 PlayItem(7, 1, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
+              "5+10 TriggerTimeReached(TRIGGER_B, 135010)\n"
+              "5+10 JumpOccurred()\n"
+              "5+10 PlayItem(7, 0, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n");
 }
 
 TEST(Repeat, ReportsThatBFailedWhenThereIsNoA)
@@ -79,7 +80,7 @@ TEST(Repeat, ReportsThatBFailedWhenThereIsNoA)
 
     EXPECT_TRUE(desk.navigator.SetPointB().IsDone());
 
-    EXPECT_EQ(desk.Take(), "1 TriggerSet(6, false)\n");
+    EXPECT_EQ(desk.Take(), "1 TriggerSet(TRIGGER_B, false)\n");
     EXPECT_EQ(desk.Snapshot(), before);
 }
 
@@ -91,7 +92,7 @@ TEST(Repeat, ReportsThatBFailedWhenAIsNotBeforeIt)
     const std::string before = desk.Snapshot();
 
     EXPECT_TRUE(desk.navigator.SetPointB().IsDone());
-    EXPECT_EQ(desk.Take(), "1 TriggerSet(6, false)\n");
+    EXPECT_EQ(desk.Take(), "1 TriggerSet(TRIGGER_B, false)\n");
     EXPECT_EQ(desk.Snapshot(), before);
 
     desk.Do(desk.navigator.SearchTime(Ticks(0)));
@@ -120,7 +121,7 @@ TEST(Repeat, GoesOnBehindBOnceTheRepeatHasEnded)
     EXPECT_TRUE(desk.navigator.EndABRepeat().IsDone());
     desk.navigator.Advance(2 * Second);
 
-    EXPECT_EQ(desk.TakeWithoutPositions(), "2 TriggerSet(7, true)\n");
+    EXPECT_EQ(desk.TakeWithoutPositions(), "2 TriggerSet(TRIGGER_AB_NONE, true)\n");
     EXPECT_EQ(desk.navigator.Context().GetCurrentABRepeatState(), bd::TRIGGER_AB_NONE);
     EXPECT_FALSE(desk.navigator.IsRepeating());
     EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), 3 * Second);
@@ -139,7 +140,7 @@ TEST(Repeat, IsNoRepeatBehindB)
     desk.Do(desk.navigator.SetPlayMode(bd::PlayMode()));
     desk.navigator.Advance(10 * Second);
 
-    EXPECT_EQ(desk.TakeWithoutPositions(), "10 Finished(0)\n");
+    EXPECT_EQ(desk.TakeWithoutPositions(), "10 Finished(EndOfMedia)\n");
 }
 
 TEST(Repeat, RepeatsAChapter)
@@ -153,11 +154,11 @@ TEST(Repeat, RepeatsAChapter)
     EXPECT_TRUE(desk.navigator.IsRepeating());
     desk.navigator.Advance(3 * Second);
 
-    EXPECT_EQ(desk.TakeWithoutPositions(), "4 TriggerSet(8, true)\n"
-                                           "5 TriggerTimeReached(8, 225000)\n"
+    EXPECT_EQ(desk.TakeWithoutPositions(), "4 TriggerSet(TRIGGER_CHP, true)\n"
+                                           "5 TriggerTimeReached(TRIGGER_CHP, 225000)\n"
                                            "5 JumpOccurred()\n"
                                            "5 MarkInfo(7, 1, 135000)\n"
-                                           "7 TriggerTimeReached(8, 225000)\n"
+                                           "7 TriggerTimeReached(TRIGGER_CHP, 225000)\n"
                                            "7 JumpOccurred()\n"
                                            "7 MarkInfo(7, 1, 135000)\n");
 }
@@ -170,7 +171,7 @@ TEST(Repeat, RepeatsTheLastChapterAtTheEndOfThePlayList)
 
     desk.navigator.Advance(Second);
 
-    EXPECT_EQ(desk.TakeWithoutPositions(), "2 TriggerTimeReached(8, 90000)\n"
+    EXPECT_EQ(desk.TakeWithoutPositions(), "2 TriggerTimeReached(TRIGGER_CHP, 90000)\n"
                                            "2 JumpOccurred()\n"
                                            "2 MarkInfo(7, 1, 45000)\n");
 }
@@ -197,7 +198,7 @@ TEST(Repeat, PlaysToTheEndWhenThereIsNoChapterToRepeat)
     EXPECT_FALSE(desk.navigator.IsRepeating());
     desk.navigator.Advance(3 * Second);
 
-    EXPECT_EQ(desk.TakeWithoutPositions(), "2 Finished(0)\n");
+    EXPECT_EQ(desk.TakeWithoutPositions(), "2 Finished(EndOfMedia)\n");
 }
 
 TEST(Repeat, PlaysPastAnEmptyChapterAndRepeatsTheNext)
@@ -224,7 +225,7 @@ TEST(Repeat, EndsInAnEmptyChapterAtTheEndOfThePlayList)
     EXPECT_FALSE(desk.navigator.IsRepeating());
     desk.navigator.Advance(Second);
 
-    EXPECT_EQ(desk.TakeWithoutPositions(), "0 Finished(0)\n");
+    EXPECT_EQ(desk.TakeWithoutPositions(), "0 Finished(EndOfMedia)\n");
 }
 
 TEST(Repeat, RepeatsThePlayList)
@@ -237,11 +238,12 @@ TEST(Repeat, RepeatsThePlayList)
     EXPECT_TRUE(desk.navigator.IsRepeating());
     desk.navigator.Advance(3 * Second);
 
-    EXPECT_EQ(desk.TakeWithoutPositions(), "1 TriggerSet(9, true)\n"
-                                           "2 PlayItem(7, 1, 6, 15)\n"
-                                           "3 TriggerTimeReached(9, 135000)\n"
-                                           "3 JumpOccurred()\n"
-                                           "3 PlayItem(7, 0, 6, 15)\n");
+    EXPECT_EQ(desk.TakeWithoutPositions(),
+              "1 TriggerSet(TRIGGER_TITLE, true)\n"
+              "2 PlayItem(7, 1, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
+              "3 TriggerTimeReached(TRIGGER_TITLE, 135000)\n"
+              "3 JumpOccurred()\n"
+              "3 PlayItem(7, 0, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n");
     EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), Second);
 }
 
@@ -256,7 +258,7 @@ TEST(Repeat, OfAPlayListWithoutLengthEnds)
     desk.Do(desk.navigator.EndStill());
     desk.navigator.Advance(Second);
 
-    EXPECT_EQ(desk.Take(), "0 Finished(0)\n");
+    EXPECT_EQ(desk.Take(), "0 Finished(EndOfMedia)\n");
 }
 
 TEST(Repeat, EndsTheRepeatOfAChapterOrThePlayList)
@@ -270,7 +272,7 @@ TEST(Repeat, EndsTheRepeatOfAChapterOrThePlayList)
         EXPECT_TRUE(desk.navigator.EndChapterTitleRepeat().IsDone());
         EXPECT_FALSE(desk.navigator.IsRepeating());
         EXPECT_EQ(desk.navigator.Context().GetCurrentChpTitleRepeatState(), bd::TRIGGER_NONE);
-        EXPECT_NE(desk.Take().find(" TriggerSet(4, true)\n"), std::string::npos);
+        EXPECT_NE(desk.Take().find(" TriggerSet(TRIGGER_NONE, true)\n"), std::string::npos);
         desk.navigator.Advance(3 * Second);
         EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Finished);
     }
@@ -315,8 +317,8 @@ TEST(Trigger, IsReachedAtItsTime)
     EXPECT_EQ(desk.navigator.TimeToNextChange(), Ticks(100));
     desk.navigator.Advance(Second / 2);
 
-    EXPECT_EQ(desk.Take(), "1 TriggerSet(13, true)\n"
-                           "1+100 TriggerTimeReached(13, 45100)\n");
+    EXPECT_EQ(desk.Take(), "1 TriggerSet(TRIGGER_NOTIFY_FROM_CURPOS, true)\n"
+                           "1+100 TriggerTimeReached(TRIGGER_NOTIFY_FROM_CURPOS, 45100)\n");
 }
 
 TEST(Trigger, IsReachedBackwardToo)
@@ -328,7 +330,7 @@ TEST(Trigger, IsReachedBackwardToo)
 
     desk.navigator.Advance(Second - Ticks(100));
 
-    EXPECT_EQ(desk.Take(), "2+44900 TriggerTimeReached(13, 45100)\n");
+    EXPECT_EQ(desk.Take(), "2+44900 TriggerTimeReached(TRIGGER_NOTIFY_FROM_CURPOS, 45100)\n");
 }
 
 TEST(Trigger, StaysAndIsReachedAgain)
@@ -337,12 +339,12 @@ TEST(Trigger, StaysAndIsReachedAgain)
     desk.Start();
     desk.Do(desk.navigator.SetTrigger(Ticks(100)));
     desk.navigator.Advance(Ticks(200));
-    EXPECT_EQ(desk.Take(), "0+100 TriggerTimeReached(13, 100)\n");
+    EXPECT_EQ(desk.Take(), "0+100 TriggerTimeReached(TRIGGER_NOTIFY_FROM_CURPOS, 100)\n");
 
     desk.Do(desk.navigator.SearchTime(Ticks(0)));
     desk.navigator.Advance(Ticks(200));
 
-    EXPECT_EQ(desk.Take(), "0+300 TriggerTimeReached(13, 100)\n");
+    EXPECT_EQ(desk.Take(), "0+300 TriggerTimeReached(TRIGGER_NOTIFY_FROM_CURPOS, 100)\n");
 }
 
 TEST(Trigger, IsANotificationDuringARepeatToo)
@@ -354,7 +356,7 @@ TEST(Trigger, IsANotificationDuringARepeatToo)
 
     desk.navigator.Advance(Ticks(200));
 
-    EXPECT_EQ(desk.Take(), "0+100 TriggerTimeReached(13, 100)\n");
+    EXPECT_EQ(desk.Take(), "0+100 TriggerTimeReached(TRIGGER_NOTIFY_FROM_CURPOS, 100)\n");
 }
 
 TEST(Trigger, IsReachedBesideTheRepeatThatGoesBackThere)
@@ -364,12 +366,12 @@ TEST(Trigger, IsReachedBesideTheRepeatThatGoesBackThere)
         std::function<void()> repeat;
         Ticks end;
         std::string heard;
-    } repeats[] = {
-        {[&desk] { SetPoints(desk, Second / 2); }, Second / 2, "TriggerTimeReached(6, 22500)\n"},
-        {[&desk] { desk.Do(desk.navigator.RepeatChapter()); }, 2 * Second,
-         "TriggerTimeReached(8, 90000)\n"},
-        {[&desk] { desk.Do(desk.navigator.RepeatTitle()); }, 10 * Second,
-         "TriggerTimeReached(9, 450000)\n"}};
+    } repeats[] = {{[&desk] { SetPoints(desk, Second / 2); }, Second / 2,
+                    "TriggerTimeReached(TRIGGER_B, 22500)\n"},
+                   {[&desk] { desk.Do(desk.navigator.RepeatChapter()); }, 2 * Second,
+                    "TriggerTimeReached(TRIGGER_CHP, 90000)\n"},
+                   {[&desk] { desk.Do(desk.navigator.RepeatTitle()); }, 10 * Second,
+                    "TriggerTimeReached(TRIGGER_TITLE, 450000)\n"}};
     for (const auto& repeat : repeats) {
         SCOPED_TRACE(repeat.heard);
         desk.Start();
@@ -385,8 +387,8 @@ TEST(Trigger, IsReachedBesideTheRepeatThatGoesBackThere)
                 reached += line.substr(line.find(' ') + 1) + "\n";
             }
         }
-        EXPECT_EQ(reached, "TriggerTimeReached(13, " + std::to_string(repeat.end.count()) + ")\n" +
-                               repeat.heard);
+        EXPECT_EQ(reached, "TriggerTimeReached(TRIGGER_NOTIFY_FROM_CURPOS, " +
+                               std::to_string(repeat.end.count()) + ")\n" + repeat.heard);
         desk.Do(desk.navigator.Stop());
     }
 }
@@ -399,8 +401,9 @@ TEST(Trigger, IsReachedAtTheEndOfThePlayList)
 
     desk.navigator.Advance(Second);
 
-    EXPECT_EQ(desk.TakeWithoutPositions(), "1 TriggerTimeReached(13, 45000)\n"
-                                           "1 Finished(0)\n");
+    EXPECT_EQ(desk.TakeWithoutPositions(),
+              "1 TriggerTimeReached(TRIGGER_NOTIFY_FROM_CURPOS, 45000)\n"
+              "1 Finished(EndOfMedia)\n");
 }
 
 TEST(Trigger, IsRefusedBehindTheEndOfThePlayList)

@@ -53,7 +53,7 @@ TEST(Speed, TakesEffectAtOnceWhilePlaying)
     EXPECT_TRUE(desk.navigator.SetPlayMode(Forward(bd::PlaySpeedFast2)).IsDone());
     desk.navigator.Advance(Second / 2);
 
-    EXPECT_EQ(desk.Take(), "1 PlayMode(0, 7)\n"
+    EXPECT_EQ(desk.Take(), "1 PlayMode(PlayDirectionForward, PlaySpeedFast2)\n"
                            "1+11250 CurrentTimePosition(90000)\n"
                            "1+22500 CurrentTimePosition(135000)\n");
 }
@@ -81,8 +81,8 @@ TEST(Speed, TakesEffectWithContinueWhilePaused)
     EXPECT_EQ(desk.navigator.Context().GetCurrentPlayMode(), bd::PlayMode());
 
     desk.navigator.Continue();
-    EXPECT_EQ(desk.Take(), "0 Continued(0, 4)\n"
-                           "0 PlayMode(0, 4)\n");
+    EXPECT_EQ(desk.Take(), "0 Continued(PlayDirectionForward, PlaySpeedSlow1)\n"
+                           "0 PlayMode(PlayDirectionForward, PlaySpeedSlow1)\n");
     EXPECT_EQ(desk.navigator.Context().GetCurrentPlayMode(), Forward(bd::PlaySpeedSlow1));
 }
 
@@ -161,8 +161,9 @@ TEST(Speed, IsKeptIntoTheNextItem)
 
     desk.navigator.Advance(3 * Second);
 
-    EXPECT_EQ(desk.TakeWithoutPositions(), "1 PlayItem(7, 1, 6, 15)\n"
-                                           "2 Finished(0)\n");
+    EXPECT_EQ(desk.TakeWithoutPositions(),
+              "1 PlayItem(7, 1, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
+              "2 Finished(EndOfMedia)\n");
 }
 
 TEST(Backward, PassesItemsChaptersAndMarksTheOtherWayRound)
@@ -174,13 +175,13 @@ TEST(Backward, PassesItemsChaptersAndMarksTheOtherWayRound)
     EXPECT_TRUE(desk.navigator.SetPlayMode(Backward(bd::PlaySpeedNormal)).IsDone());
     desk.navigator.Advance(2 * Second + Ticks(100));
 
-    EXPECT_EQ(desk.Take(), "3+10 PlayMode(1, 5)\n"
+    EXPECT_EQ(desk.Take(), "3+10 PlayMode(PlayDirectionBackward, PlaySpeedNormal)\n"
                            "3+20 CurrentTimePosition(135000)\n"
                            "3+20 MarkInfo(7, 3, 135000)\n"
                            "3+21 ChapterNumber(2)\n"
                            "3+44920 MarkInfo(7, 2, 90100)\n"
                            "4+20 CurrentTimePosition(90000)\n"
-                           "4+21 PlayItem(7, 0, 6, 15)\n"
+                           "4+21 PlayItem(7, 0, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
                            "5+20 CurrentTimePosition(45000)\n"
                            "5+20 MarkInfo(7, 1, 45000)\n"
                            "5+21 ChapterNumber(1)\n");
@@ -197,7 +198,7 @@ TEST(Backward, TurnsAroundAtTheStart)
 
     EXPECT_EQ(desk.Take(), "0+33750 CurrentTimePosition(0)\n"
                            "0+33750 MarkInfo(7, 0, 0)\n"
-                           "0+33750 PlayMode(0, 5)\n"
+                           "0+33750 PlayMode(PlayDirectionForward, PlaySpeedNormal)\n"
                            "1+33750 CurrentTimePosition(45000)\n");
     EXPECT_EQ(desk.navigator.Context().GetPlayMode(), bd::PlayMode());
 }
@@ -211,7 +212,7 @@ TEST(Backward, TurnsAroundAtOnceAtTheStart)
     EXPECT_EQ(desk.navigator.TimeToNextChange(), Ticks(0));
     desk.navigator.Advance(Second);
 
-    EXPECT_EQ(desk.Take(), "0 PlayMode(0, 5)\n"
+    EXPECT_EQ(desk.Take(), "0 PlayMode(PlayDirectionForward, PlaySpeedNormal)\n"
                            "1 CurrentTimePosition(45000)\n");
 }
 
@@ -226,11 +227,11 @@ TEST(Backward, EntersAnItemOfOneTickBeforeItTurnsAround)
 
     EXPECT_EQ(desk.Take(), "0+19 MarkInfo(7, 1, 1)\n"
                            "0+20 CurrentTimePosition(0)\n"
-                           "0+20 PlayItem(7, 0, 6, 15)\n"
+                           "0+20 PlayItem(7, 0, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
                            "0+20 MarkInfo(7, 0, 0)\n"
                            "0+20 ChapterNumber(1)\n"
-                           "0+20 PlayMode(0, 5)\n"
-                           "0+21 PlayItem(7, 1, 6, 15)\n"
+                           "0+20 PlayMode(PlayDirectionForward, PlaySpeedNormal)\n"
+                           "0+21 PlayItem(7, 1, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
                            "0+21 MarkInfo(7, 1, 1)\n"
                            "0+21 ChapterNumber(2)\n");
 }
@@ -244,8 +245,9 @@ TEST(Backward, HasNoStills)
 
     desk.navigator.Advance(2 * Second);
 
-    EXPECT_EQ(desk.TakeWithoutPositions(), "1+1 PlayItem(7, 0, 6, 15)\n"
-                                           "2 PlayMode(0, 5)\n");
+    EXPECT_EQ(desk.TakeWithoutPositions(),
+              "1+1 PlayItem(7, 0, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
+              "2 PlayMode(PlayDirectionForward, PlaySpeedNormal)\n");
 }
 
 TEST(Backward, TellsTheStreamsOfTheItemItGetsTo)
@@ -259,9 +261,10 @@ TEST(Backward, TellsTheStreamsOfTheItemItGetsTo)
     desk.navigator.Advance(Ticks(11));
 
     EXPECT_EQ(desk.Take(), "1+20 CurrentTimePosition(45000)\n"
-                           "1+21 PlayItem(7, 0, 6, 15)\n"
+                           "1+21 PlayItem(7, 0, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
                            "1+21 AudioInfo(1)\n"
-                           "1+21 AudioInfoChanged(true, (2, 0, 0, 0, 4352, 0))\n");
+                           "1+21 AudioInfoChanged(true, (AudioFormatAc3, AudioSampleRateUnknown, "
+                           "AudioBitsPerSamplingTypeInvalid, AudioChannelTypeUnknown, 4352, 0))\n");
 }
 
 } // namespace

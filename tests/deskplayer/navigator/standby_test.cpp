@@ -217,28 +217,31 @@ TEST(Standby, IsLeftWithPositionStreamsAndPlayMode)
 
     EXPECT_TRUE(desk.navigator.WakeUp(desk.desk.ResumeData()).IsDone());
 
-    EXPECT_EQ(desk.Take(), "65+7 SystemResumed(true)\n"
-                           "65+7 Playlist(7)\n"
-                           "65+7 PlayItem(7, 1, 6, 15)\n"
-                           "65+7 VideoInfo(1)\n"
-                           "65+7 AudioInfo(2)\n"
-                           "65+7 AngleInfo(1)\n"
-                           "65+7 PresentationGraphicsInfo(1, false)\n"
-                           "65+7 SecondaryVideoInfo(1)\n"
-                           "65+7 SecondaryVideoDisplay(1, false)\n"
-                           "65+7 SecondaryAudioInfo(1)\n"
-                           "65+7 SecondaryAudioDisplay(1, false)\n"
-                           "65+7 PipPgTextStInfo(1, false)\n"
-                           "65+7 InteractiveGraphicsInfo(1)\n"
-                           "65+7 AudioInfoChanged(true, (3, 0, 0, 0, 4353, 0))\n"
-                           "65+7 AudioInfoChanged(false, (8, 0, 0, 0, 6656, 0))\n"
-                           "65+7 TextSubtitleStylesAvailable(4)\n"
-                           "65+7 TextSubtitleStyleInfo(1)\n"
-                           "65+7 UOMask(0)\n"
-                           "65+7 PopUpMenuAvailable()\n"
-                           "65+7 PlayMode(0, 4)\n"
-                           "65+7 ChapterNumber(2)\n"
-                           "65+7 CurrentTimePosition(225007)\n");
+    EXPECT_EQ(desk.Take(),
+              "65+7 SystemResumed(true)\n"
+              "65+7 Playlist(7)\n"
+              "65+7 PlayItem(7, 1, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
+              "65+7 VideoInfo(1)\n"
+              "65+7 AudioInfo(2)\n"
+              "65+7 AngleInfo(1)\n"
+              "65+7 PresentationGraphicsInfo(1, false)\n"
+              "65+7 SecondaryVideoInfo(1)\n"
+              "65+7 SecondaryVideoDisplay(1, false)\n"
+              "65+7 SecondaryAudioInfo(1)\n"
+              "65+7 SecondaryAudioDisplay(1, false)\n"
+              "65+7 PipPgTextStInfo(1, false)\n"
+              "65+7 InteractiveGraphicsInfo(1)\n"
+              "65+7 AudioInfoChanged(true, (AudioFormatPcm, AudioSampleRateUnknown, "
+              "AudioBitsPerSamplingTypeInvalid, AudioChannelTypeUnknown, 4353, 0))\n"
+              "65+7 AudioInfoChanged(false, (AudioFormatEac3Sec, AudioSampleRateUnknown, "
+              "AudioBitsPerSamplingTypeInvalid, AudioChannelTypeUnknown, 6656, 0))\n"
+              "65+7 TextSubtitleStylesAvailable(4)\n"
+              "65+7 TextSubtitleStyleInfo(1)\n"
+              "65+7 UOMask(0)\n"
+              "65+7 PopUpMenuAvailable()\n"
+              "65+7 PlayMode(PlayDirectionForward, PlaySpeedSlow1)\n"
+              "65+7 ChapterNumber(2)\n"
+              "65+7 CurrentTimePosition(225007)\n");
     EXPECT_EQ(desk.Snapshot(), before);
 
     TestDesk restarted(playList);
@@ -273,7 +276,7 @@ TEST(Standby, IsLeftIntoTheStillAtTheEndAgain)
 
     EXPECT_EQ(desk.TakeWithoutPositions(), "2 StillOn()\n"
                                            "7 StillOff()\n"
-                                           "7 Finished(0)\n");
+                                           "7 Finished(EndOfMedia)\n");
 }
 
 TEST(Standby, IsLeftWhereItWasEnteredInEveryItem)
@@ -308,8 +311,8 @@ TEST(Standby, TellsThePlayModeThatWasAskedForWhilePaused)
 
     desk.navigator.Continue();
 
-    EXPECT_EQ(desk.Take(), "1 Continued(0, 4)\n"
-                           "1 PlayMode(0, 4)\n");
+    EXPECT_EQ(desk.Take(), "1 Continued(PlayDirectionForward, PlaySpeedSlow1)\n"
+                           "1 PlayMode(PlayDirectionForward, PlaySpeedSlow1)\n");
 }
 
 TEST(Standby, EndsARepeat)

@@ -28,7 +28,8 @@ struct Selection {
 const Selection Selections[] = {
     {&SimulatedNavigator::SelectAudio, "audio stream",
      "1 AudioInfo(2)\n"
-     "1 AudioInfoChanged(true, (3, 0, 0, 0, 4353, 0))\n"},
+     "1 AudioInfoChanged(true, (AudioFormatPcm, AudioSampleRateUnknown, "
+     "AudioBitsPerSamplingTypeInvalid, AudioChannelTypeUnknown, 4353, 0))\n"},
     {&SimulatedNavigator::SelectSubtitle, "subtitle stream",
      "1 PresentationGraphicsInfo(2, true)\n"},
     {&SimulatedNavigator::SelectAngle, "angle", "1 AngleInfo(2)\n"},
@@ -38,7 +39,8 @@ const Selection Selections[] = {
     {&SimulatedNavigator::SelectSecondaryAudio, "secondary audio stream",
      "1 SecondaryAudioInfo(2)\n"
      "1 SecondaryAudioDisplay(2, false)\n"
-     "1 AudioInfoChanged(false, (8, 0, 0, 0, 6657, 0))\n"},
+     "1 AudioInfoChanged(false, (AudioFormatEac3Sec, AudioSampleRateUnknown, "
+     "AudioBitsPerSamplingTypeInvalid, AudioChannelTypeUnknown, 6657, 0))\n"},
     {&SimulatedNavigator::SelectPipSubtitle, "picture-in-picture subtitle stream",
      "1 PipPgTextStInfo(2, false)\n"},
 };
@@ -106,15 +108,19 @@ TEST(Streams, AreTheLastWhereTheChosenOneIsMissingAndTheChoiceStays)
     desk.Do(desk.navigator.SelectAudio(2));
 
     desk.navigator.Advance(Second);
-    EXPECT_EQ(desk.TakeWithoutPositions(), "1 PlayItem(7, 1, 6, 15)\n"
-                                           "1 AudioInfo(1)\n"
-                                           "1 AudioInfoChanged(true, (2, 0, 0, 0, 4352, 0))\n");
+    EXPECT_EQ(desk.TakeWithoutPositions(),
+              "1 PlayItem(7, 1, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
+              "1 AudioInfo(1)\n"
+              "1 AudioInfoChanged(true, (AudioFormatAc3, AudioSampleRateUnknown, "
+              "AudioBitsPerSamplingTypeInvalid, AudioChannelTypeUnknown, 4352, 0))\n");
     desk.navigator.Advance(Second);
     EXPECT_NE(desk.Take().find("2 AudioInfo(0)\n"), std::string::npos);
     desk.navigator.Advance(Second);
     const std::string heard = desk.Take();
     EXPECT_NE(heard.find("3 AudioInfo(2)\n"), std::string::npos);
-    EXPECT_NE(heard.find("3 AudioInfoChanged(true, (3, 0, 0, 0, 4353, 0))\n"), std::string::npos);
+    EXPECT_NE(heard.find("3 AudioInfoChanged(true, (AudioFormatPcm, AudioSampleRateUnknown, "
+                         "AudioBitsPerSamplingTypeInvalid, AudioChannelTypeUnknown, 4353, 0))\n"),
+              std::string::npos);
 }
 
 TEST(Streams, TellTheirAudioAgainOnlyWhenItIsDifferent)
@@ -128,10 +134,12 @@ TEST(Streams, TellTheirAudioAgainOnlyWhenItIsDifferent)
 
     desk.navigator.Advance(2 * Second);
 
-    EXPECT_EQ(desk.TakeWithoutPositions(), "1 PlayItem(7, 1, 6, 15)\n"
-                                           "1 AudioInfoChanged(true, (2, 9, 0, 0, 4352, 0))\n"
-                                           "2 PlayItem(7, 2, 6, 15)\n"
-                                           "2 AudioInfo(1)\n");
+    EXPECT_EQ(desk.TakeWithoutPositions(),
+              "1 PlayItem(7, 1, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
+              "1 AudioInfoChanged(true, (AudioFormatAc3, AudioSampleRate_48000, "
+              "AudioBitsPerSamplingTypeInvalid, AudioChannelTypeUnknown, 4352, 0))\n"
+              "2 PlayItem(7, 2, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
+              "2 AudioInfo(1)\n");
 }
 
 TEST(Streams, AreShownAndHidden)
@@ -206,14 +214,16 @@ TEST(Streams, WithoutTextHaveNoStyles)
               "there is no text subtitle style 1, there is none here");
 
     desk.navigator.Advance(10 * Second);
-    EXPECT_EQ(desk.TakeWithoutPositions(), "10 PlayItem(7, 1, 6, 15)\n"
-                                           "10 PresentationGraphicsInfo(1, true)\n"
-                                           "10 TextSubtitleStylesAvailable(4)\n"
-                                           "10 TextSubtitleStyleInfo(1)\n");
+    EXPECT_EQ(desk.TakeWithoutPositions(),
+              "10 PlayItem(7, 1, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
+              "10 PresentationGraphicsInfo(1, true)\n"
+              "10 TextSubtitleStylesAvailable(4)\n"
+              "10 TextSubtitleStyleInfo(1)\n");
     desk.navigator.Advance(10 * Second);
-    EXPECT_EQ(desk.TakeWithoutPositions(), "20 PlayItem(7, 2, 6, 15)\n"
-                                           "20 PresentationGraphicsInfo(1, true)\n"
-                                           "20 TextSubtitleStylesAvailable(0)\n");
+    EXPECT_EQ(desk.TakeWithoutPositions(),
+              "20 PlayItem(7, 2, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
+              "20 PresentationGraphicsInfo(1, true)\n"
+              "20 TextSubtitleStylesAvailable(0)\n");
 }
 
 TEST(Streams, ZoomIsTold)
@@ -253,21 +263,23 @@ TEST(SecondaryStreams, AreAvailableWithTheItemOnTheirOwnAndBehindItsStreamsInSte
 
         desk.navigator.Play();
 
-        EXPECT_EQ(desk.Take(), "0 PlayStarted()\n"
-                               "0 Playlist(7)\n"
-                               "0 PlayItem(7, 0, 6, 15)\n" +
-                                   std::string(inStep ? "" : Available) +
-                                   "0 VideoInfo(1)\n"
-                                   "0 AngleInfo(1)\n"
-                                   "0 SecondaryVideoInfo(1)\n"
-                                   "0 SecondaryVideoDisplay(1, false)\n"
-                                   "0 SecondaryAudioInfo(1)\n"
-                                   "0 SecondaryAudioDisplay(1, false)\n"
-                                   "0 AudioInfoChanged(false, (8, 0, 0, 0, 0, 0))\n" +
-                                   (inStep ? Available : "") +
-                                   "0 UOMask(0)\n"
-                                   "0 FirstPictureDelivered()\n"
-                                   "0 CurrentTimePosition(0)\n");
+        EXPECT_EQ(desk.Take(),
+                  "0 PlayStarted()\n"
+                  "0 Playlist(7)\n"
+                  "0 PlayItem(7, 0, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n" +
+                      std::string(inStep ? "" : Available) +
+                      "0 VideoInfo(1)\n"
+                      "0 AngleInfo(1)\n"
+                      "0 SecondaryVideoInfo(1)\n"
+                      "0 SecondaryVideoDisplay(1, false)\n"
+                      "0 SecondaryAudioInfo(1)\n"
+                      "0 SecondaryAudioDisplay(1, false)\n"
+                      "0 AudioInfoChanged(false, (AudioFormatEac3Sec, AudioSampleRateUnknown, "
+                      "AudioBitsPerSamplingTypeInvalid, AudioChannelTypeUnknown, 0, 0))\n" +
+                      (inStep ? Available : "") +
+                      "0 UOMask(0)\n"
+                      "0 FirstPictureDelivered()\n"
+                      "0 CurrentTimePosition(0)\n");
     }
 }
 
@@ -280,9 +292,11 @@ TEST(SecondaryStreams, AreAvailableAtNormalSpeedOnly)
         desk.Start();
 
         desk.navigator.SetPlayMode(Fast());
-        EXPECT_EQ(desk.Take(), std::string("0 PlayMode(0, 6)\n") + Unavailable);
+        EXPECT_EQ(desk.Take(),
+                  std::string("0 PlayMode(PlayDirectionForward, PlaySpeedFast1)\n") + Unavailable);
         desk.navigator.SetPlayMode(bd::PlayMode());
-        EXPECT_EQ(desk.Take(), std::string("0 PlayMode(0, 5)\n") + Available);
+        EXPECT_EQ(desk.Take(),
+                  std::string("0 PlayMode(PlayDirectionForward, PlaySpeedNormal)\n") + Available);
     }
 }
 
@@ -296,13 +310,14 @@ TEST(SecondaryStreams, AreUnavailableOnceInTheItemThatLacksThem)
 
         desk.navigator.Advance(10 * Second);
 
-        EXPECT_EQ(desk.TakeWithoutPositions(), "10 PlayItem(7, 1, 6, 15)\n"
-                                               "10 PictureInPictureUnavailable()\n"
-                                               "10 SecondaryAudioUnavailable()\n"
-                                               "10 SecondaryVideoInfo(0)\n"
-                                               "10 SecondaryVideoDisplay(0, false)\n"
-                                               "10 SecondaryAudioInfo(0)\n"
-                                               "10 SecondaryAudioDisplay(0, false)\n");
+        EXPECT_EQ(desk.TakeWithoutPositions(),
+                  "10 PlayItem(7, 1, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
+                  "10 PictureInPictureUnavailable()\n"
+                  "10 SecondaryAudioUnavailable()\n"
+                  "10 SecondaryVideoInfo(0)\n"
+                  "10 SecondaryVideoDisplay(0, false)\n"
+                  "10 SecondaryAudioInfo(0)\n"
+                  "10 SecondaryAudioDisplay(0, false)\n");
     }
 }
 

@@ -15,7 +15,7 @@ namespace
 
 using nlohmann::json;
 
-class JsonOutputTest : public testing::Test
+class JsonLines : public testing::Test
 {
 protected:
     /** What has been written, line by line. */
@@ -37,7 +37,7 @@ protected:
     bdmv::INavigatorListener& listener = output;
 };
 
-TEST_F(JsonOutputTest, WritesAnObjectALineWithMembersInAFixedOrder)
+TEST_F(JsonLines, WritesAnObjectALineWithMembersInAFixedOrder)
 {
     clock.Advance(Ticks(45000 * 27 + 22500));
 
@@ -52,7 +52,7 @@ TEST_F(JsonOutputTest, WritesAnObjectALineWithMembersInAFixedOrder)
                             "\n");
 }
 
-TEST_F(JsonOutputTest, CanBeParsedForEveryCallback)
+TEST_F(JsonLines, CanBeParsedForEveryCallback)
 {
     CallEveryCallback(listener);
     CollectingListener expected;
@@ -74,35 +74,35 @@ TEST_F(JsonOutputTest, CanBeParsedForEveryCallback)
     }
 }
 
-TEST_F(JsonOutputTest, WritesNumbersAsNumbers)
+TEST_F(JsonLines, WritesNumbersAsNumbers)
 {
     listener.Playlist(0xFFFFFFFF);
 
     EXPECT_EQ(LastArguments(), json({{"playListId", 4294967295}}));
 }
 
-TEST_F(JsonOutputTest, WritesBooleansAsBooleans)
+TEST_F(JsonLines, WritesBooleansAsBooleans)
 {
     listener.PresentationGraphicsInfo(3, false);
 
     EXPECT_EQ(LastArguments(), json({{"number", 3}, {"available", false}}));
 }
 
-TEST_F(JsonOutputTest, WritesPositionsInTicks)
+TEST_F(JsonLines, WritesPositionsInTicks)
 {
     listener.CurrentTimePosition(0xFFFFFFFFFFFFFFFEULL);
 
     EXPECT_EQ(LastArguments(), json({{"position", 0xFFFFFFFFFFFFFFFEULL}}));
 }
 
-TEST_F(JsonOutputTest, WritesNoPositionAsNull)
+TEST_F(JsonLines, WritesNoPositionAsNull)
 {
     listener.MarkInfo(1, 2, 0xFFFFFFFFFFFFFFFFULL);
 
     EXPECT_EQ(LastArguments(), json({{"playListId", 1}, {"markId", 2}, {"time", nullptr}}));
 }
 
-TEST_F(JsonOutputTest, WritesEnumerationsAsTheirNames)
+TEST_F(JsonLines, WritesEnumerationsAsTheirNames)
 {
     listener.PlayItem(800, 2, bd::VideoFormatType1080p, static_cast<bd::VideoAspectRatioType>(99));
 
@@ -110,7 +110,7 @@ TEST_F(JsonOutputTest, WritesEnumerationsAsTheirNames)
     EXPECT_EQ(LastArguments().at("aspectRatio"), "99");
 }
 
-TEST_F(JsonOutputTest, WritesMasksAsTheOperationsTheyForbid)
+TEST_F(JsonLines, WritesMasksAsTheOperationsTheyForbid)
 {
     listener.UOMask(bdmv::UOMaskTable(0x2100000000000000ULL));
     EXPECT_EQ(LastArguments(), json({{"forbidden", {"ChapterSearch", "Stop"}}}));
@@ -122,7 +122,7 @@ TEST_F(JsonOutputTest, WritesMasksAsTheOperationsTheyForbid)
     EXPECT_EQ(LastArguments(), json({{"forbidden", json::array({"ChapterSearch"})}}));
 }
 
-TEST_F(JsonOutputTest, WritesBytesInHexadecimal)
+TEST_F(JsonLines, WritesBytesInHexadecimal)
 {
     const bd::UInt8 data[] = {0x00, 0xA5, 0xFF};
 
@@ -133,7 +133,7 @@ TEST_F(JsonOutputTest, WritesBytesInHexadecimal)
     EXPECT_EQ(LastArguments(), json({{"data", ""}, {"size", 0}}));
 }
 
-TEST_F(JsonOutputTest, WritesRectanglesAsObjects)
+TEST_F(JsonLines, WritesRectanglesAsObjects)
 {
     listener.ZoomModeSet({{1, 2, 3, 4}, {5, 6, 7, 8}, 9});
 
@@ -141,7 +141,7 @@ TEST_F(JsonOutputTest, WritesRectanglesAsObjects)
                               "destination":{"x":5,"y":6,"width":7,"height":8},"delay":9})"));
 }
 
-TEST_F(JsonOutputTest, WritesNothingForAnEmptySession)
+TEST_F(JsonLines, WritesNothingForAnEmptySession)
 {
     EXPECT_EQ(stream.str(), "");
 }

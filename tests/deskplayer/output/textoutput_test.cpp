@@ -15,7 +15,7 @@ namespace deskplayer
 namespace
 {
 
-class TextOutputTest : public testing::Test
+class TextLines : public testing::Test
 {
 protected:
     std::ostringstream stream;
@@ -24,7 +24,7 @@ protected:
     bdmv::INavigatorListener& listener = output;
 };
 
-TEST_F(TextOutputTest, PrintsTheTimeAndTheCallback)
+TEST_F(TextLines, PrintsTheTimeAndTheCallback)
 {
     clock.Advance(Ticks(((1 * 60 + 2) * 60 + 3) * 45000ULL + 45 * 4 + 44));
 
@@ -33,7 +33,7 @@ TEST_F(TextOutputTest, PrintsTheTimeAndTheCallback)
     EXPECT_EQ(stream.str(), "01:02:03.004  PlayStarted\n");
 }
 
-TEST_F(TextOutputTest, PrintsArgumentsByNameAndEnumerationsByName)
+TEST_F(TextLines, PrintsArgumentsByNameAndEnumerationsByName)
 {
     listener.PlayItem(800, 2, bd::VideoFormatType1080p, bd::VideoAspectRatioType16x9);
     listener.TriggerTimeReached(bd::TRIGGER_NOTIFY_FROM_CURPOS, 45000);
@@ -46,14 +46,14 @@ TEST_F(TextOutputTest, PrintsArgumentsByNameAndEnumerationsByName)
                             "00:00:00.000  SystemResumed               playing=true\n");
 }
 
-TEST_F(TextOutputTest, PrintsTheNumberOfAValueWithoutAName)
+TEST_F(TextLines, PrintsTheNumberOfAValueWithoutAName)
 {
     listener.Continued(static_cast<bd::PlayDirectionDef>(2), static_cast<bd::PlaySpeedDef>(-1));
 
     EXPECT_EQ(stream.str(), "00:00:00.000  Continued                   direction=2 speed=-1\n");
 }
 
-TEST_F(TextOutputTest, PrintsAMarkWithoutATimeAsNone)
+TEST_F(TextLines, PrintsAMarkWithoutATimeAsNone)
 {
     listener.MarkInfo(1, 2, bd::TimePositionNone);
 
@@ -61,7 +61,7 @@ TEST_F(TextOutputTest, PrintsAMarkWithoutATimeAsNone)
               "00:00:00.000  MarkInfo                    playListId=1 markId=2 time=none\n");
 }
 
-TEST_F(TextOutputTest, PrintsStructuresFieldByField)
+TEST_F(TextLines, PrintsStructuresFieldByField)
 {
     bd::AudioInfoType info;
     info.format = bd::AudioFormatAc3;
@@ -84,7 +84,7 @@ TEST_F(TextOutputTest, PrintsStructuresFieldByField)
               "00:00:00.000  SystemSuspended             data=00a5ff size=3\n");
 }
 
-TEST_F(TextOutputTest, PrintsTheOperationsThatAMaskForbids)
+TEST_F(TextLines, PrintsTheOperationsThatAMaskForbids)
 {
     listener.UOMask(bdmv::UOMaskTable(0x2100000000000000ULL));
     listener.UOMask(bdmv::UOMaskTable());
@@ -94,7 +94,7 @@ TEST_F(TextOutputTest, PrintsTheOperationsThatAMaskForbids)
                             "00:00:00.000  UOMask                      forbidden=nothing\n");
 }
 
-TEST_F(TextOutputTest, WritesALineForEveryCallbackWithAlignedArguments)
+TEST_F(TextLines, WritesALineForEveryCallbackWithAlignedArguments)
 {
     CallEveryCallback(listener);
 

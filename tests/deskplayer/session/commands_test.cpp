@@ -41,20 +41,24 @@ const Example Examples[] = {
     {"play", "play", "fail play", "0 PlayFailed()\n"},
     {"stop", "stop", "play", "1 Stopped()\n"},
     {"pause", "pause", "play", "1 Paused()\n"},
-    {"continue", "continue", "play\npause", "1 Continued(0, 5)\n"},
-    {"step", "step", "play\npause", "1 Stepped(900, 0)\n"},
+    {"continue", "continue", "play\npause", "1 Continued(PlayDirectionForward, PlaySpeedNormal)\n"},
+    {"step", "step", "play\npause", "1 Stepped(900, PlayDirectionForward)\n"},
     {"forward", "forward", "play\nforward fast 1",
-     "1 PlayMode(0, 5)\n"
+     "1 PlayMode(PlayDirectionForward, PlaySpeedNormal)\n"
      "1 PictureInPictureAvailable()\n"
      "1 SecondaryAudioAvailable()\n"},
-    {"forward fast NUMBER", "forward fast 2", "play\nforward fast 1", "1 PlayMode(0, 7)\n"},
-    {"forward slow NUMBER", "forward slow 2", "play\nforward fast 1", "1 PlayMode(0, 3)\n"},
-    {"backward", "backward", "play", "1 PlayMode(1, 5)\n"},
-    {"backward fast NUMBER", "backward fast 12", "play\nforward fast 1", "1 PlayMode(1, 17)\n"},
-    {"backward slow NUMBER", "backward slow 5", "play\nforward fast 1", "1 PlayMode(1, 0)\n"},
+    {"forward fast NUMBER", "forward fast 2", "play\nforward fast 1",
+     "1 PlayMode(PlayDirectionForward, PlaySpeedFast2)\n"},
+    {"forward slow NUMBER", "forward slow 2", "play\nforward fast 1",
+     "1 PlayMode(PlayDirectionForward, PlaySpeedSlow2)\n"},
+    {"backward", "backward", "play", "1 PlayMode(PlayDirectionBackward, PlaySpeedNormal)\n"},
+    {"backward fast NUMBER", "backward fast 12", "play\nforward fast 1",
+     "1 PlayMode(PlayDirectionBackward, PlaySpeedFast12)\n"},
+    {"backward slow NUMBER", "backward slow 5", "play\nforward fast 1",
+     "1 PlayMode(PlayDirectionBackward, PlaySpeedSlow5)\n"},
     {"still off", "still off", "play\nseek 19.5",
      "1 StillOff()\n"
-     "1 Finished(0)\n"},
+     "1 Finished(EndOfMedia)\n"},
     {"suspend", "suspend", "play", "1 Suspended()\n"},
     {"resume", "resume", "play\nsuspend", "1 Resumed()\n"},
     {"seek TIME", "seek 7.5", "play",
@@ -75,24 +79,26 @@ const Example Examples[] = {
      "1 MarkInfo(7, 1, 225000)\n"
      "1 ChapterNumber(2)\n"
      "1 CurrentTimePosition(225000)\n"},
-    {"repeat a", "repeat a", "play", "1 TriggerSet(5, true)\n"},
+    {"repeat a", "repeat a", "play", "1 TriggerSet(TRIGGER_A, true)\n"},
     {"repeat b", "repeat b", "play\nrepeat a",
-     "1 TriggerSet(6, true)\n"
-     "1 TriggerTimeReached(6, 45000)\n"
+     "1 TriggerSet(TRIGGER_B, true)\n"
+     "1 TriggerTimeReached(TRIGGER_B, 45000)\n"
      "1 JumpOccurred()\n"
      "1 MarkInfo(7, 0, 0)\n"
      "1 CurrentTimePosition(0)\n"},
-    {"repeat ab off", "repeat ab off", "play\nrepeat a", "1 TriggerSet(7, true)\n"},
-    {"repeat chapter", "repeat chapter", "play", "1 TriggerSet(8, true)\n"},
-    {"repeat title", "repeat title", "play", "1 TriggerSet(9, true)\n"},
-    {"repeat off", "repeat off", "play\nrepeat title", "1 TriggerSet(4, true)\n"},
-    {"trigger TIME", "trigger 5", "play", "1 TriggerSet(13, true)\n"},
+    {"repeat ab off", "repeat ab off", "play\nrepeat a", "1 TriggerSet(TRIGGER_AB_NONE, true)\n"},
+    {"repeat chapter", "repeat chapter", "play", "1 TriggerSet(TRIGGER_CHP, true)\n"},
+    {"repeat title", "repeat title", "play", "1 TriggerSet(TRIGGER_TITLE, true)\n"},
+    {"repeat off", "repeat off", "play\nrepeat title", "1 TriggerSet(TRIGGER_NONE, true)\n"},
+    {"trigger TIME", "trigger 5", "play", "1 TriggerSet(TRIGGER_NOTIFY_FROM_CURPOS, true)\n"},
     {"audio NUMBER", "audio 2", "play",
      "1 AudioInfo(2)\n"
-     "1 AudioInfoChanged(true, (3, 0, 0, 0, 4353, 0))\n"},
+     "1 AudioInfoChanged(true, (AudioFormatPcm, AudioSampleRateUnknown, "
+     "AudioBitsPerSamplingTypeInvalid, AudioChannelTypeUnknown, 4353, 0))\n"},
     {"audio next", "audio next", "play\naudio 2",
      "1 AudioInfo(1)\n"
-     "1 AudioInfoChanged(true, (2, 0, 0, 0, 4352, 0))\n"},
+     "1 AudioInfoChanged(true, (AudioFormatAc3, AudioSampleRateUnknown, "
+     "AudioBitsPerSamplingTypeInvalid, AudioChannelTypeUnknown, 4352, 0))\n"},
     {"subtitle on", "subtitle on", "play", "1 PresentationGraphicsDisplay(true)\n"},
     {"subtitle off", "subtitle off", "play", "1 PresentationGraphicsDisplay(false)\n"},
     {"subtitle next", "subtitle next", "play", "1 PresentationGraphicsInfo(2, true)\n"},
@@ -107,7 +113,8 @@ const Example Examples[] = {
     {"pip audio NUMBER", "pip audio 2", "play",
      "1 SecondaryAudioInfo(2)\n"
      "1 SecondaryAudioDisplay(2, false)\n"
-     "1 AudioInfoChanged(false, (8, 0, 0, 0, 6657, 0))\n"},
+     "1 AudioInfoChanged(false, (AudioFormatEac3Sec, AudioSampleRateUnknown, "
+     "AudioBitsPerSamplingTypeInvalid, AudioChannelTypeUnknown, 6657, 0))\n"},
     {"pip subtitle on", "pip subtitle on", "play", "1 PipPgTextSelect(true)\n"},
     {"pip subtitle off", "pip subtitle off", "play\npip subtitle on", "1 PipPgTextSelect(false)\n"},
     {"pip subtitle NUMBER", "pip subtitle 2", "play", "1 PipPgTextStInfo(2, false)\n"},
@@ -176,7 +183,7 @@ const Example Examples[] = {
     {"fail play", "fail play\nplay", "", "0 PlayFailed()\n"},
     {"fail resume", "fail resume\nresume", "play\nsuspend", "1 ResumeFailed()\n"},
     {"fail preload", "fail preload", "play", "1 PreloadFailed()\n"},
-    {"fail stream", "fail stream", "play", "1 Finished(1)\n"},
+    {"fail stream", "fail stream", "play", "1 Finished(DataStarvation)\n"},
 };
 
 /** Commands of which a listener hears more than an example wants to hold. */

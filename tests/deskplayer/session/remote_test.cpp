@@ -112,18 +112,24 @@ TEST(Remote, PerformsTheActionOfEveryKey)
 {
     const KeyExample examples[] = {
         {"", ' ', "Paused()\n"},
-        {" ", ' ', "Continued(0, 5)\n"},
+        {" ", ' ', "Continued(PlayDirectionForward, PlaySpeedNormal)\n"},
         {"", 'x', "Stopped()\n"},
         {" ", '.', nullptr}, // tells a position of the wall clock
-        {"", 'f', "PlayMode(0, 6)\nPictureInPictureUnavailable()\nSecondaryAudioUnavailable()\n"},
-        {"f", 'f', "PlayMode(0, 7)\n"},
-        {"nf", 'r', "PlayMode(1, 6)\n"},
-        {"nr", 'r', "PlayMode(1, 7)\n"},
-        {"f", 'w', "PlayMode(0, 5)\nPictureInPictureAvailable()\nSecondaryAudioAvailable()\n"},
+        {"", 'f',
+         "PlayMode(PlayDirectionForward, "
+         "PlaySpeedFast1)\nPictureInPictureUnavailable()\nSecondaryAudioUnavailable()\n"},
+        {"f", 'f', "PlayMode(PlayDirectionForward, PlaySpeedFast2)\n"},
+        {"nf", 'r', "PlayMode(PlayDirectionBackward, PlaySpeedFast1)\n"},
+        {"nr", 'r', "PlayMode(PlayDirectionBackward, PlaySpeedFast2)\n"},
+        {"f", 'w',
+         "PlayMode(PlayDirectionForward, "
+         "PlaySpeedNormal)\nPictureInPictureAvailable()\nSecondaryAudioAvailable()\n"},
         {"", 'n', "JumpOccurred()\nMarkInfo(7, 1, 27000000)\nChapterNumber(2)\n"},
         {"n", 'p', "JumpOccurred()\nMarkInfo(7, 0, 0)\nChapterNumber(1)\n"},
         {"", 'o', "playback is playing, not in a still\n"},
-        {"", 'a', "AudioInfo(2)\nAudioInfoChanged(true, (3, 0, 0, 0, 4353, 0))\n"},
+        {"", 'a',
+         "AudioInfo(2)\nAudioInfoChanged(true, (AudioFormatPcm, AudioSampleRateUnknown, "
+         "AudioBitsPerSamplingTypeInvalid, AudioChannelTypeUnknown, 4353, 0))\n"},
         {"", 's', "PresentationGraphicsInfo(2, true)\n"},
         {"", 'g', "AngleInfo(2)\n"},
         {"", 'm', "InteractiveGraphicsActive()\nInteractiveGraphicsVisible()\n"},

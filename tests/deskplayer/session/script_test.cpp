@@ -243,7 +243,7 @@ TEST(ParseScript, ReadsTimesWithColons)
 TEST(ParseScript, ReadsSecondsWithoutAUnit)
 {
     EXPECT_EQ(TimeOf("3.25"), 3250 * Millisecond);
-    EXPECT_EQ(TimeOf("0"), 0u);
+    EXPECT_EQ(TimeOf("0"), Ticks(0));
 }
 
 TEST(ParseScript, ReadsTimesWithAUnit)

@@ -13,15 +13,17 @@ namespace
 {
 
 /** Carries out a script and collects what the hooks are called with. */
-class SessionTest : public testing::Test
+class Session : public testing::Test
 {
 protected:
     /** @return what the listener heard, and the refusals where they happened */
     std::string PlayScript(TestDesk& desk, const std::string& script)
     {
         std::string heard;
-        SessionHooks hooks;
-        hooks.beforeTimePasses = [this, &desk](Ticks time) {
+        SessionHooks hooks = desk.Hooks();
+        hooks.beforeTimePasses = [this, &desk,
+                                  count = hooks.beforeTimePasses](Ticks time) {
+            count(time);
             timesPassed.emplace_back(desk.clock.Now(), time);
         };
         hooks.onRefused = [&heard, &desk](std::size_t line, const std::string& reason) {
@@ -35,15 +37,16 @@ protected:
     std::vector<std::pair<Ticks, Ticks>> timesPassed; ///< from when, how long
 };
 
-const char* const StartOfItem = "0 PlayStarted()\n"
-                                "0 Playlist(7)\n"
-                                "0 PlayItem(7, 0, 6, 15)\n"
-                                "0 VideoInfo(1)\n"
-                                "0 AngleInfo(1)\n"
-                                "0 UOMask(0)\n"
-                                "0 FirstPictureDelivered()\n";
+const char* const StartOfItem =
+    "0 PlayStarted()\n"
+    "0 Playlist(7)\n"
+    "0 PlayItem(7, 0, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
+    "0 VideoInfo(1)\n"
+    "0 AngleInfo(1)\n"
+    "0 UOMask(0)\n"
+    "0 FirstPictureDelivered()\n";
 
-TEST_F(SessionTest, CarriesOutEachStepAtItsTimeAndPlaysToTheEnd)
+TEST_F(Session, CarriesOutEachStepAtItsTimeAndPlaysToTheEnd)
 {
     TestDesk desk(ListOf({Item(10)}));
 
@@ -52,12 +55,12 @@ TEST_F(SessionTest, CarriesOutEachStepAtItsTimeAndPlaysToTheEnd)
                                "step\n"
                                "at 60 continue\n"),
               std::string(StartOfItem) + "2 Paused()\n"
-                                         "2 Stepped(90900, 0)\n"
-                                         "60 Continued(0, 5)\n"
-                                         "67+44100 Finished(0)\n");
+                                         "2 Stepped(90900, PlayDirectionForward)\n"
+                                         "60 Continued(PlayDirectionForward, PlaySpeedNormal)\n"
+                                         "67+44100 Finished(EndOfMedia)\n");
 }
 
-TEST_F(SessionTest, ReportsWhatIsRefusedWithItsLineAndGoesOn)
+TEST_F(Session, ReportsWhatIsRefusedWithItsLineAndGoesOn)
 {
     TestDesk desk(ListOf({Item(10)}));
 
@@ -69,7 +72,7 @@ TEST_F(SessionTest, ReportsWhatIsRefusedWithItsLineAndGoesOn)
                                          "1 Paused()\n");
 }
 
-TEST_F(SessionTest, NeedsNoHooks)
+TEST_F(Session, NeedsNoHooks)
 {
     TestDesk desk(ListOf({Item(1)}));
 
@@ -79,19 +82,19 @@ TEST_F(SessionTest, NeedsNoHooks)
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Finished);
 }
 
-TEST_F(SessionTest, HasItsTimeGoOnWhenPlaybackHasEnded)
+TEST_F(Session, HasItsTimeGoOnWhenPlaybackHasEnded)
 {
     TestDesk desk(ListOf({Item(1)}));
 
     EXPECT_EQ(PlayScript(desk, "play\nat 1:00:00 fail play\nplay\nafter 3 stop\n"),
-              std::string(StartOfItem) + "1 Finished(0)\n"
+              std::string(StartOfItem) + "1 Finished(EndOfMedia)\n"
                                          "3600 PlayFailed()\n"
                                          "line 4: playback is at its end, not playing or paused or "
                                          "in a still\n");
     EXPECT_EQ(desk.clock.Now(), 3603 * Second);
 }
 
-TEST_F(SessionTest, DoesNothingWithoutSteps)
+TEST_F(Session, DoesNothingWithoutSteps)
 {
     TestDesk desk(ListOf({Item(1)}));
 
@@ -99,7 +102,7 @@ TEST_F(SessionTest, DoesNothingWithoutSteps)
     EXPECT_EQ(desk.clock.Now(), Ticks(0));
 }
 
-TEST_F(SessionTest, EndsWherePlaybackWouldStand)
+TEST_F(Session, EndsWherePlaybackWouldStand)
 {
     const std::pair<const char*, Status> ends[] = {{"pause", Status::Paused},
                                                    {"suspend", Status::Suspended},
@@ -115,7 +118,7 @@ TEST_F(SessionTest, EndsWherePlaybackWouldStand)
     }
 }
 
-TEST_F(SessionTest, EndsWherePlaybackWouldGoRoundForEver)
+TEST_F(Session, EndsWherePlaybackWouldGoRoundForEver)
 {
     for (const char* const repeat :
          {"repeat a\nafter 1s repeat b", "repeat chapter", "repeat title"}) {
@@ -128,7 +131,7 @@ TEST_F(SessionTest, EndsWherePlaybackWouldGoRoundForEver)
     }
 }
 
-TEST_F(SessionTest, GoesOnToTheEndWhenPlaybackHasLeftTheRepeat)
+TEST_F(Session, GoesOnToTheEndWhenPlaybackHasLeftTheRepeat)
 {
     TestDesk desk(ListOf({Item(10)}));
 
@@ -138,7 +141,7 @@ TEST_F(SessionTest, GoesOnToTheEndWhenPlaybackHasLeftTheRepeat)
     EXPECT_EQ(desk.clock.Now(), 6 * Second);
 }
 
-TEST_F(SessionTest, WaitsBeforeTimePassesChangeByChange)
+TEST_F(Session, WaitsBeforeTimePassesChangeByChange)
 {
     TestDesk desk(ListOf({Item(2)}, {Link(0, Ticks(100))}));
 
@@ -154,7 +157,7 @@ TEST_F(SessionTest, WaitsBeforeTimePassesChangeByChange)
     EXPECT_EQ(desk.clock.Now(), 17 * Second);
 }
 
-TEST_F(SessionTest, HandsOnWhatAListenerThrows)
+TEST_F(Session, HandsOnWhatAListenerThrows)
 {
     class Thrower : public bdmv::NavigatorListenerAdapter
     {
@@ -172,7 +175,7 @@ TEST_F(SessionTest, HandsOnWhatAListenerThrows)
 /** What a listener hears of a play list without a viewer. */
 std::string HeardFromStartToEnd(TestDesk& desk)
 {
-    PlayFromStartToEnd(desk.desk, SessionHooks());
+    PlayFromStartToEnd(desk.desk, desk.Hooks());
     return desk.TakeWithoutPositions();
 }
 
@@ -180,7 +183,7 @@ TEST(FromStartToEnd, PlaysAndFinishes)
 {
     TestDesk desk(ListOf({Item(10)}));
 
-    EXPECT_EQ(HeardFromStartToEnd(desk), std::string(StartOfItem) + "10 Finished(0)\n");
+    EXPECT_EQ(HeardFromStartToEnd(desk), std::string(StartOfItem) + "10 Finished(EndOfMedia)\n");
 }
 
 TEST(FromStartToEnd, LeavesEndlessStillsAfterThreeSecondsAndTimedOnesToThemselves)
@@ -188,16 +191,18 @@ TEST(FromStartToEnd, LeavesEndlessStillsAfterThreeSecondsAndTimedOnesToThemselve
     TestDesk desk(ListOf({WithEndlessStill(Item(1)), WithTimedStill(Item(1), 10),
                           Forbidding(WithEndlessStill(Item(1)), {bd::UserOperationStillOff})}));
 
-    EXPECT_EQ(HeardFromStartToEnd(desk), std::string(StartOfItem) + "1 StillOn()\n"
-                                                                    "4 StillOff()\n"
-                                                                    "4 PlayItem(7, 1, 6, 15)\n"
-                                                                    "5 StillOn()\n"
-                                                                    "15 StillOff()\n"
-                                                                    "15 PlayItem(7, 2, 6, 15)\n"
-                                                                    "15 UOMask(1024)\n"
-                                                                    "16 StillOn()\n"
-                                                                    "19 StillOff()\n"
-                                                                    "19 Finished(0)\n");
+    EXPECT_EQ(HeardFromStartToEnd(desk),
+              std::string(StartOfItem) +
+                  "1 StillOn()\n"
+                  "4 StillOff()\n"
+                  "4 PlayItem(7, 1, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
+                  "5 StillOn()\n"
+                  "15 StillOff()\n"
+                  "15 PlayItem(7, 2, VideoFormatType1080p, VideoAspectRatioTypeNoInfo)\n"
+                  "15 UOMask(1024)\n"
+                  "16 StillOn()\n"
+                  "19 StillOff()\n"
+                  "19 Finished(EndOfMedia)\n");
 }
 
 TEST(FromStartToEnd, FinishesWhenThereIsNothingToPlay)
@@ -206,7 +211,7 @@ TEST(FromStartToEnd, FinishesWhenThereIsNothingToPlay)
 
     EXPECT_EQ(HeardFromStartToEnd(desk), "0 PlayStarted()\n"
                                          "0 Playlist(7)\n"
-                                         "0 Finished(0)\n");
+                                         "0 Finished(EndOfMedia)\n");
 }
 
 TEST(FromStartToEnd, FinishesWhenNothingHasLength)
@@ -215,15 +220,17 @@ TEST(FromStartToEnd, FinishesWhenNothingHasLength)
 
     const std::string heard = HeardFromStartToEnd(desk);
 
-    EXPECT_EQ(heard.substr(heard.size() - 14), "0 Finished(0)\n") << heard;
+    const std::string end = "0 Finished(EndOfMedia)\n";
+    EXPECT_EQ(heard.substr(heard.size() - end.size()), end) << heard;
 }
 
 TEST(FromStartToEnd, WaitsBeforeTimePasses)
 {
     TestDesk desk(ListOf({WithEndlessStill(Item(2))}));
     Ticks waited(0);
-    SessionHooks hooks;
-    hooks.beforeTimePasses = [&waited, &desk](Ticks time) {
+    SessionHooks hooks = desk.Hooks();
+    hooks.beforeTimePasses = [&waited, &desk, count = hooks.beforeTimePasses](Ticks time) {
+        count(time);
         EXPECT_EQ(desk.clock.Now(), waited);
         waited += time;
     };
@@ -238,10 +245,10 @@ TEST(FromStartToEnd, TellsEverySecondOfTwoHours)
 {
     TestDesk desk(ListOf({Item(7200)}));
 
-    PlayFromStartToEnd(desk.desk, SessionHooks());
+    PlayFromStartToEnd(desk.desk, desk.Hooks());
 
     const std::string heard = desk.Take();
-    const std::string others = std::string(StartOfItem) + "7200 Finished(0)\n";
+    const std::string others = std::string(StartOfItem) + "7200 Finished(EndOfMedia)\n";
     EXPECT_EQ(std::count(heard.begin(), heard.end(), '\n'),
               7201 + std::count(others.begin(), others.end(), '\n'));
     EXPECT_NE(heard.find("\n3601 CurrentTimePosition(162045000)\n"), std::string::npos);

@@ -117,14 +117,14 @@ Outcome Run(const std::vector<std::string>& command, const std::vector<std::stri
             const std::size_t equals = setting.find('=');
             setenv(setting.substr(0, equals).c_str(), setting.substr(equals + 1).c_str(), 1);
         }
-        std::vector<char*> arguments;
+        std::vector<char*> arguments = {const_cast<char*>("timeout"), const_cast<char*>("30")};
         for (const std::string& argument : command) {
             arguments.push_back(const_cast<char*>(argument.c_str()));
         }
         arguments.push_back(nullptr);
         if (std::freopen(outputFile.c_str(), "w", stdout) != nullptr &&
             std::freopen(errorsFile.c_str(), "a", stderr) != nullptr) {
-            execv(arguments[0], arguments.data());
+            execvp(arguments[0], arguments.data());
         }
         _exit(127);
     }

@@ -67,7 +67,7 @@ private:
 
 /** What became of a program. */
 struct Outcome {
-    int exitCode; ///< -1 when a signal ended it
+    int exitCode; ///< -1 when a signal ended it, 124 when it took more than 30 s
     int signal;   ///< 0 when it ended by itself
     std::string output;
     std::string errors; ///< standard error
