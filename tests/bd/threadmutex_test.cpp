@@ -141,6 +141,20 @@ TEST_F(ThreadMutex, TakingItTwiceOnOneThreadIsRefused)
     mutex.Release();
 }
 
+TEST_F(ThreadMutex, ErrorOfTakingItTwiceNamesTheMutexAndTheReason)
+{
+    mutex.Acquire();
+
+    try {
+        mutex.Acquire();
+        ADD_FAILURE() << "not refused";
+    } catch (const std::system_error& error) {
+        const std::string what = error.what();
+        EXPECT_EQ(0u, what.find("bd::ThreadMutex: the calling thread holds it already:")) << what;
+    }
+    mutex.Release();
+}
+
 TEST_F(ThreadMutex, TakingItTwiceNeverReachesTheOperatingSystem)
 {
     mutex.Acquire();

@@ -299,7 +299,7 @@ TEST_F(UOMask, InitOfNullIsReportedAndForbidsNothing)
     mask.Init(nullptr);
 
     const std::string report = journal.Take();
-    EXPECT_EQ(0u, report.find("assert: ")) << report;
+    EXPECT_EQ(0u, report.find("assert: field != nullptr, ")) << report;
     EXPECT_EQ(report.size() - 1, report.find('\n')) << report;
     EXPECT_TRUE(mask == UOMaskTable());
 }
