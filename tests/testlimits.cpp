@@ -16,7 +16,7 @@
 namespace
 {
 
-/** Of one test, with all its threads. The longest takes less than a tenth of it. */
+/** Of one test, with all its threads but without the programs that it starts. */
 constexpr int Seconds = BDMVNAVIGATOR_SECONDS_OF_A_TEST;
 
 /** In bytes. Many times what a test writes, little for the disk. */

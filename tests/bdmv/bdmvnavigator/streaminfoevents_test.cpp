@@ -1,6 +1,7 @@
 #include <vector>
 
 #include "eventtest.h"
+#include "support/describe.h"
 
 namespace
 {
@@ -102,42 +103,42 @@ std::string FirstSubtitleQuery(const std::string& result)
 const Scenario presentationGraphicsScenarios[] = {
     {"Shown", New<bdmv::PresentationGraphicsInfoEvent>(),
      Subtitles(bdmv::INavError::ErrOk, true, {4, 255}),
-     FirstSubtitleQuery("0") + Queried("GetPgTextStInfo(11, 12) -> 4, 255") +
+     FirstSubtitleQuery("ErrOk") + Queried("GetPgTextStInfo(11, 12) -> 4, 255") +
          Queried("GetPgTextStDisplay() -> true") +
          Logged("Sending PresentationGraphicsInfo - pgTextStNr: 4, available: TRUE") +
          Fired("PresentationGraphicsInfo(4, true)")},
     {"ShownWithOneStream", New<bdmv::PresentationGraphicsInfoEvent>(),
      Subtitles(bdmv::INavError::ErrOk, true, {65535, 1}),
-     FirstSubtitleQuery("0") + Queried("GetPgTextStInfo(11, 12) -> 65535, 1") +
+     FirstSubtitleQuery("ErrOk") + Queried("GetPgTextStInfo(11, 12) -> 65535, 1") +
          Queried("GetPgTextStDisplay() -> true") +
          Logged("Sending PresentationGraphicsInfo - pgTextStNr: 65535, available: TRUE") +
          Fired("PresentationGraphicsInfo(65535, true)")},
     {"ShownWithoutStreams", New<bdmv::PresentationGraphicsInfoEvent>(),
      Subtitles(bdmv::INavError::ErrOk, true, {4, 0}),
-     FirstSubtitleQuery("0") + Queried("GetPgTextStInfo(11, 12) -> 4, 0") +
+     FirstSubtitleQuery("ErrOk") + Queried("GetPgTextStInfo(11, 12) -> 4, 0") +
          Queried("GetPgTextStDisplay() -> true") +
          Logged("Sending PresentationGraphicsInfo - pgTextStNr: 4, available: FALSE") +
          Fired("PresentationGraphicsInfo(4, false)")},
     {"Hidden", New<bdmv::PresentationGraphicsInfoEvent>(),
      Subtitles(bdmv::INavError::ErrOk, false, {4, 3}),
-     FirstSubtitleQuery("0") + Queried("GetPgTextStInfo(11, 12) -> 4, 3") +
+     FirstSubtitleQuery("ErrOk") + Queried("GetPgTextStInfo(11, 12) -> 4, 3") +
          Queried("GetPgTextStDisplay() -> false") +
          Logged("Sending PresentationGraphicsInfo - pgTextStNr: 4, available: FALSE") +
          Fired("PresentationGraphicsInfo(4, false)")},
     {"HiddenWithoutStreams", New<bdmv::PresentationGraphicsInfoEvent>(),
      Subtitles(bdmv::INavError::ErrOk, false, {4, 0}),
-     FirstSubtitleQuery("0") + Queried("GetPgTextStInfo(11, 12) -> 4, 0") +
+     FirstSubtitleQuery("ErrOk") + Queried("GetPgTextStInfo(11, 12) -> 4, 0") +
          Queried("GetPgTextStDisplay() -> false") +
          Logged("Sending PresentationGraphicsInfo - pgTextStNr: 4, available: FALSE") +
          Fired("PresentationGraphicsInfo(4, false)")},
     {"NotAllowed", New<bdmv::PresentationGraphicsInfoEvent>(),
-     Subtitles(bdmv::INavError::ErrNotAllowed, true, {4, 3}), FirstSubtitleQuery("7")},
+     Subtitles(bdmv::INavError::ErrNotAllowed, true, {4, 3}), FirstSubtitleQuery("ErrNotAllowed")},
     {"UntouchedByTheSecondQuery", New<bdmv::PresentationGraphicsInfoEvent>(),
      [](Context& context) {
          Subtitles(bdmv::INavError::ErrOk, true, {4, 3})(context);
          context.untouched = {"GetPgTextStInfo"};
      },
-     FirstSubtitleQuery("0") + Queried("GetPgTextStInfo(11, 12) -> untouched") +
+     FirstSubtitleQuery("ErrOk") + Queried("GetPgTextStInfo(11, 12) -> untouched") +
          Queried("GetPgTextStDisplay() -> true") +
          Logged("Sending PresentationGraphicsInfo - pgTextStNr: 11, available: TRUE") +
          Fired("PresentationGraphicsInfo(11, true)")},
@@ -366,7 +367,7 @@ TEST_F(StreamInfoEvents, PresentationGraphicsInfoGoesOnAfterEveryResultButNotAll
         Subtitles(static_cast<bdmv::INavError::ErrCode>(result), true, {4, 3})(context);
 
         EXPECT_EQ(Dispatch<bdmv::PresentationGraphicsInfoEvent>(),
-                  FirstSubtitleQuery(std::to_string(result)) +
+                  FirstSubtitleQuery(bdmvtest::Describe(context.rPgTextStResult)) +
                       Queried("GetPgTextStInfo(11, 12) -> 4, 3") +
                       Queried("GetPgTextStDisplay() -> true") +
                       Logged("Sending PresentationGraphicsInfo - pgTextStNr: 4, available: TRUE") +
@@ -446,9 +447,11 @@ TEST_F(StreamInfoEvents, AudioInfoChangedKeepsItsOwnCopyOfTheAttributes)
 
     event.Dispatch(listeners);
 
-    EXPECT_EQ(journal.Take(), Logged("Sending AudioChannelsChanged") +
-                                  Fired("AudioInfoChanged(true, (7, 14, 4, 43, 65535, "
-                                        "4294967294))"));
+    EXPECT_EQ(journal.Take(),
+              Logged("Sending AudioChannelsChanged") +
+                  Fired("AudioInfoChanged(true, (AudioFormatEac3, AudioSampleRate_192000, "
+                        "AudioBitsPerSamplingType24, AudioChannelTypeOthers, 65535, "
+                        "4294967294))"));
 }
 
 } // namespace
