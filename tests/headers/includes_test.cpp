@@ -1,11 +1,14 @@
-// Who includes whom: the library needs nothing but itself, the standard libraries of C and C++ and
-// the operating system's threads, and its layers look in one direction.
+// Which file includes which: the library needs only itself, the standard libraries of C and C++ and
+// the operating system's threads, every folder uses only the folders below it, and no files or
+// folders include each other in a circle.
 
 #include <gtest/gtest.h>
 
 #include <algorithm>
 #include <filesystem>
 #include <fstream>
+#include <iterator>
+#include <map>
 #include <regex>
 #include <set>
 #include <string>
@@ -17,7 +20,8 @@ namespace
 namespace fs = std::filesystem;
 
 const fs::path Root = BDMVNAVIGATOR_SOURCE_DIR;
-const std::vector<std::string> IncludeRoots = {"inc", "bdmv/inc", "bdmv", "prv_inc"};
+const std::vector<std::string> IncludeRoots = {
+    "inc", "bdmv/inc", "bdmv", "prv_inc", "deskplayer", "ports/linux", "measure/bench", "tests"};
 
 /** An #include line of a file. */
 struct Include {
@@ -27,12 +31,14 @@ struct Include {
     bool IsQuoted() const { return name.front() == '"'; }
     std::string Path() const { return name.substr(1, name.size() - 2); }
 
-    /** The library's file that is meant, relative to the root of the sources; empty for none. */
+    /** The included file, relative to the root of the sources; empty if it is not one of them. */
     std::string Target() const
     {
-        for (const std::string& root : IncludeRoots) {
-            if (fs::is_regular_file(Root / root / Path())) {
-                return (fs::path(root) / Path()).lexically_normal();
+        std::vector<std::string> folders = {fs::path(file).parent_path()};
+        folders.insert(folders.end(), IncludeRoots.begin(), IncludeRoots.end());
+        for (const std::string& folder : folders) {
+            if (fs::is_regular_file(Root / folder / Path())) {
+                return (fs::path(folder) / Path()).lexically_normal();
             }
         }
         return "";
@@ -46,7 +52,8 @@ std::vector<Include> IncludesBelow(const std::vector<std::string>& folders)
     std::vector<Include> includes;
     for (const std::string& folder : folders) {
         for (const fs::directory_entry& entry : fs::recursive_directory_iterator(Root / folder)) {
-            if (entry.path().extension() != ".h" && entry.path().extension() != ".cpp") {
+            static const std::set<fs::path> extensions = {".h", ".cpp", ".c"};
+            if (extensions.count(entry.path().extension()) == 0) {
                 continue;
             }
             std::ifstream file(entry.path());
@@ -67,18 +74,6 @@ bool IsBelow(const std::string& path, const std::vector<std::string>& folders)
     return std::any_of(folders.begin(), folders.end(), [&path](const std::string& folder) {
         return path.compare(0, folder.size() + 1, folder + "/") == 0;
     });
-}
-
-/** Nothing below @p folders includes a file of the library that stands outside @p allowed. */
-void ExpectTargetsBelow(const std::vector<std::string>& folders,
-                        const std::vector<std::string>& allowed)
-{
-    for (const Include& include : IncludesBelow(folders)) {
-        if (include.IsQuoted()) {
-            EXPECT_TRUE(IsBelow(include.Target(), allowed))
-                << include.file << " includes " << include.name;
-        }
-    }
 }
 
 const std::set<std::string> SystemHeaders = {
@@ -112,17 +107,124 @@ TEST(Includes, OfTheLibraryAreItsOwnTheStandardsOrTheThreads)
     }
 }
 
-TEST(Includes, OfPublicHeadersAreNoneOfTheNavigatorsOwn)
+namespace
 {
-    ExpectTargetsBelow({"inc", "bdmv/inc", "prv_inc"}, {"inc", "bdmv/inc", "prv_inc"});
+
+const std::vector<std::string> Library = {"inc", "bdmv", "prv_inc", "bd"};
+const std::vector<std::string> AllFolders = {"inc",        "bdmv",     "prv_inc", "bd",   "ports",
+                                             "deskplayer", "examples", "measure", "tests"};
+
+std::vector<std::string> operator+(std::vector<std::string> left,
+                                   const std::vector<std::string>& right)
+{
+    left.insert(left.end(), right.begin(), right.end());
+    return left;
 }
 
-TEST(Includes, OfTheBaseLayerStayBelowTheNavigator)
+/** What each folder may include besides its own files. A folder has the row of its nearest parent.
+ */
+const std::map<std::string, std::vector<std::string>> Allowed = {
+    {"prv_inc", {}},
+    {"inc", {"prv_inc"}},
+    {"bd", {"inc", "prv_inc"}},
+    {"bdmv/inc", {"inc", "prv_inc"}},
+    {"bdmv", {"bdmv/inc", "inc", "prv_inc"}},
+    {"ports", {"bdmv/inc", "inc", "prv_inc"}},
+    {"deskplayer/text", Library},
+    {"deskplayer/disc", {"deskplayer/text"}},
+    {"deskplayer/navigator",
+     Library + std::vector<std::string>{"deskplayer/disc", "deskplayer/text"}},
+    {"deskplayer/session", {"deskplayer/navigator", "deskplayer/text"}},
+    {"deskplayer/listing", {"deskplayer/disc", "deskplayer/text"}},
+    {"deskplayer/output",
+     Library + std::vector<std::string>{"deskplayer/navigator", "deskplayer/text"}},
+    {"deskplayer", Library + std::vector<std::string>{"ports"}},
+    {"examples", Library + std::vector<std::string>{"deskplayer"}},
+    {"measure", AllFolders},
+    {"tests", AllFolders}};
+
+/** The row of Allowed for a file. */
+std::string RowOf(const std::string& file)
 {
-    ExpectTargetsBelow({"inc", "bd"}, {"inc", "prv_inc"});
+    fs::path folder = fs::path(file).parent_path();
+    while (!folder.empty() && Allowed.count(folder) == 0) {
+        folder = folder.parent_path();
+    }
+    return folder;
 }
 
-TEST(Includes, OfThePlatformInterfaceAreItsOwn)
+typedef std::map<std::string, std::set<std::string>> Graph;
+
+/** Every file, or every folder, and what it includes of others. */
+Graph IncludeGraph(std::string (*nodeOf)(const std::string& file))
 {
-    ExpectTargetsBelow({"prv_inc"}, {"prv_inc"});
+    Graph graph;
+    for (const Include& include : IncludesBelow(AllFolders)) {
+        const std::string target = include.IsQuoted() ? include.Target() : "";
+        if (!target.empty() && nodeOf(include.file) != nodeOf(target)) {
+            graph[nodeOf(include.file)].insert(nodeOf(target));
+        }
+    }
+    return graph;
+}
+
+/** Takes away what includes nothing that is left: what remains lies on a circle or leads to one. */
+Graph WithoutEnds(Graph graph)
+{
+    for (bool changed = true; changed;) {
+        changed = false;
+        for (auto node = graph.begin(); node != graph.end();) {
+            const bool isEnd =
+                std::none_of(node->second.begin(), node->second.end(),
+                             [&graph](const std::string& to) { return graph.count(to) != 0; });
+            node = isEnd ? graph.erase(node) : std::next(node);
+            changed |= isEnd;
+        }
+    }
+    return graph;
+}
+
+std::string NamesIn(const Graph& graph)
+{
+    std::string names;
+    for (const auto& node : graph) {
+        names += node.first + "\n";
+    }
+    return names;
+}
+
+std::string FileItself(const std::string& file)
+{
+    return file;
+}
+
+std::string FolderOf(const std::string& file)
+{
+    return fs::path(file).parent_path();
+}
+
+} // namespace
+
+TEST(Includes, LeadOnlyToFoldersBelow)
+{
+    for (const Include& include : IncludesBelow(AllFolders)) {
+        const std::string target = include.IsQuoted() ? include.Target() : "";
+        if (target.empty()) {
+            continue;
+        }
+        const std::string row = RowOf(include.file);
+        ASSERT_NE(row, "") << include.file << " is in a folder without a rule";
+        EXPECT_TRUE(IsBelow(target, {row}) || IsBelow(target, Allowed.at(row)))
+            << include.file << " includes " << include.name;
+    }
+}
+
+TEST(Includes, OfFilesHaveNoCircle)
+{
+    EXPECT_EQ(NamesIn(WithoutEnds(IncludeGraph(FileItself))), "");
+}
+
+TEST(Includes, OfFoldersHaveNoCircle)
+{
+    EXPECT_EQ(NamesIn(WithoutEnds(IncludeGraph(FolderOf))), "");
 }
