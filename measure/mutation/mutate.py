@@ -50,11 +50,11 @@ class Area:
 
 
 AREAS = (
-    Area("events", ("bdmv/bdmvnavigator/*.cpp",), ("tests/events",), None),
-    Area("base", ("inc/bd/*.h", "bd/*.cpp"), ("tests/base", "tests/contracts"), 40),
+    Area("events", ("bdmv/bdmvnavigator/*.cpp",), ("tests/bdmv/bdmvnavigator",), None),
+    Area("base", ("inc/bd/*.h", "bd/*.cpp"), ("tests/bd",), 40),
     Area("mask", ("bdmv/database/*.cpp", "bdmv/inc/database/uomasktable.h"),
-         ("tests/contracts",), 15),
-    Area("port", ("ports/linux/*.h", "ports/linux/*.cpp"), ("tests/ports",), 40),
+         ("tests/bdmv/database",), 15),
+    Area("port", ("ports/linux/*.h", "ports/linux/*.cpp"), ("tests/ports/linux",), 40),
     Area("deskplayer", ("deskplayer/**/*.h", "deskplayer/**/*.cpp"), ("tests/deskplayer",), 60),
 )
 
