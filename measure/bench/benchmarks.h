@@ -26,7 +26,7 @@ constexpr char ByReference[] = "a reference";
 constexpr char ByValue[] = "AudioInfoType by value";
 
 constexpr char OneList[] = "one list";
-constexpr char OwnLists[] = "lists of their own";
+constexpr char OwnLists[] = "separate lists";
 
 constexpr char Delivery[] = "its delivery alone, by hand";
 constexpr char DispatchOff[] = "dispatch, line off";

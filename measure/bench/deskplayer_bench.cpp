@@ -85,9 +85,9 @@ constexpr Session Sessions[] = {{30, 1},  {60, 1},   TwoHours,   {240, 1},
 
 void PrintTable(const bench::Report& report)
 {
-    std::printf("\nSessions of the desk player, and times two hours with one listener\n"
+    std::printf("\nSessions of the desk player, relative to 2 h, 1 listener\n"
                 "  %10s%12s%12s%12s%9s\n",
-                "minutes", "listeners", "ms", "events/s", "times");
+                "minutes", "listeners", "ms", "events/s", "relative");
     const double twoHours = report[TwoHours.Row()].wall;
     for (const Session& session : Sessions) {
         const bench::Row row = report[session.Row()];

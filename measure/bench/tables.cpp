@@ -69,7 +69,8 @@ void PrintTime(double time, double other)
 void PrintDelivery(const Report& report, Goal& goal)
 {
     for (const char* const callback : {NoArguments, ByReference, ByValue}) {
-        std::printf("\nDelivery with %s, ns and times the floor\n  %-28s", callback, "listeners");
+        std::printf("\nDelivery with %s: ns, and relative to the floor\n  %-28s", callback,
+                    "listeners");
         for (const int count : ListenerCounts) {
             std::printf("%11d%7s", count, "");
         }
@@ -94,9 +95,10 @@ void PrintDelivery(const Report& report, Goal& goal)
 void PrintEvents(const Report& report, Goal& allocations, Goal& lineOff)
 {
     const double logSwitch = report[LogRow(LogSwitch)].cpu;
-    std::printf("\nEvents to one listener, ns and times the delivery alone and one call of the "
-                "switch\n  %-38s",
-                "");
+    std::printf(
+        "\nEvents to one listener: ns, and relative to the delivery alone plus one call of the "
+        "switch\n  %-38s",
+        "");
     for (const char* const event : Events) {
         std::printf("%25s", event);
     }
@@ -121,9 +123,10 @@ void PrintEvents(const Report& report, Goal& allocations, Goal& lineOff)
 
 void PrintThreads(const Report& report)
 {
-    std::printf("\nThreads that fire at eight listeners each: ns of one delivery as its thread "
-                "sees it, times the floor,\nhow much of the time a thread ran, and how much it "
-                "waited for a processor\n");
+    std::printf(
+        "\nThreads that fire at eight listeners each: elapsed ns of one delivery in its thread, "
+        "relative to the floor,\nhow much of the time a thread ran, and how much it waited for a "
+        "processor\n");
     for (const char* const lists : {OneList, OwnLists}) {
         for (const int threads : ThreadCounts) {
             for (const char* const subject : {FloorName, LibraryName}) {
@@ -142,7 +145,8 @@ void PrintThreads(const Report& report)
 
 void PrintLog(const Report& report, Goal& queued)
 {
-    std::printf("\nA log line: ns of the caller's processor, times vsnprintf alone, ns passed\n");
+    std::printf(
+        "\nA log line: processor ns of the caller, relative to vsnprintf alone, elapsed ns\n");
     const double formatting = report[LogRow(LogVsnprintf)].cpu;
     for (const char* const what : {LogSwitch, LogOff, LogVsnprintf, LogNull, LogQueue, LogQueueNull,
                                    LogSpdlog, LogSpdlogQueue, LogSpdlogQueueNull}) {
@@ -161,10 +165,11 @@ void PrintLog(const Report& report, Goal& queued)
 
 void PrintTables(const Report& report)
 {
-    Goal delivery("delivery, times the floor", 1.10);
+    Goal delivery("delivery, relative to the floor", 1.10);
     Goal allocations("allocations between Dispatch() and its return", 0);
-    Goal lineOff("an event with its line off, times its delivery and one call of the switch", 1.15);
-    Goal queued("a line into the queue, times vsnprintf alone", 1.5);
+    Goal lineOff("an event with its line off, relative to its delivery plus one call of the switch",
+                 1.15);
+    Goal queued("a queued line, relative to vsnprintf alone", 1.5);
 
     PrintDelivery(report, delivery);
     PrintEvents(report, allocations, lineOff);

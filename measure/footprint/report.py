@@ -13,7 +13,7 @@ import sys
 
 from elftools.elf.elffile import ELFFile
 
-LIMIT = 200  # bytes of text an event on average, beyond texts and names
+LIMIT = 200  # bytes of text per event on average, without strings
 EVENT = re.compile(r"_ZN4bdmv\d+(\w+Event)(8DispatchE|D[02]Ev)")
 TABLE = re.compile(r"_ZT[VI]N4bdmv\d+(\w+Event)E$")
 TYPE_NAME = re.compile(r"_ZTSN4bdmv\d+(\w+Event)E$")
@@ -87,11 +87,11 @@ def print_program(builds, count):
         ("text", "text"),
         ("- code of the events", "events"),
         ("- code that fires callbacks", "firing"),
-        ("- code of locks, shared pointers, the log, the mask and helpers", "rest"),
-        ("- tables for exceptions", "unwinding"),
+        ("- code of locks, reference-counted pointers, log, mask and helpers", "rest"),
+        ("- exception tables", "unwinding"),
         ("- texts of log lines and assertions", "texts"),
-        ("- names of types", "names"),
-        ("data, which is virtual tables and type information", "data"),
+        ("- type names", "names"),
+        ("data: virtual tables and type information", "data"),
         ("bss", "bss"),
     ):
         print_row(title, [getattr(build, attribute) for build in builds])
@@ -100,14 +100,14 @@ def print_program(builds, count):
     print_heading("the library in a program", ("with log lines", "without"))
     for title, attribute in (
         ("text", "text"),
-        ("text beyond texts and names", "beyond_strings"),
+        ("text without strings", "beyond_strings"),
         ("data", "data"),
     ):
         print_row(title, [round(getattr(build, attribute) / count) for build in builds])
 
 
 def print_objects(directory):
-    print("\nObject files before they are linked, in bytes:\n")
+    print("\nObject files before linking, in bytes:\n")
     print_heading("`arm-linux-gnueabihf-size`", ("text", "data", "bss"))
     for title, pattern in (
         ("the library", "CMakeFiles/bdmvnavigator.dir/**/*.o"),
@@ -120,7 +120,7 @@ def print_objects(directory):
 
 
 def print_events(full, quiet):
-    print("\nEvent by event, in bytes; the code has its destructors in it:\n")
+    print("\nPer event, in bytes; code includes the destructors:\n")
     print_heading("event", ("code", "without log lines", "name", "tables"))
     for name in sorted(full.code_of):
         sizes = (full.code_of, quiet.code_of, full.name_of, full.tables_of)
@@ -136,7 +136,7 @@ def main():
     print_objects(directory)
     print_events(full, quiet)
     if full.beyond_strings > LIMIT * count:
-        sys.exit(f"an event takes more than {LIMIT} bytes of text beyond texts and names")
+        sys.exit(f"an event takes more than {LIMIT} bytes of text without strings")
 
 
 main()
