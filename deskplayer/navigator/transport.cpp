@@ -61,7 +61,7 @@ Ticks Transport::Advance(Ticks time)
         Ticks distance(0);
         if (m_rState.status == Status::Playing) {
             distance = m_rPlayhead.Pass(pass);
-        } else if (m_rState.stillLeft) {
+        } else if (m_rState.status == Status::Still && m_rState.stillLeft) {
             *m_rState.stillLeft -= pass;
         }
 

@@ -44,7 +44,8 @@ TEST_F(AnnouncerOnThreeItems, AnnouncesEverythingAboutTheFirstItem)
 
     EXPECT_EQ(TakeNames(),
               "PlayItem VideoInfo AudioInfo AngleInfo PresentationGraphicsInfo SecondaryVideoInfo "
-              "SecondaryAudioInfo PipPgTextStInfo InteractiveGraphicsInfo AudioInfoChanged "
+              "SecondaryVideoDisplay SecondaryAudioInfo SecondaryAudioDisplay PipPgTextStInfo "
+              "InteractiveGraphicsInfo AudioInfoChanged "
               "AudioInfoChanged TextSubtitleStylesAvailable TextSubtitleStyleInfo "
               "PictureInPictureAvailable SecondaryAudioAvailable UOMask ");
 }
@@ -81,7 +82,8 @@ TEST_F(AnnouncerOnThreeItems, AnnouncesThatStreamsAreGone)
 
     EXPECT_EQ(TakeNames(),
               "VideoInfo AudioInfo AngleInfo PresentationGraphicsInfo SecondaryVideoInfo "
-              "SecondaryAudioInfo PipPgTextStInfo InteractiveGraphicsInfo "
+              "SecondaryVideoDisplay SecondaryAudioInfo SecondaryAudioDisplay PipPgTextStInfo "
+              "InteractiveGraphicsInfo "
               "TextSubtitleStylesAvailable ");
 }
 
