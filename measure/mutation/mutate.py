@@ -122,13 +122,18 @@ def compile_commands():
 
 
 def options_of(area, file):
-    """What libclang has to know; a header is read as a source of its area is."""
+    """What libclang has to know; a header is read with the options of all sources of its area."""
     sources = [str(ROOT / file)] if file.endswith(".cpp") else \
         sorted(str(path) for pattern in area.sources for path in ROOT.glob(pattern))
-    command = next(compile_commands()[s] for s in sources if s in compile_commands())
-    kept = [word for i, word in enumerate(command)
-            if word.startswith(("-I", "-D", "-std=")) or "-isystem" in (word, command[i - 1])]
-    return ["-xc++", *kept]
+    kept = {}
+    for source in sources:
+        command = compile_commands().get(source, ())
+        for i, word in enumerate(command):
+            if word.startswith(("-I", "-D", "-std=")):
+                kept[word] = (word,)
+            elif word == "-isystem":
+                kept[command[i + 1]] = (word, command[i + 1])
+    return ["-xc++", *(word for words in kept.values() for word in words)]
 
 
 def changes_of_file(area, file):
