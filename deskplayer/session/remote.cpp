@@ -139,8 +139,8 @@ Ticks TimeSince(Clock::time_point start)
 const std::vector<RemoteKey>& RemoteKeys()
 {
     static const std::vector<RemoteKey> keys = {
-        {' ', "pause, continue", PauseOrContinue},
-        {'x', "stop, play", PlayOrStop},
+        {' ', "pause/continue", PauseOrContinue},
+        {'x', "stop/play", PlayOrStop},
         {'.', "step", [](Desk& d) { return PerformNamed(d, "step"); }},
         {'f', "faster", [](Desk& d) { return Faster(d, bd::PlayDirectionForward); }},
         {'r', "faster backward", [](Desk& d) { return Faster(d, bd::PlayDirectionBackward); }},
