@@ -363,11 +363,10 @@ void AddOptions(CLI::App& app, Options& options)
                        "Session file to carry out; by default, play from start to end")
             ->type_name("FILE");
     auto* const realTime =
-        app.add_flag("--realtime", options.realTime, "Play in real time, not at once");
-    auto* const remote =
-        app.add_flag("--remote", options.remote,
-                     "Play in real time, controlled by single keys, which are listed")
-            ->excludes(session);
+        app.add_flag("--realtime", options.realTime, "Play in real time instead of at once");
+    auto* const remote = app.add_flag("--remote", options.remote,
+                                      "Play in real time, with single keys as a remote control")
+                             ->excludes(session);
     for (CLI::Option* const playing : {playList, session, realTime, remote}) {
         playing->excludes(list)->excludes(describe);
     }

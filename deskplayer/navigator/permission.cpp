@@ -12,7 +12,7 @@ namespace deskplayer
 namespace
 {
 
-const char* NameOf(Status status)
+const char* StatusName(Status status)
 {
     switch (status) {
     case Status::Stopped:
@@ -51,7 +51,7 @@ Outcome Permission::CheckMask(bd::UserOperationMaskDef operation) const
     }
     const std::string list = "play list " + std::to_string(loaded.number);
     const std::string playItem = "play item " + std::to_string(m_rState.item);
-    return Outcome::Refused(deskplayer::NameOf(operation) + " is forbidden by " +
+    return Outcome::Refused(NameOf(operation) + " is forbidden by " +
                             (!byItem       ? list
                              : !byPlayList ? playItem
                                            : list + " and its " + playItem));
@@ -64,9 +64,9 @@ Outcome Permission::CheckStatus(std::initializer_list<Status> statuses) const
     }
     std::string expected;
     for (const Status status : statuses) {
-        expected += (expected.empty() ? "" : " or ") + std::string(NameOf(status));
+        expected += (expected.empty() ? "" : " or ") + std::string(StatusName(status));
     }
-    return Outcome::Refused("not " + expected + ", but " + NameOf(m_rState.status));
+    return Outcome::Refused("not " + expected + ", but " + StatusName(m_rState.status));
 }
 
 Outcome Permission::CheckActive() const

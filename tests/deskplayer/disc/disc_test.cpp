@@ -293,7 +293,7 @@ TEST_F(DiscFiles, ReportsThatNoPlayListCanBeRead)
     EXPECT_EQ(FileErrorOf([&] { MakeDisc().FindLongestPlayList(); }),
               PathOf("PLAYLIST").string() +
                   ": no play list can be read: BDMV/PLAYLIST/00000.mpls: offset 0: file has 0 "
-                  "bytes left, but expected 4 bytes of type indicator");
+                  "bytes left, but expected 4 bytes for type indicator");
 }
 
 } // namespace
