@@ -1,5 +1,5 @@
-// bdmv-deskplayer: plays a play list of a disc without its streams and writes what a navigator's
-// listeners are told.
+// bdmv-deskplayer: plays a play list of a disc without its streams and writes the callbacks that a
+// navigator's listeners receive.
 
 #include <CLI/CLI.hpp>
 #include <fcntl.h>
@@ -41,14 +41,14 @@ constexpr int ExitOutput = 1;
 constexpr int ExitUsage = 2;
 constexpr int ExitDisc = 3;
 
-/** What was asked for cannot be done as it was asked. */
+/** The command line or the session is invalid. */
 class UsageError : public std::runtime_error
 {
 public:
     using std::runtime_error::runtime_error;
 };
 
-/** What was written did not arrive. */
+/** The output could not be written. */
 class OutputError : public std::runtime_error
 {
 public:
@@ -89,46 +89,46 @@ public:
     File(const File&) = delete;
     File& operator=(const File&) = delete;
 
-    /** Whether there is something to read, even if a fault, before long: a pipe can stay silent. */
-    bool HasMore() const
+    /** Waits for input, the end or an error. @return false if a silent pipe made it time out */
+    bool WaitForInput() const
     {
-        constexpr int patience = 500; // milliseconds
+        constexpr int timeout = 500; // milliseconds
         pollfd input = {m_Descriptor, POLLIN, 0};
-        return m_Descriptor < 0 || poll(&input, 1, patience) != 0;
+        return m_Descriptor < 0 || poll(&input, 1, timeout) != 0;
     }
 
-    /** @return how many bytes; 0 at the end, negative if it cannot be read */
+    /** @return the number of bytes read; 0 at the end, negative on an error */
     ssize_t Read(char* bytes, std::size_t size) const { return read(m_Descriptor, bytes, size); }
 
 private:
     int m_Descriptor;
 };
 
-/** Reads no more than it takes to see that a session is too long. */
+/** Stops reading once the session is known to be too long. */
 std::string ReadSession(const std::string& fileName)
 {
     const File file(fileName);
     std::string text;
-    std::array<char, 4096> piece;
+    std::array<char, 4096> buffer;
     ssize_t size = 1;
     while (size > 0 && text.size() <= deskplayer::LongestScript) {
-        if (!file.HasMore()) {
-            throw UsageError(fileName + ": nothing comes out of it, expected a session");
+        if (!file.WaitForInput()) {
+            throw UsageError(fileName + ": timed out waiting for input");
         }
-        size = file.Read(piece.data(), piece.size());
+        size = file.Read(buffer.data(), buffer.size());
         if (size < 0) {
-            throw UsageError(fileName + ": no session that can be read, expected a text file");
+            throw UsageError(fileName + ": cannot read session, expected a text file");
         }
-        text.append(piece.data(), static_cast<std::size_t>(size));
+        text.append(buffer.data(), static_cast<std::size_t>(size));
     }
     if (text.size() > deskplayer::LongestScript) {
-        throw UsageError(fileName + ": has more than " + std::to_string(deskplayer::LongestScript) +
-                         " bytes, expected a session");
+        throw UsageError(fileName + ": session too long, expected at most " +
+                         std::to_string(deskplayer::LongestScript) + " bytes");
     }
     return text;
 }
 
-/** The steps of the session; none without one. */
+/** The steps of the session; none if no session is given. */
 std::vector<deskplayer::ScriptStep> ReadSteps(const Options& options)
 {
     if (options.session.empty()) {
@@ -165,16 +165,16 @@ deskplayer::LoadedPlayList Load(const deskplayer::Disc& disc, const Options& opt
     }
     deskplayer::LongestPlayList longest = disc.FindLongestPlayList();
     for (const std::string& line : longest.unreadable) {
-        Complain("left out: " + line);
+        Complain("skipped: " + line);
     }
     return deskplayer::LoadPlayList(disc, longest.number, std::move(longest.playList));
 }
 
-/** Tells on a terminal how far a session has come, once it takes long. */
+/** Shows the time of the session on a terminal once playback takes more than a second. */
 class Progress
 {
 public:
-    /** @param options say whether output goes to the same terminal, where it would be in the way */
+    /** @param options whether output goes to the same terminal, which rules out showing progress */
     Progress(const deskplayer::VirtualClock& clock, const Options& options)
         : m_rClock(clock), m_Possible(isatty(STDERR_FILENO) != 0 &&
                                       (isatty(STDOUT_FILENO) == 0 || !options.output.empty()))
@@ -249,14 +249,14 @@ void Play(deskplayer::LoadedPlayList playList, const std::vector<deskplayer::Scr
     }
 }
 
-/** Standard output, or the file that is to be written. */
+/** The output: a file, or standard output. */
 class Target
 {
 public:
     /** @param fileName empty for standard output */
     explicit Target(const std::string& fileName) : m_rFileName(fileName) {}
 
-    /** What the file holds is lost: called only once all that is to be read has been read. */
+    /** Discards the contents of an existing file, so call this only after reading all input. */
     std::ostream& Open()
     {
         if (m_rFileName.empty()) {
@@ -269,7 +269,7 @@ public:
         return m_File;
     }
 
-    /** Has everything arrive. */
+    /** Flushes the output and throws if anything could not be written. */
     void Finish()
     {
         if (m_rFileName.empty() ? !std::cout.flush() : !m_File.flush()) {
@@ -305,7 +305,7 @@ int Run(const Options& options)
     return status;
 }
 
-/** Log lines appear when they are asked for, here or in the environment. */
+/** Log lines are written only if an option or the environment selects them. */
 void ConfigureLog(const Options& options)
 {
     if (!options.log && std::getenv("KEVRO_LOG") != nullptr) {
@@ -324,7 +324,7 @@ void PrintCommands()
     }
 }
 
-/** Help without the lists of options that exclude each other. */
+/** Help without the lists of mutually exclusive options. */
 class HelpFormatter : public CLI::Formatter
 {
 public:
@@ -346,58 +346,55 @@ void AddOptions(CLI::App& app, Options& options)
             throw CLI::Success();
         },
         "Print the commands of sessions and exit");
-    app.add_option("DISC", options.disc, "Folder that holds BDMV/, or that folder itself")
-        ->required()
-        ->type_name("");
+    app.add_option("DISC", options.disc, "A BDMV folder or its parent")->required()->type_name("");
 
-    auto* const playList = app.add_option("--playlist", options.playList,
-                                          "Play list to play; the longest one unless given")
-                               ->check(CLI::Range(0, 99999).description(""))
-                               ->type_name("N");
+    auto* const playList =
+        app.add_option("--playlist", options.playList, "Play list to play; the longest by default")
+            ->check(CLI::Range(0, 99999).description(""))
+            ->type_name("N");
     auto* const list = app.add_flag("--list", options.list, "Print a table of the play lists");
     auto* const describe =
-        app.add_option("--describe", options.describe, "Print all there is in a play list")
+        app.add_option("--describe", options.describe, "Print the full contents of a play list")
             ->check(CLI::Range(0, 99999).description(""))
             ->type_name("N")
             ->excludes(list);
     auto* const session =
         app.add_option("--session", options.session,
-                       "Do what a session file says; from start to end unless given")
+                       "Session file to carry out; by default, play from start to end")
             ->type_name("FILE");
     auto* const realTime =
-        app.add_flag("--realtime", options.realTime, "Play on the wall clock, not at once");
+        app.add_flag("--realtime", options.realTime, "Play in real time instead of at once");
     auto* const remote = app.add_flag("--remote", options.remote,
-                                      "Play on the wall clock under single keys, which are shown")
+                                      "Play in real time, with single keys as a remote control")
                              ->excludes(session);
     for (CLI::Option* const playing : {playList, session, realTime, remote}) {
         playing->excludes(list)->excludes(describe);
     }
 
     app.add_option("--format", options.format,
-                   "How to write callbacks: text, json (one object a line), trace (for trace "
-                   "viewers)")
+                   "Output format: text, json (one object per line) or trace (for trace viewers)")
         ->type_name("FORMAT");
-    app.add_option("--output", options.output, "Where to write; standard output unless given")
+    app.add_option("--output", options.output, "File to write; standard output by default")
         ->type_name("FILE");
     app.add_option("--listen", options.listen,
-                   "Interfaces to listen to: control, settings, button, interactive")
+                   "Listener interfaces to write: control, settings, button, interactive")
         ->type_name("NAME,...");
     app.add_option("--only", options.only, "Callbacks to write: PlayItem, AudioInfo, ...")
         ->type_name("NAME,...");
     app.add_option("--log", options.log,
-                   "Log lines to write to standard error: BdmvNavigator=Event for those of the "
-                   "events")
+                   "Log lines to write to standard error, such as BdmvNavigator=Event for those "
+                   "of events")
         ->type_name("TEXT");
     app.footer(
-        "A session file has one command a line, and times: \"at 00:01:30.500 chapter next\",\n"
-        "\"after 2s pause\". --commands lists the commands.\n\n"
+        "A session file has one command per line, which may begin with a time:\n"
+        "\"at 00:01:30.500 chapter next\", \"after 2s pause\". --commands lists the commands.\n\n"
         "Examples:\n"
         "  bdmv-deskplayer --list disc\n"
         "  bdmv-deskplayer disc --session evening.session\n"
         "  bdmv-deskplayer disc --only PlayItem,ChapterNumber --format json\n"
         "  bdmv-deskplayer disc --remote\n\n"
-        "Exit status: 0 done, 1 the output could not be written, 2 wrong usage or a session that\n"
-        "cannot be read, 3 the disc cannot be read.");
+        "Exit status: 0 success, 1 the output could not be written, 2 wrong usage or a session\n"
+        "that cannot be read, 3 the disc cannot be read.");
 }
 
 } // namespace
@@ -406,7 +403,7 @@ int main(int argc, char** argv)
 {
     Options options;
     CLI::App app("Plays a play list of a Blu-ray disc without its streams and writes every "
-                 "callback that a listener of the navigator gets, with its time and arguments.",
+                 "callback that the navigator's listeners receive, with its time and arguments.",
                  "bdmv-deskplayer");
     AddOptions(app, options);
     try {

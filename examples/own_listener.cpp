@@ -1,5 +1,5 @@
-// A client's own listener on the desk: a front panel that shows what playback does, driven by a
-// real disc's play list and a session of its own. Compile it against bdmvnavigator::deskplayer.
+// A client's listener on the desk player: a front panel that shows the state of playback, driven by
+// a disc's play list and a session. Link it with bdmvnavigator::deskplayer.
 
 #include <fstream>
 #include <iostream>
@@ -38,7 +38,7 @@ const char* const Evening = "play\n"
                             "after 10s chapter next\n"
                             "at 05:00 still off\n";
 
-std::string ContentOf(const char* fileName)
+std::string ReadFile(const char* fileName)
 {
     std::ifstream file(fileName, std::ios::binary);
     return {std::istreambuf_iterator<char>(file), std::istreambuf_iterator<char>()};
@@ -53,7 +53,7 @@ int main(int argc, char** argv)
         return 2;
     }
     try {
-        const std::string session = argc == 3 ? ContentOf(argv[2]) : Evening;
+        const std::string session = argc == 3 ? ReadFile(argv[2]) : Evening;
         const deskplayer::Disc disc(argv[1]);
         deskplayer::LongestPlayList longest = disc.FindLongestPlayList();
         deskplayer::Desk desk(

@@ -1,6 +1,6 @@
 /**
  * @file
- * Aspect ratios of many streams: each clip is read once.
+ * Looks up the aspect ratios of streams; reads each clip once.
  */
 #ifndef DESKPLAYER_DISC_ASPECTRATIOS_H
 #define DESKPLAYER_DISC_ASPECTRATIOS_H
@@ -18,19 +18,19 @@
 namespace deskplayer
 {
 
-/** An aspect ratio as the disc codes it, or why it is not known. */
+/** The code of an aspect ratio, or the reason why it is unknown. */
 struct AspectRatio {
     std::optional<std::uint8_t> code;
-    std::string reason;   ///< one line; empty if there is a code
-    bool damaged = false; ///< there is clip information, but it cannot be read
+    std::string reason;   ///< one line; empty if the code is known
+    bool damaged = false; ///< clip information exists but cannot be read
 };
 
 /**
- * Looks up aspect ratios in the clip information of a disc. Keeps what it needs of every clip that
- * it has read, which is less than the bytes it was read from.
+ * Looks up aspect ratios in the clip information of a disc. Caches the aspect ratios of every clip
+ * it has read, which take less memory than the file.
  *
- * Clip information that cannot be read is a reason here, not an error: a disc with a damaged clip
- * can still be described.
+ * Clip information that cannot be read is reported as a reason, not as an error, so that a disc
+ * with a damaged clip can still be described.
  */
 class AspectRatios
 {
@@ -39,7 +39,7 @@ public:
     explicit AspectRatios(const Disc& disc) : m_rDisc(disc) {}
 
     /**
-     * The one of a video stream, from the clip that carries it.
+     * The aspect ratio of a video stream, from the clip that carries it.
      *
      * @param playItem from 0; @p stream is one of its streams
      */

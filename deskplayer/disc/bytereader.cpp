@@ -141,7 +141,7 @@ void ByteReader::Need(std::size_t size, const char* field) const
 {
     if (size > BytesLeft()) {
         Fail(m_Offset, m_Name.ToString() + " has " + CountOfBytes(BytesLeft()) + " left",
-             CountOfBytes(size) + " of " + field);
+             CountOfBytes(size) + " for " + field);
     }
 }
 

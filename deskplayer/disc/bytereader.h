@@ -1,13 +1,12 @@
 /**
  * @file
- * Takes big-endian fields out of a file, one after the other, and never leaves its bytes.
+ * Reads big-endian fields from a file in sequence, with bounds checks.
  *
- * This is the only code that touches the bytes of a file. Every operation that needs bytes which
- * are not there throws FormatError; a field that was read is behind the reader.
+ * This is the only code that accesses the bytes of a file. Every operation advances the reader past
+ * the field, and throws FormatError if bytes are missing.
  *
- * Structures that announce their own length are read through a reader of their own. It ends where
- * the structure ends, while the reader around it already stands behind the structure, so it does
- * not matter how much of a structure is understood.
+ * Structures with a length field have a separate reader. It ends where the structure ends, and the
+ * outer reader is already past the structure, so unknown content at its end is skipped.
  *
  * @code
  * ByteReader item = section.TakePart16({"play item", 3});
@@ -26,10 +25,10 @@
 namespace deskplayer
 {
 
-/** The content of a file. */
+/** The contents of a file. */
 using Bytes = std::vector<std::uint8_t>;
 
-/** What a stretch of a file is called in messages: "play list section", or "play item 3". */
+/** The name of a part of a file in messages: "play list section", or "play item 3". */
 struct PartName {
     const char* kind;
     std::optional<std::size_t> number = std::nullopt;
@@ -38,15 +37,15 @@ struct PartName {
 };
 
 /**
- * Reads a stretch of a file from front to back.
+ * Reads a part of a file from front to back.
  *
- * Refers to the bytes and to the file name it was made with, and so do the readers it hands out;
- * both must outlive them. The names of fields are for messages.
+ * It and the readers it returns refer to the bytes and the file name given to the constructor,
+ * which must outlive them. The names of fields are for messages.
  */
 class ByteReader
 {
 public:
-    /** Reads all of @p bytes. */
+    /** A reader of all of @p bytes. */
     ByteReader(const Bytes& bytes, const std::string& fileName);
 
     std::uint8_t UInt8(const char* field);
@@ -54,49 +53,49 @@ public:
     std::uint32_t UInt32(const char* field);
     std::uint64_t UInt64(const char* field);
 
-    /** A text field of @p size bytes, without the NUL bytes at its end. The bytes can be any. */
+    /** Reads text of @p size bytes, without trailing NUL bytes. It may contain any bytes. */
     std::string Text(std::size_t size, const char* field);
 
-    /** Passes over @p size bytes. */
+    /** Skips @p size bytes. */
     void Skip(std::size_t size, const char* field);
 
-    /** Reads a length of one byte and hands out a reader of the bytes it counts. */
+    /** Reads a length of one byte and returns a reader of the bytes it counts. */
     ByteReader TakePart8(PartName name);
 
-    /** Reads a length of two bytes and hands out a reader of the bytes it counts. */
+    /** Reads a length of two bytes and returns a reader of the bytes it counts. */
     ByteReader TakePart16(PartName name);
 
-    /** Reads a length of four bytes and hands out a reader of the bytes it counts. */
+    /** Reads a length of four bytes and returns a reader of the bytes it counts. */
     ByteReader TakePart32(PartName name);
 
     /**
-     * Reads an address and hands out a reader of what is there: a length of four bytes and the
-     * bytes it counts. The reader itself goes on behind the address.
+     * Reads an address and returns a reader of the part there: a length of four bytes and the bytes
+     * it counts. This reader continues after the address.
      *
-     * @param lowest first byte of the file the address may name
+     * @param lowest the lowest valid address
      */
     ByteReader PartAtAddress(std::size_t lowest, PartName name);
 
-    /** The same, but an address of 0 says that there is no such part. */
+    /** The same, but an address of 0 means that the part is missing. */
     std::optional<ByteReader> OptionalPartAtAddress(std::size_t lowest, PartName name);
 
     /**
-     * Reads a number of entries, in one byte. As many can really follow, so it is safe to reserve
-     * memory for them.
+     * Reads a number of entries from one byte. Checks that as many can follow, so it is safe to
+     * reserve memory for them.
      *
-     * @param smallestEntry bytes that an entry has at least
+     * @param smallestEntry minimum size of an entry, in bytes
      */
     std::uint8_t Count8(std::size_t smallestEntry, const char* field);
 
-    /** The same for a number in two bytes. */
+    /** The same for a number of two bytes. */
     std::uint16_t Count16(std::size_t smallestEntry, const char* field);
 
-    /** Counts from the start of the file. */
+    /** From the start of the file. */
     std::size_t Offset() const { return m_Offset; }
 
     std::size_t BytesLeft() const { return m_End - m_Offset; }
 
-    /** Reports the field at @p offset. */
+    /** Throws FormatError for the field at @p offset. */
     [[noreturn]] void Fail(std::size_t offset, const std::string& found,
                            const std::string& expected) const;
 

@@ -1,6 +1,6 @@
 /**
  * @file
- * CLIPINF/nnnnn.clpi: what a clip holds.
+ * CLIPINF/nnnnn.clpi: the contents of a clip.
  */
 #ifndef DESKPLAYER_DISC_CLIPINFO_H
 #define DESKPLAYER_DISC_CLIPINFO_H
@@ -17,7 +17,7 @@
 namespace deskplayer
 {
 
-/** A stretch of the clip with one unbroken time line. Times are in ticks of 45 kHz. */
+/** A part of the clip with a continuous time line. Times are in ticks of 45 kHz. */
 struct StcSequence {
     std::uint16_t pcrPid = 0; ///< PID of the clock reference
     std::uint32_t firstPacket = 0;
@@ -49,7 +49,7 @@ struct ClipInfo {
     std::string version;
     std::uint8_t clipStreamType = 0;
     std::uint8_t applicationType = 0;   ///< 1: main path of a movie
-    bool arrivalTimeOffsets = false;    ///< there is an arrival time offset table
+    bool arrivalTimeOffsets = false;    ///< an arrival time offset table exists
     std::uint32_t greatestDataRate = 0; ///< bytes per second
     std::uint32_t packets = 0;          ///< packets of 192 bytes in the clip file
     std::vector<AtcSequence> atcSequences;
@@ -57,22 +57,22 @@ struct ClipInfo {
 };
 
 /**
- * Reads clip information. Characteristic points, clip marks and extension data are passed over.
+ * Reads clip information. Characteristic points, clip marks and extension data are skipped.
  *
  * @param fileName for messages
- * @throw FormatError wrong type or version, an address outside of the file or in its header, a
- *        structure that is longer than what holds it or shorter than its own content, or an STC
- *        sequence that ends before it starts. Reserved codes and anything behind the known content
- *        of a structure are no error.
+ * @throw FormatError wrong type or version, an address outside the file or in its header, a
+ *        structure that is longer than the enclosing one or shorter than its own content, or an STC
+ *        sequence that ends before it starts. Reserved codes and anything after the known content
+ *        of a structure are not errors.
  */
 ClipInfo ParseClipInfo(const Bytes& bytes, const std::string& fileName);
 
-/** How long the clip plays, over all its STC sequences. */
+/** The duration of the clip: the sum over all its STC sequences. */
 Ticks Duration(const ClipInfo& clipInfo);
 
 /**
- * Aspect ratios of the video streams, by the PID of the stream, in ascending order. Of several
- * streams with one PID the first counts.
+ * PIDs and aspect ratios of the video streams, in ascending order of PID. If several streams have
+ * the same PID, the first is used.
  */
 std::vector<std::pair<std::uint16_t, std::uint8_t>> AspectRatiosOf(const ClipInfo& clipInfo);
 

@@ -90,7 +90,7 @@ const CodeName g_SubPathTypes[] = {
     {10, "enhancement layer video"},
 };
 
-// Where ISO 639-2 has two codes for a language, discs are met with either.
+// Where ISO 639-2 has two codes for a language, discs use either.
 const Language g_Languages[] = {
     {"ara", "Arabic"},     {"bul", "Bulgarian"},  {"cat", "Catalan"},   {"ces", "Czech"},
     {"chi", "Chinese"},    {"cze", "Czech"},      {"dan", "Danish"},    {"deu", "German"},

@@ -1,8 +1,8 @@
 /**
  * @file
- * Names of the codes a disc uses, for people to read.
+ * Names of the codes used on discs, for people to read.
  *
- * A code without a name comes out as "reserved (7)", so what is printed is never empty.
+ * A code without a name is given as "reserved (7)", so the text is never empty.
  */
 #ifndef DESKPLAYER_DISC_CODES_H
 #define DESKPLAYER_DISC_CODES_H
@@ -13,7 +13,7 @@
 namespace deskplayer
 {
 
-/** Which attributes a stream has. */
+/** Determines the attributes of a stream. */
 enum StreamKind {
     StreamKindUnknown,
     StreamKindVideo,
@@ -22,10 +22,10 @@ enum StreamKind {
     StreamKindTextSubtitle
 };
 
-/** The one coding type whose attributes go beyond those of its kind. */
+/** The only coding type with more attributes than its kind. */
 constexpr std::uint8_t CodingTypeH265 = 0x24;
 
-/** The kind of stream that @p codingType codes; StreamKindUnknown for reserved ones. */
+/** The kind of a stream with @p codingType; StreamKindUnknown for reserved ones. */
 StreamKind KindOfStream(std::uint8_t codingType);
 
 std::string CodingTypeName(std::uint8_t codingType);       ///< "H.264 video"
@@ -40,8 +40,8 @@ std::string CharacterCodeName(std::uint8_t characterCode); ///< "UTF-8"
 std::string SubPathTypeName(std::uint8_t subPathType);     ///< "text subtitles"
 
 /**
- * The English name of a language of ISO 639-2. The code itself, made printable, if it is not among
- * those discs commonly have; "no language" for an empty one.
+ * The English name of a language code of ISO 639-2. The code itself, made printable, if it is not
+ * common on discs; "no language" for an empty one.
  */
 std::string LanguageName(const std::string& language);
 

@@ -30,7 +30,7 @@ fs::path FindBdmv(const fs::path& folder)
     if (IsFolder(folder / "PLAYLIST")) {
         return folder;
     }
-    throw FileError(folder.string(), "no disc, expected a folder that holds BDMV or is it");
+    throw FileError(folder.string(), "not a disc, expected a BDMV folder or its parent");
 }
 
 Bytes ReadFile(const fs::path& path, std::uintmax_t largest)
@@ -41,9 +41,9 @@ Bytes ReadFile(const fs::path& path, std::uintmax_t largest)
         throw FileError(path.string(), error.message() + ", expected a file");
     }
     if (!fs::is_regular_file(status)) {
-        throw FileError(path.string(), "not a regular file, expected one");
+        throw FileError(path.string(), "expected a regular file");
     }
-    const std::uintmax_t size = fs::file_size(path, error); // if that fails, the greatest there is
+    const std::uintmax_t size = fs::file_size(path, error); // the maximum value on failure
     if (size > largest) {
         throw FileError(path.string(), "has " + std::to_string(size) + " bytes, expected at most " +
                                            std::to_string(largest));
@@ -60,7 +60,7 @@ Bytes ReadFile(const fs::path& path, std::uintmax_t largest)
     return bytes;
 }
 
-/** The number that a play list file name stands for; nothing if it is not such a name. */
+/** The number in the name of a play list file; nothing if the name is not one of a play list. */
 std::optional<std::uint32_t> NumberOfPlayList(const std::string& fileName)
 {
     if (fileName.size() != 10 || fileName.substr(5) != ".mpls" ||
@@ -155,10 +155,10 @@ LongestPlayList Disc::FindLongestPlayList() const
     }
     if (!longest) {
         throw FileError((m_Bdmv / "PLAYLIST").string(),
-                        unreadable.empty() ? "no play list, expected files like 00000.mpls"
+                        unreadable.empty() ? "no play list, expected files such as 00000.mpls"
                                            : "no play list can be read: " + unreadable.front());
     }
-    // Read again rather than kept: two of the greatest would take twice the memory.
+    // Read again rather than kept: keeping it would double the peak memory.
     return {*longest, ReadPlayList(*longest), std::move(unreadable)};
 }
 

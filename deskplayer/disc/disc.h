@@ -1,6 +1,6 @@
 /**
  * @file
- * The metadata files of a disc that lies in a folder.
+ * The metadata files of a disc in a folder.
  *
  * @code
  * const Disc disc("/media/disc");
@@ -27,35 +27,35 @@ namespace deskplayer
 {
 
 /**
- * Greatest play list that is read, in bytes; real ones have a tenth of that. The values of one that
- * was made for the purpose take almost forty times the memory of its bytes.
+ * Maximum size of a play list file, in bytes; real ones are a tenth of that. The values of a
+ * malicious one take almost forty times the memory of its bytes.
  */
 constexpr std::uintmax_t LargestPlayListFile = std::uintmax_t{1024} * 1024;
 
-/** The same of any other file, whose values do not grow as much. */
+/** Maximum size of any other file, whose values expand less. */
 constexpr std::uintmax_t LargestFile = std::uintmax_t{4} * 1024 * 1024;
 
-/** The play list of a disc that plays longest, most likely the main movie. */
+/** The longest play list of a disc, most likely the main movie. */
 struct LongestPlayList {
     std::uint32_t number = 0;
     PlayList playList;
-    std::vector<std::string> unreadable; ///< one line for each play list that was left out
+    std::vector<std::string> unreadable; ///< one message for each play list that was skipped
 };
 
 /**
- * Reads the files of one disc, each time anew. Holds nothing but the path of the folder.
+ * Reads the files of one disc. Nothing is cached; only the path of the folder is stored.
  *
  * All operations throw FileError if a file is missing, is not a regular file, is larger than
- * LargestPlayListFile or LargestFile or cannot be read, and FormatError if its content is wrong;
- * both are DiscErrors. The copies in BDMV/BACKUP are not used: a damaged disc is reported, not
- * papered over.
+ * LargestPlayListFile or LargestFile or cannot be read, and FormatError if its contents are
+ * malformed; both are DiscErrors. The copies in BDMV/BACKUP are not used, so that damage to a disc
+ * is reported.
  */
 class Disc
 {
 public:
     /**
-     * @param folder holds the folder BDMV, or is that folder
-     * @throw FileError neither is so
+     * @param folder a BDMV folder or its parent
+     * @throw FileError @p folder is neither
      */
     explicit Disc(const std::filesystem::path& folder);
 
@@ -70,15 +70,14 @@ public:
     Index ReadIndex() const;
     MovieObjects ReadMovieObjects() const;
 
-    /** Whether there is clip information, be it readable or not. */
+    /** Whether clip information exists, even if it cannot be read. */
     bool HasClipInfo(const std::string& clip) const;
 
     /**
-     * Reads all play lists and chooses the longest, of several the one with the lowest number.
+     * Reads all play lists and chooses the longest; among equals, the one with the lowest number.
+     * Those that cannot be read are skipped and reported in the result.
      *
-     * Those that cannot be read are left out, and said to be in the result.
-     *
-     * @throw FileError there is no play list, or none that can be read
+     * @throw FileError there are no play lists, or none can be read
      */
     LongestPlayList FindLongestPlayList() const;
 

@@ -1,6 +1,6 @@
 /**
  * @file
- * What the disc reader throws.
+ * The errors of the disc reader.
  */
 #ifndef DESKPLAYER_DISC_ERRORS_H
 #define DESKPLAYER_DISC_ERRORS_H
@@ -12,33 +12,33 @@
 namespace deskplayer
 {
 
-/** Anything that keeps a disc from being read. what() is one line without control characters. */
+/** A disc cannot be read. what() is one line without control characters. */
 class DiscError : public std::runtime_error
 {
 public:
     using std::runtime_error::runtime_error;
 };
 
-/** A file or folder is not there, or is not one that can be read. */
+/** A file or folder is missing or cannot be read. */
 class FileError : public DiscError
 {
 public:
     /**
-     * @param path as it is named in the message
+     * @param path as it appears in the message
      * @param problem what was found at @p path, and what was expected
      */
     FileError(const std::string& path, const std::string& problem);
 };
 
-/** The bytes of a file contradict the format or each other. */
+/** The contents of a file violate the format or contradict each other. */
 class FormatError : public DiscError
 {
 public:
     /**
-     * @param fileName as it is named in the message
-     * @param offset of the field that is wrong, in bytes from the start of the file
-     * @param found says what is there, "play item 0 has length 65535"
-     * @param expected says what could have been there, "at most 120"
+     * @param fileName as it appears in the message
+     * @param offset of the invalid field, in bytes from the start of the file
+     * @param found what was found, such as "play item 0 has length 65535"
+     * @param expected what is valid there, such as "at most 120"
      */
     FormatError(const std::string& fileName, std::size_t offset, const std::string& found,
                 const std::string& expected);

@@ -1,6 +1,6 @@
 /**
  * @file
- * Structures and ways to read them that more than one kind of file has.
+ * Readers for structures that several kinds of files share.
  */
 #ifndef DESKPLAYER_DISC_FIELDS_H
 #define DESKPLAYER_DISC_FIELDS_H
@@ -15,14 +15,14 @@
 namespace deskplayer
 {
 
-/** Every file starts with a header of this many bytes; addresses that lead into it are wrong. */
+/** Size of the header of every file, in bytes; addresses within it are invalid. */
 constexpr std::size_t FileHeaderSize = 40;
 
 /**
  * Reads the type indicator and the version at the start of a file.
  *
  * @return the version
- * @throw FormatError the file is of another type, or of a version this reader does not know
+ * @throw FormatError the file has another type or an unknown version
  */
 std::string ReadTypeAndVersion(ByteReader& reader, const std::string& typeIndicator);
 
@@ -33,8 +33,8 @@ void ReadVideoFormat(ByteReader& reader, StreamAttributes& attributes);
 void ReadDynamicRange(ByteReader& reader, StreamAttributes& attributes);
 
 /**
- * Reads the attributes of audio, graphics and text subtitles. These look the same wherever streams
- * are described, those of video do not. Reads nothing for any other coding type.
+ * Reads the attributes of audio, graphics and text subtitles, which have the same layout in all
+ * files, unlike those of video. Reads nothing for any other coding type.
  */
 void ReadAttributesOtherThanVideo(ByteReader& reader, StreamAttributes& attributes);
 

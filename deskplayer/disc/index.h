@@ -17,10 +17,10 @@ namespace deskplayer
 constexpr std::uint8_t ObjectTypeMovieObject = 1;
 constexpr std::uint8_t ObjectTypeJavaObject = 2;
 
-/** The program that runs for first playback, top menu or a title. */
+/** The program of first playback, the top menu or a title. */
 struct IndexObject {
     std::uint8_t objectType = 0;   ///< ObjectTypeMovieObject, ObjectTypeJavaObject or reserved
-    std::uint8_t accessType = 0;   ///< titles: 0 if the user may search for it; else padding
+    std::uint8_t accessType = 0;   ///< 0 if title search is permitted; padding except for titles
     std::uint8_t playbackType = 0; ///< 0 movie, 1 interactive; 2 and 3 the same for Java objects
     std::uint16_t movieObject = 0; ///< number of the movie object, if it is one
     std::string javaObject;        ///< five-character name, if it is a Java object
@@ -38,12 +38,12 @@ struct Index {
 };
 
 /**
- * Reads index.bdmv. Content provider data and extension data are passed over.
+ * Reads index.bdmv. Content provider data and extension data are skipped.
  *
  * @param fileName for messages
- * @throw FormatError wrong type or version, an address outside of the file or in its header, a
- *        structure that is longer than what holds it, or shorter than its own content. Reserved
- *        codes and anything behind the known content of a structure are no error.
+ * @throw FormatError wrong type or version, an address outside the file or in its header, a
+ *        structure that is longer than the enclosing one or shorter than its own content. Reserved
+ *        codes and anything after the known content of a structure are not errors.
  */
 Index ParseIndex(const Bytes& bytes, const std::string& fileName);
 

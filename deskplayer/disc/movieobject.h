@@ -1,6 +1,6 @@
 /**
  * @file
- * MovieObject.bdmv: the programs the titles run.
+ * MovieObject.bdmv: the programs of the titles.
  */
 #ifndef DESKPLAYER_DISC_MOVIEOBJECT_H
 #define DESKPLAYER_DISC_MOVIEOBJECT_H
@@ -24,14 +24,14 @@ struct MovieObject {
 
 struct MovieObjects {
     std::string version;
-    std::vector<MovieObject> objects; ///< movie object numbers count from 0
+    std::vector<MovieObject> objects; ///< numbered from 0
 };
 
 /**
- * Reads MovieObject.bdmv. Commands and extension data are passed over.
+ * Reads MovieObject.bdmv. Commands and extension data are skipped.
  *
  * @param fileName for messages
- * @throw FormatError wrong type or version, or more objects or commands announced than there are
+ * @throw FormatError wrong type or version, or fewer objects or commands than declared
  */
 MovieObjects ParseMovieObjects(const Bytes& bytes, const std::string& fileName);
 

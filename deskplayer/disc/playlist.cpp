@@ -31,7 +31,7 @@ std::string ReadClipName(ByteReader& reader)
     return name;
 }
 
-/** Clip, codec and STC sequence as they stand in the tables of further angles and clips. */
+/** Reads clip, codec and STC sequence from a table of further angles or clips. */
 ClipReference ReadClipReference(ByteReader& reader)
 {
     ClipReference reference;
@@ -41,7 +41,7 @@ ClipReference ReadClipReference(ByteReader& reader)
     return reference;
 }
 
-/** @param count includes the clip that stands before the table */
+/** @param count includes the clip before the table */
 std::vector<ClipReference> ReadFurtherClips(ByteReader& reader, std::uint8_t count)
 {
     std::vector<ClipReference> references;
@@ -113,7 +113,7 @@ std::vector<std::uint8_t> ReadReferences(ByteReader& table)
 
 using ReferenceList = std::vector<std::uint8_t> Stream::*;
 
-/** @param referenceLists the lists that follow each stream of this kind */
+/** @param referenceLists the lists of references after each stream of this kind */
 std::vector<Stream> ReadStreams(ByteReader& table, std::size_t count, const char* name,
                                 const std::vector<ReferenceList>& referenceLists = {})
 {
@@ -153,7 +153,7 @@ StreamTable ReadStreamTable(ByteReader table, bool hasEnhancementVideo)
     }
     table.Skip(4, "padding");
 
-    // The streams do not come in the order of their counts.
+    // The order of the streams differs from the order of their counts.
     StreamTable streams;
     streams.primaryVideo = ReadStreams(table, primaryVideo, "primary video stream");
     streams.primaryAudio = ReadStreams(table, primaryAudio, "primary audio stream");
@@ -209,8 +209,8 @@ SubPlayItem ReadSubPlayItem(ByteReader body)
     item.clip.stcSequence = body.UInt8("STC sequence");
     item.inTime = body.UInt32("IN time");
     item.outTime = ReadOutTime(body, item.inTime);
-    item.syncPlayItem = body.UInt16("play item to run with");
-    item.syncTime = body.UInt32("start time on the play item");
+    item.syncPlayItem = body.UInt16("sync play item");
+    item.syncTime = body.UInt32("sync time on the play item");
     if (Bit(connectionAndClips, 31)) {
         const std::uint8_t count = body.UInt8("number of clips");
         body.Skip(1, "padding");
@@ -293,8 +293,8 @@ std::vector<ExtensionBlock> ReadExtensionDirectory(ByteReader directory)
     std::vector<ExtensionBlock> blocks(
         directory.Count8(ExtensionEntrySize, "number of extension blocks"));
     for (ExtensionBlock& block : blocks) {
-        block.kind = directory.UInt16("first half of the kind");
-        block.subKind = directory.UInt16("second half of the kind");
+        block.kind = directory.UInt16("first half of the block kind");
+        block.subKind = directory.UInt16("second half of the block kind");
         block.offset = directory.UInt32("start of the block");
         block.size = directory.UInt32("size of the block");
     }

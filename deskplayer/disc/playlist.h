@@ -1,9 +1,9 @@
 /**
  * @file
- * PLAYLIST/nnnnn.mpls: which stretches of which clips play one after the other, with which streams.
+ * PLAYLIST/nnnnn.mpls: the sequence of play items, each a part of a clip, and their streams.
  *
  * Times are in ticks of 45 kHz. IN, OUT and mark times are positions on the time line of the clip;
- * disc/timeline.h says where they are on the time line of the play list.
+ * disc/timeline.h maps them to the time line of the play list.
  */
 #ifndef DESKPLAYER_DISC_PLAYLIST_H
 #define DESKPLAYER_DISC_PLAYLIST_H
@@ -34,19 +34,19 @@ struct ApplicationInfo {
     bool baseViewIsRightEye = false;
 };
 
-/** A clip, and which of its STC sequences the times belong to. */
+/** A clip and the STC sequence that times refer to. */
 struct ClipReference {
     std::string name;  ///< five digits: CLIPINF/nnnnn.clpi, STREAM/nnnnn.m2ts
     std::string codec; ///< "M2TS", rarely "FMTS"
     std::uint8_t stcSequence = 0;
 };
 
-constexpr std::uint8_t EntryTypePlayItem = 1;         ///< of the clip of the play item
-constexpr std::uint8_t EntryTypeSubPath = 2;          ///< of another clip, named by a sub path
-constexpr std::uint8_t EntryTypePlayItemSubPath3 = 3; ///< of the clip of the play item, but belongs
-constexpr std::uint8_t EntryTypePlayItemSubPath4 = 4; ///< to a sub path
+constexpr std::uint8_t EntryTypePlayItem = 1;         ///< in the clip of the play item
+constexpr std::uint8_t EntryTypeSubPath = 2;          ///< in another clip, named by a sub path
+constexpr std::uint8_t EntryTypePlayItemSubPath3 = 3; ///< in the clip of the play item, but part
+constexpr std::uint8_t EntryTypePlayItemSubPath4 = 4; ///< of a sub path
 
-/** A stream of a play item: where it comes from, what it is, and what it goes with. */
+/** A stream of a play item: its source, its attributes, and the streams it can be combined with. */
 struct Stream {
     std::uint8_t entryType = 0;
     std::uint16_t pid = 0;    ///< 0 if the entry type is reserved
@@ -63,7 +63,7 @@ struct StreamTable {
     std::vector<Stream> primaryVideo;
     std::vector<Stream> primaryAudio;
     std::vector<Stream> pg;    ///< PG and text subtitles
-    std::vector<Stream> pipPg; ///< PG and text subtitles for picture in picture
+    std::vector<Stream> pipPg; ///< PG and text subtitles for picture-in-picture
     std::vector<Stream> ig;
     std::vector<Stream> secondaryAudio;
     std::vector<Stream> secondaryVideo;
@@ -75,22 +75,22 @@ constexpr std::uint8_t StillModeTimed = 1;
 constexpr std::uint8_t StillModeEndless = 2;
 
 struct PlayItem {
-    ClipReference clip; ///< and angle 1
+    ClipReference clip; ///< angle 1 of several
     std::uint8_t connectionCondition = 0;
     std::uint32_t inTime = 0;
-    std::uint32_t outTime = 0; ///< not before inTime; holds for all angles, like inTime
-    std::uint64_t uoMask = 0;  ///< as in the file; adds to the one of the play list
+    std::uint32_t outTime = 0; ///< not before inTime; applies to all angles, like inTime
+    std::uint64_t uoMask = 0;  ///< as in the file; in addition to the one of the play list
     bool randomAccessFlag = false;
     std::uint8_t stillMode = 0;
     std::uint16_t stillTime = 0; ///< seconds; 0 unless the still mode is StillModeTimed
-    bool multiAngle = false;     ///< there is an angle table
+    bool multiAngle = false;     ///< an angle table exists
     bool differentAudios = false;
     bool seamlessAngleChange = false;
     std::vector<ClipReference> furtherAngles; ///< angles 2 and up
     StreamTable streams;
 };
 
-/** How many angles there are to choose among; 1 where there is no choice. */
+/** The number of angles; 1 without an angle table. */
 inline std::size_t NumberOfAngles(const PlayItem& item)
 {
     return 1 + item.furtherAngles.size();
@@ -103,7 +103,7 @@ struct SubPlayItem {
     std::uint32_t outTime = 0;               ///< not before inTime
     std::uint16_t syncPlayItem = 0;          ///< from 0; there may be no such play item
     std::uint32_t syncTime = 0;              ///< on the clip of that play item
-    std::vector<ClipReference> furtherClips; ///< clips 1 and up, counted from 0
+    std::vector<ClipReference> furtherClips; ///< clips 1 and up, since clips are numbered from 0
 };
 
 struct SubPath {
@@ -120,11 +120,11 @@ struct Mark {
     std::uint8_t type = 0;
     std::uint16_t playItem = 0; ///< from 0; there may be no such play item
     std::uint32_t time = 0;     ///< on the clip of that play item, not always between IN and OUT
-    std::uint16_t pid = 0;      ///< stream it belongs to, or MarkForAllStreams
+    std::uint16_t pid = 0;      ///< PID of its stream, or MarkForAllStreams
     std::uint32_t duration = 0;
 };
 
-/** A block of the extension data. Its bytes are not read, so it may lie outside of the file. */
+/** A block of the extension data. Its bytes are not read, so it may lie outside the file. */
 struct ExtensionBlock {
     std::uint16_t kind = 0;    ///< first half
     std::uint16_t subKind = 0; ///< second half
@@ -135,7 +135,7 @@ struct ExtensionBlock {
 struct PlayList {
     std::string version;
     ApplicationInfo applicationInfo;
-    std::vector<PlayItem> playItems; ///< can be empty
+    std::vector<PlayItem> playItems; ///< may be empty
     std::vector<SubPath> subPaths;
     std::vector<Mark> marks;
     std::vector<ExtensionBlock> extensionBlocks;
@@ -144,17 +144,17 @@ struct PlayList {
 /**
  * Reads a play list.
  *
- * What contradicts itself is refused, because nothing behind it can be trusted: a wrong type or an
- * unknown version, an address outside of the file or in its header, a structure that is longer than
- * what holds it or shorter than the content it announces, a clip name that is not five digits, OUT
+ * Contradictions are refused, because nothing after them can be trusted: a wrong type or an unknown
+ * version, an address outside the file or in its header, a structure that is longer than the
+ * enclosing one or shorter than its declared content, a clip name that is not five digits, OUT
  * before IN.
  *
- * What a player can live with is kept: reserved codes, marks outside of their play item, marks and
- * streams that refer to play items, sub paths or streams that are not there. Padding, and
- * anything behind the known content of a structure, is passed over. Sections may overlap; each is
- * read for itself.
+ * Anomalies that a player can tolerate are kept: reserved codes, marks outside their play item,
+ * marks and streams that refer to missing play items, sub paths or streams. Padding, and anything
+ * after the known content of a structure, is skipped. Sections may overlap; each is read
+ * independently.
  *
- * Time and memory grow with the number of bytes, whatever these announce.
+ * Time and memory are linear in the number of bytes, whatever they declare.
  *
  * @param fileName for messages
  * @throw FormatError see above
@@ -164,12 +164,11 @@ PlayList ParsePlayList(const Bytes& bytes, const std::string& fileName);
 /**
  * The clip that carries a stream of a play item, at angle 1.
  *
- * Entry type 2 leaves open which sub play item is meant. It is the first one that starts in this
- * play item; a sub path with only one sub play item can mean no other.
+ * Entry type 2 does not specify the sub play item. It is the first one that starts in this play
+ * item, or the only one of the sub path.
  *
  * @param playItem from 0
- * @return the name of the clip; nothing if the entry type is reserved or what it refers to is not
- *         there
+ * @return the name of the clip; nothing if the entry type is reserved or refers to a missing part
  */
 std::optional<std::string> ClipOfStream(const PlayList& playList, std::size_t playItem,
                                         const Stream& stream);

@@ -1,6 +1,6 @@
 /**
  * @file
- * What a play list and a clip information file both say about a stream.
+ * Stream attributes that play lists and clip information files share.
  */
 #ifndef DESKPLAYER_DISC_STREAMATTRIBUTES_H
 #define DESKPLAYER_DISC_STREAMATTRIBUTES_H
@@ -12,8 +12,8 @@ namespace deskplayer
 {
 
 /**
- * What a stream is. A field that this kind of stream does not have is 0 or empty. Codes are passed
- * on as they are read, reserved ones too; disc/codes.h names them.
+ * The attributes of a stream. A field that does not apply to this kind of stream is 0 or empty.
+ * Codes are kept as read, including reserved ones; disc/codes.h names them.
  */
 struct StreamAttributes {
     std::uint8_t codingType = 0;
@@ -21,7 +21,7 @@ struct StreamAttributes {
     std::uint8_t frameRate = 0;         ///< video
     std::uint8_t dynamicRange = 0;      ///< H.265 video
     std::uint8_t colourSpace = 0;       ///< H.265 video
-    bool hdrFlag = false;               ///< H.265 video; what it means is not known
+    bool hdrFlag = false;               ///< H.265 video; meaning unknown
     bool dynamicMetadata = false;       ///< H.265 video: dynamic metadata is present
     std::uint8_t audioPresentation = 0; ///< audio
     std::uint8_t sampleRate = 0;        ///< audio

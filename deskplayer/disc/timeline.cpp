@@ -46,7 +46,7 @@ TimeLine BuildTimeLine(const PlayList& playList)
         }
     }
 
-    // Marks need not be in order of playback; a chapter that would end before it starts is empty.
+    // Marks need not be in playback order; a chapter that would end before it starts is empty.
     for (std::size_t index = 1; index < timeLine.chapters.size(); ++index) {
         Chapter& chapter = timeLine.chapters[index - 1];
         chapter.end = std::max(chapter.start, timeLine.chapters[index].start);

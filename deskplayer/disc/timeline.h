@@ -1,6 +1,6 @@
 /**
  * @file
- * Where play items, marks and chapters are on the time line of their play list.
+ * Positions of play items, marks and chapters on the time line of their play list.
  */
 #ifndef DESKPLAYER_DISC_TIMELINE_H
 #define DESKPLAYER_DISC_TIMELINE_H
@@ -15,7 +15,7 @@
 namespace deskplayer
 {
 
-/** The stretch from a mark of type entry to the next. */
+/** The part from an entry mark to the next. */
 struct Chapter {
     std::size_t number = 0;   ///< from 1; see TimeLine::chapters
     std::size_t mark = 0;     ///< index of its mark
@@ -25,21 +25,21 @@ struct Chapter {
 };
 
 /**
- * Positions from the start of the play list. They make sense if the play items play in sequence.
+ * Positions from the start of the play list, valid if the play items are played in sequence.
  */
 struct TimeLine {
     Ticks duration{0};
     std::vector<Ticks> itemStarts;
 
     /**
-     * One for each mark; nothing for a mark whose play item is not there, or that is before IN or
+     * One for each mark; nothing for a mark whose play item is missing, or that is before IN or
      * after OUT of its play item.
      */
     std::vector<std::optional<Ticks>> markPositions;
 
     /**
-     * In the order of their marks. A mark of type entry that has no position is no chapter here,
-     * but takes a chapter number, so that the numbers stay those the disc was made with.
+     * In the order of their marks. An entry mark without a position has no chapter here, but uses
+     * up a chapter number, so that the numbers are those the disc was authored with.
      */
     std::vector<Chapter> chapters;
 };

@@ -21,7 +21,7 @@ namespace deskplayer
 namespace
 {
 
-/** A named value, and what it means. */
+/** A named value and its meaning. */
 struct Field {
     std::string name;
     std::string value;
@@ -101,7 +101,7 @@ Field Time(const char* name, std::uint32_t ticks)
     return Time(name, Ticks(ticks));
 }
 
-/** @param meaning may name the code again, as codes.h does with reserved ones */
+/** @param meaning may repeat the code, as codes.h does for reserved ones */
 Field Code(const char* name, std::uint8_t code, const std::string& meaning)
 {
     const bool reserved = meaning.rfind("reserved", 0) == 0;
@@ -113,7 +113,7 @@ Field Language(const std::string& language)
     return {"language", language.empty() ? "none" : Printable(language), LanguageName(language)};
 }
 
-/** The operations are those of the file, whatever a debug override would report. */
+/** The operations are those in the file, regardless of a debug override. */
 Field UOMask(std::uint64_t mask)
 {
     std::string forbidden;
@@ -126,7 +126,7 @@ Field UOMask(std::uint64_t mask)
     return {"mask", Hex(mask, 16), forbidden.empty() ? "forbids nothing" : forbidden};
 }
 
-/** Streams refer to each other from 0, but are labelled from 1. */
+/** References to streams are numbered from 0, labels from 1. */
 Field References(const char* name, const std::vector<std::uint8_t>& references)
 {
     std::string numbers;

@@ -22,7 +22,7 @@ namespace
 
 using Lines = std::vector<std::string>;
 
-/** What is to be said about the aspect ratio of a video stream. */
+/** Describes the aspect ratio of a video stream. */
 using AspectText = std::function<std::string(const Stream&)>;
 
 constexpr std::size_t WidthOfFirstColumns = 47; ///< all columns but the streams
@@ -31,7 +31,7 @@ constexpr std::size_t WidthOfStreams = 53;
 std::string ObjectText(const IndexObject& object)
 {
     std::string text;
-    std::uint8_t movie = 0; // the playback type that means a movie; the next one is interactive
+    std::uint8_t movie = 0; // the playback type of a movie; the next one is interactive
     switch (object.objectType) {
     case ObjectTypeMovieObject:
         text = "movie object " + std::to_string(object.movieObject);
@@ -127,7 +127,7 @@ std::string StreamText(const StreamAttributes& attributes)
     }
 }
 
-/** One line a stream. */
+/** Adds one line per stream. */
 void AddStreams(Lines& lines, const std::string& label, const std::vector<Stream>& streams,
                 const AspectText& aspectText)
 {
@@ -137,7 +137,7 @@ void AddStreams(Lines& lines, const std::string& label, const std::vector<Stream
     }
 }
 
-/** Streams of which there are many, and of which the language is enough: as many as fit a line. */
+/** Adds the languages of streams, which can be many: as many as fit on each line. */
 void AddLanguages(Lines& lines, const std::string& label, const std::vector<Stream>& streams)
 {
     std::string line = label;
@@ -179,7 +179,7 @@ std::size_t LongestItem(const PlayList& playList)
     return static_cast<std::size_t>(longest - items.begin());
 }
 
-/** The streams of the longest play item, and whether they are those of all of them. */
+/** The streams of the longest play item, and the number of play items with other streams. */
 Lines StreamLines(const PlayList& playList, AspectRatios& aspectRatios)
 {
     if (playList.playItems.empty()) {
@@ -192,7 +192,7 @@ Lines StreamLines(const PlayList& playList, AspectRatios& aspectRatios)
         return code ? ", " + AspectRatioName(*code) : ", aspect ratio not known";
     });
 
-    // Aspect ratios do not count: looking at them would mean to read the clips of all play items.
+    // Aspect ratios are ignored: comparing them would require reading the clips of all play items.
     const AspectText nothing = [](const Stream&) { return ""; };
     const Lines common = StreamLines(shown, nothing);
     const auto others = std::count_if(
@@ -238,7 +238,7 @@ std::size_t ListPlayLists(std::ostream& output, const Disc& disc,
     ListTitles(output, disc);
     output << '\n';
     if (numbers.empty()) {
-        output << "There is no play list.\n";
+        output << "There are no play lists.\n";
         return 0;
     }
 

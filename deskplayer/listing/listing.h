@@ -1,6 +1,6 @@
 /**
  * @file
- * What is on a disc, as a table.
+ * The contents of a disc as a table.
  *
  *     Index           version 0200, 1 title
  *     First playback  movie object 2, interactive
@@ -26,14 +26,15 @@ namespace deskplayer
 {
 
 /**
- * Prints the titles and the play lists of a disc. One play list is held at a time, and written as
- * soon as it is read; nobody flushes @p output.
+ * Prints the titles and the play lists of a disc. Only one play list is in memory at a time, and it
+ * is written as soon as it is read; @p output is not flushed.
  *
- * Streams can differ from play item to play item. Shown are those of the longest one, and how many
- * have others. Where the index or a play list cannot be read, a line says why.
+ * Streams may differ between play items. The table shows those of the longest play item and the
+ * number of play items with other streams. If the index or a play list cannot be read, a line gives
+ * the reason.
  *
- * @param numbers of the play lists, as Disc::PlayListNumbers() gives them
- * @return how many play lists cannot be read
+ * @param numbers of the play lists, as returned by Disc::PlayListNumbers()
+ * @return the number of play lists that cannot be read
  */
 std::size_t ListPlayLists(std::ostream& output, const Disc& disc,
                           const std::vector<std::uint32_t>& numbers);

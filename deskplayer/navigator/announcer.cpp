@@ -79,14 +79,14 @@ void Announcer::AnnounceSyncStreams()
     const StreamTable& streams = m_rPlayhead.CurrentStreams();
     const bool pip = anySync(streams.secondaryVideo) && atNormalSpeed;
     const bool audio = anySync(streams.secondaryAudio) && atNormalSpeed;
-    if (std::exchange(m_Announced.syncPip, pip) != pip) {
+    if (std::exchange(m_Announced.syncPipAvailable, pip) != pip) {
         if (pip) {
             m_rSender.Send<bdmv::PipAvailableEvent>();
         } else if (!streams.secondaryVideo.empty()) {
             m_rSender.Send<bdmv::PipUnavailableEvent>();
         }
     }
-    if (std::exchange(m_Announced.syncSecondaryAudio, audio) != audio) {
+    if (std::exchange(m_Announced.syncSecondaryAudioAvailable, audio) != audio) {
         if (audio) {
             m_rSender.Send<bdmv::SecondaryAudioAvailableEvent>();
         } else if (!streams.secondaryAudio.empty()) {
@@ -108,7 +108,7 @@ void Announcer::AnnounceMask()
 void Announcer::AnnounceMenu()
 {
     const bool available = !m_rPlayhead.CurrentStreams().ig.empty();
-    if (std::exchange(m_Announced.popUpMenu, available) == available) {
+    if (std::exchange(m_Announced.popUpMenuAvailable, available) == available) {
         return;
     }
     if (available) {

@@ -1,6 +1,6 @@
 /**
  * @file
- * What the listeners were notified of last.
+ * The latest announcements to the listeners.
  */
 #ifndef DESKPLAYER_NAVIGATOR_ANNOUNCER_H
 #define DESKPLAYER_NAVIGATOR_ANNOUNCER_H
@@ -19,7 +19,8 @@
 namespace deskplayer
 {
 
-/** Sends the events of what differs from the last announcement. Changes nothing in playback. */
+/** Sends events for everything that differs from the last announcement. Does not affect playback.
+ */
 class Announcer
 {
 public:
@@ -33,41 +34,41 @@ public:
     Announcer(const Announcer&) = delete;
     Announcer& operator=(const Announcer&) = delete;
 
-    /** Forgets what was announced, so that everything counts as different. */
+    /** Forgets all announcements, so that everything counts as different. */
     void Forget() { m_Announced = Announced(); }
 
-    /** The play item, which is always announced, its streams and its mask. */
+    /** Announces the play item, and its streams and mask if they differ. */
     void AnnounceItem();
 
-    /** The kinds of streams whose number or count has changed, audio details, styles. */
+    /** Announces stream numbers and counts, audio attributes and text subtitle styles. */
     void AnnounceStreams();
 
     /**
-     * Whether the secondary streams on the time base of the play item are available.
-     * PlayItemEvent and PlayModeEvent announce the asynchronous ones.
+     * Announces whether the secondary streams on the time base of the play item are available.
+     * PlayItemEvent and PlayModeEvent do so for asynchronous ones.
      */
     void AnnounceSyncStreams();
 
-    /** Whether there is a pop-up menu. */
+    /** Announces whether a pop-up menu is available. */
     void AnnounceMenu();
 
     void AnnounceChapter();
 
-    /** The chapter that was announced last; 0 for none. */
+    /** The last announced chapter; 0 for none. */
     bd::ChapterNumberDef AnnouncedChapter() const { return m_Announced.chapter; }
 
 private:
-    /** The kinds of streams whose number and count events report. */
+    /** Kinds of streams whose number and count are announced. */
     static constexpr std::size_t StreamKinds = 8;
 
     struct Announced {
         std::array<PlaybackContext::NumberAndCount, StreamKinds> streams;
         std::optional<bd::AudioInfoType> audio;
         std::optional<bd::AudioInfoType> secondaryAudio;
-        bool syncPip = false;            ///< as available
-        bool syncSecondaryAudio = false; ///< as available
+        bool syncPipAvailable = false;
+        bool syncSecondaryAudioAvailable = false;
         bd::UInt8 styles = 0;
-        bool popUpMenu = false; ///< as available
+        bool popUpMenuAvailable = false;
         std::optional<bdmv::UOMaskTable> mask;
         bd::ChapterNumberDef chapter = 0;
     };

@@ -1,6 +1,6 @@
 /**
  * @file
- * Audio attributes as listeners get them.
+ * Audio attributes as listeners receive them.
  */
 #ifndef DESKPLAYER_NAVIGATOR_AUDIOINFO_H
 #define DESKPLAYER_NAVIGATOR_AUDIOINFO_H
@@ -12,8 +12,8 @@ namespace deskplayer
 {
 
 /**
- * What a play list says about an audio stream. It does not say how many bits a sample has, nor
- * which channels there are beyond two; a decoder would.
+ * The attributes of an audio stream in a play list. A play list gives neither the bits per sample
+ * nor the layout of more than two channels; only a decoder could.
  */
 bd::AudioInfoType AudioInfoOf(const Stream& stream);
 

@@ -50,7 +50,7 @@ public:
         return static_cast<bd::UInt16>(m_Commands.size());
     }
 
-    /** Null for a command that is not there. */
+    /** Null for a command that does not exist. */
     const bdmv::INavigationCommandData*
     GetNavigationCommandData(CommandIdDef commandId) const override
     {

@@ -1,6 +1,6 @@
 /**
  * @file
- * A navigator on a desk: what a program makes first.
+ * A navigator with everything it needs: the first object a program creates.
  *
  * @code
  * Desk desk(LoadPlayList(disc, 800, disc.ReadPlayList(800)));
@@ -23,10 +23,10 @@ namespace deskplayer
 {
 
 /**
- * Owns a clock, a delivering thread, a navigator, and the listener that keeps its resume data, which
- * is registered before all others.
+ * Owns a clock, a delivering thread, a navigator, and the listener that stores its resume data,
+ * which is registered before all others.
  *
- * All operations but Listeners() belong to one thread. Every event has been delivered when an
+ * Call all operations except Listeners() from one thread. Every event has been delivered when an
  * operation of the navigator returns, so a listener may be destroyed before the desk once it has
  * been removed, or once no more operations follow.
  */
@@ -42,7 +42,7 @@ public:
     Desk(const Desk&) = delete;
     Desk& operator=(const Desk&) = delete;
 
-    /** Where clients register. Any thread. */
+    /** The list in which clients register. Any thread. */
     bdmv::INavigatorEvent::Listeners& Listeners() { return m_Delivery.Listeners(); }
 
     SimulatedNavigator& Navigator() { return m_Navigator; }
@@ -50,13 +50,13 @@ public:
     /** The time of the session. Any thread may read it. */
     VirtualClock& Clock() { return m_Clock; }
 
-    /** The data that the last standby handed to listeners; empty before. */
+    /** The resume data of the last standby; empty before the first. */
     const std::vector<bd::UInt8>& ResumeData() const { return m_Keeper.ResumeData(); }
 
 private:
     VirtualClock m_Clock;
     ResumeDataKeeper m_Keeper;
-    EventDelivery m_Delivery; ///< ends before what its thread uses
+    EventDelivery m_Delivery; ///< after the members that its thread uses
     SimulatedNavigator m_Navigator;
 };
 

@@ -8,8 +8,8 @@ namespace deskplayer
 namespace
 {
 
-/** How often a thread lets the other one run before it falls asleep. */
-constexpr int Patience = 100;
+/** How often a waiting thread yields the processor before it blocks. */
+constexpr int YieldsBeforeBlocking = 100;
 
 } // namespace
 
@@ -44,11 +44,11 @@ void EventDelivery::Settle()
     }
 }
 
-/** Waking a thread takes many times what an event does, so there is no hurry to sleep. */
+/** Yields before blocking, because waking a thread takes far longer than delivering an event. */
 template <typename Condition>
 void EventDelivery::Wait(std::unique_lock<std::mutex>& lock, Condition condition)
 {
-    for (int turn = 0; turn < Patience && !condition(); ++turn) {
+    for (int yields = 0; yields < YieldsBeforeBlocking && !condition(); ++yields) {
         lock.unlock();
         std::this_thread::yield();
         lock.lock();

@@ -21,10 +21,10 @@ namespace deskplayer
 /**
  * A queue of events, and the thread that dispatches and deletes them in order.
  *
- * Post() and Settle() belong to the thread of the navigator. Between Post() and Settle() the
- * delivering thread reads the playback context, so the navigator leaves it alone; what it wrote
- * before is visible to the listeners, and what they did is visible to it afterwards. That is what
- * makes a session exactly repeatable although events report the values of their dispatch.
+ * Call Post() and Settle() from the navigator's thread. Between the two the delivering thread reads
+ * the playback context, so the navigator must not change it. Earlier writes of the navigator are
+ * visible to the listeners, and writes of the listeners are visible to the navigator afterwards.
+ * This makes a session exactly repeatable although events report values at dispatch.
  */
 class EventDelivery
 {
@@ -32,13 +32,13 @@ public:
     /** Starts the thread. */
     EventDelivery();
 
-    /** Delivers what is still queued and ends the thread. */
+    /** Delivers the events still queued and ends the thread. */
     ~EventDelivery();
 
     EventDelivery(const EventDelivery&) = delete;
     EventDelivery& operator=(const EventDelivery&) = delete;
 
-    /** Where clients register. Any thread. */
+    /** The list in which clients register. Any thread. */
     bdmv::INavigatorEvent::Listeners& Listeners() { return m_Listeners; }
 
     /** Queues an event. */
@@ -47,7 +47,7 @@ public:
     /**
      * Waits until everything posted has been delivered.
      *
-     * @throw what a listener threw; the events behind that one have been delivered all the same
+     * @throw the first exception thrown by a listener; later events have been delivered
      */
     void Settle();
 
@@ -57,13 +57,13 @@ private:
     void Wait(std::unique_lock<std::mutex>& lock, Condition condition);
 
     bdmv::INavigatorEvent::Listeners m_Listeners;
-    std::mutex m_Mutex; ///< guards what follows
+    std::mutex m_Mutex; ///< guards the members below
     std::condition_variable m_Changed;
     std::deque<std::unique_ptr<bdmv::INavigatorEvent>> m_Queue;
     std::uint64_t m_Undelivered = 0; ///< queued, and the one being dispatched
     std::exception_ptr m_Failure;    ///< the first since the last Settle()
     bool m_Ending = false;
-    std::thread m_Thread; ///< last, so that it finds everything in place
+    std::thread m_Thread; ///< last, so that it starts after everything it uses is constructed
 };
 
 } // namespace deskplayer

@@ -27,10 +27,10 @@ public:
     EventSender& operator=(const EventSender&) = delete;
 
     /**
-     * Returns when every listener has been called, with the values of this moment.
+     * Sends an event with the current values, and returns when every listener has been called.
      *
-     * @param arguments of the event, after the context
-     * @throw what a listener threw
+     * @param arguments the event's constructor arguments after the context
+     * @throw any exception thrown by a listener
      */
     template <typename Event, typename... Arguments> void Send(Arguments... arguments)
     {

@@ -19,33 +19,33 @@
 namespace deskplayer
 {
 
-/** The longest play list that is played. No disc holds so much. */
+/** The longest play list that is played. No disc has one as long. */
 constexpr Ticks LongestDuration = std::chrono::hours(100);
 
-/** A play list, where its parts lie in time, and what the clips add to it. */
+/** A play list, its time line, and the aspect ratios from its clips. */
 struct LoadedPlayList {
     std::uint32_t number = 0;
     PlayList playList;
     TimeLine timeLine;
 
-    /** Positions of the marks that have one, with their indices, in order of position. */
+    /** Positions and indices of the marks that have a position, in order of position. */
     std::vector<std::pair<Ticks, std::size_t>> marksByPosition;
 
-    /** The chapters in order of their start, those at the same position of their play items. */
+    /** The chapters in order of their start; at the same position, in order of play item. */
     std::vector<Chapter> chaptersByStart;
 
-    /** Of the first primary video of every play item, as the disc codes it. */
+    /** The code of the first primary video stream of every play item. */
     std::vector<std::optional<std::uint8_t>> aspectRatios;
 };
 
-/** Lays out a play list in time. */
+/** Adds the time line to a play list. */
 LoadedPlayList LayOut(std::uint32_t number, PlayList playList);
 
 /**
- * Completes a play list that was read from @p disc.
+ * Adds time line and aspect ratios to a play list that was read from @p disc.
  *
- * @throw DiscError clip information that is there cannot be read, or the play list lasts longer
- * than LongestDuration
+ * @throw DiscError clip information exists but cannot be read, or the play list is longer than
+ * LongestDuration
  */
 LoadedPlayList LoadPlayList(const Disc& disc, std::uint32_t number, PlayList playList);
 

@@ -1,6 +1,6 @@
 /**
  * @file
- * What became of a user operation.
+ * The result of a user operation.
  */
 #ifndef DESKPLAYER_NAVIGATOR_OUTCOME_H
 #define DESKPLAYER_NAVIGATOR_OUTCOME_H
@@ -12,31 +12,33 @@
 namespace deskplayer
 {
 
-/** Carried out, or refused: then no event was sent and nothing has changed. */
+/** Carried out or refused. A refused operation sends no event and changes nothing. */
 class Outcome
 {
 public:
     static Outcome Done() { return Outcome(std::string()); }
 
-    /** @param reason why, as a sentence without a full stop; not empty */
+    /** @param reason a sentence without a full stop; not empty */
     static Outcome Refused(std::string reason) { return Outcome(std::move(reason)); }
 
     /**
-     * Refused for a number that does not exist, of a stream, a chapter or a button.
+     * Refused because no stream, chapter or button has this number.
      *
-     * @param what  a word for the thing that is numbered, from 1
-     * @param count the greatest number; 0 if there is nothing
+     * @param what  what is numbered, from 1, in the singular: "button"
+     * @param count the highest number; 0 if there are none
      */
     static Outcome NoSuch(const std::string& what, std::uint64_t number, std::uint64_t count)
     {
-        return Refused("there is no " + what + " " + std::to_string(number) +
-                       (count == 0 ? ", there is none here"
-                                   : ", they count from 1 to " + std::to_string(count)));
+        const std::string valid = count == 0 ? "there are no " + what + "s"
+                                  : count == 1
+                                      ? "the only " + what + " is 1"
+                                      : what + "s are numbered 1 to " + std::to_string(count);
+        return Refused("no " + what + " " + std::to_string(number) + "; " + valid);
     }
 
     bool IsDone() const { return m_Reason.empty(); }
 
-    /** Why the operation was refused; empty when it was carried out. */
+    /** Why the operation was refused; empty if it was carried out. */
     const std::string& Reason() const { return m_Reason; }
 
 private:

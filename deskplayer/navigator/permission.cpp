@@ -12,7 +12,7 @@ namespace deskplayer
 namespace
 {
 
-const char* NameOf(Status status)
+const char* StatusName(Status status)
 {
     switch (status) {
     case Status::Stopped:
@@ -28,7 +28,7 @@ const char* NameOf(Status status)
     case Status::Standby:
         return "in standby";
     case Status::Finished:
-        return "at its end";
+        return "finished";
     }
     return "";
 }
@@ -50,11 +50,11 @@ Outcome Permission::CheckMask(bd::UserOperationMaskDef operation) const
         return Outcome::Done();
     }
     const std::string list = "play list " + std::to_string(loaded.number);
-    const std::string who = "play item " + std::to_string(m_rState.item);
-    return Outcome::Refused(deskplayer::NameOf(operation) + " is forbidden by " +
+    const std::string playItem = "play item " + std::to_string(m_rState.item);
+    return Outcome::Refused(NameOf(operation) + " is forbidden by " +
                             (!byItem       ? list
-                             : !byPlayList ? who
-                                           : list + " and its " + who));
+                             : !byPlayList ? playItem
+                                           : list + " and its " + playItem));
 }
 
 Outcome Permission::CheckStatus(std::initializer_list<Status> statuses) const
@@ -64,10 +64,9 @@ Outcome Permission::CheckStatus(std::initializer_list<Status> statuses) const
     }
     std::string expected;
     for (const Status status : statuses) {
-        expected += (expected.empty() ? "" : " or ") + std::string(NameOf(status));
+        expected += (expected.empty() ? "" : " or ") + std::string(StatusName(status));
     }
-    return Outcome::Refused(std::string("playback is ") + NameOf(m_rState.status) + ", not " +
-                            expected);
+    return Outcome::Refused("not " + expected + ", but " + StatusName(m_rState.status));
 }
 
 Outcome Permission::CheckActive() const

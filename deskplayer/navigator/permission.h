@@ -36,7 +36,7 @@ public:
     /** Whether playback has one of these statuses. */
     Outcome CheckStatus(std::initializer_list<Status> statuses) const;
 
-    /** Whether a picture is shown that an operation could change. */
+    /** Whether playback shows a picture: playing, paused or in a still. */
     Outcome CheckActive() const;
 
 private:

@@ -16,7 +16,7 @@ namespace
 
 const StreamTable NoStreams;
 
-/** User styles that a text subtitle stream is taken to have: its own file would tell. */
+/** Assumed number of user styles of a text subtitle stream, whose file is not read. */
 constexpr bd::UInt8 TextSubtitleStyles = 4;
 
 bool IsTextSubtitle(const Stream& stream)
@@ -88,7 +88,7 @@ bd::TriggerType PlaybackContext::GetTriggerTypeByTime(bd::TimePosition time)
     if (position == m_rState.pointB) {
         return bd::TRIGGER_B;
     }
-    // The end of a chapter or title is not a point that was set: the repeat state identifies it.
+    // No trigger is set at the end of a chapter or title: the repeat state identifies it.
     return position == m_rState.notifyAt ? bd::TRIGGER_NOTIFY_FROM_CURPOS : bd::TRIGGER_INVALID;
 }
 
@@ -121,7 +121,7 @@ void PlaybackContext::GetVideoAttributes(bd::VideoFormatType& format,
     aspectRatio = bd::VideoAspectRatioTypeNoInfo;
     const std::vector<Stream>& videos = CurrentStreams().primaryVideo;
     if (!videos.empty()) {
-        // Both are numbered as on the disc; a number without a name travels as it is.
+        // The enumerations have the disc's codes; codes without an enumerator are passed on.
         format = static_cast<bd::VideoFormatType>(videos.front().attributes.videoFormat);
         if (const std::optional<std::uint8_t> code =
                 m_rPlayhead.LoadedList().aspectRatios[m_rState.item]) {
@@ -255,7 +255,7 @@ void PlaybackContext::IsAsyncPipInCurrentPlayItem(bool& fg2ndVid, bool& fg2ndAud
     fg2ndVid = anyAsync(streams.secondaryVideo);
     fg2ndAud = anyAsync(streams.secondaryAudio);
 
-    // What the previous play item offered becomes unavailable only where this one lacks it.
+    // Streams of the previous play item become unavailable only if this one has none.
     const StreamTable& previous =
         m_rState.previousItem
             ? m_rPlayhead.LoadedList().playList.playItems[*m_rState.previousItem].streams
@@ -264,7 +264,7 @@ void PlaybackContext::IsAsyncPipInCurrentPlayItem(bool& fg2ndVid, bool& fg2ndAud
     fgPrev2ndAud = !previous.secondaryAudio.empty() && streams.secondaryAudio.empty();
 }
 
-/** The stream that was asked for, or the last where it is not there. */
+/** The wanted stream, or the last one if it does not exist. */
 PlaybackContext::NumberAndCount PlaybackContext::Choose(bd::StreamNumberDef wanted,
                                                         std::size_t count)
 {
@@ -320,7 +320,7 @@ void PlaybackContext::StoreSystemResumeData(std::vector<bd::UInt8> block)
                            static_cast<bd::UInt32>(m_SystemResumeData.size())};
 }
 
-/** A stream runs on its own when the sub path that brings it is not in step with the play item. */
+/** Whether the sub path that carries the stream is not synchronized with the play item. */
 bool PlaybackContext::IsAsync(const Stream& stream) const
 {
     const std::vector<SubPath>& subPaths = m_rPlayhead.LoadedList().playList.subPaths;

@@ -18,13 +18,13 @@ namespace deskplayer
 {
 
 /**
- * Answers every query from the play list and from the state of playback.
+ * Answers every query from the play list and the state of playback.
  *
- * Reports positions in ticks of 45 kHz on the time line of the play list, play items and marks by
- * their number in the play list, from 0, and chapters from 1.
+ * Positions are in ticks of 45 kHz on the time line of the play list. Play items and marks are
+ * numbered as in the play list, from 0, and chapters from 1.
  *
- * The navigator's thread changes the state while no event is on its way; the delivering thread only
- * reads it.
+ * The navigator's thread changes the state only while no event is queued or being dispatched; the
+ * delivering thread only reads it.
  */
 class PlaybackContext final : public bdmv::IPlaybackContext
 {
@@ -78,7 +78,7 @@ public:
     void IsAsyncPipInCurrentPlayItem(bool& fg2ndVid, bool& fg2ndAud, bool& fgPrev2ndVid,
                                      bool& fgPrev2ndAud) override;
 
-    /** A stream that is selected, from 1, and how many there are of its kind; 0 of 0 for none. */
+    /** The selected stream, from 1, and the number of streams of its kind; 0 and 0 for none. */
     typedef std::pair<bd::StreamNumberDef, bd::UInt8> NumberAndCount;
 
     NumberAndCount ChosenVideo() const;
@@ -90,10 +90,10 @@ public:
     NumberAndCount ChosenIg() const;
     NumberAndCount ChosenAngle() const;
 
-    /** Stores the block that GetSystemResumeData() gives, until it is cleaned up. */
+    /** Stores the block that GetSystemResumeData() returns until CleanupSystemResumeData(). */
     void StoreSystemResumeData(std::vector<bd::UInt8> block);
 
-    /** Whether a stream runs on a time base of its own, not on that of the play item. */
+    /** Whether a stream has its own time base instead of the play item's. */
     bool IsAsync(const Stream& stream) const;
 
 private:

@@ -1,6 +1,6 @@
 /**
  * @file
- * What changes while a play list plays.
+ * The state of playback.
  */
 #ifndef DESKPLAYER_NAVIGATOR_PLAYBACKSTATE_H
 #define DESKPLAYER_NAVIGATOR_PLAYBACKSTATE_H
@@ -18,8 +18,8 @@ namespace deskplayer
 {
 
 /**
- * What the viewer has chosen. Streams, angles and styles count from 1. A play item that lacks the
- * chosen one shows its last instead; the choice stays.
+ * The viewer's selection. Streams, angles and styles are numbered from 1. A play item that lacks
+ * the selected one uses its last instead; the selection is kept.
  */
 struct StreamSelection {
     bd::StreamNumberDef video = 1;
@@ -38,7 +38,7 @@ struct StreamSelection {
     bool pipPgPicked = false;
 };
 
-/** A button that was activated and waits for its program to be executed. */
+/** An activated button whose program is to be executed. */
 struct PendingButton {
     bdmv::IProgramData::RefPtr program;
     bd::UInt32 ticket = 0;
@@ -52,26 +52,26 @@ enum class Status {
     Still,     ///< holds the last picture of a play item
     Suspended, ///< holds until it is resumed
     Standby,   ///< the system is in standby
-    Finished   ///< played to the end, or the stream ran dry
+    Finished   ///< played to the end, or out of data
 };
 
 /** Positions are on the time line of the play list. */
 struct PlaybackState {
     Status status = Status::Stopped;
     Status statusBeforeSuspend = Status::Stopped; ///< restored when playback resumes
-    std::optional<Ticks> stillLeft;               ///< of a still that ends by itself
+    std::optional<Ticks> stillLeft;               ///< remaining time of a timed still
 
     Ticks position{0};
-    std::size_t item = 0;                    ///< the play item in playback
-    std::optional<std::size_t> previousItem; ///< the one that was in playback before
+    std::size_t item = 0;                    ///< the active play item
+    std::optional<std::size_t> previousItem; ///< the play item that was active before
     std::optional<std::size_t> mark;         ///< index of the mark that was passed last
 
-    bd::PlayMode playMode;        ///< what was asked for
-    bd::PlayMode currentPlayMode; ///< what playback does
+    bd::PlayMode playMode;        ///< the play mode requested
+    bd::PlayMode currentPlayMode; ///< the play mode in effect
     StreamSelection selection;
 
     std::optional<Ticks> pointA;                           ///< of the A-B repeat
-    std::optional<Ticks> pointB;                           ///< set: A to B repeats
+    std::optional<Ticks> pointB;                           ///< if set, A to B repeats
     std::optional<Ticks> notifyAt;                         ///< the position of the trigger
     bd::TriggerType chapterTitleRepeat = bd::TRIGGER_NONE; ///< TRIGGER_CHP, TRIGGER_TITLE
     bd::TriggerType trigger = bd::TRIGGER_NONE;            ///< the one set last

@@ -16,7 +16,7 @@ namespace
 
 const StreamTable NoStreams;
 
-/** A mark to compare those of LoadedPlayList::marksByPosition with. */
+/** A search key for LoadedPlayList::marksByPosition. */
 std::pair<Ticks, std::size_t> MarkAt(Ticks position, std::size_t index)
 {
     return {position, index};
@@ -24,7 +24,7 @@ std::pair<Ticks, std::size_t> MarkAt(Ticks position, std::size_t index)
 
 constexpr std::size_t LastMark = std::numeric_limits<std::size_t>::max();
 
-constexpr Ticks Second = std::chrono::seconds(1); ///< positions are reported once in each
+constexpr Ticks Second = std::chrono::seconds(1); ///< the interval of position reports
 
 } // namespace
 
@@ -98,7 +98,7 @@ bool Playhead::IsForward() const
 bool Playhead::IsRepeating() const
 {
     const TimeLine& timeLine = m_rPlayList.timeLine;
-    // Playing backward turns around at the start, so that everything is still ahead.
+    // Backward playback turns around at the start, so every repeat is still ahead.
     const Ticks from = IsForward() ? m_rState.position : Ticks(0);
     switch (m_rState.chapterTitleRepeat) {
     case bd::TRIGGER_CHP:
@@ -188,8 +188,7 @@ Ticks Playhead::Pass(Ticks time)
 {
     const SpeedRatio ratio = RatioOf(m_rState.currentPlayMode.Speed());
     m_SubTickRemainder += time.count() * ratio.played;
-    const Ticks distance =
-        std::min(DistanceToNextStop(), Ticks(m_SubTickRemainder / ratio.passed));
+    const Ticks distance = std::min(DistanceToNextStop(), Ticks(m_SubTickRemainder / ratio.passed));
     m_SubTickRemainder -= distance.count() * ratio.passed;
     Move(distance);
     return distance;

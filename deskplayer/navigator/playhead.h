@@ -1,6 +1,6 @@
 /**
  * @file
- * Where playback is on the time line of its play list, and what lies ahead.
+ * The position of playback on the time line of its play list, and the next stop.
  */
 #ifndef DESKPLAYER_NAVIGATOR_PLAYHEAD_H
 #define DESKPLAYER_NAVIGATOR_PLAYHEAD_H
@@ -18,10 +18,10 @@ namespace deskplayer
 
 /**
  * Arithmetic on the time line: reads the state of playback, and changes its position and play item.
- * It sends no events, and never leaves the play item except through Enter().
+ * Sends no events. Only JumpTo() and Enter() change the play item.
  *
- * Belongs to the navigator's thread; the queries may be made by the delivering thread as long as
- * the navigator waits for it.
+ * Use it on the navigator's thread. The delivering thread may call the queries while the navigator
+ * waits for it.
  */
 class Playhead
 {
@@ -42,16 +42,16 @@ public:
     /** The active play item; null if the play list has none. */
     const PlayItem* CurrentItem() const;
 
-    /** The streams of the active play item; none while there is no play item. */
+    /** The streams of the active play item; none if there is no play item. */
     const StreamTable& CurrentStreams() const;
 
-    /** The chapter at the position; null before the first, or when there is none. */
+    /** The chapter at the position; null before the first, or if there are none. */
     const Chapter* CurrentChapter() const;
 
-    /** The chapter with this number, which counts from 1; null if there is none. */
+    /** The chapter with this number, from 1; null if there is none. */
     const Chapter* FindChapter(std::uint64_t number) const;
 
-    /** The play item that a position belongs to: the later one where two meet. */
+    /** The play item at a position: the later one where two meet. */
     std::size_t ItemAt(Ticks position) const;
 
     Ticks StartOfItem(std::size_t item) const { return m_rPlayList.timeLine.itemStarts[item]; }
@@ -60,29 +60,28 @@ public:
     /**
      * The marks at the position, as indices into the play list and in its order.
      *
-     * @param firstItem the first play item whose marks count, up to the active one: a mark at OUT
-     *        of an earlier play item lies at the same position
+     * @param firstItem marks of play items from this one to the active one are returned: a mark at
+     *        OUT of an earlier play item has the same position
      */
     std::vector<std::size_t> MarksHere(std::size_t firstItem) const;
 
-    /** The direction of play; while paused, that of the next step. */
+    /** Whether playback runs forward; while paused, whether the next step does. */
     bool IsForward() const;
 
-    /** Whether a repeat lies ahead, so that playback never ends by itself. */
+    /** Whether a repeat lies ahead, so that playback never reaches its end. */
     bool IsRepeating() const;
 
-    /** How far it is to the next position at which something happens, in the direction of play. */
+    /** The distance to the next stop in the direction of play: a position with something to do. */
     Ticks DistanceToNextStop() const;
 
-    /** How long playback takes to the next stop at its current speed, in time of the session. */
+    /** The session time until the next stop at the current speed. */
     Ticks TimeToNextStop() const;
 
     // Movement.
 
     /**
-     * Moves as far as playback gets in this time of the session, at most to the next stop.
-     *
-     * What is too short to be a tick of the play list counts for the next call.
+     * Moves as far as playback gets in this session time, at most to the next stop. A remainder of
+     * less than one tick of the play list is carried over to the next call.
      *
      * @return the distance
      */
@@ -91,13 +90,13 @@ public:
     /** Moves by @p distance in the direction of play. */
     void Move(Ticks distance);
 
-    /** Forgets the time that did not add up to a tick: after a jump or a change of speed. */
+    /** Drops the remainder of Pass(), after a jump or a change of speed. */
     void DropRemainder() { m_SubTickRemainder = 0; }
 
-    /** Moves to a position and to the play item there. @return whether that is another one */
+    /** Moves to a position and its play item. @return whether the play item changed */
     bool JumpTo(Ticks position);
 
-    /** Makes a play item the active one; the position stays. */
+    /** Makes a play item the active one without changing the position. */
     void Enter(std::size_t item);
 
 private:
@@ -107,7 +106,7 @@ private:
 
     const LoadedPlayList& m_rPlayList;
     PlaybackState& m_rState;
-    Ticks::rep m_SubTickRemainder = 0; ///< in parts of a tick, as the speed divides it
+    Ticks::rep m_SubTickRemainder = 0; ///< in units of 1 / SpeedRatio::passed of a tick
 };
 
 } // namespace deskplayer

@@ -1,6 +1,6 @@
 /**
  * @file
- * How fast the steps of bd::PlaySpeedDef are.
+ * The speeds of bd::PlaySpeedDef.
  */
 #ifndef DESKPLAYER_NAVIGATOR_PLAYSPEED_H
 #define DESKPLAYER_NAVIGATOR_PLAYSPEED_H
@@ -12,7 +12,7 @@
 namespace deskplayer
 {
 
-/** So many ticks of the play list pass in so many ticks of the session. */
+/** Ticks of the play list that are played while ticks of the session pass. */
 struct SpeedRatio {
     std::uint64_t played;
     std::uint64_t passed;
@@ -21,9 +21,9 @@ struct SpeedRatio {
 /**
  * The ratio of a speed.
  *
- * Slow motion halves from step to step, down to a thirty-second; fast play is 2, 4, 8, 16, 32, 48,
- * 64, 80, 96, 112, 120 and 128 times normal. Players differ in this; a navigator knows the steps
- * only. A value that is no step plays at normal speed.
+ * Each slow motion step halves the speed, down to 1/32; fast play is 2, 4, 8, 16, 32, 48, 64, 80,
+ * 96, 112, 120 and 128 times normal. Players differ in this; bd::PlaySpeedDef defines only the
+ * steps. A value that is not a step plays at normal speed.
  */
 SpeedRatio RatioOf(bd::PlaySpeedDef speed);
 

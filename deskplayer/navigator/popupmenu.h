@@ -17,7 +17,7 @@ namespace deskplayer
 /**
  * A menu with a button for each chapter, in the order of the chapters. Buttons are numbered from 1.
  *
- * The stream that draws it is not read: the menu is made up from the chapters.
+ * The interactive graphics stream is not read; the menu is derived from the chapters.
  */
 class PopUpMenu
 {
@@ -33,10 +33,10 @@ public:
 
     bool IsOpen() const { return m_Open; }
 
-    /** Opens the menu and selects the button of the current chapter; the first before any. */
+    /** Opens the menu and selects the button of the current chapter, or 1 before the first. */
     void Open();
 
-    /** Closes the menu; does nothing while it is closed. */
+    /** Closes the menu if it is open. */
     void Close();
 
     std::size_t NumberOfButtons() const;
@@ -48,7 +48,7 @@ public:
     /**
      * Hands the program of the selected button to the listeners and closes the menu.
      *
-     * @return the chapter to play from its start, as the program says
+     * @return the chapter that the program plays from its start
      */
     const Chapter& ExecuteSelectedButton();
 

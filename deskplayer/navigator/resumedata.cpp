@@ -8,7 +8,7 @@ namespace
 
 constexpr std::uint32_t Magic = 0x42445231; // "BDR1"
 
-/** FNV-1a: tells a block that was damaged while somebody kept it. */
+/** FNV-1a: detects damage to a stored block. */
 std::uint32_t ChecksumOf(const bd::UInt8* bytes, std::size_t size)
 {
     std::uint32_t sum = 2166136261U;

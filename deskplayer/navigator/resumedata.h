@@ -1,6 +1,6 @@
 /**
  * @file
- * The block that carries playback across a standby.
+ * The resume data: a block that preserves playback across a standby.
  */
 #ifndef DESKPLAYER_NAVIGATOR_RESUMEDATA_H
 #define DESKPLAYER_NAVIGATOR_RESUMEDATA_H
@@ -15,20 +15,20 @@
 namespace deskplayer
 {
 
-/** Where playback stood and how. */
+/** Position and settings of playback at a standby. */
 struct ResumePoint {
     bd::PlayListIdDef playList = 0;
-    bool playing = false; ///< rather than paused, or stopped
+    bool playing = false; ///< false if paused
     bd::PlayItemIdDef playItem = 0;
-    Ticks position{0}; ///< can be the end of the play item, where the next one starts
+    Ticks position{0}; ///< may be the end of the play item, where the next one starts
     bd::PlayMode playMode;
     StreamSelection selection;
 };
 
-/** The block for a resume point: a fixed size, the same bytes on every machine. */
+/** Encodes a resume point. Size and byte order are the same on every machine. */
 std::vector<bd::UInt8> MakeResumeData(const ResumePoint& point);
 
-/** The resume point in a block; nothing when the block is damaged or is not one. */
+/** Decodes a resume point; nothing if the block is damaged or is not resume data. */
 std::optional<ResumePoint> ReadResumeData(const std::vector<bd::UInt8>& block);
 
 } // namespace deskplayer

@@ -1,6 +1,6 @@
 /**
  * @file
- * The listener that carries playback across a standby.
+ * The listener that stores resume data during a standby.
  */
 #ifndef DESKPLAYER_NAVIGATOR_RESUMEDATAKEEPER_H
 #define DESKPLAYER_NAVIGATOR_RESUMEDATAKEEPER_H
@@ -12,12 +12,11 @@
 namespace deskplayer
 {
 
-/** Keeps a copy of the resume data: the context discards its own once the listeners have returned.
- */
+/** Stores a copy of the resume data, which is valid only during the callback. */
 class ResumeDataKeeper : public bdmv::NavigatorListenerAdapter
 {
 public:
-    /** What the last SystemSuspended() brought; empty before. */
+    /** The data of the last SystemSuspended(); empty before the first. */
     const std::vector<bd::UInt8>& ResumeData() const { return m_ResumeData; }
 
     void SystemSuspended(const void* data, bd::UInt32 size) override

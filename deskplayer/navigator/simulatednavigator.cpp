@@ -13,7 +13,7 @@ namespace deskplayer
 namespace
 {
 
-/** SkipToPreviousChapter() jumps to the previous chapter within this time of the start. */
+/** SkipToPreviousChapter() goes to the previous chapter if this one has played for less. */
 constexpr Ticks SkipBackWindow = std::chrono::seconds(3);
 
 } // namespace
@@ -241,7 +241,7 @@ Outcome SimulatedNavigator::SetTrigger(Ticks position)
     const Ticks duration = m_PlayList.timeLine.duration;
     Outcome outcome = m_Permission.CheckActive();
     if (outcome.IsDone() && position > duration) {
-        outcome = Outcome::Refused(TimeText(position) + " is behind the end of the play list, " +
+        outcome = Outcome::Refused(TimeText(position) + " is past the end of the play list, " +
                                    "which lasts " + TimeText(duration));
     }
     return Operate(outcome, [this, position] {

@@ -1,6 +1,6 @@
 /**
  * @file
- * A navigator that plays a play list without a stream.
+ * A navigator that plays a play list without its streams.
  */
 #ifndef DESKPLAYER_NAVIGATOR_SIMULATEDNAVIGATOR_H
 #define DESKPLAYER_NAVIGATOR_SIMULATEDNAVIGATOR_H
@@ -27,14 +27,14 @@ namespace deskplayer
 /**
  * Plays a play list on a virtual clock and sends the events that a navigator would.
  *
- * User operations say what became of them. One that the mask in force forbids, or that makes no
- * sense at that moment, is refused: it sends no event and changes nothing.
+ * User operations return an Outcome. One that the current mask forbids, or that is not possible at
+ * that moment, is refused: it sends no event and changes nothing.
  *
- * Every event has been delivered when an operation returns, with the values of its moment. All
- * operations belong to one thread. They throw what a listener threw.
+ * Every event has been delivered, with the values at that moment, when an operation returns. Call
+ * all operations from one thread. They rethrow exceptions of listeners.
  *
- * Positions are on the time line of the play list. Play items are played in sequence, whatever
- * playback type the play list asks for.
+ * Positions are on the time line of the play list. Play items are played in sequence, whatever the
+ * playback type of the play list.
  */
 class SimulatedNavigator
 {
@@ -49,10 +49,10 @@ public:
 
     Status CurrentStatus() const { return m_State.status; }
 
-    /** Answers the queries of events, and those of a viewer: what plays, which streams, where. */
+    /** Answers queries about playback, streams and position, for events and for callers. */
     PlaybackContext& Context() { return m_Context; }
 
-    /** Whether playback repeats, so that it never ends by itself. */
+    /** @copydoc Playhead::IsRepeating() */
     bool IsRepeating() const { return m_Playhead.IsRepeating(); }
 
     // Time.
@@ -65,30 +65,30 @@ public:
 
     // Playback.
 
-    /** Starts at the beginning. */
+    /** Starts at the beginning of the play list. */
     Outcome Play();
     Outcome Stop();
     Outcome Pause();
 
-    /** Goes on after Pause(), in the play mode that was set last. */
+    /** Continues after Pause(), in the play mode that was set last. */
     Outcome Continue();
 
     /**
-     * Shows the next or the previous picture, as the direction says; only while paused. The
-     * listeners are told of what lies on the way, and then of the step.
+     * Shows the next picture in the direction of play; only while paused. Listeners are notified of
+     * the marks and positions passed, and then of the step.
      */
     Outcome Step();
 
-    /** Takes effect at once while playing, with Continue() while paused. */
+    /** Takes effect at once while playing, and with Continue() while paused. */
     Outcome SetPlayMode(bd::PlayMode mode);
 
-    /** Ends a still and goes on with the next play item. */
+    /** Ends a still and continues with the next play item. */
     Outcome EndStill();
 
-    /** The same, by a program of the disc: no mask forbids it. Does nothing outside of a still. */
+    /** The same, on behalf of a disc program: no mask forbids it. Does nothing outside a still. */
     void LeaveStill() { m_Transport.LeaveStill(); }
 
-    /** Holds playback until Resume(), as a title does that calls a menu. */
+    /** Suspends playback until Resume(), as a title does when it calls a menu. */
     Outcome Suspend();
     Outcome Resume();
 
@@ -98,14 +98,14 @@ public:
     Outcome SearchChapter(std::uint64_t number);
     Outcome SkipToNextChapter();
 
-    /** To the start of this chapter, or of the one before within its first three seconds. */
+    /** Goes to the start of this chapter; within its first three seconds, of the previous one. */
     Outcome SkipToPreviousChapter();
 
     // Repeat and triggers.
 
     Outcome SetPointA();
 
-    /** From now on, playback goes from here back to A. Reports a failure when A is not before it.
+    /** Repeats from A to this position; listeners are notified of a failure unless A is before it.
      */
     Outcome SetPointB();
     Outcome EndABRepeat();
@@ -113,7 +113,7 @@ public:
     Outcome RepeatTitle();
     Outcome EndChapterTitleRepeat();
 
-    /** Has the listeners told when playback gets to @p position, at most the end. */
+    /** Notifies listeners when playback reaches @p position, which may be the end. */
     Outcome SetTrigger(Ticks position);
 
     // Streams.
@@ -134,7 +134,7 @@ public:
 
     Outcome Zoom(const bd::ZOOM_PARAM_Def& zoom);
 
-    // The menu. Its buttons, from 1, each play a chapter from its start.
+    // The menu. Its buttons, numbered from 1, each play a chapter from its start.
 
     Outcome OpenPopUpMenu();
     Outcome ClosePopUpMenu();
@@ -146,13 +146,13 @@ public:
 
     // The system.
 
-    /** Gives the listeners the resume data, and goes to sleep. */
+    /** Sends the system to standby and passes the resume data to the listeners. */
     Outcome GoToStandby();
 
     /**
-     * Comes back from standby, to where playback stood. A still is shown again, in full.
+     * Wakes up from standby at the position where playback was. A still starts again.
      *
-     * @param resumeData what a listener kept of SystemSuspended(); anything else fails
+     * @param resumeData the data that SystemSuspended() passed; any other data makes it fail
      */
     Outcome WakeUp(const std::vector<bd::UInt8>& resumeData);
 
@@ -166,7 +166,7 @@ public:
 
     Outcome FailPreload();
 
-    /** The stream runs dry: playback ends. */
+    /** The stream runs out of data, and playback ends. */
     Outcome Starve();
 
 private:
@@ -179,7 +179,7 @@ private:
         return possible;
     }
 
-    /** The same for an operation that a disc can forbid, which takes precedence as the reason. */
+    /** The same for an operation that a disc can forbid; that reason takes precedence. */
     template <typename Action>
     Outcome Operate(bd::UserOperationMaskDef operation, const Outcome& possible, Action action)
     {

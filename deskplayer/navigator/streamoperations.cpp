@@ -44,7 +44,8 @@ Outcome SimulatedNavigator::SelectAudio(std::uint64_t number)
 Outcome SimulatedNavigator::SelectSubtitle(std::uint64_t number)
 {
     return SelectStream(bd::UserOperationPGTextSTStreamNumberChange, number,
-                        m_Playhead.CurrentStreams().pg.size(), "subtitle stream", m_State.selection.pg);
+                        m_Playhead.CurrentStreams().pg.size(), "subtitle stream",
+                        m_State.selection.pg);
 }
 
 Outcome SimulatedNavigator::ShowSubtitles(bool shown)
@@ -68,8 +69,8 @@ Outcome SimulatedNavigator::SelectStyle(std::uint64_t number)
 
 Outcome SimulatedNavigator::SelectAngle(std::uint64_t number)
 {
-    return SelectStream(bd::UserOperationAngleNumberChange, number, m_Context.ChosenAngle().second, "angle",
-                        m_State.selection.angle);
+    return SelectStream(bd::UserOperationAngleNumberChange, number, m_Context.ChosenAngle().second,
+                        "angle", m_State.selection.angle);
 }
 
 Outcome SimulatedNavigator::SelectSecondaryVideo(std::uint64_t number)
@@ -101,8 +102,8 @@ Outcome SimulatedNavigator::ShowSecondaryAudio(bool shown)
 Outcome SimulatedNavigator::SelectPipSubtitle(std::uint64_t number)
 {
     return SelectStream(bd::UserOperationPiPPGTextSTStreamNumberChange, number,
-                        m_Playhead.CurrentStreams().pipPg.size(), "picture-in-picture subtitle stream",
-                        m_State.selection.pipPg);
+                        m_Playhead.CurrentStreams().pipPg.size(),
+                        "picture-in-picture subtitle stream", m_State.selection.pipPg);
 }
 
 Outcome SimulatedNavigator::PickPipSubtitle(bool pick)
@@ -131,8 +132,9 @@ Outcome SimulatedNavigator::CheckButton(std::uint64_t number) const
 {
     const std::size_t count = m_Menu.NumberOfButtons();
     const Outcome outcome = CheckMenu();
-    return !outcome.IsDone() || (number != 0 && number <= count) ? outcome
-                                                                 : Outcome::NoSuch("button", number, count);
+    return !outcome.IsDone() || (number != 0 && number <= count)
+               ? outcome
+               : Outcome::NoSuch("button", number, count);
 }
 
 Outcome SimulatedNavigator::OpenPopUpMenu()
@@ -141,7 +143,7 @@ Outcome SimulatedNavigator::OpenPopUpMenu()
     if (outcome.IsDone() && m_Playhead.CurrentStreams().ig.empty()) {
         outcome = Outcome::Refused("the play item has no menu");
     } else if (outcome.IsDone() && m_Menu.IsOpen()) {
-        outcome = Outcome::Refused("the menu is open");
+        outcome = Outcome::Refused("the menu is already open");
     }
     return Operate(bd::UserOperationPopupOn, outcome, [this] { m_Menu.Open(); });
 }
@@ -185,7 +187,7 @@ Outcome SimulatedNavigator::SelectAndActivateButton(std::uint64_t number)
     });
 }
 
-/** Hands the program of the button to the listeners, then does what the program says. */
+/** Hands the button's program to the listeners, then carries it out. */
 void SimulatedNavigator::ActivateSelectedButton()
 {
     m_Transport.JumpTo(m_Menu.ExecuteSelectedButton().start);

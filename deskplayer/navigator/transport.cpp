@@ -11,9 +11,9 @@ namespace deskplayer
 namespace
 {
 
-constexpr Ticks Second = std::chrono::seconds(1); ///< positions are reported once in each
+constexpr Ticks Second = std::chrono::seconds(1); ///< the interval of position reports
 
-/** How long a picture is shown, rounded to the nearest tick. */
+/** The duration of a picture, rounded to the nearest tick. */
 Ticks PictureDuration(const std::vector<Stream>& videos)
 {
     switch (videos.empty() ? 0 : videos.front().attributes.frameRate) {
@@ -79,7 +79,7 @@ Ticks Transport::Advance(Ticks time)
     return time;
 }
 
-/** Does what is due at a position that playback has moved to by itself, except leaving it. */
+/** Sends the events of a position that playback has reached, and carries out a repeat there. */
 void Transport::ReachPosition()
 {
     if (m_rState.position % Second == Ticks(0)) {
@@ -123,7 +123,7 @@ void Transport::ReachBackward()
     m_rAnnouncer.AnnounceChapter();
 }
 
-/** @param type of the trigger, for there can be several at the position */
+/** @param type of the trigger, since there can be several at the position */
 void Transport::ReachTrigger(bd::TriggerType type)
 {
     m_rState.triggerReachedTime = m_rState.position;
@@ -132,7 +132,7 @@ void Transport::ReachTrigger(bd::TriggerType type)
     m_rState.triggerReached.reset();
 }
 
-/** Continues where nothing lies ahead in the play item, or before the play list. */
+/** Handles the end of the play item or, playing backward, the start of the play list. */
 void Transport::ReachEnd()
 {
     if (m_rPlayhead.IsForward()) {
@@ -205,7 +205,7 @@ void Transport::AnnounceMarks(std::size_t firstItem)
 // ---------------------------------------------------------------------------------------------
 // Starting and ending
 
-/** Forgets everything but the viewer's selection, and what the listeners know. */
+/** Resets playback except for the viewer's selection, and forgets all announcements. */
 void Transport::StartFresh()
 {
     const StreamSelection selection = m_rState.selection;

@@ -1,6 +1,6 @@
 /**
  * @file
- * Playback as time passes, and every way it moves.
+ * Playback over time: playing, stepping, jumping and repeating.
  */
 #ifndef DESKPLAYER_NAVIGATOR_TRANSPORT_H
 #define DESKPLAYER_NAVIGATOR_TRANSPORT_H
@@ -20,13 +20,13 @@ namespace deskplayer
 {
 
 /**
- * Plays, jumps and repeats, and sends the events on the way. It does what it is told: whether an
- * operation is permitted is checked by its caller.
+ * Plays, jumps and repeats, and sends the resulting events. The caller checks whether an operation
+ * is permitted.
  */
 class Transport
 {
 public:
-    /** All must outlive the transport. */
+    /** All parameters must outlive the transport. */
     Transport(VirtualClock& clock, PlaybackState& state, Playhead& playhead, PopUpMenu& menu,
               Announcer& announcer, EventSender& sender)
         : m_rClock(clock), m_rState(state), m_rPlayhead(playhead), m_rMenu(menu),
@@ -38,48 +38,50 @@ public:
     Transport& operator=(const Transport&) = delete;
 
     /**
-     * The time of the session until playback changes by itself; nothing when it waits for an
-     * operation, or has ended.
+     * The session time until playback changes without an operation; nothing if it waits for an
+     * operation or has ended.
      */
     std::optional<Ticks> TimeToNextChange() const;
 
     /**
-     * Lets time pass, and playback with it.
+     * Advances the clock and playback.
      *
-     * @return how much of @p time was left when playback ended; the clock has not passed it
+     * @return the part of @p time that was left when playback ended; the clock has not advanced by
+     *         it
      */
     Ticks Advance(Ticks time);
 
-    /** Starts at the beginning, with everything announced. */
+    /** Starts at the beginning and announces everything. */
     void Start();
 
-    /** Starts where a resume point says, which lies in the play list. */
+    /** Starts at a resume point, which must lie in the play list. */
     void StartFrom(const ResumePoint& point);
 
     /** Ends playback on request. */
     void Stop();
 
-    /** Ends playback by itself. */
+    /** Ends playback without a request. */
     void Finish(bdstreaming::FinishedReason reason);
 
-    /** Ends a still and plays the next play item; does nothing outside of a still. */
+    /** Ends a still and plays the next play item; does nothing outside a still. */
     void LeaveStill();
 
     /** Sets the play mode and applies it at once. */
     void ChangePlayMode(bd::PlayMode mode);
 
     /**
-     * Moves by one picture and announces what lies on the way. A repeat ends the step at its start.
+     * Moves by one picture and announces the marks and positions passed. A repeat ends the step at
+     * its start.
      */
     void Step();
 
-    /** Whether there is another picture of the play item in the direction of the step. */
+    /** Whether the play item has another picture in the direction of the step. */
     bool CanStep() const;
 
-    /** Moves to a position and announces all that is different there. */
+    /** Moves to a position and announces everything that differs there. */
     void JumpTo(Ticks position);
 
-    /** Jumps in a repeat, after announcing that its end was reached. */
+    /** Announces that the end of a repeat was reached and jumps to its start. */
     void RepeatFrom(Ticks position);
 
 private:

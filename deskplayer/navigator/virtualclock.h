@@ -13,9 +13,8 @@ namespace deskplayer
 {
 
 /**
- * The time since the session began; only Advance() changes it.
- *
- * The navigator's thread advances it, any thread reads it.
+ * The time since the session began. Only the navigator's thread may advance it; any thread may read
+ * it.
  */
 class VirtualClock
 {

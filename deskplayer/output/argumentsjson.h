@@ -13,8 +13,8 @@ namespace deskplayer
 {
 
 /**
- * An object with a member for every argument, in their order. Positions are numbers of ticks of
- * 45 kHz, or null; rectangles are objects.
+ * An object with a member for every argument, in order. Positions are in ticks of 45 kHz, or null;
+ * rectangles are objects.
  */
 nlohmann::ordered_json ArgumentsJson(const Callback& callback);
 

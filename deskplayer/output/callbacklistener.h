@@ -1,6 +1,6 @@
 /**
  * @file
- * Callbacks as values: for listeners that treat all callbacks alike.
+ * Callbacks as values, for listeners that treat all callbacks alike.
  */
 #ifndef DESKPLAYER_OUTPUT_CALLBACKLISTENER_H
 #define DESKPLAYER_OUTPUT_CALLBACKLISTENER_H
@@ -21,11 +21,11 @@ struct Position {
     bd::TimePosition ticks;
 };
 
-/** A value of an argument. Enumerations, sets of them, and bytes travel as their names. */
+/** The value of an argument. Enumerators and sets of them are given by name, bytes in hex. */
 using ArgumentValue = std::variant<bool, std::uint64_t, Position, std::string,
                                    std::vector<std::string>, bd::ZoomRectangleDef>;
 
-/** An argument of a callback, by its name. */
+/** A named argument of a callback. */
 struct Argument {
     const char* name;
     ArgumentValue value;
@@ -37,7 +37,7 @@ struct Callback {
     std::vector<Argument> arguments;
 };
 
-/** Hands every callback on as a value. */
+/** Passes every callback on as a value. */
 class CallbackListener : public bdmv::INavigatorListener
 {
 public:

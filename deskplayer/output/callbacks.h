@@ -1,6 +1,6 @@
 /**
  * @file
- * The callbacks of a navigator's listener: which there are, and who declares them.
+ * The callbacks of a navigator's listener, and the interfaces that declare them.
  */
 #ifndef DESKPLAYER_OUTPUT_CALLBACKS_H
 #define DESKPLAYER_OUTPUT_CALLBACKS_H
@@ -15,11 +15,11 @@ namespace deskplayer
 /** The interface that declares a callback. */
 enum class ListenerInterface { Control, Settings, Button, Interactive };
 
-/** By the value of ListenerInterface. */
+/** Indexed by ListenerInterface. */
 inline constexpr std::array<std::string_view, 4> InterfaceNames{"control", "settings", "button",
                                                                 "interactive"};
 
-// All callbacks, in the order of their declaration. The enumerators and the names come from here.
+// All callbacks in order of declaration: the source of the enumerators and names below.
 #define DESKPLAYER_CALLBACKS(ENTRY)                                                                \
     ENTRY(Control, PlayStarted)                                                                    \
     ENTRY(Control, FirstPictureDelivered)                                                          \
@@ -78,20 +78,20 @@ inline constexpr std::array<std::string_view, 4> InterfaceNames{"control", "sett
     ENTRY(Interactive, InteractiveGraphicsActive)                                                  \
     ENTRY(Interactive, InteractiveGraphicsInactive)
 
-/** Which callback; counts from 0 in the order of their declaration. */
+/** Identifies a callback; numbered from 0 in order of declaration. */
 enum class CallbackId : std::size_t {
 #define DESKPLAYER_ENUMERATOR(interface, name) name,
     DESKPLAYER_CALLBACKS(DESKPLAYER_ENUMERATOR)
 #undef DESKPLAYER_ENUMERATOR
 };
 
-/** What is the same at every call of a callback. */
+/** The properties of a callback. */
 struct CallbackInfo {
     ListenerInterface interface;
     std::string_view name;
 };
 
-/** By the value of CallbackId. */
+/** Indexed by CallbackId. */
 inline constexpr std::array AllCallbacks{
 #define DESKPLAYER_INFO(interface, name) CallbackInfo{ListenerInterface::interface, #name},
     DESKPLAYER_CALLBACKS(DESKPLAYER_INFO)

@@ -1,6 +1,6 @@
 /**
  * @file
- * Callbacks for programs, one JSON object a line.
+ * Callbacks for programs, one JSON object per line.
  */
 #ifndef DESKPLAYER_OUTPUT_JSONOUTPUT_H
 #define DESKPLAYER_OUTPUT_JSONOUTPUT_H
@@ -11,7 +11,7 @@ namespace deskplayer
 {
 
 /**
- * Writes one JSON object a callback, each on a line of its own. docs/outputs.md tells the members.
+ * Writes one JSON object per callback, each on its own line. docs/outputs.md describes the members.
  *
  *     {"ticks":900000,"time":"00:00:20.000","interface":"control","callback":"Paused","arguments":{}}
  */

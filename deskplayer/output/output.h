@@ -1,6 +1,6 @@
 /**
  * @file
- * Callbacks on a stream.
+ * Writes callbacks to a stream.
  */
 #ifndef DESKPLAYER_OUTPUT_OUTPUT_H
 #define DESKPLAYER_OUTPUT_OUTPUT_H
@@ -15,10 +15,10 @@ namespace deskplayer
 {
 
 /**
- * Writes the callbacks that a filter lets through, with the time of the session.
+ * Writes the callbacks that pass a filter, with the time of the session.
  *
- * It writes on the delivering thread and never flushes. What it has written is complete once it is
- * destroyed; whether it reached its destination is for the stream to tell.
+ * Writes on the delivering thread and never flushes. The output is complete once this object is
+ * destroyed; the state of the stream shows whether writing succeeded.
  */
 class Output : public CallbackListener
 {
@@ -40,10 +40,10 @@ protected:
     Ticks Now() const { return m_rClock.Now(); }
 
 private:
-    /** Called for every callback, for outputs that must know what the filter hides. */
+    /** Called for every callback, for outputs that also need those the filter hides. */
     virtual void Follow(const Callback& /*callback*/) {}
 
-    /** Called for every callback that the filter lets through, after Follow(). */
+    /** Called for every callback that passes the filter, after Follow(). */
     virtual void Write(const Callback& callback) = 0;
 
     void OnCallback(const Callback& callback) final

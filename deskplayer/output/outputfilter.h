@@ -1,6 +1,6 @@
 /**
  * @file
- * Which callbacks are written.
+ * Selects the callbacks to write.
  */
 #ifndef DESKPLAYER_OUTPUT_OUTPUTFILTER_H
 #define DESKPLAYER_OUTPUT_OUTPUTFILTER_H
@@ -13,21 +13,21 @@
 namespace deskplayer
 {
 
-/** A set of callbacks: all at first, fewer with every Keep operation. A plain value. */
+/** A set of callbacks: initially all; every Keep operation reduces it. A plain value. */
 class OutputFilter
 {
 public:
     /**
-     * Keeps the callbacks of some interfaces.
+     * Keeps only the callbacks of some interfaces.
      *
      * @param interfaces InterfaceNames separated by commas: "control,settings"
-     * @throw std::invalid_argument names the word that is none and all that there are; the filter
-     *        stays as it is
+     * @throw std::invalid_argument names the unknown word and all valid ones; the filter is
+     *        unchanged
      */
     void KeepInterfaces(std::string_view interfaces);
 
     /**
-     * Keeps some callbacks.
+     * Keeps only some callbacks.
      *
      * @param callbacks names of AllCallbacks separated by commas: "PlayItem,AudioInfo"
      * @throw std::invalid_argument as KeepInterfaces() does

@@ -11,7 +11,7 @@ namespace deskplayer
 OutputFormat ParseOutputFormat(std::string_view name)
 {
     return static_cast<OutputFormat>(
-        FindChoice(name, "output format", {OutputFormatNames.begin(), OutputFormatNames.end()}));
+        FindChoice(name, "an output format", {OutputFormatNames.begin(), OutputFormatNames.end()}));
 }
 
 std::unique_ptr<Output> MakeOutput(const OutputOptions& options, std::ostream& stream,

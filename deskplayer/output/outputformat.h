@@ -1,6 +1,6 @@
 /**
  * @file
- * The formats in which callbacks can be written.
+ * The output formats.
  */
 #ifndef DESKPLAYER_OUTPUT_OUTPUTFORMAT_H
 #define DESKPLAYER_OUTPUT_OUTPUTFORMAT_H
@@ -21,12 +21,12 @@ enum class OutputFormat {
     Trace ///< TraceOutput
 };
 
-/** By the value of OutputFormat. */
+/** Indexed by OutputFormat. */
 inline constexpr std::array<std::string_view, 3> OutputFormatNames{"text", "json", "trace"};
 
 /**
  * @param name one of OutputFormatNames
- * @throw std::invalid_argument names the word that is none and all that there are
+ * @throw std::invalid_argument names the unknown word and all valid ones
  */
 OutputFormat ParseOutputFormat(std::string_view name);
 
@@ -34,7 +34,7 @@ OutputFormat ParseOutputFormat(std::string_view name);
 struct OutputOptions {
     OutputFormat format = OutputFormat::Text;
     OutputFilter filter;
-    bool coloured = false; ///< counts for text only
+    bool coloured = false; ///< for text only
 };
 
 /** @param stream does not throw; it and @p clock must outlive the output */

@@ -11,7 +11,7 @@ namespace deskplayer
 namespace
 {
 
-/** Of the longest callback with arguments, PresentationGraphicsDisplay; others stand alone. */
+/** The length of PresentationGraphicsDisplay, the longest name of a callback with arguments. */
 constexpr std::size_t NameWidth = 27;
 
 // Control sequences of a terminal.

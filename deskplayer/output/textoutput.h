@@ -1,6 +1,6 @@
 /**
  * @file
- * Callbacks as a person reads them.
+ * Callbacks for people to read.
  */
 #ifndef DESKPLAYER_OUTPUT_TEXTOUTPUT_H
 #define DESKPLAYER_OUTPUT_TEXTOUTPUT_H
@@ -13,11 +13,11 @@ namespace deskplayer
 {
 
 /**
- * Writes one line a callback: the time of the session, the callback, and its arguments by name.
+ * Writes one line per callback: the time of the session, the callback, and its arguments by name.
  *
  *     00:00:20.000  Stepped                     position=00:00:20.041 direction=Forward
  *
- * Colours make out the callback, one for each interface; times and names of arguments are dim.
+ * The callback has the colour of its interface; times and names of arguments are dim.
  */
 class TextOutput : public Output
 {
@@ -37,12 +37,12 @@ private:
 };
 
 /**
- * Whether a user wants colours on an open file: it is a terminal, and the user's environment does
- * not forbid them.
+ * Whether a user wants colours on an open file: it is a terminal, and the environment does not
+ * turn colours off.
  *
  * @param fileDescriptor of the file
- * @param noColor        value of the environment variable NO_COLOR, which forbids colours when it
- *                       is not empty; null when it is not set
+ * @param noColor        value of the environment variable NO_COLOR, which turns colours off unless
+ *                       it is empty; null if it is not set
  */
 bool WantsColours(int fileDescriptor, const char* noColor);
 

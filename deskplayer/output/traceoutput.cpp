@@ -11,7 +11,7 @@ namespace deskplayer
 
 using nlohmann::ordered_json;
 
-/** From top to bottom. */
+/** In order from top to bottom. */
 enum class TraceOutput::Track : std::size_t {
     Playback,
     PlayMode,
@@ -27,13 +27,13 @@ enum class TraceOutput::Track : std::size_t {
     SecondaryAudio,
     PipSubtitles,
     Menu,
-    FirstInterface ///< of one for the callbacks of every ListenerInterface
+    FirstInterface ///< followed by one track for every other ListenerInterface
 };
 
 namespace
 {
 
-/** By the value of TraceOutput::Track. */
+/** Indexed by TraceOutput::Track. */
 constexpr std::array<std::string_view, 18> TrackNames{"playback",
                                                       "play mode",
                                                       "play list",
@@ -55,7 +55,7 @@ constexpr std::array<std::string_view, 18> TrackNames{"playback",
 
 constexpr int Process = 1;
 
-/** What a viewer is to know of the process or of one of its threads, which are the tracks. */
+/** A metadata event, which describes the process or one of its threads; the tracks are threads. */
 template <typename Value>
 ordered_json Metadata(const char* name, std::size_t thread, const char* member, const Value& value)
 {
@@ -66,13 +66,13 @@ ordered_json Metadata(const char* name, std::size_t thread, const char* member, 
             {"args", {{member, value}}}};
 }
 
-/** Whole microseconds, which are enough to tell ticks of 45 kHz apart. */
+/** Whole microseconds, which are precise enough to distinguish ticks of 45 kHz. */
 std::uint64_t Microseconds(Ticks time)
 {
     return (time.count() * 200 + 4) / 9;
 }
 
-/** @param name of an argument that the callback has */
+/** @param name of an argument of the callback */
 template <typename Value> const Value& ValueOf(std::string_view name, const Callback& callback)
 {
     const auto argument =
@@ -217,7 +217,7 @@ void TraceOutput::BeginNumbered(Track track, std::string_view number, const Call
           callback);
 }
 
-/** Streams, angles and chapters count from 1: 0 says that there is none. */
+/** Streams, angles and chapters are numbered from 1; 0 means none. */
 void TraceOutput::BeginCounted(Track track, std::string_view number, const Callback& callback)
 {
     if (ValueOf<std::uint64_t>(number, callback) == 0) {
@@ -242,7 +242,7 @@ void TraceOutput::EndPlayback()
     }
 }
 
-/** Says the same at both ends: some viewers find the begin of a slice by what its end says. */
+/** Gives both ends the same members, because some viewers match them by name and arguments. */
 void TraceOutput::AppendSlice(Track track, const char* phase, const Slice& slice)
 {
     AppendEvent(track, phase, {{"name", slice.name}, {"args", ArgumentsJson(slice.callback)}});

@@ -1,6 +1,6 @@
 /**
  * @file
- * Callbacks for viewers of traces.
+ * Callbacks for trace viewers.
  */
 #ifndef DESKPLAYER_OUTPUT_TRACEOUTPUT_H
 #define DESKPLAYER_OUTPUT_TRACEOUTPUT_H
@@ -19,15 +19,15 @@ namespace deskplayer
 {
 
 /**
- * Writes a trace in the JSON array form of the trace-event format: what lasts as slices on tracks
- * of its own, and every callback that the filter lets through as an instant on the track of its
+ * Writes a trace in the JSON array form of the trace-event format: lasting states as slices, one
+ * track each, and every callback that passes the filter as an instant on the track of its
  * interface.
  *
- * The filter does not reach the slices: they would tell of states that had long ended.
+ * The filter does not apply to slices: a state whose end is hidden would seem to last.
  *
- * A slice lasts from the callback that tells of it until another one on its track; those of
- * playback itself end with playback. What is still open ends when the output is destroyed, which
- * completes the trace. Memory does not grow with the session.
+ * A slice lasts from the callback that begins it until the next one on its track; those of playback
+ * itself end with playback. Open slices end when the output is destroyed, which completes the
+ * trace. Memory does not grow with the length of the session.
  */
 class TraceOutput : public Output
 {
@@ -35,7 +35,7 @@ public:
     /** @copydoc Output::Output */
     TraceOutput(std::ostream& stream, const VirtualClock& clock, const OutputFilter& filter);
 
-    /** Completes the trace, at the time at which the clock then stands. */
+    /** Completes the trace at the current time of the clock. */
     ~TraceOutput() override;
 
 private:
@@ -43,12 +43,12 @@ private:
 
     struct Slice {
         std::string name;
-        Callback callback; ///< that told of it
+        Callback callback; ///< that began it
     };
 
     struct TrackState {
         std::string name;
-        bool named = false;         ///< in the trace: only tracks with something on them are
+        bool named = false;         ///< whether the trace names it: only before its first event
         std::optional<Slice> slice; ///< the open one
     };
 
@@ -65,7 +65,7 @@ private:
     void Append(const nlohmann::ordered_json& event);
     TrackState& StateOf(Track track) { return m_Tracks[static_cast<std::size_t>(track)]; }
 
-    std::vector<TrackState> m_Tracks; ///< by the value of Track
+    std::vector<TrackState> m_Tracks; ///< indexed by Track
     const char* m_Separator = "[\n";  ///< before the next event
 };
 

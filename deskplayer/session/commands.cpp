@@ -14,7 +14,7 @@ typedef const std::vector<std::uint64_t>& Values;
 constexpr std::uint64_t SlowSteps = 5;
 constexpr std::uint64_t FastSteps = 12;
 
-/** @param steps above normal speed; below it when negative */
+/** @param steps above normal speed; negative for below it */
 bd::PlayMode ModeOf(bd::PlayDirectionDef direction, std::int64_t steps)
 {
     return bd::PlayMode(direction,
@@ -24,7 +24,7 @@ bd::PlayMode ModeOf(bd::PlayDirectionDef direction, std::int64_t steps)
 Outcome PlayFast(Desk& desk, bd::PlayDirectionDef direction, std::uint64_t steps)
 {
     if (steps == 0 || steps > FastSteps) {
-        return Outcome::Refused("fast play has the steps 1 to " + std::to_string(FastSteps));
+        return Outcome::Refused("fast play has steps 1 to " + std::to_string(FastSteps));
     }
     return desk.Navigator().SetPlayMode(ModeOf(direction, static_cast<std::int64_t>(steps)));
 }
@@ -32,7 +32,7 @@ Outcome PlayFast(Desk& desk, bd::PlayDirectionDef direction, std::uint64_t steps
 Outcome PlaySlowly(Desk& desk, bd::PlayDirectionDef direction, std::uint64_t steps)
 {
     if (steps == 0 || steps > SlowSteps) {
-        return Outcome::Refused("slow motion has the steps 1 to " + std::to_string(SlowSteps));
+        return Outcome::Refused("slow motion has steps 1 to " + std::to_string(SlowSteps));
     }
     return desk.Navigator().SetPlayMode(ModeOf(direction, -static_cast<std::int64_t>(steps)));
 }
@@ -43,7 +43,7 @@ bd::ZoomRectangleDef RectangleOf(Values values, std::size_t first)
             static_cast<bd::UInt16>(values[first + 2]), static_cast<bd::UInt16>(values[first + 3])};
 }
 
-/** The stream behind the selected one, or the first behind the last. */
+/** The number after the selected one, or 1 after the last. */
 template <typename Number>
 std::uint64_t NextOf(Desk& desk, void (PlaybackContext::*get)(Number*, bd::UInt8*))
 {
@@ -64,10 +64,10 @@ const std::vector<Command>& Commands()
         {{"play", "start at the beginning of the play list"},
          [](Desk& d, Values) { return d.Navigator().Play(); }},
         {{"stop", "end playback"}, [](Desk& d, Values) { return d.Navigator().Stop(); }},
-        {{"pause", "hold playback"}, [](Desk& d, Values) { return d.Navigator().Pause(); }},
-        {{"continue", "go on after a pause"},
+        {{"pause", "pause playback"}, [](Desk& d, Values) { return d.Navigator().Pause(); }},
+        {{"continue", "continue after a pause"},
          [](Desk& d, Values) { return d.Navigator().Continue(); }},
-        {{"step", "show the next picture, while paused"},
+        {{"step", "show the next picture while paused"},
          [](Desk& d, Values) { return d.Navigator().Step(); }},
         {{"forward", "play forward at normal speed"},
          [](Desk& d, Values) {
@@ -86,16 +86,17 @@ const std::vector<Command>& Commands()
         {{"backward slow NUMBER", "play backward in slow motion, steps 1 to 5"},
          [](Desk& d, Values v) { return PlaySlowly(d, bd::PlayDirectionBackward, v[0]); }},
         {{"still off", "leave a still"}, [](Desk& d, Values) { return d.Navigator().EndStill(); }},
-        {{"suspend", "hold playback as a title does that calls a menu"},
+        {{"suspend", "suspend playback, as a title does when it calls a menu"},
          [](Desk& d, Values) { return d.Navigator().Suspend(); }},
-        {{"resume", "go on after suspend"}, [](Desk& d, Values) { return d.Navigator().Resume(); }},
+        {{"resume", "resume suspended playback"},
+         [](Desk& d, Values) { return d.Navigator().Resume(); }},
 
         // Position
         {{"seek TIME", "go to a time of the play list"},
          [](Desk& d, Values v) { return d.Navigator().SearchTime(Ticks(v[0])); }},
         {{"chapter next", "go to the next chapter"},
          [](Desk& d, Values) { return d.Navigator().SkipToNextChapter(); }},
-        {{"chapter previous", "go to the start of the chapter, or to the one before"},
+        {{"chapter previous", "go to the start of this chapter or of the previous one"},
          [](Desk& d, Values) { return d.Navigator().SkipToPreviousChapter(); }},
         {{"chapter NUMBER", "go to a chapter"},
          [](Desk& d, Values v) { return d.Navigator().SearchChapter(v[0]); }},
@@ -103,7 +104,7 @@ const std::vector<Command>& Commands()
         // Repeat and triggers
         {{"repeat a", "set the start of an A-B repeat"},
          [](Desk& d, Values) { return d.Navigator().SetPointA(); }},
-        {{"repeat b", "set its end, and repeat from A to here"},
+        {{"repeat b", "set its end, and repeat from A to B"},
          [](Desk& d, Values) { return d.Navigator().SetPointB(); }},
         {{"repeat ab off", "end the A-B repeat"},
          [](Desk& d, Values) { return d.Navigator().EndABRepeat(); }},
@@ -111,9 +112,9 @@ const std::vector<Command>& Commands()
          [](Desk& d, Values) { return d.Navigator().RepeatChapter(); }},
         {{"repeat title", "repeat the play list"},
          [](Desk& d, Values) { return d.Navigator().RepeatTitle(); }},
-        {{"repeat off", "end the repeat of chapter or play list"},
+        {{"repeat off", "end the repeat of the chapter or play list"},
          [](Desk& d, Values) { return d.Navigator().EndChapterTitleRepeat(); }},
-        {{"trigger TIME", "be told when playback gets to a time of the play list"},
+        {{"trigger TIME", "notify listeners when playback reaches a time of the play list"},
          [](Desk& d, Values v) { return d.Navigator().SetTrigger(Ticks(v[0])); }},
 
         // Streams
@@ -145,15 +146,15 @@ const std::vector<Command>& Commands()
          [](Desk& d, Values) { return d.Navigator().ShowSecondaryVideo(true); }},
         {{"pip off", "hide the secondary video"},
          [](Desk& d, Values) { return d.Navigator().ShowSecondaryVideo(false); }},
-        {{"pip audio on", "switch the secondary audio on"},
+        {{"pip audio on", "turn the secondary audio on"},
          [](Desk& d, Values) { return d.Navigator().ShowSecondaryAudio(true); }},
-        {{"pip audio off", "switch the secondary audio off"},
+        {{"pip audio off", "turn the secondary audio off"},
          [](Desk& d, Values) { return d.Navigator().ShowSecondaryAudio(false); }},
         {{"pip audio NUMBER", "select a secondary audio stream"},
          [](Desk& d, Values v) { return d.Navigator().SelectSecondaryAudio(v[0]); }},
-        {{"pip subtitle on", "take subtitles from the picture-in-picture"},
+        {{"pip subtitle on", "show the subtitles of the picture-in-picture"},
          [](Desk& d, Values) { return d.Navigator().PickPipSubtitle(true); }},
-        {{"pip subtitle off", "take subtitles from the film"},
+        {{"pip subtitle off", "show the subtitles of the main video"},
          [](Desk& d, Values) { return d.Navigator().PickPipSubtitle(false); }},
         {{"pip subtitle NUMBER", "select a subtitle stream of the picture-in-picture"},
          [](Desk& d, Values v) { return d.Navigator().SelectPipSubtitle(v[0]); }},
@@ -172,7 +173,8 @@ const std::vector<Command>& Commands()
         // The menu
         {{"menu on", "open the pop-up menu"},
          [](Desk& d, Values) { return d.Navigator().OpenPopUpMenu(); }},
-        {{"menu off", "close it"}, [](Desk& d, Values) { return d.Navigator().ClosePopUpMenu(); }},
+        {{"menu off", "close the pop-up menu"},
+         [](Desk& d, Values) { return d.Navigator().ClosePopUpMenu(); }},
         {{"button previous", "select the button above"},
          [](Desk& d, Values) { return d.Navigator().SelectPreviousButton(); }},
         {{"button next", "select the button below"},
@@ -187,25 +189,25 @@ const std::vector<Command>& Commands()
         // The system
         {{"standby", "send the system to standby"},
          [](Desk& d, Values) { return d.Navigator().GoToStandby(); }},
-        {{"wake", "come back with the resume data that was kept"},
+        {{"wake", "wake up with the stored resume data"},
          [](Desk& d, Values) { return d.Navigator().WakeUp(d.ResumeData()); }},
-        {{"wake without data", "come back without it"},
+        {{"wake without data", "wake up without resume data"},
          [](Desk& d, Values) { return d.Navigator().WakeUp({}); }},
 
         // Failures
-        {{"fail play", "have the next play fail"},
+        {{"fail play", "make the next play fail"},
          [](Desk& d, Values) {
              d.Navigator().FailNextPlay();
              return Outcome::Done();
          }},
-        {{"fail resume", "have the next resume fail"},
+        {{"fail resume", "make the next resume fail"},
          [](Desk& d, Values) {
              d.Navigator().FailNextResume();
              return Outcome::Done();
          }},
-        {{"fail preload", "have preloading fail"},
+        {{"fail preload", "make preloading fail"},
          [](Desk& d, Values) { return d.Navigator().FailPreload(); }},
-        {{"fail stream", "have the stream run dry"},
+        {{"fail stream", "make the stream run out of data"},
          [](Desk& d, Values) { return d.Navigator().Starve(); }},
     };
     return commands;

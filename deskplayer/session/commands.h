@@ -1,6 +1,6 @@
 /**
  * @file
- * The commands that sessions are made of.
+ * The commands of sessions.
  */
 #ifndef DESKPLAYER_SESSION_COMMANDS_H
 #define DESKPLAYER_SESSION_COMMANDS_H
@@ -15,13 +15,13 @@
 namespace deskplayer
 {
 
-/** A command: how it is written, and what it does with the values of its placeholders. */
+/** A command: its syntax, and a function that performs it with the values of the placeholders. */
 struct Command {
     CommandSyntax syntax;
     Outcome (*perform)(Desk& desk, const std::vector<std::uint64_t>& values);
 };
 
-/** All commands, in the order in which help lists them. */
+/** All commands, in the order of the help. */
 const std::vector<Command>& Commands();
 
 /** Their syntaxes, in the same order. */

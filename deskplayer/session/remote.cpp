@@ -20,7 +20,7 @@ namespace
 typedef std::chrono::steady_clock Clock;
 
 constexpr char QuitKey = 'q';
-constexpr char ControlC = '\x03'; ///< quits as well: as a key, for the terminal must be put back
+constexpr char ControlC = '\x03'; ///< a key, not a signal, so that the terminal is restored
 
 Outcome PauseOrContinue(Desk& desk)
 {
@@ -35,18 +35,18 @@ Outcome PlayOrStop(Desk& desk)
                                                                    : desk.Navigator().Stop();
 }
 
-/** One step faster in a direction; the first step from anything else is fast play. */
+/** One step faster in a direction; from another direction or slow motion, the first fast step. */
 Outcome Faster(Desk& desk, bd::PlayDirectionDef direction)
 {
     const bd::PlayMode& mode = desk.Navigator().Context().GetPlayMode();
-    const bool goesOn = mode.Direction() == direction && mode.Speed() >= bd::PlaySpeedNormal;
-    const int speed = goesOn ? std::min<int>(mode.Speed() + 1, bd::PlaySpeedFast12)
-                             : static_cast<int>(bd::PlaySpeedFast1);
+    const bool accelerates = mode.Direction() == direction && mode.Speed() >= bd::PlaySpeedNormal;
+    const int speed = accelerates ? std::min<int>(mode.Speed() + 1, bd::PlaySpeedFast12)
+                                  : static_cast<int>(bd::PlaySpeedFast1);
     return desk.Navigator().SetPlayMode(
         bd::PlayMode(direction, static_cast<bd::PlaySpeedDef>(speed)));
 }
 
-Outcome PerformNamed(Desk& desk, std::string_view pattern)
+Outcome PerformCommand(Desk& desk, std::string_view pattern)
 {
     const auto found =
         std::find_if(Commands().begin(), Commands().end(), [pattern](const Command& command) {
@@ -55,20 +55,20 @@ Outcome PerformNamed(Desk& desk, std::string_view pattern)
     return found->perform(desk, {});
 }
 
-/** Signals that end a program from outside, and that a program can still answer. */
-constexpr std::array<int, 4> EndingSignals = {SIGHUP, SIGINT, SIGQUIT, SIGTERM};
+/** Signals that terminate a program and that it can handle. */
+constexpr std::array<int, 4> TerminatingSignals = {SIGHUP, SIGINT, SIGQUIT, SIGTERM};
 
-/** The terminal to put back when a signal ends the program; there is one remote at a time. */
+/** The terminal to restore when a signal ends the program. Only one remote exists at a time. */
 int g_Terminal = -1;
 termios g_TerminalBefore = {};
 
-extern "C" void PutTerminalBack(int signal)
+extern "C" void RestoreTerminal(int signal)
 {
     tcsetattr(g_Terminal, TCSANOW, &g_TerminalBefore);
-    raise(signal); // its handler is gone: the program ends as it would have without one
+    raise(signal); // SA_RESETHAND removed the handler, so the default action ends the program
 }
 
-/** Has a terminal give single keys without showing them; puts it back as it was. */
+/** Makes a terminal deliver single keys without echo, and restores its settings. */
 class SingleKeys
 {
 public:
@@ -80,13 +80,13 @@ public:
         }
         g_Terminal = m_Terminal;
         g_TerminalBefore = m_Before;
-        struct sigaction putBack = {};
-        putBack.sa_handler = PutTerminalBack;
-        putBack.sa_flags = static_cast<int>(SA_RESETHAND);
-        for (std::size_t i = 0; i < EndingSignals.size(); ++i) {
-            sigaction(EndingSignals[i], nullptr, &m_Actions[i]);
+        struct sigaction restore = {};
+        restore.sa_handler = RestoreTerminal;
+        restore.sa_flags = static_cast<int>(SA_RESETHAND);
+        for (std::size_t i = 0; i < TerminatingSignals.size(); ++i) {
+            sigaction(TerminatingSignals[i], nullptr, &m_Actions[i]);
             if (m_Actions[i].sa_handler == SIG_DFL) {
-                sigaction(EndingSignals[i], &putBack, nullptr);
+                sigaction(TerminatingSignals[i], &restore, nullptr);
             }
         }
         termios single = m_Before;
@@ -102,8 +102,8 @@ public:
             return;
         }
         tcsetattr(m_Terminal, TCSANOW, &m_Before);
-        for (std::size_t i = 0; i < EndingSignals.size(); ++i) {
-            sigaction(EndingSignals[i], &m_Actions[i], nullptr);
+        for (std::size_t i = 0; i < TerminatingSignals.size(); ++i) {
+            sigaction(TerminatingSignals[i], &m_Actions[i], nullptr);
         }
     }
 
@@ -113,11 +113,11 @@ public:
 private:
     int m_Terminal;
     termios m_Before = {};
-    std::array<struct sigaction, EndingSignals.size()> m_Actions = {};
+    std::array<struct sigaction, TerminatingSignals.size()> m_Actions = {};
     bool m_Changed;
 };
 
-/** Milliseconds until something happens by itself, for poll(). */
+/** Milliseconds until the next change without an operation, for poll(). */
 int TimeoutOf(const SimulatedNavigator& navigator)
 {
     const std::optional<Ticks> next = navigator.TimeToNextChange();
@@ -139,32 +139,32 @@ Ticks TimeSince(Clock::time_point start)
 const std::vector<RemoteKey>& RemoteKeys()
 {
     static const std::vector<RemoteKey> keys = {
-        {' ', "pause, continue", PauseOrContinue},
-        {'x', "stop, play", PlayOrStop},
-        {'.', "step", [](Desk& d) { return PerformNamed(d, "step"); }},
+        {' ', "pause/continue", PauseOrContinue},
+        {'x', "stop/play", PlayOrStop},
+        {'.', "step", [](Desk& d) { return PerformCommand(d, "step"); }},
         {'f', "faster", [](Desk& d) { return Faster(d, bd::PlayDirectionForward); }},
         {'r', "faster backward", [](Desk& d) { return Faster(d, bd::PlayDirectionBackward); }},
-        {'w', "normal speed", [](Desk& d) { return PerformNamed(d, "forward"); }},
-        {'n', "next chapter", [](Desk& d) { return PerformNamed(d, "chapter next"); }},
-        {'p', "previous chapter", [](Desk& d) { return PerformNamed(d, "chapter previous"); }},
-        {'o', "leave a still", [](Desk& d) { return PerformNamed(d, "still off"); }},
-        {'a', "next audio", [](Desk& d) { return PerformNamed(d, "audio next"); }},
-        {'s', "next subtitle", [](Desk& d) { return PerformNamed(d, "subtitle next"); }},
-        {'g', "next angle", [](Desk& d) { return PerformNamed(d, "angle next"); }},
-        {'m', "menu", [](Desk& d) { return PerformNamed(d, "menu on"); }},
-        {'c', "close menu", [](Desk& d) { return PerformNamed(d, "menu off"); }},
-        {'k', "button above", [](Desk& d) { return PerformNamed(d, "button previous"); }},
-        {'j', "button below", [](Desk& d) { return PerformNamed(d, "button next"); }},
-        {'e', "enter", [](Desk& d) { return PerformNamed(d, "button activate"); }},
-        {'z', "standby", [](Desk& d) { return PerformNamed(d, "standby"); }},
-        {'Z', "wake up", [](Desk& d) { return PerformNamed(d, "wake"); }},
+        {'w', "normal speed", [](Desk& d) { return PerformCommand(d, "forward"); }},
+        {'n', "next chapter", [](Desk& d) { return PerformCommand(d, "chapter next"); }},
+        {'p', "previous chapter", [](Desk& d) { return PerformCommand(d, "chapter previous"); }},
+        {'o', "leave a still", [](Desk& d) { return PerformCommand(d, "still off"); }},
+        {'a', "next audio", [](Desk& d) { return PerformCommand(d, "audio next"); }},
+        {'s', "next subtitle", [](Desk& d) { return PerformCommand(d, "subtitle next"); }},
+        {'g', "next angle", [](Desk& d) { return PerformCommand(d, "angle next"); }},
+        {'m', "menu", [](Desk& d) { return PerformCommand(d, "menu on"); }},
+        {'c', "close menu", [](Desk& d) { return PerformCommand(d, "menu off"); }},
+        {'k', "button above", [](Desk& d) { return PerformCommand(d, "button previous"); }},
+        {'j', "button below", [](Desk& d) { return PerformCommand(d, "button next"); }},
+        {'e', "enter", [](Desk& d) { return PerformCommand(d, "button activate"); }},
+        {'z', "standby", [](Desk& d) { return PerformCommand(d, "standby"); }},
+        {'Z', "wake up", [](Desk& d) { return PerformCommand(d, "wake"); }},
     };
     return keys;
 }
 
 std::string RemoteHelp()
 {
-    constexpr std::size_t keysInALine = 4;
+    constexpr std::size_t keysPerLine = 4;
     constexpr std::size_t width = 22;
 
     std::ostringstream help;
@@ -174,7 +174,7 @@ std::string RemoteHelp()
         std::string entry = name + " " + key.help;
         entry.resize(std::max(entry.size() + 1, width), ' ');
         help << entry;
-        if (++column % keysInALine == 0) {
+        if (++column % keysPerLine == 0) {
             help << '\n';
         }
     }

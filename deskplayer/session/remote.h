@@ -15,28 +15,28 @@
 namespace deskplayer
 {
 
-/** A key, what it is for, and what it does. */
+/** A key, its description, and its action. */
 struct RemoteKey {
     char key;
     const char* help;
     Outcome (*perform)(Desk& desk);
 };
 
-/** All keys but those that quit, `q` and Ctrl-C. */
+/** All keys except those that quit, `q` and Ctrl-C. */
 const std::vector<RemoteKey>& RemoteKeys();
 
-/** The keys and what they are for, in a few lines. */
+/** The keys and their descriptions, in a few lines. */
 std::string RemoteHelp();
 
 /**
- * Plays in real time under the keys that are read from a terminal, until `q`, Ctrl-C, the end of
- * the input, or the end of playback. What is no terminal is read as it is.
+ * Plays in real time, controlled by keys from a terminal, until `q`, Ctrl-C, the end of the input,
+ * or the end of playback. Input that is not a terminal is read unchanged.
  *
- * The terminal is put back as it was at the end, also when a signal ends the program.
+ * The terminal's settings are restored at the end, even if a signal ends the program.
  *
  * @param keys file descriptor to read single characters from
- * @param onRefused called when a key could not be obeyed, with the reason
- * @throw what a listener threw
+ * @param onRefused called with the reason when the operation of a key was refused
+ * @throw any exception thrown by a listener
  */
 void PlayByRemote(Desk& desk, int keys,
                   const std::function<void(const std::string& reason)>& onRefused);

@@ -17,7 +17,7 @@ namespace
 
 using Words = std::vector<std::string_view>;
 
-/** The words refer to @p text, which tells where they are. */
+/** The words refer to @p text, so their positions in it can be computed. */
 Words SplitAtBlanks(std::string_view text)
 {
     constexpr const char* blanks = " \t";
@@ -31,7 +31,7 @@ Words SplitAtBlanks(std::string_view text)
     return words;
 }
 
-/** A line of the script, and where to find it. */
+/** A line of the script with its file name and number. */
 class Line
 {
 public:
@@ -42,7 +42,7 @@ public:
 
     std::size_t Number() const { return m_Number; }
 
-    /** Without those of the comment. */
+    /** The words before the comment. */
     Words GetWords() const
     {
         for (const char& character : m_Text) {
@@ -55,7 +55,7 @@ public:
         return SplitAtBlanks(m_Text.substr(0, m_Text.find('#')));
     }
 
-    /** @param place in the text of this line, or at its end */
+    /** @param place points into the text of this line, or to its end */
     [[noreturn]] void Fail(const char* place, const std::string& problem) const
     {
         throw ScriptError(m_rFileName, m_Number, std::size_t(place - m_Text.data()) + 1, problem);
@@ -67,7 +67,7 @@ private:
     std::string_view m_Text;
 };
 
-/** Takes the first line off @p text, and its end. */
+/** Removes the first line from @p text, with its line ending. */
 std::string_view TakeLine(std::string_view& text)
 {
     const std::size_t size = std::min(text.find('\n'), text.size());
@@ -83,17 +83,17 @@ constexpr std::string_view NumberPlaceholder = "NUMBER";
 constexpr std::string_view TimePlaceholder = "TIME";
 constexpr std::string_view EndOfLine;
 
-constexpr std::string_view NoCommandHere = "is no command here";
+constexpr std::string_view Unexpected = "unexpected";
 
-/** What a word means in its place. */
+/** The meaning of a word at its position. */
 struct Meaning {
     std::uint64_t value = 0;
     std::string_view problem; ///< empty if the word fits
 };
 
 /**
- * Takes the digits at the front of @p text, if there are any. A number that is too great for the
- * result becomes the greatest one, which is out of range wherever numbers are used.
+ * Removes leading digits from @p text. A number that does not fit the result becomes the greatest
+ * one, which is out of range wherever numbers are used.
  */
 std::optional<std::uint32_t> TakeNumber(std::string_view& text)
 {
@@ -106,7 +106,7 @@ std::optional<std::uint32_t> TakeNumber(std::string_view& text)
     return error == std::errc() ? number : std::numeric_limits<std::uint32_t>::max();
 }
 
-/** Takes @p character off the front of @p text, if it is there. */
+/** Removes @p character from the front of @p text. @return false if it is not there */
 bool TakeCharacter(std::string_view& text, char character)
 {
     const bool found = !text.empty() && text.front() == character;
@@ -118,10 +118,10 @@ Meaning ReadNumber(std::string_view word)
 {
     const auto number = TakeNumber(word);
     if (!number) {
-        return {0, NoCommandHere};
+        return {0, Unexpected};
     }
     if (!word.empty()) {
-        return {0, "is no number"};
+        return {0, "is not a whole number"};
     }
     if (*number > GreatestNumber) {
         return {0, "is not between 0 and 65535"};
@@ -129,7 +129,7 @@ Meaning ReadNumber(std::string_view word)
     return {*number, ""};
 }
 
-/** Takes a decimal fraction off the front of @p text, in thousandths; 0 if there is none. */
+/** Removes a decimal fraction from the front of @p text. @return thousandths; 0 without one */
 std::optional<std::uint64_t> TakeThousandths(std::string_view& text)
 {
     if (!TakeCharacter(text, '.')) {
@@ -145,7 +145,7 @@ std::optional<std::uint64_t> TakeThousandths(std::string_view& text)
     return *number * thousandths[digits - 1];
 }
 
-/** Milliseconds of the unit of a time. */
+/** The number of milliseconds in a unit of time. */
 std::optional<std::uint64_t> ReadUnit(std::string_view unit)
 {
     if (unit == "ms") {
@@ -165,21 +165,21 @@ std::optional<std::uint64_t> ReadUnit(std::string_view unit)
 
 Meaning ReadTime(std::string_view word)
 {
-    constexpr Meaning noTime{0, "is no time"};
+    constexpr Meaning notATime{0, "is not a time"};
 
     const auto first = TakeNumber(word);
     if (!first) {
-        return {0, NoCommandHere};
+        return {0, Unexpected};
     }
     std::uint64_t whole = *first;
     std::size_t colons = 0;
     while (colons < 2 && TakeCharacter(word, ':')) {
         const auto part = TakeNumber(word);
         if (!part) {
-            return noTime;
+            return notATime;
         }
         if (*part > 59) {
-            return {0, "has more than 59 behind a colon"};
+            return {0, "is not a time: minutes and seconds must be below 60"};
         }
         whole = whole * 60 + *part;
         ++colons;
@@ -187,7 +187,7 @@ Meaning ReadTime(std::string_view word)
     const auto thousandths = TakeThousandths(word);
     const auto unit = ReadUnit(word);
     if (!thousandths || !unit || (colons > 0 && !word.empty())) {
-        return noTime;
+        return notATime;
     }
     if (*thousandths * *unit % 1000 != 0) {
         return {0, "is finer than a millisecond"};
@@ -205,7 +205,7 @@ bool IsPlaceholder(std::string_view patternWord)
     return patternWord == NumberPlaceholder || patternWord == TimePlaceholder;
 }
 
-/** Reads @p word where the pattern of a command has @p patternWord. */
+/** Reads @p word as @p patternWord of a command's pattern. */
 Meaning Read(std::string_view patternWord, std::string_view word)
 {
     if (patternWord == NumberPlaceholder) {
@@ -214,18 +214,18 @@ Meaning Read(std::string_view patternWord, std::string_view word)
     if (patternWord == TimePlaceholder) {
         return ReadTime(word);
     }
-    return {0, patternWord == word ? "" : NoCommandHere};
+    return {0, patternWord == word ? "" : Unexpected};
 }
 
 enum Timing { TimingAt, TimingAfter, TimingWithLineBefore };
 
-/** One way to write a line: a command, with or without a time before it. */
+/** A possible form of a line: a command, with or without a time before it. */
 struct Form {
-    Words words; ///< and placeholders
+    Words words; ///< including placeholders
     std::size_t command = 0;
     Timing timing = TimingWithLineBefore;
 
-    /** What stands at @p position, which can be the one behind the last word. */
+    /** The word at @p position; EndOfLine after the last word. */
     std::string_view At(std::size_t position) const
     {
         return position < words.size() ? words[position] : EndOfLine;
@@ -269,7 +269,7 @@ std::string Description(std::string_view patternWord)
     return patternWord == EndOfLine ? "the end of the line" : std::string(patternWord);
 }
 
-/** "; expected next, previous or a NUMBER": what @p forms have at @p position. */
+/** The words of @p forms at @p position, such as "; expected next, previous or a NUMBER". */
 std::string Expectation(const Forms& forms, std::size_t position)
 {
     Words choices;
@@ -288,26 +288,28 @@ std::string Expectation(const Forms& forms, std::size_t position)
     return text;
 }
 
-/** Goes through @p words and drops the forms that each of them rules out. */
+/** Goes through @p words and drops the forms that do not match them. */
 const Form& FindForm(const Line& line, const Words& words, Forms forms)
 {
     for (std::size_t position = 0; position < words.size(); ++position) {
         const std::string_view word = words[position];
-        Forms fitting;
-        std::string_view problem = NoCommandHere;
+        Forms matching;
+        std::string_view problem = Unexpected;
         for (const Form* form : forms) {
             const Meaning meaning = Read(form->At(position), word);
             if (meaning.problem.empty()) {
-                fitting.push_back(form);
-            } else if (meaning.problem != NoCommandHere) {
+                matching.push_back(form);
+            } else if (meaning.problem != Unexpected) {
                 problem = meaning.problem;
             }
         }
-        if (fitting.empty()) {
-            line.Fail(word.data(),
-                      Quoted(word) + " " + std::string(problem) + Expectation(forms, position));
+        if (matching.empty()) {
+            const std::string message = problem == Unexpected
+                                            ? "unexpected " + Quoted(word)
+                                            : Quoted(word) + " " + std::string(problem);
+            line.Fail(word.data(), message + Expectation(forms, position));
         }
-        forms = std::move(fitting);
+        forms = std::move(matching);
     }
     for (const Form* form : forms) {
         if (form->At(words.size()) == EndOfLine) {
@@ -318,7 +320,7 @@ const Form& FindForm(const Line& line, const Words& words, Forms forms)
               "the line ends here" + Expectation(forms, words.size()));
 }
 
-/** When a line is carried out that begins with a time, the word @p word. */
+/** The time of a line that begins with "at" or "after" and the time @p word. */
 Ticks TimeOf(const Line& line, Timing timing, std::string_view word, const ScriptStep& previous)
 {
     const Ticks time(Read(TimePlaceholder, word).value);

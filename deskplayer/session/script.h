@@ -1,17 +1,17 @@
 /**
  * @file
- * Session scripts: what a viewer does, and when.
+ * Session scripts: the viewer's operations and their times.
  *
- * A script is a text of one command a line. `#` begins a comment, blank lines do not count, words
- * are separated by blanks. A line may begin with the time of the session at which it is carried
- * out:
+ * A script is a text with one command per line. `#` begins a comment, blank lines are ignored, and
+ * words are separated by blanks. A line may begin with the time of the session at which it is
+ * carried out:
  *
  *     play
  *     at 00:01:30.500 chapter next    # at this time of the session
- *     after 2s pause                  # this long after the line before
- *     continue                        # together with the line before
+ *     after 2s pause                  # this long after the previous line
+ *     continue                        # at the time of the previous line
  *
- * Times are hours, minutes, seconds and milliseconds, of which all but the seconds may be left out
+ * Times are hours, minutes, seconds and a fraction, of which all but the seconds may be omitted
  * ("1:02:03.5", "02:03", "3.25"), or numbers with a unit ("2s", "500ms", "1.5m", "1h"). They have
  * up to three decimals and are whole milliseconds.
  */
@@ -40,22 +40,22 @@ constexpr Ticks LongestSession = std::chrono::hours(1000);
 constexpr std::uint64_t GreatestNumber = 65535;
 
 /**
- * How a command is written: words as they stand, and placeholders in capitals for values.
+ * The pattern of a command: literal words, and placeholders in capitals for values.
  *
  *     "chapter next"    "chapter NUMBER"    "seek TIME"
  *
  * NUMBER is a decimal number from 0 to 65535, TIME a time as above, given in ticks of 45 kHz. The
  * first word is neither "at" nor "after".
  *
- * Patterns may begin alike, and one may be the beginning of another. Of several that fit a line,
- * the first in the table counts.
+ * Patterns may share their first words, and one may be a prefix of another. If several match a
+ * line, the first in the table is used.
  */
 struct CommandSyntax {
     std::string_view pattern;
-    std::string_view help; ///< what the command does, in a few words
+    std::string_view help; ///< a short description of the command
 };
 
-/** A command that is to be carried out. */
+/** A command to carry out. */
 struct ScriptStep {
     Ticks time{0};                     ///< of the session; never decreases
     std::size_t command = 0;           ///< index of its syntax
@@ -64,19 +64,19 @@ struct ScriptStep {
 };
 
 /**
- * A script that cannot be read. what() is one line without control characters: the file, the line,
- * the column in bytes, what is wrong.
+ * A script is malformed. what() is one line without control characters: the file, the line, the
+ * column in bytes, and the problem.
  *
- *     evening.session:3:9: 'nxt' is no command here; expected next, previous or a NUMBER
+ *     evening.session:3:9: unexpected 'nxt'; expected next, previous or a NUMBER
  */
 class ScriptError : public std::runtime_error
 {
 public:
     /**
-     * @param fileName can hold any bytes
+     * @param fileName may contain any bytes
      * @param line     from 1
      * @param column   from 1
-     * @param problem  is printable
+     * @param problem  printable text
      */
     ScriptError(const std::string& fileName, std::size_t line, std::size_t column,
                 const std::string& problem);
@@ -85,13 +85,13 @@ public:
 /**
  * Reads a script.
  *
- * Lines end in LF or CR LF, the last one may lack it. Comments may hold any bytes but control
- * characters. Time and memory grow with the length of the text.
+ * Lines end in LF or CR LF, which the last line may lack. Comments may contain any bytes except
+ * control characters. Time and memory are linear in the length of the text.
  *
- * @param text     the whole of it
+ * @param text     the whole script
  * @param fileName for messages
- * @param syntaxes all commands there are; their patterns are looked at during the call only
- * @throw ScriptError the first line that is wrong, with all that would have been right in its place
+ * @param syntaxes all commands; their patterns are used only during the call
+ * @throw ScriptError for the first malformed line, with everything that is valid there
  */
 std::vector<ScriptStep> ParseScript(std::string_view text, const std::string& fileName,
                                     const std::vector<CommandSyntax>& syntaxes);

@@ -10,7 +10,7 @@ namespace
 
 constexpr Ticks EndlessStillDuration = std::chrono::seconds(3);
 
-/** Lets time pass, change by change, so that a session in real time shows each when it happens. */
+/** Advances time change by change, so that a session in real time shows each when it happens. */
 void Pass(Ticks time, Desk& desk, const SessionHooks& hooks)
 {
     while (time > Ticks(0)) {
@@ -18,13 +18,13 @@ void Pass(Ticks time, Desk& desk, const SessionHooks& hooks)
         if (hooks.beforeTimePasses) {
             hooks.beforeTimePasses(next);
         }
-        // What is left when playback has ended passes all the same.
+        // The clock also advances by the time left after playback has ended.
         desk.Clock().Advance(desk.Navigator().Advance(next));
         time -= next;
     }
 }
 
-void PassWhileAnythingHappens(Desk& desk, const SessionHooks& hooks)
+void PassUntilNothingChanges(Desk& desk, const SessionHooks& hooks)
 {
     while (!desk.Navigator().IsRepeating()) {
         const std::optional<Ticks> next = desk.Navigator().TimeToNextChange();
@@ -47,14 +47,14 @@ void PlaySession(const std::vector<ScriptStep>& steps, Desk& desk, const Session
             hooks.onRefused(step.line, outcome.Reason());
         }
     }
-    PassWhileAnythingHappens(desk, hooks);
+    PassUntilNothingChanges(desk, hooks);
 }
 
 void PlayFromStartToEnd(Desk& desk, const SessionHooks& hooks)
 {
     desk.Navigator().Play();
     for (;;) {
-        PassWhileAnythingHappens(desk, hooks);
+        PassUntilNothingChanges(desk, hooks);
         if (desk.Navigator().CurrentStatus() != Status::Still) {
             return;
         }

@@ -1,6 +1,6 @@
 /**
  * @file
- * Carrying out a session.
+ * Carries out sessions.
  */
 #ifndef DESKPLAYER_SESSION_SESSION_H
 #define DESKPLAYER_SESSION_SESSION_H
@@ -14,30 +14,29 @@
 namespace deskplayer
 {
 
-/** How a session goes about its time, and whom it tells what it cannot do. */
+/** What a session calls when time passes and when a command is refused. */
 struct SessionHooks {
     /**
      * Called before the clock advances by @p time; a session in real time waits here. May be empty.
      */
     std::function<void(Ticks time)> beforeTimePasses;
 
-    /** Called when a command was refused, with its line and the reason. */
+    /** Called when a command was refused, with its line and the reason. May be empty. */
     std::function<void(std::size_t line, const std::string& reason)> onRefused;
 };
 
 /**
- * Carries out a script, each step at its time, and then lets playback go on to its end, or to where
- * it would stand or go round for ever.
+ * Carries out a script, each step at its time. Afterwards playback continues until it ends, waits
+ * for an operation, or would repeat forever.
  *
- * @throw what a listener threw
+ * @throw any exception thrown by a listener
  */
 void PlaySession(const std::vector<ScriptStep>& steps, Desk& desk, const SessionHooks& hooks);
 
 /**
- * Plays from start to end, without a viewer: a still that would never end is left after three
- * seconds.
+ * Plays from start to end without a viewer: an endless still is left after three seconds.
  *
- * @throw what a listener threw
+ * @throw any exception thrown by a listener
  */
 void PlayFromStartToEnd(Desk& desk, const SessionHooks& hooks);
 

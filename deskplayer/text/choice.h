@@ -1,6 +1,6 @@
 /**
  * @file
- * Words of which a user writes one or several.
+ * Names chosen by a user from a list.
  */
 #ifndef DESKPLAYER_TEXT_CHOICE_H
 #define DESKPLAYER_TEXT_CHOICE_H
@@ -14,22 +14,22 @@ namespace deskplayer
 {
 
 /**
- * Finds the word that a user wrote.
+ * Finds a word that a user wrote among the choices.
  *
- * @param word    exactly as one of @p choices is written
- * @param kind    what a choice is, for the message: "output format"
+ * @param word    must equal one of @p choices exactly
+ * @param kind    what a choice is, with its article, for the message: "an output format"
  * @param choices at least two
- * @return index among @p choices
- * @throw std::invalid_argument "'xml' is no output format; expected text, json or trace"
+ * @return index into @p choices
+ * @throw std::invalid_argument "'xml' is not an output format; expected text, json or trace"
  */
 std::size_t FindChoice(std::string_view word, std::string_view kind,
                        const std::vector<std::string_view>& choices);
 
 /**
- * Finds the words of a list that are separated by commas, such as "control,settings".
+ * Finds the words of a comma-separated list, such as "control,settings".
  *
- * @return their indexes, in the order of the list
- * @throw std::invalid_argument the first word that is wrong, as FindChoice() does
+ * @return their indices, in the order of the list
+ * @throw std::invalid_argument for the first invalid word, as FindChoice() does
  */
 std::vector<std::size_t> FindChoices(std::string_view list, std::string_view kind,
                                      const std::vector<std::string_view>& choices);

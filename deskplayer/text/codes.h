@@ -1,6 +1,6 @@
 /**
  * @file
- * Tables of codes and what they stand for.
+ * Tables of codes and their meanings.
  */
 #ifndef DESKPLAYER_TEXT_CODES_H
 #define DESKPLAYER_TEXT_CODES_H
@@ -12,7 +12,7 @@
 namespace deskplayer
 {
 
-/** A code of a disc and its name. */
+/** A code used on discs and its name. */
 struct CodeName {
     std::uint8_t code;
     const char* name;
@@ -21,13 +21,13 @@ struct CodeName {
 /**
  * The entry of a table whose member `code` equals @p code; null if there is none.
  *
- * @param table an array, which keeps the entry
+ * @param table an array, which the returned pointer refers to
  */
 template <typename Table, typename Code> auto FindCode(const Table& table, const Code& code)
 {
-    const auto entry = std::find_if(std::begin(table), std::end(table), [&code](const auto& candidate) {
-        return candidate.code == code;
-    });
+    const auto entry =
+        std::find_if(std::begin(table), std::end(table),
+                     [&code](const auto& candidate) { return candidate.code == code; });
     return entry == std::end(table) ? nullptr : &*entry;
 }
 

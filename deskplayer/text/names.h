@@ -1,6 +1,6 @@
 /**
  * @file
- * Values as a person reads them. A value without a name gives its number.
+ * Names of values for people to read. A value without a name is given as its number.
  */
 #ifndef DESKPLAYER_TEXT_NAMES_H
 #define DESKPLAYER_TEXT_NAMES_H
@@ -27,10 +27,10 @@ std::string NameOf(bd::AudioChannelType value);
 std::string NameOf(bd::UserOperationMaskDef value);
 std::string NameOf(bdmv::INavControlListener::FinishedReason value);
 
-/** The operations that are forbidden. */
+/** The operations that a mask forbids. */
 std::vector<std::string> NamesOf(const bdmv::UOMaskTable& mask);
 
-/** Two hexadecimal digits a byte. */
+/** Two hexadecimal digits per byte. */
 std::string HexOf(const void* data, bd::UInt32 size);
 
 } // namespace deskplayer

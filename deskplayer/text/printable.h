@@ -1,6 +1,6 @@
 /**
  * @file
- * Text from outside, made safe to print.
+ * Makes text from files and users safe to print.
  */
 #ifndef DESKPLAYER_TEXT_PRINTABLE_H
 #define DESKPLAYER_TEXT_PRINTABLE_H

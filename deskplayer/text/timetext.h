@@ -1,6 +1,6 @@
 /**
  * @file
- * Times as a person reads them.
+ * Times for people to read.
  */
 #ifndef DESKPLAYER_TEXT_TIMETEXT_H
 #define DESKPLAYER_TEXT_TIMETEXT_H

@@ -93,10 +93,10 @@ TEST_F(HostileInput, MayBeAPipeOrAFolderInsteadOfAPlayList)
 {
     fs::remove(playList);
     ASSERT_EQ(mkfifo(playList.c_str(), 0600), 0);
-    ExpectRefusedPlayList("PLAYLIST/00001.mpls: not a regular file, expected one");
+    ExpectRefusedPlayList("PLAYLIST/00001.mpls: expected a regular file");
     fs::remove(playList);
     fs::create_directory(playList);
-    ExpectRefusedPlayList("PLAYLIST/00001.mpls: not a regular file, expected one");
+    ExpectRefusedPlayList("PLAYLIST/00001.mpls: expected a regular file");
 }
 
 TEST_F(HostileInput, MayClaimMorePlayItemsThanItHas)
@@ -149,14 +149,14 @@ TEST_F(HostileInput, MayNameALargeClipInEveryPlayItem)
 
 TEST_F(HostileInput, MayBeAnEndlessOrSilentSession)
 {
-    const std::string tooLong = ": has more than 1048576 bytes, expected a session";
+    const std::string tooLong = ": session too long, expected at most 1048576 bytes";
     ExpectRefusedSession("/dev/zero", "/dev/zero" + tooLong);
     const std::string huge = WriteFile("huge.session", "");
     ResizeSparsely(huge, ThreeGibibytes);
     ExpectRefusedSession(huge, huge + tooLong);
     const std::string silent = folder / "silent.session";
     ASSERT_EQ(mkfifo(silent.c_str(), 0600), 0);
-    ExpectRefusedSession(silent, silent + ": nothing comes out of it, expected a session");
+    ExpectRefusedSession(silent, silent + ": timed out waiting for input");
 }
 
 TEST_F(HostileInput, MayBeASessionOfOneLineOrWord)
@@ -166,12 +166,12 @@ TEST_F(HostileInput, MayBeASessionOfOneLineOrWord)
         words += "a ";
     }
     const std::string line = WriteFile("line.session", words);
-    ExpectRefusedSession(line, line + ":1:1: 'a' is no command here");
+    ExpectRefusedSession(line, line + ":1:1: unexpected 'a'");
     const std::string word = WriteFile("word.session", std::string(deskplayer::LongestScript, 'a'));
     ExpectRefusedSession(word, word + ":1:1: 'aaa");
     const std::string late =
         WriteFile("late.session", std::string(deskplayer::LongestScript - 1, '\n') + "x");
-    ExpectRefusedSession(late, late + ":1048576:1: 'x' is no command here");
+    ExpectRefusedSession(late, late + ":1048576:1: unexpected 'x'");
 }
 
 } // namespace

@@ -158,15 +158,16 @@ TEST_F(DeskPlayerOutput, IsLimitedToTheSelectedInterfacesAndCallbacks)
 TEST_F(DeskPlayerOutput, RefusesUnknownFormatsInterfacesAndCallbacks)
 {
     ExpectUsageError({SampleDisc, "--format", "xml"},
-                     "'xml' is no output format; expected text, json or trace");
+                     "'xml' is not an output format; expected text, json or trace");
     ExpectUsageError({SampleDisc, "--listen", "control,x"},
-                     "'x' is no listener interface; expected control, settings, button or "
+                     "'x' is not a listener interface; expected control, settings, button or "
                      "interactive");
     const ProgramResult result = RunDeskPlayer({SampleDisc, "--only", "PlayItem,Foo"});
     EXPECT_EQ(result.status, 2);
     EXPECT_EQ(result.output, "");
     EXPECT_EQ(
-        result.errors.rfind("bdmv-deskplayer: 'Foo' is no callback; expected PlayStarted, ", 0), 0U)
+        result.errors.rfind("bdmv-deskplayer: 'Foo' is not a callback; expected PlayStarted, ", 0),
+        0U)
         << result.errors;
 }
 

@@ -117,7 +117,7 @@ TEST_F(DeskPlayerPlayback, SkipsAndNamesPlayListsThatCannotBeRead)
 
     EXPECT_EQ(result.status, 0);
     EXPECT_TRUE(
-        std::regex_search(result.errors, std::regex("left out: .*00003\\.mpls: offset 0: .*INDX")))
+        std::regex_search(result.errors, std::regex("skipped: .*00003\\.mpls: offset 0: .*INDX")))
         << result.errors;
     EXPECT_EQ(LastLine(result.output),
               "00:03:02.000  Finished                    reason=EndOfMedia");

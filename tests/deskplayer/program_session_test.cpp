@@ -67,17 +67,17 @@ TEST_F(DeskPlayerSession, ThatCannotBeReadIsRefused)
     EXPECT_EQ(result.status, 2);
     EXPECT_EQ(result.output, "");
     EXPECT_EQ(result.errors.rfind("bdmv-deskplayer: " + wrong +
-                                      ":2:3: 'nxt' is no command here; expected at, after, play, ",
+                                      ":2:3: unexpected 'nxt'; expected at, after, play, ",
                                   0),
               0U)
         << result.errors;
     EXPECT_EQ(LinesOf(result.errors).size(), 1U);
 
-    const std::string noTextFile = ": no session that can be read, expected a text file";
+    const std::string noTextFile = ": cannot read session, expected a text file";
     ExpectUsageError({SampleDisc, "--session", "no.session"}, "no.session" + noTextFile);
     ExpectUsageError({SampleDisc, "--session", folder}, folder.string() + noTextFile);
 
-    const std::string tooLong = ": has more than 1048576 bytes, expected a session";
+    const std::string tooLong = ": session too long, expected at most 1048576 bytes";
     const std::string longFile = WriteFile("long.session", std::string(1024 * 1024 + 1, '\n'));
     ExpectUsageError({SampleDisc, "--session", longFile}, longFile + tooLong);
     ExpectUsageError({SampleDisc, "--session", "/dev/zero"}, "/dev/zero" + tooLong);

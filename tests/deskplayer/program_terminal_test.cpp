@@ -63,7 +63,7 @@ TEST_F(DeskPlayerTerminal, ShowsTheKeysOfTheRemoteAndEndsWithoutInput)
 
     EXPECT_EQ(result.status, 0);
     EXPECT_EQ(result.output, "00:00:00.000  PlayStarted\n");
-    EXPECT_NE(result.errors.find("space pause, continue"), std::string::npos) << result.errors;
+    EXPECT_NE(result.errors.find("space pause/continue"), std::string::npos) << result.errors;
 }
 
 } // namespace

@@ -31,7 +31,7 @@ TEST(DeskPlayerUsage, IsExplained)
     EXPECT_EQ(LinesOf(commands.output).front(),
               "play                                start at the beginning of the play list");
     EXPECT_EQ(LinesOf(commands.output).back(),
-              "fail stream                         have the stream run dry");
+              "fail stream                         make the stream run out of data");
 }
 
 TEST(DeskPlayerUsage, IsRefusedWithStatus2WhenWrong)

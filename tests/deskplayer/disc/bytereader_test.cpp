@@ -55,7 +55,7 @@ TEST(ByteReader, RefusesANumberThatIsCutOff)
     ByteReader reader(bytes, FileName);
     reader.Skip(2, "padding");
     EXPECT_EQ(FormatErrorOf([&] { reader.UInt32("IN time"); }),
-              "file: offset 2: file has 3 bytes left, but expected 4 bytes of IN time");
+              "file: offset 2: file has 3 bytes left, but expected 4 bytes for IN time");
 }
 
 TEST(ByteReader, RefusesTextThatIsCutOff)
@@ -63,7 +63,7 @@ TEST(ByteReader, RefusesTextThatIsCutOff)
     const Bytes bytes = Zeros(1);
     ByteReader reader(bytes, FileName);
     EXPECT_EQ(FormatErrorOf([&] { reader.Text(5, "clip name"); }),
-              "file: offset 0: file has 1 byte left, but expected 5 bytes of clip name");
+              "file: offset 0: file has 1 byte left, but expected 5 bytes for clip name");
 }
 
 TEST(ByteReader, RefusesToSkipBeyondTheEnd)
@@ -71,7 +71,7 @@ TEST(ByteReader, RefusesToSkipBeyondTheEnd)
     const Bytes bytes = Zeros(1);
     ByteReader reader(bytes, FileName);
     EXPECT_EQ(FormatErrorOf([&] { reader.Skip(2, "padding"); }),
-              "file: offset 0: file has 1 byte left, but expected 2 bytes of padding");
+              "file: offset 0: file has 1 byte left, but expected 2 bytes for padding");
 }
 
 TEST(ByteReader, StandsWhereItWasAfterARefusal)
@@ -108,7 +108,7 @@ TEST(ByteReader, KeepsAPartWithinItsLength)
     ByteReader reader(bytes, FileName);
     ByteReader part = reader.TakePart8({"play item", 3});
     EXPECT_EQ(FormatErrorOf([&] { part.UInt16("number"); }),
-              "file: offset 1: play item 3 has 1 byte left, but expected 2 bytes of number");
+              "file: offset 1: play item 3 has 1 byte left, but expected 2 bytes for number");
 }
 
 TEST(ByteReader, RefusesAPartThatIsLongerThanWhatHoldsIt)
@@ -166,7 +166,7 @@ TEST(ByteReader, RefusesAnAddressOfTheEndOfTheFileBecauseNoLengthIsThere)
     const Bytes bytes = U32(4);
     ByteReader reader(bytes, FileName);
     EXPECT_EQ(FormatErrorOf([&] { reader.PartAtAddress(0, {"part"}); }),
-              "file: offset 4: file has 0 bytes left, but expected 4 bytes of length");
+              "file: offset 4: file has 0 bytes left, but expected 4 bytes for length");
 }
 
 TEST(ByteReader, TakesAddressZeroOfAnOptionalPartForNoPart)

@@ -149,7 +149,7 @@ TEST(ParseClipInfo, RefusesCodingInfoThatLacksTheAspectRatio)
                   WithStream(Part8({0x1B, 0x61}));
               }),
               "BDMV/CLIPINF/00001.clpi: offset 213: coding info of stream 0 has 0 bytes left, but "
-              "expected 1 byte of aspect ratio");
+              "expected 1 byte for aspect ratio");
 }
 
 TEST(ParseClipInfo, ReadsVideoBesidePadding)

@@ -63,7 +63,7 @@ TEST_F(DiscFiles, IsNotFoundInAFolderWithoutBdmv)
     const fs::path folder = m_Folder / "else\nwhere";
     EXPECT_EQ(FileErrorOf([&] { Disc disc(folder); }),
               (m_Folder / "else").string() +
-                  "\\x0Awhere: no disc, expected a folder that holds BDMV or is it");
+                  "\\x0Awhere: not a disc, expected a BDMV folder or its parent");
 }
 
 TEST_F(DiscFiles, ListsPlayListsOfFiveDigitsInOrder)
@@ -98,10 +98,10 @@ TEST_F(DiscFiles, ReportsWhatIsNotARegularFile)
 {
     fs::create_directory(PathOf("index.bdmv"));
     EXPECT_EQ(FileErrorOf([&] { MakeDisc().ReadIndex(); }),
-              PathOf("index.bdmv").string() + ": not a regular file, expected one");
+              PathOf("index.bdmv").string() + ": expected a regular file");
     fs::create_symlink("/dev/zero", PathOf("MovieObject.bdmv"));
     EXPECT_EQ(FileErrorOf([&] { MakeDisc().ReadMovieObjects(); }),
-              PathOf("MovieObject.bdmv").string() + ": not a regular file, expected one");
+              PathOf("MovieObject.bdmv").string() + ": expected a regular file");
 }
 
 TEST_F(DiscFiles, RefusesAFileThatIsTooLarge)
@@ -278,13 +278,13 @@ TEST_F(DiscFiles, SaysWhichPlayListsWereLeftOutOfTheSearch)
               (std::vector<std::string>{
                   "BDMV/PLAYLIST/00000.mpls: offset 0: type indicator is \"dama\", but expected "
                   "\"MPLS\"",
-                  PathOf("PLAYLIST/00002.mpls").string() + ": not a regular file, expected one"}));
+                  PathOf("PLAYLIST/00002.mpls").string() + ": expected a regular file"}));
 }
 
 TEST_F(DiscFiles, ReportsThatThereIsNoPlayList)
 {
     EXPECT_EQ(FileErrorOf([&] { MakeDisc().FindLongestPlayList(); }),
-              PathOf("PLAYLIST").string() + ": no play list, expected files like 00000.mpls");
+              PathOf("PLAYLIST").string() + ": no play list, expected files such as 00000.mpls");
 }
 
 TEST_F(DiscFiles, ReportsThatNoPlayListCanBeRead)
@@ -293,7 +293,7 @@ TEST_F(DiscFiles, ReportsThatNoPlayListCanBeRead)
     EXPECT_EQ(FileErrorOf([&] { MakeDisc().FindLongestPlayList(); }),
               PathOf("PLAYLIST").string() +
                   ": no play list can be read: BDMV/PLAYLIST/00000.mpls: offset 0: file has 0 "
-                  "bytes left, but expected 4 bytes of type indicator");
+                  "bytes left, but expected 4 bytes for type indicator");
 }
 
 } // namespace

@@ -109,7 +109,7 @@ TEST(ParsePlayList, RefusesAnotherType)
 TEST(ParsePlayList, RefusesAnEmptyFile)
 {
     EXPECT_EQ(FormatErrorOf([] { ParsePlayList({}, FileName); }),
-              "BDMV/PLAYLIST/00000.mpls: offset 0: file has 0 bytes left, but expected 4 bytes of "
+              "BDMV/PLAYLIST/00000.mpls: offset 0: file has 0 bytes left, but expected 4 bytes for "
               "type indicator");
 }
 
@@ -386,7 +386,7 @@ TEST(ParsePlayList, NamesTheStreamThatIsCutOff)
     const Bytes streams = Join({AudioStream(0x1100), entry, StreamAttributesBytes(0x81, Zeros(4))});
     EXPECT_EQ(ErrorOf(WithStreams({0, 2, 0, 0, 0, 0, 0, 0}, streams)),
               "BDMV/PLAYLIST/00000.mpls: offset 136: primary audio stream 1 has 1 byte left, but "
-              "expected 2 bytes of PID");
+              "expected 2 bytes for PID");
 }
 
 TEST(ParsePlayList, ReadsAnEntryOfTypeOne)
@@ -538,7 +538,7 @@ TEST(ParsePlayList, RefusesMoreSubPathsThanThereAre)
     PlayListBytes bytes = WithItem(PlayItemBytes());
     bytes.subPathCount = 1;
     EXPECT_EQ(ErrorOf(bytes), "BDMV/PLAYLIST/00000.mpls: offset 118: play list section has 0 bytes "
-                              "left, but expected 4 bytes of length");
+                              "left, but expected 4 bytes for length");
     bytes.subPathCount = 65535;
     EXPECT_EQ(ErrorOf(bytes), "BDMV/PLAYLIST/00000.mpls: offset 66: number of sub paths is 65535, "
                               "but expected at most 5 in the 50 bytes left in play list section");

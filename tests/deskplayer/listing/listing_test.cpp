@@ -492,7 +492,7 @@ TEST(ListPlayLists, SaysThatThereIsNoPlayList)
     const ScratchDisc scratch("pip");
     scratch.Remove("PLAYLIST/00000.mpls");
     const std::string listing = ListingOf(scratch.Read());
-    EXPECT_EQ(listing.substr(listing.find("\n\n")), "\n\nThere is no play list.\n");
+    EXPECT_EQ(listing.substr(listing.find("\n\n")), "\n\nThere are no play lists.\n");
 }
 
 TEST(ListPlayLists, WritesTheGreatestPlayListsPromptly)

@@ -61,7 +61,7 @@ TEST(Menu, IsRefusedWhenItIsOpenOrWhenThereIsNone)
     TestDesk desk(ThreeChapters());
     desk.Start();
     desk.Do(desk.navigator.OpenPopUpMenu());
-    EXPECT_EQ(desk.navigator.OpenPopUpMenu().Reason(), "the menu is open");
+    EXPECT_EQ(desk.navigator.OpenPopUpMenu().Reason(), "the menu is already open");
 
     desk.Do(desk.navigator.SearchTime(11 * Second));
     EXPECT_EQ(desk.navigator.OpenPopUpMenu().Reason(), "the play item has no menu");
@@ -133,11 +133,11 @@ TEST(Menu, MovesBetweenButtonsWithoutTelling)
     desk.Do(desk.navigator.OpenPopUpMenu());
 
     EXPECT_EQ(desk.navigator.SelectPreviousButton().Reason(),
-              "there is no button 0, they count from 1 to 3");
+              "no button 0; buttons are numbered 1 to 3");
     EXPECT_TRUE(desk.navigator.SelectNextButton().IsDone());
     EXPECT_TRUE(desk.navigator.SelectNextButton().IsDone());
     EXPECT_EQ(desk.navigator.SelectNextButton().Reason(),
-              "there is no button 4, they count from 1 to 3");
+              "no button 4; buttons are numbered 1 to 3");
     EXPECT_TRUE(desk.navigator.SelectPreviousButton().IsDone());
     EXPECT_EQ(desk.Take(), "");
 
@@ -154,10 +154,9 @@ TEST(Menu, SelectsAButtonByItsNumber)
     desk.Do(desk.navigator.OpenPopUpMenu());
 
     EXPECT_TRUE(desk.navigator.SelectButton(3).IsDone());
-    EXPECT_EQ(desk.navigator.SelectButton(0).Reason(),
-              "there is no button 0, they count from 1 to 3");
+    EXPECT_EQ(desk.navigator.SelectButton(0).Reason(), "no button 0; buttons are numbered 1 to 3");
     EXPECT_EQ(desk.navigator.SelectButton(65539).Reason(),
-              "there is no button 65539, they count from 1 to 3");
+              "no button 65539; buttons are numbered 1 to 3");
     EXPECT_EQ(desk.Take(), "");
 
     desk.Do(desk.navigator.ActivateButton());
@@ -170,7 +169,7 @@ TEST(Menu, SelectsAButtonAndActivatesIt)
     desk.Start(Second);
     desk.Do(desk.navigator.OpenPopUpMenu());
     EXPECT_EQ(desk.navigator.SelectAndActivateButton(4).Reason(),
-              "there is no button 4, they count from 1 to 3");
+              "no button 4; buttons are numbered 1 to 3");
 
     EXPECT_TRUE(desk.navigator.SelectAndActivateButton(3).IsDone());
 
@@ -251,9 +250,8 @@ TEST(Menu, HasNoButtonsWhereThereAreNoChapters)
     desk.Start();
     desk.Do(desk.navigator.OpenPopUpMenu());
 
-    EXPECT_EQ(desk.navigator.ActivateButton().Reason(), "there is no button 1, there is none here");
-    EXPECT_EQ(desk.navigator.SelectNextButton().Reason(),
-              "there is no button 2, there is none here");
+    EXPECT_EQ(desk.navigator.ActivateButton().Reason(), "no button 1; there are no buttons");
+    EXPECT_EQ(desk.navigator.SelectNextButton().Reason(), "no button 2; there are no buttons");
     EXPECT_EQ(desk.Take(), "");
 }
 
@@ -263,7 +261,7 @@ TEST(Menu, WaitsWhilePlaybackIsSuspended)
     desk.Start();
     desk.Do(desk.navigator.OpenPopUpMenu());
     desk.Do(desk.navigator.Suspend());
-    const std::string suspended = "playback is suspended, not playing or paused or in a still";
+    const std::string suspended = "not playing or paused or in a still, but suspended";
 
     EXPECT_EQ(desk.navigator.ClosePopUpMenu().Reason(), suspended);
     EXPECT_EQ(desk.navigator.SelectPreviousButton().Reason(), suspended);

@@ -12,7 +12,8 @@ namespace
 
 PlayList ForbiddingList()
 {
-    PlayList list = ListOf({Forbidding(Item(10), {bd::UserOperationStop, bd::UserOperationPauseOn})});
+    PlayList list =
+        ListOf({Forbidding(Item(10), {bd::UserOperationStop, bd::UserOperationPauseOn})});
     list.applicationInfo.uoMask = MaskOf({bd::UserOperationStop, bd::UserOperationTimeSearch});
     return list;
 }
@@ -58,7 +59,7 @@ TEST_F(PermissionWhilePlaying, DependsOnTheStatus)
     EXPECT_TRUE(permission.CheckStatus({Status::Playing}).IsDone());
     EXPECT_TRUE(permission.CheckStatus({Status::Paused, Status::Playing}).IsDone());
     EXPECT_EQ(permission.CheckStatus({Status::Paused, Status::Still}).Reason(),
-              "playback is playing, not paused or in a still");
+              "not paused or in a still, but playing");
 }
 
 TEST_F(PermissionWhilePlaying, IsActiveWhileThereIsAPicture)

@@ -180,13 +180,13 @@ TEST(Position, RefusesChaptersThatAreNotThere)
     const std::string before = desk.Snapshot();
 
     EXPECT_EQ(desk.navigator.SearchChapter(0).Reason(),
-              "there is no chapter 0, they count from 1 to 4");
+              "no chapter 0; chapters are numbered 1 to 4");
     EXPECT_EQ(desk.navigator.SearchChapter(5).Reason(),
-              "there is no chapter 5, they count from 1 to 4");
+              "no chapter 5; chapters are numbered 1 to 4");
     EXPECT_EQ(desk.navigator.SearchChapter(65537).Reason(),
-              "there is no chapter 65537, they count from 1 to 4");
+              "no chapter 65537; chapters are numbered 1 to 4");
     EXPECT_EQ(desk.navigator.SkipToNextChapter().Reason(),
-              "there is no chapter 5, they count from 1 to 4");
+              "no chapter 5; chapters are numbered 1 to 4");
     EXPECT_EQ(desk.Take(), "");
     EXPECT_EQ(desk.Snapshot(), before);
 }
@@ -197,10 +197,9 @@ TEST(Position, RefusesToSkipWhereThereAreNoChapters)
     desk.Start(Second);
     const std::string before = desk.Snapshot();
 
-    EXPECT_EQ(desk.navigator.SkipToNextChapter().Reason(),
-              "there is no chapter 1, there is none here");
+    EXPECT_EQ(desk.navigator.SkipToNextChapter().Reason(), "no chapter 1; there are no chapters");
     EXPECT_EQ(desk.navigator.SkipToPreviousChapter().Reason(),
-              "there is no chapter 0, there is none here");
+              "no chapter 0; there are no chapters");
     EXPECT_EQ(desk.Take(), "");
     EXPECT_EQ(desk.Snapshot(), before);
 }

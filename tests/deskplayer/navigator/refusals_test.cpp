@@ -61,14 +61,14 @@ const std::vector<std::pair<Status, std::string>> AllStatuses = {
     {Status::Stopped, "stopped"},     {Status::Playing, "playing"},
     {Status::Paused, "paused"},       {Status::Still, "in a still"},
     {Status::Suspended, "suspended"}, {Status::Standby, "in standby"},
-    {Status::Finished, "at its end"}};
+    {Status::Finished, "finished"}};
 
 /** Operations that are carried out in some statuses and refused in all others. */
 struct StatusRule {
     const char* name;
     Operation operation;
     std::vector<Status> statuses;
-    const char* expected; ///< the end of the message
+    const char* expected; ///< the statuses as the message lists them
 };
 
 typedef std::pair<const char*, Operation> NamedOperation;
@@ -96,7 +96,7 @@ std::vector<StatusRule> StatusRules()
         {"Play",
          [](TestDesk& d) { return d.navigator.Play(); },
          {Status::Stopped, Status::Finished},
-         "stopped or at its end"},
+         "stopped or finished"},
         {"Pause", [](TestDesk& d) { return d.navigator.Pause(); }, {Status::Playing}, "playing"},
         {"Continue",
          [](TestDesk& d) { return d.navigator.Continue(); },
@@ -176,7 +176,7 @@ TEST(Refusals, SayWhichStatusAnOperationNeeds)
                 EXPECT_TRUE(outcome.IsDone()) << outcome.Reason();
                 continue;
             }
-            EXPECT_EQ(outcome.Reason(), "playback is " + name + ", not " + rule.expected);
+            EXPECT_EQ(outcome.Reason(), "not " + std::string(rule.expected) + ", but " + name);
             EXPECT_EQ(desk.Take(), "");
             EXPECT_EQ(desk.Snapshot(), before);
         }
@@ -368,7 +368,7 @@ TEST(Refusals, DoNotComeFromTheMaskOfAPlaybackThatIsOver)
         playList.applicationInfo.uoMask = MaskOf({bd::UserOperationTimeSearch});
         TestDesk desk(playList);
         Bring(desk, status);
-        EXPECT_EQ(desk.navigator.SearchTime(Ticks(0)).Reason().rfind("playback is ", 0), 0);
+        EXPECT_EQ(desk.navigator.SearchTime(Ticks(0)).Reason().rfind("not playing ", 0), 0);
     }
 }
 

@@ -413,7 +413,7 @@ TEST(Trigger, IsRefusedBehindTheEndOfThePlayList)
     const std::string before = desk.Snapshot();
 
     EXPECT_EQ(desk.navigator.SetTrigger(20 * Second + Ticks(45)).Reason(),
-              "00:00:20.001 is behind the end of the play list, which lasts 00:00:20.000");
+              "00:00:20.001 is past the end of the play list, which lasts 00:00:20.000");
 
     EXPECT_EQ(desk.Take(), "");
     EXPECT_EQ(desk.Snapshot(), before);

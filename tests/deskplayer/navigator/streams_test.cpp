@@ -75,8 +75,8 @@ TEST(Streams, ThatAreNotThereAreRefused)
 
         for (const std::uint64_t number : std::vector<std::uint64_t>{0, 3, 257, 65537}) {
             EXPECT_EQ((desk.navigator.*selection.select)(number).Reason(),
-                      "there is no " + std::string(selection.what) + " " + std::to_string(number) +
-                          ", they count from 1 to 2");
+                      "no " + std::string(selection.what) + " " + std::to_string(number) + "; " +
+                          selection.what + "s are numbered 1 to 2");
         }
         EXPECT_EQ(desk.Take(), "");
         EXPECT_EQ(desk.Snapshot(), before);
@@ -90,11 +90,10 @@ TEST(Streams, CannotBeSelectedWhereThereAreNone)
         TestDesk desk(ListOf({Item(10)}));
         desk.Start(Second);
 
-        const std::string none = selection.select == &SimulatedNavigator::SelectAngle
-                                     ? ", they count from 1 to 1"
-                                     : ", there is none here";
+        const std::string what = selection.what;
         EXPECT_EQ((desk.navigator.*selection.select)(2).Reason(),
-                  "there is no " + std::string(selection.what) + " 2" + none);
+                  "no " + what + " 2; " +
+                      (what == "angle" ? "the only angle is 1" : "there are no " + what + "s"));
         EXPECT_EQ(desk.Take(), "");
     }
 }
@@ -192,9 +191,9 @@ TEST(Streams, OfTextHaveFourStyles)
     const std::string before = desk.Snapshot();
 
     EXPECT_EQ(desk.navigator.SelectStyle(0).Reason(),
-              "there is no text subtitle style 0, they count from 1 to 4");
+              "no text subtitle style 0; text subtitle styles are numbered 1 to 4");
     EXPECT_EQ(desk.navigator.SelectStyle(5).Reason(),
-              "there is no text subtitle style 5, they count from 1 to 4");
+              "no text subtitle style 5; text subtitle styles are numbered 1 to 4");
     EXPECT_EQ(desk.Take(), "");
     EXPECT_EQ(desk.Snapshot(), before);
 
@@ -211,7 +210,7 @@ TEST(Streams, WithoutTextHaveNoStyles)
     desk.Start();
 
     EXPECT_EQ(desk.navigator.SelectStyle(1).Reason(),
-              "there is no text subtitle style 1, there is none here");
+              "no text subtitle style 1; there are no text subtitle styles");
 
     desk.navigator.Advance(10 * Second);
     EXPECT_EQ(desk.TakeWithoutPositions(),

@@ -82,7 +82,7 @@ TEST(OutputFilter, NamesAnUnknownInterfaceAndThoseThereAre)
     OutputFilter filter;
 
     EXPECT_EQ(MessageOf([&] { filter.KeepInterfaces("control,buttons"); }),
-              "'buttons' is no listener interface; expected control, settings, button or "
+              "'buttons' is not a listener interface; expected control, settings, button or "
               "interactive");
 }
 
@@ -91,7 +91,8 @@ TEST(OutputFilter, NamesAnUnknownCallbackAndThoseThereAre)
     OutputFilter filter;
     const std::string message = MessageOf([&] { filter.KeepCallbacks("PlayItem,playitem"); });
 
-    EXPECT_EQ(message.rfind("'playitem' is no callback; expected PlayStarted, ", 0), 0U) << message;
+    EXPECT_EQ(message.rfind("'playitem' is not a callback; expected PlayStarted, ", 0), 0U)
+        << message;
     for (const CallbackInfo& info : AllCallbacks) {
         EXPECT_NE(message.find(' ' + std::string(info.name)), std::string::npos) << info.name;
     }

@@ -33,7 +33,7 @@ TEST(OutputFormat, NamesAnUnknownNameAndThoseThereAre)
         ParseOutputFormat("xml");
         FAIL() << "no error";
     } catch (const std::invalid_argument& error) {
-        EXPECT_STREQ(error.what(), "'xml' is no output format; expected text, json or trace");
+        EXPECT_STREQ(error.what(), "'xml' is not an output format; expected text, json or trace");
     }
 }
 

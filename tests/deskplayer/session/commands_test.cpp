@@ -247,10 +247,10 @@ TEST(Commands, PlayAtEveryStepOfSpeedAndNoOther)
         int steps;
         const char* refusal;
     } kinds[] = {
-        {"forward fast ", bd::PlayDirectionForward, 1, 12, "fast play has the steps 1 to 12"},
-        {"forward slow ", bd::PlayDirectionForward, -1, 5, "slow motion has the steps 1 to 5"},
-        {"backward fast ", bd::PlayDirectionBackward, 1, 12, "fast play has the steps 1 to 12"},
-        {"backward slow ", bd::PlayDirectionBackward, -1, 5, "slow motion has the steps 1 to 5"}};
+        {"forward fast ", bd::PlayDirectionForward, 1, 12, "fast play has steps 1 to 12"},
+        {"forward slow ", bd::PlayDirectionForward, -1, 5, "slow motion has steps 1 to 5"},
+        {"backward fast ", bd::PlayDirectionBackward, 1, 12, "fast play has steps 1 to 12"},
+        {"backward slow ", bd::PlayDirectionBackward, -1, 5, "slow motion has steps 1 to 5"}};
     for (const auto& kind : kinds) {
         SCOPED_TRACE(kind.words);
         TestDesk desk(TwoItems());
@@ -295,9 +295,9 @@ TEST(Commands, RefuseTheNextOfNoStreams)
     desk.Start();
 
     EXPECT_EQ(Perform(desk, "audio next").Reason(),
-              "there is no audio stream 1, there is none here");
+              "no audio stream 1; there are no audio streams");
     EXPECT_EQ(Perform(desk, "subtitle next").Reason(),
-              "there is no subtitle stream 1, there is none here");
+              "no subtitle stream 1; there are no subtitle streams");
     EXPECT_TRUE(Perform(desk, "angle next").IsDone()) << "there is always one";
     EXPECT_EQ(desk.Take(), "");
 }

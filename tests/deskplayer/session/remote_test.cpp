@@ -126,7 +126,7 @@ TEST(Remote, PerformsTheActionOfEveryKey)
          "PlaySpeedNormal)\nPictureInPictureAvailable()\nSecondaryAudioAvailable()\n"},
         {"", 'n', "JumpOccurred()\nMarkInfo(7, 1, 27000000)\nChapterNumber(2)\n"},
         {"n", 'p', "JumpOccurred()\nMarkInfo(7, 0, 0)\nChapterNumber(1)\n"},
-        {"", 'o', "playback is playing, not in a still\n"},
+        {"", 'o', "not in a still, but playing\n"},
         {"", 'a',
          "AudioInfo(2)\nAudioInfoChanged(true, (AudioFormatPcm, AudioSampleRateUnknown, "
          "AudioBitsPerSamplingTypeInvalid, AudioChannelTypeUnknown, 4353, 0))\n"},
@@ -134,14 +134,14 @@ TEST(Remote, PerformsTheActionOfEveryKey)
         {"", 'g', "AngleInfo(2)\n"},
         {"", 'm', "InteractiveGraphicsActive()\nInteractiveGraphicsVisible()\n"},
         {"m", 'c', "InteractiveGraphicsInvisible()\nInteractiveGraphicsInactive()\n"},
-        {"m", 'k', "there is no button 0, they count from 1 to 2\n"},
-        {"mj", 'j', "there is no button 3, they count from 1 to 2\n"},
+        {"m", 'k', "no button 0; buttons are numbered 1 to 2\n"},
+        {"mj", 'j', "no button 3; buttons are numbered 1 to 2\n"},
         {"mj", 'e',
          "ButtonActivationBusy()\nExecuteButton(1, 2, program shared by 2)\n"
          "ButtonActivationDone()\nInteractiveGraphicsInvisible()\nInteractiveGraphicsInactive()\n"
          "JumpOccurred()\nMarkInfo(7, 1, 27000000)\nChapterNumber(2)\n"},
         {"", 'z', nullptr}, // tells a position of the wall clock
-        {"", 'Z', "playback is playing, not in standby\n"},
+        {"", 'Z', "not in standby, but playing\n"},
     };
     std::set<char> keys;
     for (const KeyExample& example : examples) {

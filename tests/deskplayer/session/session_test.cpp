@@ -21,8 +21,7 @@ protected:
     {
         std::string heard;
         SessionHooks hooks = desk.Hooks();
-        hooks.beforeTimePasses = [this, &desk,
-                                  count = hooks.beforeTimePasses](Ticks time) {
+        hooks.beforeTimePasses = [this, &desk, count = hooks.beforeTimePasses](Ticks time) {
             count(time);
             timesPassed.emplace_back(desk.clock.Now(), time);
         };
@@ -66,9 +65,9 @@ TEST_F(Session, ReportsWhatIsRefusedWithItsLineAndGoesOn)
 
     EXPECT_EQ(PlayScript(desk, "play\n"
                                "\n"
-                               "after 1s continue # it does not stand\n"
+                               "after 1s continue # refused: not paused\n"
                                "pause\n"),
-              std::string(StartOfItem) + "line 3: playback is playing, not paused\n"
+              std::string(StartOfItem) + "line 3: not paused, but playing\n"
                                          "1 Paused()\n");
 }
 
@@ -89,8 +88,8 @@ TEST_F(Session, HasItsTimeGoOnWhenPlaybackHasEnded)
     EXPECT_EQ(PlayScript(desk, "play\nat 1:00:00 fail play\nplay\nafter 3 stop\n"),
               std::string(StartOfItem) + "1 Finished(EndOfMedia)\n"
                                          "3600 PlayFailed()\n"
-                                         "line 4: playback is at its end, not playing or paused or "
-                                         "in a still\n");
+                                         "line 4: not playing or paused or in a still, but "
+                                         "finished\n");
     EXPECT_EQ(desk.clock.Now(), 3603 * Second);
 }
 
