@@ -46,7 +46,7 @@ TEST(Environment, ReportsAnUnreadableSwitchInOneLineAndKeepsTheDefault)
     const Outcome outcome = RunHelper({"enabled", "57", "3", "0"}, {"KEVRO_LOG=Jpi=Evnt"});
     EXPECT_EQ(outcome.output, "1\n");
     EXPECT_EQ(outcome.errors, "KEVRO_LOG: \"Evnt\" at character 5: expected a level or *; "
-                              "did you mean Event?; the default stays\n");
+                              "did you mean Event?; using the default\n");
 }
 
 TEST(Environment, WritesToStandardErrorUnlessToldOtherwise)
@@ -70,7 +70,7 @@ TEST(Environment, ReportsAnUnreadableSinkInOneLineAndKeepsStandardError)
     const auto lines = SplitLines(RunHelper({"write", "1"}, {"KEVRO_LOG_SINK=paper"}).errors);
     ASSERT_EQ(lines.size(), 2U);
     EXPECT_EQ(lines[0], "KEVRO_LOG_SINK: \"paper\" at character 1: expected stderr, file:PATH, "
-                        "syslog or syslog:IDENT; the default stays");
+                        "syslog or syslog:IDENT; using the default");
     EXPECT_EQ(WithoutTime(lines[1]), "BdmvNavigator Event: a line");
 }
 
@@ -117,7 +117,7 @@ constexpr char ReportedAssertion[] = "Common Fatal: Assertion failed: a > b (som
 TEST(AssertInAProgram, ReturnsUnlessToldOtherwise)
 {
     const Outcome outcome = RunHelper({"assert", "0"}, {"KEVRO_LOG="});
-    EXPECT_EQ(outcome.output, "went on\n");
+    EXPECT_EQ(outcome.output, "continued\n");
     EXPECT_EQ(outcome.exitCode, 0);
     const auto lines = SplitLines(outcome.errors);
     ASSERT_EQ(lines.size(), 1U);
@@ -140,10 +140,10 @@ TEST(AssertInAProgram, AbortsOnRequestWhenTheReportIsOut)
 TEST(AssertInAProgram, ReportsAnUnreadableRequestInOneLineAndReturns)
 {
     const Outcome outcome = RunHelper({"assert", "0"}, {"KEVRO_ASSERT=stop"});
-    EXPECT_EQ(outcome.output, "went on\n");
+    EXPECT_EQ(outcome.output, "continued\n");
     const auto lines = SplitLines(outcome.errors);
     ASSERT_EQ(lines.size(), 2U);
-    EXPECT_EQ(lines[0], "KEVRO_ASSERT: \"stop\" at character 1: expected abort; the default stays");
+    EXPECT_EQ(lines[0], "KEVRO_ASSERT: \"stop\" at character 1: expected abort; using the default");
 }
 
 } // namespace

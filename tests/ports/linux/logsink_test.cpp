@@ -198,7 +198,7 @@ TEST_F(LogSink, RefusesAnUnreadableTextWithTheWordItsPositionAndWhatWasExpected)
         {"stderr,queue=-1", "\"-1\" at character 14: expected a number from 1 to 65536"},
         {"stderr,queue=99999999999999999999",
          "\"99999999999999999999\" at character 14: expected a number from 1 to 65536"},
-        {"stderr,queue=5,queue=6", "\"queue\" at character 16: expected it once"},
+        {"stderr,queue=5,queue=6", "\"queue\" at character 16: given twice"},
         {"stderr,size=5", "\"size\" at character 8: expected queue=LINES"},
         {"syslog,files=5", "\"files\" at character 8: expected queue=LINES"},
         {"stderr,", "nothing at character 8: expected queue=LINES"},

@@ -258,7 +258,7 @@ TEST_F(LogSwitch, RefusesAnUnreadableTextWithTheWordItsPositionAndWhatWasExpecte
         {"Jpi=Event+fast", R"("fast" at character 11: expected hifreq)"},
         {"Jpi=Event+", R"(nothing at character 11: expected hifreq)"},
         {"Jpi=Event+hifreq+hifreq",
-         R"("Event+hifreq+hifreq" at character 5: expected one + after a level)"},
+         R"("Event+hifreq+hifreq" at character 5: expected at most one + after a level)"},
         {"Jpi", R"("Jpi" at character 1: expected COMPONENT=LEVEL[|LEVEL...])"},
         {"Jpi=Event=Info",
          R"("Jpi=Event=Info" at character 1: expected COMPONENT=LEVEL[|LEVEL...])"},

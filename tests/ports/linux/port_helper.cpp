@@ -54,7 +54,7 @@ int main(int argc, char** argv)
     } else if (std::strcmp(command, "assert") == 0 && argc > 2) {
         WriteEvents(std::atoi(argv[2]));
         Assert("a > b", "some/file.cpp", 12);
-        std::puts("went on");
+        std::puts("continued");
     } else if (std::strcmp(command, "uopmask") == 0) {
         std::printf("%d\n", g_u1Bduopmask);
     } else {
