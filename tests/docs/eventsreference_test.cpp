@@ -226,7 +226,7 @@ TEST_F(EventsDocument, HasASectionForEveryEventInTheOrderOfDeclaration)
     EXPECT_EQ(titles.size(), 56U);
 }
 
-TEST_F(EventsDocument, SendsEveryCallbackThereIs)
+TEST_F(EventsDocument, SendsEveryCallback)
 {
     std::set<std::string> sent;
     for (const EventSection& section : reference.sections) {
@@ -285,7 +285,7 @@ TEST_F(EventsDocument, ListsLinesAsTheSectionsHaveThemInTheOrderOfTheirBytes)
     EXPECT_EQ(reference.ChapterOf("Log lines").TableRows(), expected);
 }
 
-TEST_F(EventsDocument, GivesNumbersTheNamesThatTheyHave)
+TEST_F(EventsDocument, NamesNumbersAsDeclared)
 {
     const std::map<std::string, std::vector<Enumerator>> declared = DeclaredEnumerations();
     std::set<std::string> told;
@@ -306,7 +306,7 @@ TEST_F(EventsDocument, GivesNumbersTheNamesThatTheyHave)
                                      "TriggerType", "VideoAspectRatioType", "VideoFormatType"}));
 }
 
-TEST_F(EventsDocument, LinksToWhatThereIs)
+TEST_F(EventsDocument, HasOnlyValidLinks)
 {
     std::set<std::string> anchors;
     for (const Chapter& chapter : reference.chapters) {
@@ -491,7 +491,7 @@ TEST_P(EventsDocumentSection, HasTheSignaturesOfTheListenerAndExplainsEveryArgum
     }
 }
 
-TEST_P(EventsDocumentSection, TellsWhatEveryConversionShows)
+TEST_P(EventsDocumentSection, ExplainsEveryConversion)
 {
     for (const Step& step : section.steps) {
         if (IsLog(step)) {
@@ -519,7 +519,7 @@ TEST_P(EventsDocumentSection, TellsWhatEveryConversionShows)
         });
 }
 
-TEST_P(EventsDocumentSection, TellsWhatVariablesArePresetTo)
+TEST_P(EventsDocumentSection, StatesThePresetsOfVariables)
 {
     ForEachStepMade([](const Step& step, const std::vector<Happening>& happenings, std::size_t i) {
         if (step.action == "query") {

@@ -102,7 +102,7 @@ const std::set<std::string> SystemHeaders = {
 
 } // namespace
 
-TEST(Includes, OfTheLibraryAreItsOwnTheStandardsOrTheThreads)
+TEST(Includes, OfTheLibraryAreItsOwnTheStandardLibrariesOrTheThreads)
 {
     for (const Include& include : IncludesBelow({"inc", "bdmv", "prv_inc", "bd"})) {
         const bool known = include.IsQuoted()
@@ -112,7 +112,7 @@ TEST(Includes, OfTheLibraryAreItsOwnTheStandardsOrTheThreads)
     }
 }
 
-TEST(Includes, OfPublicHeadersAreNoneOfTheNavigatorsOwn)
+TEST(Includes, OfPublicHeadersExcludeTheNavigatorsHeaders)
 {
     ExpectTargetsBelow({"inc", "bdmv/inc", "prv_inc"}, {"inc", "bdmv/inc", "prv_inc"});
 }

@@ -12,8 +12,8 @@ namespace
 const int rounds = 200;
 
 /**
- * The list must not let two threads in at once: it counts without a lock, and the one atomic orders
- * nothing, so that a thread checker sees every missing lock.
+ * The list must never call it on two threads at once: it counts without a lock, and its only atomic
+ * is relaxed, so that ThreadSanitizer detects every missing lock.
  */
 class CountingListener : public bdmv::NavigatorListenerAdapter
 {
@@ -35,7 +35,7 @@ private:
     std::atomic<bool> m_IsInside{false};
 };
 
-/** Must not be called while it is not in a list. */
+/** Counts the calls it receives while it is in no list. */
 class VisitingListener : public bdmv::NavigatorListenerAdapter
 {
 public:
@@ -45,7 +45,7 @@ public:
     int callsWhileAbsent = 0;
 };
 
-TEST(ConcurrentDispatch, DeliversEveryEventOnceWhileListenersComeAndGo)
+TEST(ConcurrentDispatch, DeliversEveryEventOnceWhileListenersAreAddedAndRemoved)
 {
     bdmvtest::FakePlatform platform(nullptr);
     Context context;

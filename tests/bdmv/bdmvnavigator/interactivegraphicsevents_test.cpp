@@ -8,7 +8,7 @@ namespace
 
 typedef bdmv::IPlaybackContext::RefPtr ProgramPtr;
 
-/** A program without commands that tells when it goes. */
+/** A program without commands that reports its destruction. */
 class Program : public bdmv::IProgramData
 {
 public:
@@ -81,7 +81,7 @@ INSTANTIATE_TEST_SUITE_P(InteractiveGraphics, EventScenario, testing::ValuesIn(s
 class ButtonExecution : public EventTest
 {
 protected:
-    /** Does something of the test's own with the program that it receives. */
+    /** Runs an action of the test with the program that it receives. */
     struct ProgramListener : bdmv::NavigatorListenerAdapter {
         void ExecuteButton(bd::UInt32, bd::ButtonId, ProgramPtr& program) override
         {
@@ -125,7 +125,7 @@ TEST_F(ButtonExecution, TakesOneReferenceAndReleasesItAfterTheLastListener)
                   Fired("ExecuteButton(0, 0, program shared by 2)") + "atomic add -1 -> 1\n");
 }
 
-TEST_F(ButtonExecution, TakesNoReferenceWhenTheContextLeavesTheProgram)
+TEST_F(ButtonExecution, TakesNoReferenceWhenTheContextWritesNoProgram)
 {
     platform.RecordAtomicAdds();
     context.untouched = {"GetExecuteButtonData"};
@@ -161,7 +161,7 @@ TEST_F(ButtonExecution, ReleasesTheProgramWhenAListenerThrows)
                                   "atomic add -1 -> 1\n");
 }
 
-TEST_F(ButtonExecution, DestroysTheProgramAtTheEndWhenTheContextLetsGoOfIt)
+TEST_F(ButtonExecution, DestroysTheProgramAtTheEndWhenTheContextReleasesIt)
 {
     a.onCallback = [this](const std::string&) { context.executeButtonProgram.Release(); };
 
@@ -190,7 +190,7 @@ TEST_F(ButtonExecution, LeavesTheProgramToAListenerThatCopiesTheHandle)
     EXPECT_EQ(journal.Take(), "gone\n");
 }
 
-TEST_F(ButtonExecution, ShowsTheListenersBehindThatOneResetTheHandle)
+TEST_F(ButtonExecution, ShowsLaterListenersThatTheHandleWasReset)
 {
     ProgramListener resetter;
     resetter.onProgram = [](ProgramPtr& program) { program.Release(); };
@@ -204,11 +204,11 @@ TEST_F(ButtonExecution, ShowsTheListenersBehindThatOneResetTheHandle)
     EXPECT_TRUE(context.executeButtonProgram.IsUnique());
 }
 
-TEST_F(ButtonExecution, ReleasesTheProgramThatAListenerPutInPlace)
+TEST_F(ButtonExecution, ReleasesTheProgramThatAListenerAssigned)
 {
     ProgramListener replacer;
     replacer.onProgram = [this](ProgramPtr& program) {
-        program = ProgramPtr(new Program([this] { journal.Add("replacement gone"); }));
+        program = ProgramPtr(new Program([this] { journal.Add("replacement destroyed"); }));
     };
     AddBehindA(replacer);
 
@@ -216,11 +216,11 @@ TEST_F(ButtonExecution, ReleasesTheProgramThatAListenerPutInPlace)
               m_QueriedAndLogged + "A.ExecuteButton(0, 0, program shared by 2)\n"
                                    "B.ExecuteButton(0, 0, program shared by 1)\n"
                                    "C.ExecuteButton(0, 0, program shared by 1)\n"
-                                   "replacement gone\n");
+                                   "replacement destroyed\n");
     EXPECT_TRUE(context.executeButtonProgram.IsUnique());
 }
 
-TEST_F(ButtonExecution, LetsTheProgramUseTheListWhenItGoes)
+TEST_F(ButtonExecution, LetsTheProgramUseTheListInItsDestructor)
 {
     HoldAProgram([this] {
         listeners.RemoveListener(&b);
@@ -237,7 +237,7 @@ TEST_F(ButtonExecution, LetsTheProgramUseTheListWhenItGoes)
                   "A.ButtonActivationDone()\nC.ButtonActivationDone()\n");
 }
 
-TEST_F(ButtonExecution, RefusesTheListToAProgramThatGoesInsideACallback)
+TEST_F(ButtonExecution, RefusesTheListToAProgramDestroyedInsideACallback)
 {
     HoldAProgram([this] {
         EXPECT_THROW(listeners.RemoveListener(&a), std::system_error);

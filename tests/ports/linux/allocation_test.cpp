@@ -46,7 +46,7 @@ TEST_F(LogAllocation, IsNoneWhenTheQueueDropsLines)
     EXPECT_EQ(bdmvtest::CountAllocations() - before, 0U);
 }
 
-TEST_F(LogAllocation, IsNoneToAskTheSwitch)
+TEST_F(LogAllocation, IsNoneToCheckTheSwitch)
 {
     const std::size_t before = bdmvtest::CountAllocations();
     KEVRO_Log_IsEnabled(bd::CompIdBdmvNavigator, KEVRO_Log_LevelEvent, 0);
@@ -102,7 +102,7 @@ TEST_F(LogAllocation, RefusesAConfigurationWhenItFails)
     EXPECT_TRUE(KEVRO_Log_Configure("*=Exception|Warning|Fatal", nullptr, 0));
 }
 
-TEST_F(LogAllocation, RefusesASinkWhenItFailsAndKeepsTheOneInForce)
+TEST_F(LogAllocation, RefusesASinkWhenItFailsAndKeepsTheOldOne)
 {
     const std::string other = m_Directory.Path("other");
     const std::string text = "file:" + other + ",queue=10";

@@ -19,7 +19,7 @@ Outcome RunHelper(std::vector<std::string> arguments, const std::vector<std::str
     return porttesting::Run(arguments, environment);
 }
 
-TEST(Environment, IsNotNeeded)
+TEST(Environment, IsOptional)
 {
     EXPECT_EQ(RunHelper({"enabled", "57", "3", "0"}, {}).output, "1\n");
     EXPECT_EQ(RunHelper({"enabled", "57", "5", "0"}, {}).output, "0\n");
@@ -49,7 +49,7 @@ TEST(Environment, ReportsAnUnreadableSwitchInOneLineAndKeepsTheDefault)
                               "did you mean Event?; using the default\n");
 }
 
-TEST(Environment, WritesToStandardErrorUnlessToldOtherwise)
+TEST(Environment, WritesToStandardErrorByDefault)
 {
     const auto lines = SplitLines(RunHelper({"write", "2"}, {}).errors);
     ASSERT_EQ(lines.size(), 2U);
@@ -96,13 +96,13 @@ TEST(Environment, ReportsAnUnreadableUserOperationMaskInOneLineAndKeepsZero)
     }
 }
 
-TEST(EndOfProgram, WritesWhatIsStillQueued)
+TEST(EndOfProgram, WritesLinesStillQueued)
 {
     const Outcome outcome = RunHelper({"write", "500"}, {"KEVRO_LOG_SINK=stderr,queue=1000"});
     EXPECT_EQ(SplitLines(outcome.errors).size(), 500U);
 }
 
-TEST(EndOfProgram, WritesWhatALateDestructorQueues)
+TEST(EndOfProgram, WritesLinesQueuedByALateDestructor)
 {
     for (const char* sink : {"stderr", "stderr,queue=10"}) {
         const auto lines =
@@ -114,7 +114,7 @@ TEST(EndOfProgram, WritesWhatALateDestructorQueues)
 
 constexpr char ReportedAssertion[] = "Common Fatal: Assertion failed: a > b (some/file.cpp:12)";
 
-TEST(AssertInAProgram, ReturnsUnlessToldOtherwise)
+TEST(AssertInAProgram, ReturnsByDefault)
 {
     const Outcome outcome = RunHelper({"assert", "0"}, {"KEVRO_LOG="});
     EXPECT_EQ(outcome.output, "continued\n");
@@ -124,7 +124,7 @@ TEST(AssertInAProgram, ReturnsUnlessToldOtherwise)
     EXPECT_EQ(WithoutTime(lines[0]), ReportedAssertion);
 }
 
-TEST(AssertInAProgram, AbortsOnRequestWhenTheReportIsOut)
+TEST(AssertInAProgram, AbortsOnRequestAfterTheReport)
 {
     for (const char* sink : {"stderr", "stderr,queue=1000"}) {
         const Outcome outcome = RunHelper(

@@ -143,7 +143,7 @@ TEST_F(LogSink, AppendsToAFile)
     EXPECT_EQ(WithoutTime(lines[1]), "BdmvNavigator Event: added");
 }
 
-TEST_F(LogSink, MakesTheDirectoriesOfAFile)
+TEST_F(LogSink, CreatesTheDirectoriesOfAFile)
 {
     const std::string file = m_Directory.Path("one/two/log");
     ConfigureSink("file:" + file);
@@ -151,7 +151,7 @@ TEST_F(LogSink, MakesTheDirectoriesOfAFile)
     EXPECT_EQ(ReadLines(file).size(), 1U);
 }
 
-TEST_F(LogSink, RotatesAFileAndKeepsTheYoungest)
+TEST_F(LogSink, RotatesAFileAndKeepsTheNewest)
 {
     ConfigureSink("file:" + m_LogFile + ", size=110, files=2");
     for (int i = 1; i <= 5; ++i) {
@@ -223,14 +223,14 @@ TEST_F(LogSink, RefusesAFileThatCannotBeOpenedAndNamesIt)
     EXPECT_EQ(ReadLines(m_LogFile).size(), 1U);
 }
 
-TEST_F(LogSink, RefusesNoTextAtAll)
+TEST_F(LogSink, RefusesANullText)
 {
     char message[64] = "";
     EXPECT_FALSE(KEVRO_Log_ConfigureSink(nullptr, message, sizeof(message)));
     EXPECT_STREQ(message, "no text");
 }
 
-TEST_F(LogSink, FlushesWhatIsQueued)
+TEST_F(LogSink, FlushesQueuedLines)
 {
     ConfigureSink("file:" + m_LogFile + ",queue=100");
     for (std::size_t round = 1; round <= 50; ++round) {
@@ -242,7 +242,7 @@ TEST_F(LogSink, FlushesWhatIsQueued)
     }
 }
 
-TEST_F(LogSink, WritesWhatIsQueuedBeforeAnotherSinkIsInForce)
+TEST_F(LogSink, WritesQueuedLinesBeforeChangingTheSink)
 {
     for (std::size_t round = 1; round <= 50; ++round) {
         ConfigureSink("file:" + m_LogFile + ",queue=100");
@@ -281,7 +281,7 @@ std::string Now()
     return text;
 }
 
-TEST_F(LogSink, ShowsTheTimeAtWhichAQueuedLineWasGiven)
+TEST_F(LogSink, ShowsTheTimeAtWhichAQueuedLineWasLogged)
 {
     StoppedPipe terminal;
     std::string before;
@@ -305,7 +305,7 @@ TEST_F(LogSink, ShowsTheTimeAtWhichAQueuedLineWasGiven)
     EXPECT_LE(shown, after);
 }
 
-TEST_F(LogSink, DropsTheOldestQueuedLinesInsteadOfWaitingAndSaysHowMany)
+TEST_F(LogSink, DropsTheOldestQueuedLinesInsteadOfWaitingAndReportsTheirNumber)
 {
     constexpr int Queue = 10;
     constexpr int Written = 100;
@@ -336,7 +336,7 @@ TEST_F(LogSink, DropsTheOldestQueuedLinesInsteadOfWaitingAndSaysHowMany)
     }
 }
 
-TEST_F(LogSink, CountsDroppedLinesOnAcrossSinks)
+TEST_F(LogSink, KeepsCountingDroppedLinesAcrossSinks)
 {
     StoppedPipe terminal;
     const KEVRO_UInt64 before = KEVRO_Log_GetDroppedLines();
@@ -357,7 +357,7 @@ TEST_F(LogSink, CountsDroppedLinesOnAcrossSinks)
     EXPECT_EQ(received.lost, 10 - received.texts.size());
 }
 
-TEST_F(LogSink, LetsWritersGoOnAndKeepsItsCountWhileTheSinkBeforeIsStillWriting)
+TEST_F(LogSink, LetsWritersContinueAndKeepsItsCountWhileThePreviousSinkStillWrites)
 {
     StoppedPipe terminal;
     const KEVRO_UInt64 before = KEVRO_Log_GetDroppedLines();
@@ -380,7 +380,7 @@ TEST_F(LogSink, LetsWritersGoOnAndKeepsItsCountWhileTheSinkBeforeIsStillWriting)
     EXPECT_EQ(KEVRO_Log_GetDroppedLines(), before + Received(reading.get()).lost);
 }
 
-TEST_F(LogSink, DoesNotEndAFlushBeforeTheSinkBeforeHasWritten)
+TEST_F(LogSink, DoesNotEndAFlushBeforeThePreviousSinkHasWritten)
 {
     StoppedPipe terminal;
     std::future<std::vector<std::string>> reading;
@@ -415,7 +415,7 @@ TEST_F(LogSink, DoesNotEndAFlushBeforeTheSinkBeforeHasWritten)
     EXPECT_FALSE(reading.get().empty());
 }
 
-TEST_F(LogSink, CountsLinesThatTheSinkDoesNotTake)
+TEST_F(LogSink, CountsLinesThatTheSinkRejects)
 {
     const KEVRO_UInt64 before = KEVRO_Log_GetDroppedLines();
     for (const char* sink : {"file:/dev/full", "file:/dev/full,queue=10"}) {
@@ -427,7 +427,7 @@ TEST_F(LogSink, CountsLinesThatTheSinkDoesNotTake)
     EXPECT_EQ(KEVRO_Log_GetDroppedLines(), before + 4);
 }
 
-TEST_F(LogSink, SaysHowManyLinesWereLostWhenItTakesLinesAgain)
+TEST_F(LogSink, ReportsTheNumberOfLostLinesWhenItAcceptsLinesAgain)
 {
     const int full = open("/dev/full", O_WRONLY);
     const int file = open(m_LogFile.c_str(), O_WRONLY | O_CREAT, 0600);

@@ -94,7 +94,7 @@ TEST_F(Syslog, GetsTheProgramsNameOrTheGivenOne)
     EXPECT_EQ(g_Ident, "player");
 }
 
-TEST_F(Syslog, KeepsTheNameWhenTheSinkBeforeGoes)
+TEST_F(Syslog, KeepsTheNameWhenThePreviousSinkIsDestroyed)
 {
     porttesting::ConfigureSink("syslog:first");
     porttesting::ConfigureSink("syslog:second");
