@@ -343,7 +343,7 @@ TEST_F(EventDelivery, CallsNoListenerWhenTheLockIsRefused)
     bdmvtest::FailMutexLock(EAGAIN);
     try {
         EventListenerList_FireParam0(list, &IProbe::Call0);
-        ADD_FAILURE() << "nothing was thrown";
+        ADD_FAILURE() << "no exception was thrown";
     } catch (const std::system_error& error) {
         EXPECT_EQ(std::errc::resource_unavailable_try_again, error.code());
     }
@@ -450,7 +450,7 @@ TEST_P(ReentrantDelivery, UncaughtExceptionInsideACallbackEndsTheWalk)
     b.onCall = [this] { GetParam().run(list, another); };
     try {
         EventListenerList_FireParam0(list, &IProbe::Call0);
-        ADD_FAILURE() << "nothing was thrown";
+        ADD_FAILURE() << "no exception was thrown";
     } catch (const std::system_error& refusal) {
         EXPECT_EQ(std::errc::resource_deadlock_would_occur, refusal.code());
     }

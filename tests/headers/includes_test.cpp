@@ -1,5 +1,5 @@
-// Who includes whom: the library needs nothing but itself, the standard libraries of C and C++ and
-// the operating system's threads, and its layers look in one direction.
+// The direction of includes: the library needs nothing but itself, the standard libraries of C and
+// C++ and the operating system's threads, and a layer includes only lower layers.
 
 #include <gtest/gtest.h>
 
@@ -27,7 +27,7 @@ struct Include {
     bool IsQuoted() const { return name.front() == '"'; }
     std::string Path() const { return name.substr(1, name.size() - 2); }
 
-    /** The library's file that is meant, relative to the root of the sources; empty for none. */
+    /** The library's file, relative to the root of the sources; empty for any other file. */
     std::string Target() const
     {
         for (const std::string& root : IncludeRoots) {
@@ -39,7 +39,7 @@ struct Include {
     }
 };
 
-/** Every #include of the headers and sources below the folders, which must hold some. */
+/** Every #include of the headers and sources below the folders; there must be at least one. */
 std::vector<Include> IncludesBelow(const std::vector<std::string>& folders)
 {
     static const std::regex directive("^\\s*#\\s*include\\s*([\"<][^\">]+[\">])");
@@ -69,7 +69,7 @@ bool IsBelow(const std::string& path, const std::vector<std::string>& folders)
     });
 }
 
-/** Nothing below @p folders includes a file of the library that stands outside @p allowed. */
+/** No file below @p folders includes a file of the library that lies outside @p allowed. */
 void ExpectTargetsBelow(const std::vector<std::string>& folders,
                         const std::vector<std::string>& allowed)
 {

@@ -40,8 +40,8 @@ constexpr long DeletingDestructorSlot = 1;
 constexpr long DestructorSlots = 2;
 constexpr long NotVirtual = -1;
 
-// Where the lowest bit of a function's address is not free, the mark of a virtual function stands
-// in the adjustment of the object, which is doubled.
+// Where the lowest bit of a function's address is in use, the adjustment of the object is doubled
+// and its lowest bit marks a virtual function.
 #if defined(__arm__) || defined(__aarch64__) || defined(__mips__)
 constexpr bool MarkIsInAdjustment = true;
 #else
@@ -161,7 +161,7 @@ template <typename Interface> long CountOperations()
     return SlotOf(&Extended<Interface>::Next) - DestructorSlots;
 }
 
-struct NotVirtual {
+struct PlainClass {
     void Plain() {}
 };
 
@@ -225,11 +225,10 @@ private:
     bdmvtest::Journal& m_rJournal;
 };
 
-/** Counts how often it is destroyed, and how often its memory is given back, which is not its own.
- */
-template <typename Implementation> struct Doomed : Implementation {
+/** Counts its destructions and its deletions; does not own its memory. */
+template <typename Implementation> struct CountedDestruction : Implementation {
     using Implementation::Implementation;
-    ~Doomed() override { ++destroyed; }
+    ~CountedDestruction() override { ++destroyed; }
     static void operator delete(void*) { ++deleted; }
 
     static inline int destroyed = 0;
@@ -241,7 +240,7 @@ template <typename Interface, typename Implementation, typename... Arguments>
 void ExpectDestructorFirst(const char* name, Arguments&&... arguments)
 {
     SCOPED_TRACE(name);
-    typedef Doomed<Implementation> Object;
+    typedef CountedDestruction<Implementation> Object;
     Object::destroyed = 0;
     Object::deleted = 0;
 
@@ -264,7 +263,7 @@ struct Mark : bdmv::IPlayListMark {
 
 TEST_F(BinaryInterface, OrdinaryMemberFunctionsHaveNoSlot)
 {
-    EXPECT_EQ(NotVirtual, SlotOf(&NotVirtual::Plain));
+    EXPECT_EQ(NotVirtual, SlotOf(&PlainClass::Plain));
 }
 
 TEST_F(BinaryInterface, BeginsWithTheDestructor)

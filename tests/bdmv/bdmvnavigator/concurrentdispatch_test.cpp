@@ -63,7 +63,7 @@ TEST(ConcurrentDispatch, DeliversEveryEventOnceWhileListenersAreAddedAndRemoved)
         }
         --dispatching;
     };
-    const auto comeAndGo = [&](VisitingListener& visitor) {
+    const auto addAndRemove = [&](VisitingListener& visitor) {
         while (dispatching != 0) {
             visitor.isListed = true;
             EXPECT_TRUE(listeners.AddListener(&visitor));
@@ -75,8 +75,8 @@ TEST(ConcurrentDispatch, DeliversEveryEventOnceWhileListenersAreAddedAndRemoved)
     std::vector<std::thread> threads;
     threads.emplace_back(dispatchAll);
     threads.emplace_back(dispatchAll);
-    threads.emplace_back(comeAndGo, std::ref(visitors[0]));
-    threads.emplace_back(comeAndGo, std::ref(visitors[1]));
+    threads.emplace_back(addAndRemove, std::ref(visitors[0]));
+    threads.emplace_back(addAndRemove, std::ref(visitors[1]));
     for (std::thread& thread : threads) {
         thread.join();
     }

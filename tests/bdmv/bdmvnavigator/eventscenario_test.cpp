@@ -92,9 +92,9 @@ TEST_P(EventScenario, HappensInThisOrder)
 
 TEST_P(EventScenario, DiffersOnlyInTheCallbacksWithoutListeners)
 {
-    Listeners nobody;
+    Listeners empty;
 
-    DispatchScenario(nobody);
+    DispatchScenario(empty);
 
     EXPECT_EQ(journal.Take(), WithoutCallbacks(GetParam().journal));
 }

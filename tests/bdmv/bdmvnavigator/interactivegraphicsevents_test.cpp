@@ -102,7 +102,7 @@ protected:
     }
 
     /** Puts a listener between A and B. */
-    void AddBehindA(ProgramListener& listener)
+    void AddAfterA(ProgramListener& listener)
     {
         listeners.RemoveListener(&b);
         listeners.RemoveListener(&c);
@@ -138,10 +138,10 @@ TEST_F(ButtonExecution, TakesNoReferenceWhenTheContextWritesNoProgram)
 
 TEST_F(ButtonExecution, ReleasesTheProgramWithoutListeners)
 {
-    Listeners nobody;
+    Listeners empty;
     platform.RecordAtomicAdds();
 
-    bdmv::ExecuteButtonEvent(context).Dispatch(nobody);
+    bdmv::ExecuteButtonEvent(context).Dispatch(empty);
 
     EXPECT_EQ(journal.Take(), "atomic add 1 -> 2\n" + m_QueriedAndLogged + "atomic add -1 -> 1\n");
 }
@@ -180,7 +180,7 @@ TEST_F(ButtonExecution, LeavesTheProgramToAListenerThatCopiesTheHandle)
         kept = program;
         context.executeButtonProgram.Release();
     };
-    AddBehindA(keeper);
+    AddAfterA(keeper);
 
     EXPECT_EQ(Dispatch<bdmv::ExecuteButtonEvent>(),
               m_QueriedAndLogged + Fired("ExecuteButton(0, 0, program shared by 2)"));
@@ -194,7 +194,7 @@ TEST_F(ButtonExecution, ShowsLaterListenersThatTheHandleWasReset)
 {
     ProgramListener resetter;
     resetter.onProgram = [](ProgramPtr& program) { program.Release(); };
-    AddBehindA(resetter);
+    AddAfterA(resetter);
 
     EXPECT_EQ(Dispatch<bdmv::ExecuteButtonEvent>(), m_QueriedAndLogged +
                                                         "A.ExecuteButton(0, 0, program shared by "
@@ -210,7 +210,7 @@ TEST_F(ButtonExecution, ReleasesTheProgramThatAListenerAssigned)
     replacer.onProgram = [this](ProgramPtr& program) {
         program = ProgramPtr(new Program([this] { journal.Add("replacement destroyed"); }));
     };
-    AddBehindA(replacer);
+    AddAfterA(replacer);
 
     EXPECT_EQ(Dispatch<bdmv::ExecuteButtonEvent>(),
               m_QueriedAndLogged + "A.ExecuteButton(0, 0, program shared by 2)\n"
@@ -248,7 +248,7 @@ TEST_F(ButtonExecution, RefusesTheListToAProgramDestroyedInsideACallback)
         context.executeButtonProgram.Release();
         program.Release();
     };
-    AddBehindA(resetter);
+    AddAfterA(resetter);
 
     EXPECT_EQ(Dispatch<bdmv::ExecuteButtonEvent>(), m_QueriedAndLogged +
                                                         "A.ExecuteButton(0, 0, program shared by "

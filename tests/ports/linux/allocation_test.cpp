@@ -1,4 +1,4 @@
-// What a line costs the heap, and what happens when the heap has nothing to give.
+// The heap allocations of log lines, and what happens when an allocation fails.
 #include <string>
 
 #include "porttesting.h"
@@ -14,7 +14,7 @@ class LogAllocation : public porttesting::LogFileTest
 {
 };
 
-/** What a line of the calling thread takes from the heap once the port has warmed up. */
+/** The heap allocations of a line of the calling thread, after earlier lines. */
 std::size_t AllocationsOfALine(const std::string& text)
 {
     porttesting::EventLogger().Log("%s", text.c_str());

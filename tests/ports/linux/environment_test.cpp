@@ -1,4 +1,4 @@
-// What the port reads from the environment when a program starts, and what it does when one ends.
+// The environment that the port reads at the start of a program, and its actions at the end.
 #include <csignal>
 #include <string>
 #include <vector>

@@ -1,4 +1,4 @@
-// What a line looks like.
+// The format of a line.
 #include <cstdarg>
 #include <cwchar>
 #include <regex>
@@ -25,7 +25,7 @@ protected:
     }
 };
 
-/** Writes past the logger, whose level is one of the list. */
+/** Writes without the logger, which restricts levels to those in the list. */
 BD_PRINTF_FORMAT(2, 3) void WriteAtLevel(KEVRO_Int32 level, const char* format, ...)
 {
     va_list args;

@@ -1,4 +1,4 @@
-// Where lines go: the sinks, the queue, and the account of what was lost.
+// The destinations of lines: the sinks, the queue, and the count of lost lines.
 #include <atomic>
 #include <cstdio>
 #include <ctime>
@@ -34,7 +34,7 @@ std::string RefusalOf(const std::string& text)
     return message;
 }
 
-/** What a terminal received: the lines written, and what was told of those that were lost. */
+/** The lines that a terminal received, and the losses reported among them. */
 struct Received {
     explicit Received(const std::vector<std::string>& lines)
     {
@@ -57,7 +57,7 @@ struct Received {
     KEVRO_UInt64 lost = 0;
 };
 
-/** A pipe that takes nothing until it is read, as a terminal that has been stopped. */
+/** A pipe that accepts nothing until it is read, like a stopped terminal. */
 class StoppedPipe
 {
 public:
@@ -96,7 +96,8 @@ public:
         }
     }
 
-    /** Begins to read; the lines written to the pipe are there once both write ends are closed. */
+    /** Starts reading; the lines written to the pipe are available once both write ends are closed.
+     */
     std::future<std::vector<std::string>> StartReading()
     {
         return std::async(std::launch::async,
@@ -290,9 +291,9 @@ TEST_F(LogSink, ShowsTheTimeAtWhichAQueuedLineWasLogged)
     {
         const StderrRedirection redirection(terminal.WriteEnd());
         ConfigureSink("stderr,queue=10");
-        EventLogger().Log("the terminal does not take it");
+        EventLogger().Log("blocks at the terminal");
         before = Now();
-        EventLogger().Log("nor this one behind it");
+        EventLogger().Log("waits in the queue");
         after = Now();
         reading = terminal.StartReading();
         ConfigureSink("file:" + m_LogFile);
@@ -316,7 +317,7 @@ TEST_F(LogSink, DropsTheOldestQueuedLinesInsteadOfWaitingAndReportsTheirNumber)
         const StderrRedirection redirection(terminal.WriteEnd());
         ConfigureSink("stderr,queue=" + std::to_string(Queue));
         for (int i = 0; i < Written; ++i) {
-            EventLogger().Log("%d", i); // a writer that waited would never come back
+            EventLogger().Log("%d", i); // a writer that waited would never return
         }
         reading = terminal.StartReading();
         ConfigureSink("file:" + m_LogFile);
@@ -330,7 +331,8 @@ TEST_F(LogSink, DropsTheOldestQueuedLinesInsteadOfWaitingAndReportsTheirNumber)
     EXPECT_EQ(received.lost, dropped);
     EXPECT_EQ(received.reports, 1);
     ASSERT_EQ(received.texts.size(), Written - dropped);
-    EXPECT_EQ(received.linesBeforeReport, received.texts.size() - 1) << "told when caught up";
+    EXPECT_EQ(received.linesBeforeReport, received.texts.size() - 1)
+        << "the report comes once the queue has caught up";
     for (std::size_t i = 1; i <= Queue; ++i) {
         EXPECT_EQ(received.texts[received.texts.size() - i], std::to_string(Written - i));
     }
@@ -402,7 +404,7 @@ TEST_F(LogSink, DoesNotEndAFlushBeforeThePreviousSinkHasWritten)
         });
         line.Wait();
         for (int i = 0; i < 1000; ++i) {
-            EventLogger().Log("time in which a flush that did not wait would have ended");
+            EventLogger().Log("gives a flush that does not wait time to return");
             std::this_thread::yield();
         }
         EXPECT_FALSE(flushed);
@@ -437,16 +439,16 @@ TEST_F(LogSink, ReportsTheNumberOfLostLinesWhenItAcceptsLinesAgain)
         EventLogger().Log("lost");
         EventLogger().Log("lost, too");
         dup2(file, STDERR_FILENO);
-        EventLogger().Log("back");
-        EventLogger().Log("and on");
+        EventLogger().Log("written");
+        EventLogger().Log("written, too");
     }
     close(full);
     close(file);
     const auto lines = ReadLines(m_LogFile);
     ASSERT_EQ(lines.size(), 3U);
     EXPECT_EQ(WithoutTime(lines[0]), "Common Warning: lines lost: 2");
-    EXPECT_EQ(TextOf(lines[1]), "back");
-    EXPECT_EQ(TextOf(lines[2]), "and on");
+    EXPECT_EQ(TextOf(lines[1]), "written");
+    EXPECT_EQ(TextOf(lines[2]), "written, too");
 }
 
 TEST_F(LogSink, WaitsForANonBlockingTerminal)

@@ -1,4 +1,4 @@
-// Which lines are switched on: the texts, what they mean, and how an unreadable one is refused.
+// The log switch: its configuration texts, their meaning, and the refusal of unreadable ones.
 #include <array>
 #include <string>
 #include <utility>
