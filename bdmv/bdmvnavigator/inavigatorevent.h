@@ -1,6 +1,6 @@
 /**
  * @file
- * What the navigator queues: an event that is dispatched once and then deleted.
+ * The interface of the events that the navigator queues, each dispatched once and then deleted.
  */
 #ifndef BDMVNAVIGATOR_INAVIGATOREVENT_H
 #define BDMVNAVIGATOR_INAVIGATOREVENT_H
@@ -14,8 +14,8 @@ namespace bdmv
 /**
  * An event of the navigator.
  *
- * Made with plain new when something happens, dispatched once, later, on the delivering thread, and
- * then deleted through this interface.
+ * Created with plain `new` when something happens, dispatched once, later, on the delivering
+ * thread, then deleted through this interface.
  */
 class INavigatorEvent
 {
@@ -33,8 +33,8 @@ public:
      * Call it once. Allocates nothing.
      *
      * @param listeners the navigator's listeners; its lock must not be held by the calling thread
-     * @throw whatever a callback throws: nothing that the event would have done after it is done.
-     *        The event still belongs to the caller.
+     * @throw whatever a callback throws; the rest of the event is then skipped. The event still
+     *        belongs to the caller.
      * @throw std::system_error the lock of @p listeners could not be taken
      */
     virtual void Dispatch(bd::EventListenerList<INavigatorListener>& listeners) = 0;

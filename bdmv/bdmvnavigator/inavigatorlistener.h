@@ -8,7 +8,7 @@
  * UserInterface userInterface;
  * navigatorListeners.AddListener(&userInterface);
  * ...
- * navigatorListeners.RemoveListener(&userInterface); // no callback runs from here on
+ * navigatorListeners.RemoveListener(&userInterface); // no callback runs after this
  * @endcode
  *
  * A client that wants a few callbacks derives from NavigatorListenerAdapter instead.
@@ -25,19 +25,19 @@ namespace bdmv
 {
 
 /**
- * Everything the navigator tells its clients.
+ * Everything the navigator reports to its clients.
  *
  * Threads. Every callback runs on the thread that dispatches the event, once for every registered
- * listener, in order of registration, while the lock of the list is held: it returns promptly. The
- * playback context is not locked meanwhile.
+ * listener, in order of registration, while the lock of the list is held: it must return promptly.
+ * The playback context is not locked meanwhile.
  *
- * Re-entrancy. A callback does not touch the list that is calling it, nor dispatch an event to it;
- * bd::EventListenerList tells what happens then, and what to do instead.
+ * Re-entrancy. A callback must not use the list that is calling it, nor dispatch an event to it;
+ * bd::EventListenerList describes what happens otherwise, and what to do instead.
  *
- * Exceptions. What a callback throws leaves INavigatorEvent::Dispatch(): the listeners behind it
- * miss this callback, and all miss what the event would have done after it.
+ * Exceptions. An exception thrown by a callback leaves INavigatorEvent::Dispatch(): later listeners
+ * miss this callback, and all listeners miss the rest of the event.
  *
- * Lifetime. What a reference argument refers to lives for the duration of the call. Copy what is
+ * Lifetime. The object behind a reference argument lives for the duration of the call. Copy what is
  * needed later.
  *
  * The order of the bases is part of the binary interface.

@@ -1,6 +1,6 @@
 /**
  * @file
- * What events read of the playback in progress.
+ * The interface through which events read the playback in progress.
  */
 #ifndef BDMVNAVIGATOR_IPLAYBACKCONTEXT_H
 #define BDMVNAVIGATOR_IPLAYBACKCONTEXT_H
@@ -18,14 +18,14 @@ namespace bdmv
  * The navigator's record of the playback in progress, as far as events read it.
  *
  * Events call these operations on the dispatching thread while they are dispatched, never while the
- * lock of a listener list is held and without any lock of their own. A context that another thread
- * changes meanwhile makes each single query consistent; events do not try to read several values at
- * once. Queries are taken to succeed.
+ * lock of a listener list is held; events have no lock. A context that another thread changes
+ * meanwhile keeps each single query consistent; events do not expect several queries to be. Queries
+ * are assumed to succeed.
  *
- * An operation with output parameters writes all of them. An output that it leaves keeps what the
- * variable held: the value that the event preset (0, false, empty, or no information, unless the
- * operation says otherwise) or, for the GetPgTextStInfo() of PresentationGraphicsInfoEvent, what
- * rGetPgTextStInfo() wrote.
+ * An operation with output parameters writes all of them. An output that it does not write keeps
+ * its earlier value: the event's preset (0, false, empty, or no information, unless the operation
+ * says otherwise) or, in the GetPgTextStInfo() call of PresentationGraphicsInfoEvent, the value
+ * that rGetPgTextStInfo() wrote.
  *
  * The order of the operations is part of the binary interface.
  */
@@ -47,21 +47,20 @@ public:
      */
     virtual const bd::DataBlockDef& GetSystemResumeData() = 0;
 
-    /** Discards the system resume data. Called after the listeners were told, also when there is
-     * none. */
+    /** Discards the system resume data. Called after the callbacks, even when there is no data. */
     virtual void CleanupSystemResumeData() = 0;
 
     /** Whether playback runs after the system resume. */
     virtual bool IsPlayingAfterSystemResume() = 0;
 
-    /** The play list in playback. */
+    /** The play list being played. */
     virtual bd::PlayListIdDef GetPlayListId() = 0;
 
-    /** The play item in playback. */
+    /** The play item being played. */
     virtual bd::PlayItemIdDef GetPlayItemId() = 0;
 
     /**
-     * The play mode that is set, the requested one.
+     * The play mode that is set, which is the requested one.
      *
      * @return valid until the event has copied or read it
      */
@@ -79,7 +78,7 @@ public:
     /** The chapter or title repeat state in force. */
     virtual bd::TriggerType GetCurrentChpTitleRepeatState() = 0;
 
-    /** The kind of trigger that lies at @p time. */
+    /** The kind of trigger at @p time. */
     virtual bd::TriggerType GetTriggerTypeByTime(bd::TimePosition time) = 0;
 
     /** The current chapter. */
@@ -108,10 +107,10 @@ public:
     /**
      * As GetPgTextStInfo(), with a result.
      *
-     * PresentationGraphicsInfoEvent calls it first and GetPgTextStInfo() with the same variables,
-     * so an output that the latter leaves keeps the answer of this one.
+     * PresentationGraphicsInfoEvent calls it before GetPgTextStInfo(), with the same variables, so
+     * an output that the latter does not write keeps the value written here.
      *
-     * @return INavError::ErrNotAllowed keeps the event from being sent
+     * @return INavError::ErrNotAllowed suppresses the event
      */
     virtual ErrCode rGetPgTextStInfo(bd::StreamNumberDef* number, bd::UInt8* count) = 0;
 
@@ -152,7 +151,7 @@ public:
     virtual void GetUOMask(UOMaskTable& mask) = 0;
 
     /**
-     * The play mode that playback currently runs in; may differ from GetPlayMode().
+     * The current play mode; may differ from GetPlayMode().
      *
      * @return valid until the event has copied or read it
      */
@@ -174,7 +173,7 @@ public:
     /** The text subtitle user style in use. */
     virtual bd::UserStyleNumber GetCurrentTextSubtitleStyleNumber() = 0;
 
-    /** How many text subtitle user styles there are. */
+    /** The number of text subtitle user styles. */
     virtual bd::UInt8 GetNumberOfTextSubtitleStyles() = 0;
 
     /** Why playback finished. */

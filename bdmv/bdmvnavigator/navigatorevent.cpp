@@ -13,22 +13,22 @@ namespace
 /** The lines that announce a callback. */
 constexpr bd::LogTag Notification = {bd::CompIdBdmvNavigator, KEVRO_Log_LevelEvent, 0};
 
-/** The one notification that comes every so often while playback runs. */
+/** The notification that repeats many times a second during playback. */
 constexpr bd::LogTag HighFrequencyNotification = {bd::CompIdBdmvNavigator, KEVRO_Log_LevelEvent, 1};
 
-/** What helps to find out why a trigger was reported as it was. */
+/** The line that helps to find out why a trigger was reported as it was. */
 constexpr bd::LogTag Diagnostic = {bd::CompIdBdmvNavigator, KEVRO_Log_LevelWarning, 0};
 
-/** Identifies the report of an unknown finish reason in the field, wherever its line stands. */
+/** Identifies the report of an unknown finish reason in the field; independent of the real line. */
 constexpr int FinishReasonAssertionLine = 885;
 
-/** A 32-bit value as "%lu" wants it, whatever type of the target carries 32 bits. */
+/** A 32-bit value as "%lu" expects it, whichever type has 32 bits on the target. */
 unsigned long Lu(bd::UInt32 value)
 {
     return value;
 }
 
-/** A 64-bit value as "%llu" wants it, whatever type of the target carries 64 bits. */
+/** A 64-bit value as "%llu" expects it, whichever type has 64 bits on the target. */
 unsigned long long Llu(bd::UInt64 value)
 {
     return value;
@@ -39,8 +39,7 @@ const char* TrueOrFalse(bool value)
     return value ? "TRUE" : "FALSE";
 }
 
-/** The stream that is selected and how many there are of its kind; 0 where the context leaves it.
- */
+/** The selected stream and the number of its kind; 0 where the context does not write it. */
 struct StreamInfo {
     bd::StreamNumberDef number = 0;
     bd::UInt8 count = 0;
@@ -62,7 +61,7 @@ struct SecondaryVideoInfo : StreamInfo {
     }
 };
 
-/** Which secondary streams play asynchronously; none where the context leaves it. */
+/** Which secondary streams play asynchronously; none where the context does not write it. */
 struct AsyncFlags {
     bool fg2ndVid = false;
     bool fg2ndAud = false;
@@ -76,11 +75,11 @@ struct AsyncFlags {
 };
 
 /**
- * The trigger that listeners hear about when a time of kind @p type was reached.
+ * The trigger that listeners receive when a time of kind @p type was reached.
  *
  * A B point without an A-B repeat while a chapter or title repeats is a notification. A time of no
- * valid kind is put down to the B point first, then to the chapter or title repeat, and last to the
- * trigger that is set.
+ * valid kind is attributed to the B point first, then to the chapter or title repeat, and last to
+ * the trigger that is set.
  */
 bd::TriggerType CorrectByRepeatStates(IPlaybackContext& context, bd::TriggerType type)
 {
@@ -112,7 +111,7 @@ INavControlListener::FinishedReason ToListenerReason(bdstreaming::FinishedReason
     return INavControlListener::EndOfMedia;
 }
 
-// Notifications that several events send, each with a line of its own.
+// Notifications that several events send, each event with its own line.
 
 void FirePictureInPictureAvailable(INavigatorEvent::Listeners& listeners)
 {

@@ -3,7 +3,7 @@
  * The events of the navigator.
  *
  * @code
- * // where it happens
+ * // where playback pauses
  * queue.Push(std::unique_ptr<bdmv::INavigatorEvent>(new bdmv::PausedEvent(context)));
  *
  * // on the delivering thread
@@ -13,8 +13,8 @@
  *
  * Dispatching an event does three things, in the order that the event states: it queries the
  * playback context, it writes a log line that begins with "Sending", and it fires a callback on
- * every listener. The values are those of the moment of dispatch; what an event freezes at its
- * construction stands among its constructor's arguments.
+ * every listener. The values are those at the time of dispatch; values fixed at construction are
+ * constructor arguments.
  *
  * Lifetime. The context must outlive the event, which does not own it.
  *
@@ -86,8 +86,8 @@ public:
 };
 
 /**
- * Playback continues. The listeners receive the play mode that is set; the one that playback
- * currently runs in is only logged.
+ * Playback continues. The listeners receive the play mode that is set; the current play mode is
+ * only logged.
  */
 class ContinuedEvent : public NavigatorEvent
 {
@@ -116,8 +116,8 @@ public:
 };
 
 /**
- * Playback reached the time of a trigger. Which kind the listeners hear about is decided by the
- * kind that lies at that time and by the repeat states.
+ * Playback reached the time of a trigger. The kind of trigger that listeners receive depends on the
+ * kind at that time and on the repeat states.
  */
 class TriggerReachedEvent : public NavigatorEvent
 {
@@ -157,7 +157,7 @@ public:
     void Dispatch(Listeners& listeners) override;
 };
 
-/** A play list is in playback. */
+/** A play list is being played. */
 class PlaylistEvent : public NavigatorEvent
 {
 public:
@@ -167,9 +167,9 @@ public:
 };
 
 /**
- * A play item is in playback. After the play item itself, and from the asynchronous streams of this
- * item and what the previous one had, it tells whether picture-in-picture and secondary audio are
- * available.
+ * A play item is being played. After the play item itself, the event reports whether
+ * picture-in-picture and secondary audio are available. This depends on the asynchronous streams of
+ * this item and the secondary streams of the previous one.
  */
 class PlayItemEvent : public NavigatorEvent
 {
@@ -179,7 +179,7 @@ public:
     void Dispatch(Listeners& listeners) override;
 };
 
-/** The user operations that are forbidden changed. */
+/** The set of forbidden user operations changed. */
 class UOMaskEvent : public NavigatorEvent
 {
 public:
@@ -201,7 +201,7 @@ public:
 class MarkInfoEvent : public NavigatorEvent
 {
 public:
-    /** @param markType stored, and not read by anything: all marks are reported alike */
+    /** @param markType stored but unused: marks of all types are reported alike */
     MarkInfoEvent(IPlaybackContext& thePlaybackContext, IPlayListMark::MarkType markType)
         : NavigatorEvent(thePlaybackContext), m_MarkType(markType)
     {
@@ -215,8 +215,8 @@ private:
 };
 
 /**
- * The play mode that playback runs in changed. After the play mode itself it tells that the
- * asynchronous streams of the play item are available at normal speed and unavailable at any other.
+ * The current play mode changed. After the play mode itself, the event reports the asynchronous
+ * streams of the play item as available at normal speed and as unavailable at any other.
  */
 class PlayModeEvent : public NavigatorEvent
 {
@@ -254,7 +254,7 @@ public:
 };
 
 /**
- * The presentation graphics or text subtitle stream is selected. Says nothing at all when the
+ * The presentation graphics or text subtitle stream is selected. Neither logged nor sent when the
  * context does not allow the query.
  */
 class PresentationGraphicsInfoEvent : public NavigatorEvent
@@ -332,7 +332,7 @@ public:
     void Dispatch(Listeners& listeners) override;
 };
 
-/** The picture-in-picture subtitle was picked or not. */
+/** The picture-in-picture subtitle was selected or deselected. */
 class PipPgTextSelectEvent : public NavigatorEvent
 {
 public:
@@ -360,7 +360,7 @@ public:
 };
 
 /**
- * Playback reached its end, or starved. A reason that is neither of the two is reported through
+ * Playback reached the end of the media, or ran out of data. Any other reason is reported through
  * Assert() and sent as the end of the media.
  */
 class FinishedEvent : public NavigatorEvent
@@ -417,7 +417,7 @@ public:
 };
 
 /**
- * The system goes into standby: hands the resume data to the listeners, then has the context
+ * The system goes into standby: passes the resume data to the listeners, then makes the context
  * discard it.
  */
 class SystemSuspendedEvent : public NavigatorEvent
@@ -428,7 +428,7 @@ public:
     void Dispatch(Listeners& listeners) override;
 };
 
-/** The system came back from standby. Has the context discard its resume data afterwards. */
+/** The system returned from standby. Makes the context discard its resume data afterwards. */
 class SystemResumedEvent : public NavigatorEvent
 {
 public:
@@ -438,7 +438,7 @@ public:
 };
 
 /**
- * The system came back from standby, and playback could not be restored. Has the context discard
+ * The system returned from standby, and playback could not be restored. Makes the context discard
  * its resume data afterwards.
  */
 class SystemResumeFailedEvent : public NavigatorEvent
@@ -561,7 +561,7 @@ public:
     void Dispatch(Listeners& listeners) override;
 };
 
-/** The current time position. Its log line is the one high-frequency line of the events. */
+/** The current time position. Its log line is the only high-frequency line of the events. */
 class CurrentTimePositionEvent : public NavigatorEvent
 {
 public:

@@ -1,6 +1,6 @@
 /**
  * @file
- * A listener that ignores everything, to derive from when only a few callbacks are wanted.
+ * A listener that ignores every callback, to derive from when only a few are wanted.
  *
  * @code
  * class FrontPanel : public bdmv::NavigatorListenerAdapter

@@ -1,6 +1,6 @@
 /**
  * @file
- * Values of the navigation model that stand for "none".
+ * Values of the navigation model that mean "none".
  */
 #ifndef BD_CONSTANTS_H
 #define BD_CONSTANTS_H

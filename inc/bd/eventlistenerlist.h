@@ -17,16 +17,17 @@
  *
  * Re-entrancy. The lock is not recursive. A callback that adds, removes, looks up or fires on the
  * list that is calling it gets std::system_error with
- * std::errc::resource_deadlock_would_occur; list and lock stay sound. Post such work to the thread
- * that delivers events and do it there once the delivery is over. To be silent at once, let the
- * listener ignore further callbacks until it has been removed.
+ * std::errc::resource_deadlock_would_occur; the list and its lock stay valid. Post such work to the
+ * thread that delivers events and do it there after the delivery. To stop reacting immediately, let
+ * the listener ignore further callbacks until it has been removed.
  *
  * Threads. Every operation may be called from any thread. Callbacks run on the thread that fires,
- * one after another, front to back. Whoever fires or registers meanwhile waits for the whole walk,
- * so callbacks return promptly, and do not wait for a thread that is about to use the same list.
+ * one after another, front to back. A thread that fires or registers meanwhile waits for the whole
+ * walk, so a callback must return promptly and must not wait for a thread that may use the same
+ * list.
  *
- * Exceptions. What a callback throws leaves the firing function unchanged: the listeners behind the
- * one that threw are not called, and the lock is released.
+ * Exceptions. The firing function passes on the exception that a callback throws: the listeners
+ * after that one are not called, and the lock is released.
  *
  * Memory. Firing allocates nothing. AddListener() allocates one list node.
  */
@@ -63,7 +64,7 @@ public:
      *
      * @param listener not owned; must live until it is removed or the list is destroyed
      * @return false, and no change, for null and for a listener that is already in the list
-     * @throw std::bad_alloc there is no memory for it; the list is as before
+     * @throw std::bad_alloc out of memory; the list is unchanged
      * @throw std::system_error the lock could not be taken, see ThreadMutex::Acquire()
      */
     bool AddListener(T* listener)
@@ -77,7 +78,7 @@ public:
     }
 
     /**
-     * Takes a listener out. When this has returned, no callback of the listener is running or will
+     * Removes a listener. Once this has returned, no callback of the listener is running or will
      * run.
      *
      * @return false for null and for a listener that is not in the list
@@ -122,9 +123,9 @@ private:
 /**
  * One method of a listener and the arguments to call it with.
  *
- * A value parameter is held as a copy, made once here; every listener gets a copy of that one. A
- * reference parameter is held as a reference: every listener sees the caller's object, which must
- * outlive the invoker.
+ * A value parameter is copied once, here; every listener receives a copy of that copy. A reference
+ * parameter is stored as a reference: every listener sees the caller's object, which must outlive
+ * the invoker.
  *
  * @tparam T the listener interface; EventInvokerParam1 to EventInvokerParam4 add the parameter
  *         types of the method, exactly as it declares them
@@ -220,17 +221,17 @@ private:
 };
 
 /**
- * Names the type of a firing function's value argument: the parameter of the method decides what it
- * is, the value given does not. For a reference parameter it is that reference, for a value a const
- * reference, so the value is not copied before the invoker holds it.
+ * The type of a firing function's value argument. It follows from the method's parameter, not from
+ * the argument passed: for a reference parameter it is that reference, for a value a const
+ * reference, so the value is not copied before it reaches the invoker.
  */
 template <typename P> struct FiredValue {
     typedef const P& Type;
 };
 
 /**
- * Lets @p invoker fire at every listener, front to back, with the list's lock held from before the
- * first call to after the last.
+ * Calls Fire() of @p invoker with every listener, front to back, with the list's lock held from
+ * before the first call to after the last.
  *
  * @tparam Invoker has Fire(T&)
  * @throw std::system_error the lock could not be taken, see ThreadMutex::Acquire()
@@ -245,15 +246,15 @@ inline void EventListenerList_FireInvoker(EventListenerList<T>& list, Invoker& i
     }
 }
 
-// The word inline on the firing functions is not idle: with it g++ sees which method the stored
-// pointer names, and the run-time test that a call through a pointer to member carries is gone.
+// `inline` matters here: with it g++ resolves the stored pointer to member at compile time, which
+// removes the run-time test from every call.
 
 /**
  * Calls a method without parameters on every listener; see EventListenerList_FireInvoker().
  *
  * EventListenerList_FireParam1() to EventListenerList_FireParam4() do the same for methods with
- * that many parameters. The argument for a value parameter P binds to a `const P&`: a static
- * constant of a class that is given there needs a definition, not only its value in the class.
+ * that many parameters. The argument for a value parameter P binds to a `const P&`: a class's
+ * static constant passed there needs a definition as well as its value in the class.
  *
  * @tparam Owner the class that declares the method: T or one of its bases
  */

@@ -28,15 +28,14 @@ public:
     Guard(const Guard&) = delete;
     Guard& operator=(const Guard&) = delete;
 
-    /** Takes the lock again after Release(). If that throws, the guard holds what it held before.
-     */
+    /** Takes the lock again after Release(). If that throws, the guard is unchanged. */
     void Acquire()
     {
         m_rLock.Acquire();
         m_Acquired = true;
     }
 
-    /** Lets the lock go early; does nothing when the guard does not hold it. */
+    /** Releases the lock early; does nothing when the guard does not hold it. */
     void Release()
     {
         if (m_Acquired) {

@@ -7,14 +7,14 @@
  * BD_LOG(Diagnostic, "play item %u has no stream table", playItemId);
  * @endcode
  *
- * Levels: a line's level is a value of bd::LogLevelDef or of KEVRO_Log_Level, which are one list of
- * numbers. LogHighFrequency is not a line's level: high frequency is the separate flag.
+ * Levels: a line's level is a value of bd::LogLevelDef or of KEVRO_Log_Level; both have the same
+ * values. LogHighFrequency is not a line's level: high frequency is the separate flag.
  *
  * Cost: while the platform's switch is off for the tag, a line costs one call of
  * KEVRO_Log_IsEnabled() and a test; its arguments are not evaluated. While it is on, the writer is
  * three words on the stack. Nothing here allocates, and nothing limits the length of a line.
  *
- * Threads: everything may be used from several threads at once; one VargLogger belongs to one.
+ * Threads: everything may be used from several threads at once; a VargLogger belongs to one thread.
  *
  * Errors: none are reported. A line that cannot be written is dropped by the platform.
  */
@@ -105,7 +105,7 @@ enum LogLevelDef : KEVRO_Int32 {
     LogHighFrequency = 16  ///< marks high-frequency logging; not a level of a line
 };
 
-// A level may come from either list, so a drift between the two would change meaning silently.
+// A level may come from either enumeration, so a difference would silently change its meaning.
 static_assert(static_cast<KEVRO_Int32>(LogMethod) == KEVRO_Log_LevelMethod, "one list of levels");
 static_assert(static_cast<KEVRO_Int32>(LogInterface) == KEVRO_Log_LevelInterface,
               "one list of levels");
@@ -126,7 +126,7 @@ static_assert(static_cast<KEVRO_Int32>(LogLevel__sizeof) == KEVRO_Log_Level__siz
               "one list of levels");
 static_assert(sizeof(KEVRO_Log_Level) == 4, "layout of the writer");
 
-/** Component, level and high-frequency flag: what a line is switched on by and written under. */
+/** Component, level and high-frequency flag, by which a line is switched on and labelled. */
 struct LogTag {
     KEVRO_UInt32 component; ///< a CompIdDef value
     KEVRO_Int32 level;      ///< a LogLevelDef or KEVRO_Log_Level value
@@ -149,7 +149,7 @@ public:
     {
     }
 
-    /** The same, with a level of the library's own enumeration: any but LogHighFrequency. */
+    /** The same, with a level from the library's own enumeration: any but LogHighFrequency. */
     VargLogger(KEVRO_UInt32 userId, LogLevelDef level, KEVRO_Bool hiFreq)
         : VargLogger(userId, static_cast<KEVRO_Log_Level>(level), hiFreq)
     {

@@ -22,8 +22,8 @@
 /**
  * Writes one log line if, and only if, the platform's log switch is on for it.
  *
- * A macro because the arguments must not be evaluated while the switch is off: whatever work only
- * the line needs stands among them and costs nothing then. Include "bd/logging.h" to use it.
+ * A macro because the arguments must not be evaluated while the switch is off: work that only the
+ * line needs goes into its arguments and then costs nothing. Include "bd/logging.h" to use it.
  *
  * @code
  * BD_LOG(Notification, "Sending Playlist - playListId: %lu", static_cast<unsigned long>(id));

@@ -1,18 +1,18 @@
 /**
  * @file
- * A shared-ownership pointer whose counter stands beside the object.
+ * A shared-ownership pointer whose counter is allocated apart from the object.
  *
  * @code
  * bd::RefPtr<bdmv::IProgramData> program(CreateProgram()); // takes ownership
  * bd::RefPtr<bdmv::IProgramData> kept = program;            // shares it
- * program.Release();                                        // kept still holds it
+ * program.Release();                                        // kept still owns it
  * @endcode
  *
- * Lifetime. The last RefPtr to let go deletes the object, through its virtual destructor, and then
- * the counter. Give a raw pointer to one RefPtr only; copy that one from then on.
+ * Lifetime. The last RefPtr to release the object deletes it, through its virtual destructor, and
+ * then the counter. Give a raw pointer to one RefPtr only; copy that one from then on.
  *
  * Re-entrancy. The destructor of an object may release, assign or read the very RefPtr that is
- * letting go of it. It must not copy or move from that RefPtr, and it must not throw.
+ * releasing it. It must not copy or move from that RefPtr, and it must not throw.
  *
  * Threads. RefPtr objects that share an object may be copied and released on different threads at
  * once. One RefPtr object is not safe for concurrent use.
@@ -46,7 +46,7 @@ public:
     /**
      * Takes ownership of @p p; empty for null.
      *
-     * @throw std::bad_alloc there is no memory for the counter; @p p has been deleted
+     * @throw std::bad_alloc no memory for the counter; @p p has been deleted
      */
     RefPtr(T* p) // NOLINT(google-explicit-constructor): factories return raw pointers
         : m_RawPtr(nullptr), m_Counter(nullptr)
@@ -58,13 +58,13 @@ public:
         }
     }
 
-    /** Shares what @p other holds. */
+    /** Shares the object of @p other. */
     RefPtr(const RefPtr& other) : m_RawPtr(other.m_RawPtr), m_Counter(nullptr)
     {
         Acquire(other.m_Counter);
     }
 
-    /** Takes over what @p other holds and leaves it empty; the count stays. */
+    /** Takes over the object of @p other and leaves @p other empty; the count stays the same. */
     RefPtr(RefPtr&& other) noexcept : m_RawPtr(other.m_RawPtr), m_Counter(other.m_Counter)
     {
         other.m_RawPtr = nullptr;
@@ -74,8 +74,8 @@ public:
     ~RefPtr() { Release(); }
 
     /**
-     * Lets go of the current object, then shares what @p other holds. Changes nothing when both
-     * share the same object already. @p other may lie within the object that is let go.
+     * Releases the current object, then shares that of @p other. Changes nothing when both share
+     * the same object already. @p other may lie within the released object.
      */
     // NOLINTNEXTLINE(bugprone-unhandled-self-assignment): equal counters cover it
     RefPtr& operator=(const RefPtr& other)
@@ -88,9 +88,8 @@ public:
     }
 
     /**
-     * Lets go of the current object, then takes over what @p other holds and leaves it empty.
-     * Changes nothing when both are the same RefPtr. @p other may lie within the object that is let
-     * go.
+     * Releases the current object, then takes over that of @p other and leaves @p other empty.
+     * Changes nothing when both are the same RefPtr. @p other may lie within the released object.
      */
     RefPtr& operator=(RefPtr&& other) noexcept
     {
@@ -102,11 +101,11 @@ public:
     }
 
     /**
-     * Lets go of the current object, then takes ownership of @p p. Changes nothing when @p p is the
+     * Releases the current object, then takes ownership of @p p. Changes nothing when @p p is the
      * current object.
      *
-     * @throw std::bad_alloc there is no memory for the counter; @p p has been deleted, and the
-     *        current object is still held
+     * @throw std::bad_alloc no memory for the counter; @p p has been deleted, and the current
+     *        object is kept
      */
     RefPtr& operator=(T* p)
     {
@@ -126,7 +125,7 @@ public:
     /** The object, or null. Still owned by the RefPtr. */
     T* Get() const { return m_RawPtr; }
 
-    /** Whether this is the only RefPtr that holds the object; false when empty. */
+    /** Whether this is the only RefPtr that shares the object; false when empty. */
     bool IsUnique() const { return GetCount() == 1; }
 
     bool Null() const { return m_RawPtr == nullptr; }
@@ -138,7 +137,7 @@ public:
         return m_Counter == nullptr ? 0 : KEVRO_Osa_TaskAtomicAdd(&m_Counter->m_Count, 0);
     }
 
-    /** Lets go: empty afterwards. Harmless when empty. */
+    /** Releases the object; empty afterwards. Does nothing when empty. */
     void Release()
     {
         static_assert(std::has_virtual_destructor<T>::value,
@@ -149,7 +148,7 @@ public:
             const bool replaced = m_Counter != counter;
             delete counter;
             if (replaced) {
-                // The object's destructor left something else in this RefPtr: that goes in turn.
+                // The object's destructor put another object into this RefPtr: release that, too.
                 Release();
             }
         }
@@ -164,7 +163,7 @@ private:
         KEVRO_Int32 m_Count; ///< RefPtr objects that share the object; changed by the platform only
     };
 
-    /** Joins @p counter, adding one to its count; stays without one for null. */
+    /** Shares @p counter and adds one to its count; has no counter for null. */
     void Acquire(M_Counter* counter)
     {
         m_Counter = counter;
@@ -173,7 +172,7 @@ private:
         }
     }
 
-    /** Lets go, then takes over what @p keep holds: it has its share before anything is deleted. */
+    /** Releases, then takes over from @p keep, which owns its share before anything is deleted. */
     void Replace(RefPtr& keep)
     {
         Release();
@@ -182,7 +181,7 @@ private:
     }
 
     T* m_RawPtr;
-    M_Counter* m_Counter; ///< null exactly when nothing is shared
+    M_Counter* m_Counter; ///< null if and only if empty
 };
 
 } // namespace bd

@@ -17,7 +17,7 @@ namespace bd
  * A plain mutex of the operating system that knows its owner. Not recursive.
  *
  * A thread that acquires a mutex it already holds gets an exception: it never hangs, and the mutex
- * stays as it is. Both operations are const, so that a lock can be taken through a const reference.
+ * is unchanged. Both operations are const, so that a lock can be taken through a const reference.
  */
 class ThreadMutex
 {
@@ -34,13 +34,13 @@ public:
      * Waits until the mutex is free and takes it.
      *
      * @throw std::system_error std::errc::resource_deadlock_would_occur when the calling thread
-     *        holds the mutex already; else the code with which the operating system refused. The
-     *        mutex is then as it was before the call.
+     *        holds the mutex already; otherwise the operating system's error code. The mutex is
+     *        then unchanged.
      */
     void Acquire() const
     {
         const std::thread::id self = std::this_thread::get_id();
-        // Another thread's id may be stale when it is read here, the calling thread's own never is.
+        // Another thread's id may be stale when read here; the calling thread's own never is.
         if (m_Owner.load(std::memory_order_relaxed) == self) {
             ThrowHeldAlready();
         }
@@ -52,8 +52,8 @@ public:
     }
 
     /**
-     * Lets the mutex go. Never throws: a call by a thread that does not hold the mutex, and a
-     * refusal by the operating system, are reported through Assert() and leave it as it is.
+     * Frees the mutex. Never throws: a call by a thread that does not hold the mutex, and an error
+     * of the operating system, are reported through Assert() and leave the mutex unchanged.
      */
     void Release() const
     {
@@ -70,7 +70,7 @@ public:
     }
 
 private:
-    // The rare ways out stand apart, so that the usual one stays short where it is inlined.
+    // The error paths are out of line, so that the inlined common path stays short.
     [[noreturn]] static void ThrowHeldAlready();
     [[noreturn]] static void ThrowRefused(int error);
     static void ReportNotHeld();

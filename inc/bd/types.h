@@ -7,7 +7,7 @@
  * and !=, safe to read from any thread.
  *
  * Enumerations have the fixed underlying type KEVRO_Int32, so a value outside the list, from a disc
- * or from another layer, can travel and be reported, and no size depends on compiler flags.
+ * or from another layer, can be passed on and reported, and no size depends on compiler flags.
  */
 #ifndef BD_TYPES_H
 #define BD_TYPES_H
@@ -53,7 +53,7 @@ typedef UInt32 ServiceRequestId;  ///< identifier of a service request
 enum PlayDirectionDef : KEVRO_Int32 { PlayDirectionForward = 0, PlayDirectionBackward = 1 };
 
 /**
- * Speed of playback in 18 steps: 5 is normal, below it slow motion, above it fast play.
+ * Speed of playback in 18 steps: 5 is normal, lower is slow motion, higher is fast play.
  */
 enum PlaySpeedDef : KEVRO_Int32 {
     PlaySpeedSlow5 = 0,
@@ -78,7 +78,7 @@ enum PlaySpeedDef : KEVRO_Int32 {
 
 /**
  * Kind of a repeat or notification trigger, and state of a repeat. Two families of names share the
- * range; both are in use.
+ * range of values; both are in use.
  */
 enum TriggerType : KEVRO_Int32 {
     TriggerTypeNone = 0,
@@ -318,7 +318,7 @@ struct AudioInfoType {
 };
 
 /**
- * A rectangle of the picture. Neither its unit nor its origin is settled: navigator and clients
+ * A rectangle of the picture. Neither its unit nor its origin is specified: navigator and clients
  * agree on them.
  */
 struct ZoomRectangleDef {
@@ -332,7 +332,7 @@ struct ZoomRectangleDef {
 struct ZOOM_PARAM_Def {
     ZoomRectangleDef rClipRectangle; ///< the part of the picture to enlarge
     ZoomRectangleDef rDestRectangle; ///< where it is shown
-    UInt32 u4Delay;                  ///< passed through unchanged; its unit is not settled
+    UInt32 u4Delay;                  ///< passed through unchanged; its unit is unspecified
 };
 
 /** The trigger that is set. */
@@ -436,7 +436,7 @@ inline bool operator!=(const BDMarkDef& left, const BDMarkDef& right)
     return !(left == right);
 }
 
-/** Whether both are the same block: address and size. Its bytes are not looked at. */
+/** Whether both are the same block: same address, same size. The bytes are not compared. */
 inline bool operator==(const DataBlockDef& left, const DataBlockDef& right)
 {
     return left.pData == right.pData && left.size == right.size;
@@ -448,8 +448,8 @@ inline bool operator!=(const DataBlockDef& left, const DataBlockDef& right)
     return !(left == right);
 }
 
-// Clients on the other side of a binary interface see these layouts. BDMarkDef ends on a 64-bit
-// boundary only where 64-bit members are aligned so.
+// Clients across a binary interface see these layouts. BDMarkDef ends on a 64-bit boundary only on
+// targets that align 64-bit members to 8 bytes.
 static_assert(sizeof(PlayDirectionDef) == 4, "enumerations are 32 bits wide");
 static_assert(sizeof(AudioInfoType) == 24, "layout seen by listeners");
 static_assert(alignof(AudioInfoType) == 4, "layout seen by listeners");

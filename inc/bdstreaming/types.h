@@ -1,6 +1,6 @@
 /**
  * @file
- * What the navigator takes over from the streaming layer.
+ * Types that the navigator shares with the streaming layer.
  */
 #ifndef BDSTREAMING_TYPES_H
 #define BDSTREAMING_TYPES_H

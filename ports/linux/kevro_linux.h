@@ -1,19 +1,19 @@
 /**
  * @file
- * What the Linux port offers beside the platform interface: its log is configured here. Plain C
+ * The configuration of the Linux port's log, which is not part of the platform interface. Plain C
  * (C99) and C++.
  *
  * All functions may be called from several threads at once, while others write log lines, and from
- * constructors and destructors of static objects; none throws. They belong neither into a signal
- * handler nor into the child of a fork() that goes on without exec.
+ * constructors and destructors of static objects; none throws. Do not call them from a signal
+ * handler, or from the child of a fork() that continues without exec.
  *
- * At start the port reads these environment variables; what it cannot read it reports in one line
- * on standard error and leaves at its default:
+ * At start the port reads these environment variables; it reports an unreadable value in one line
+ * on standard error and keeps the default:
  *
  * - `KEVRO_LOG`: a text for KEVRO_Log_Configure(); without it `*=Exception|Warning|Fatal`.
  * - `KEVRO_LOG_SINK`: a text for KEVRO_Log_ConfigureSink(); without it `stderr`.
- * - `KEVRO_ASSERT`: `abort` makes Assert() end the program when its report is out; without it
- *   Assert() returns.
+ * - `KEVRO_ASSERT`: `abort` makes Assert() abort the program after its report is written; without
+ *   it Assert() returns.
  * - `KEVRO_UOPMASK`: a number that presets `g_u1Bduopmask`; without it 0.
  */
 #ifndef KEVRO_LINUX_H
@@ -32,20 +32,20 @@ extern "C" {
  * Decides which lines are written from now on.
  *
  * The text is a list, separated by commas, of `COMPONENT=LEVEL[|LEVEL...]`. Components and levels
- * are named as in bd::CompIdDef and bd::LogLevelDef without their prefixes; `*` stands for all.
- * `+hifreq` after a level switches on its high-frequency lines as well. Blanks around words do not
- * count.
+ * are named as in bd::CompIdDef and bd::LogLevelDef without their prefixes; `*` means all.
+ * `+hifreq` after a level switches on its high-frequency lines as well. Blanks around words are
+ * ignored.
  *
  * @code
  * BdmvNavigator=Event+hifreq|Warning, *=Fatal
  * @endcode
  *
- * The text is the whole configuration: what it does not name is off, and the empty text switches
- * everything off. A component that is named gets exactly the levels of its own entries, which add
- * up; `*` governs all the others, wherever it stands.
+ * The text is the whole configuration: anything it does not name is off, and the empty text
+ * switches everything off. A named component gets exactly the levels of its own entries, which add
+ * up; `*` applies to all others, wherever it appears.
  *
- * A text that cannot be read is refused whole, and the configuration in force stays. Of calls on
- * several threads one is applied after the other.
+ * An unreadable text is refused as a whole, and the configuration in force stays. Calls on several
+ * threads are applied one after the other.
  *
  * @param text        null is refused
  * @param message     receives why the text was refused: the word, its position and what was
@@ -60,32 +60,33 @@ bool KEVRO_Log_Configure(const char* text, char* message, size_t messageSize);
  *
  * The text is one of the following, each with the option `,queue=LINES`:
  * - `stderr`: standard error.
- * - `file:PATH[,size=BYTES][,files=N]`: a file that is appended to. When a line would take it
- * beyond BYTES (1048576 unless given), it is renamed and a new one begun; the N (3 unless given)
- * youngest of the renamed are kept, numbered from 1 before the extension. Missing directories are
- * made. PATH has no comma.
+ * - `file:PATH[,size=BYTES][,files=N]`: a file, to which lines are appended. A line that would make
+ *   it larger than BYTES (default 1048576) starts a new file; the newest N (default 3) old files
+ * are kept, numbered from 1 before the extension. Missing directories are created. PATH must not
+ *   contain a comma.
  * - `syslog[:IDENT]`: the system's logger, facility user, under the name IDENT or, without it, the
  *   program's.
  *
- * Without a queue a line is out when its writer goes on. With one, writers never wait for the sink:
- * a thread writes, and when LINES (1 to 65536) lines wait, the oldest of them is dropped.
+ * Without a queue, the call that logs returns after the line is written. With a queue, it never
+ * waits for the sink: a separate thread writes, and when LINES (1 to 65536) lines are waiting, the
+ * oldest is dropped.
  *
- * Returns when all lines given to the sink before are out. A text that cannot be read, or a file
- * that cannot be opened, is refused and the sink in force stays. Parameters and result are those of
+ * Returns after the previous sink has written all its lines. An unreadable text, or a file that
+ * cannot be opened, is refused, and the sink in force stays. Parameters and result are those of
  * KEVRO_Log_Configure().
  */
 bool KEVRO_Log_ConfigureSink(const char* text, char* message, size_t messageSize);
 
 /**
- * How many lines were lost since the start: dropped by a full queue, or refused by the sink.
+ * The number of lines lost since the start: dropped by a full queue, or rejected by the sink.
  *
- * Never decreases. The log tells it too, in a line of its own, as soon as the queue has caught up
- * or the sink takes lines again.
+ * Never decreases. A log line reports the loss, too, as soon as the queue has caught up or the sink
+ * accepts lines again.
  */
 KEVRO_UInt64 KEVRO_Log_GetDroppedLines(void);
 
 /**
- * Waits until every line written before the call is out, as far as it was not dropped.
+ * Waits until every line logged before the call is written or dropped.
  *
  * The end of the program, by exit() or by return from main(), does the same.
  */

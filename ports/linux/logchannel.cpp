@@ -32,17 +32,17 @@ void LogChannel::Exchange(Destination next)
 {
     auto output = std::make_unique<Output>(m_Mutex, std::move(next.sink), next.queueLines);
     const std::lock_guard<std::mutex> exchange(m_ExchangeMutex);
-    std::unique_ptr<Output> gone; // ends its queue's thread after the lock is released
+    std::unique_ptr<Output> drained; // ends its queue's thread after the lock is released
     Output::Lock lock(m_Mutex);
-    m_Leaving = std::exchange(m_Current, std::move(output));
-    m_Leaving->Drain(lock);
-    m_LostBefore += m_Leaving->CountLost(lock);
-    gone = std::move(m_Leaving);
+    m_Previous = std::exchange(m_Current, std::move(output));
+    m_Previous->Drain(lock);
+    m_LostBefore += m_Previous->CountLost(lock);
+    drained = std::move(m_Previous);
 }
 
 void LogChannel::Flush() noexcept
 {
-    // An exchange ends with a flush of the output before, so waiting for it covers that one, too.
+    // An exchange ends by draining the previous output, so waiting for it covers that output, too.
     const std::lock_guard<std::mutex> exchange(m_ExchangeMutex);
     Output::Lock lock(m_Mutex);
     m_Current->Drain(lock);
@@ -57,7 +57,8 @@ void LogChannel::Finish() noexcept
 KEVRO_UInt64 LogChannel::CountLost() noexcept
 {
     const Output::Lock lock(m_Mutex);
-    return m_LostBefore + m_Current->CountLost(lock) + (m_Leaving ? m_Leaving->CountLost(lock) : 0);
+    return m_LostBefore + m_Current->CountLost(lock) +
+           (m_Previous ? m_Previous->CountLost(lock) : 0);
 }
 
 } // namespace kevro

@@ -1,6 +1,6 @@
 /**
  * @file
- * The one way of all lines: through the output in force, also while it is exchanged.
+ * The path every line takes, even while the sink is swapped.
  */
 #ifndef KEVRO_LOGCHANNEL_H
 #define KEVRO_LOGCHANNEL_H
@@ -17,10 +17,10 @@
 namespace kevro
 {
 
-/** Where lines go. */
+/** A sink and its queue. */
 struct Destination {
     std::unique_ptr<spdlog::sinks::sink> sink;
-    std::size_t queueLines; ///< lines that may wait for it; 0 writes each directly
+    std::size_t queueLines; ///< lines that may wait for the sink; 0 writes each directly
 };
 
 /** All operations may be called from several threads at once. */
@@ -34,30 +34,30 @@ public:
 
     void Write(const LogLine& line) noexcept;
 
-    /** Counts a line that was lost on its way here. */
+    /** Counts a line that was lost before it reached the channel. */
     void AddLost() noexcept;
 
-    /** Sends the lines from now on to @p next; returns when the output before has written all. */
+    /** Sends later lines to @p next; returns after the previous output has written its lines. */
     void Exchange(Destination next);
 
-    /** Waits until every line written before is out. */
+    /** Waits until every earlier line is written or lost. */
     void Flush() noexcept;
 
-    /** Flushes now and after every line from now on: nobody will do it later. */
+    /** Flushes now and after every later line, since no other flush follows. */
     void Finish() noexcept;
 
     KEVRO_UInt64 CountLost() noexcept;
 
 private:
     std::mutex m_ExchangeMutex; ///< one exchange or flush at a time; taken before m_Mutex
-    std::mutex m_Mutex;         ///< never held while anything is written
+    std::mutex m_Mutex;         ///< never held while a line is written
     std::unique_ptr<Output> m_Current;
-    std::unique_ptr<Output> m_Leaving; ///< null, or what an exchange is waiting for
-    KEVRO_UInt64 m_LostBefore = 0;     ///< by outputs that are gone
+    std::unique_ptr<Output> m_Previous; ///< null, or the output that an exchange is draining
+    KEVRO_UInt64 m_LostBefore = 0;      ///< by earlier outputs
     std::atomic<bool> m_Finishing{false};
 };
 
-/** The channel of the process, made when it is first asked for and never destroyed. */
+/** The channel of the process, created on first use and never destroyed. */
 LogChannel& TheLogChannel();
 
 } // namespace kevro

@@ -17,7 +17,7 @@ void Append(TextBuffer& buffer, std::string_view text)
     buffer.append(text.data(), text.data() + text.size());
 }
 
-/** The name of a number, or the number where it has none. */
+/** Appends the name of a number, or the number if it has no name. */
 template <typename Number> void AppendName(TextBuffer& buffer, const Names& names, Number number)
 {
     if (const Names::Entry* const entry = names.Find(static_cast<KEVRO_UInt32>(number))) {

@@ -1,6 +1,6 @@
 /**
  * @file
- * A log line on its way from its writer to a destination.
+ * A log line between its writer and its destination.
  */
 #ifndef KEVRO_LOGLINE_H
 #define KEVRO_LOGLINE_H
@@ -14,10 +14,10 @@
 namespace kevro
 {
 
-/** Characters on the stack unless they are many. */
+/** Characters, on the stack unless they are many. */
 using TextBuffer = spdlog::memory_buf_t;
 
-/** A line as its writer gave it; the text belongs to somebody else. */
+/** A line as its writer passed it; the text is borrowed. */
 struct LogLine {
     spdlog::log_clock::time_point time;
     KEVRO_UInt32 component;
@@ -25,10 +25,10 @@ struct LogLine {
     std::string_view text;
 };
 
-/** Appends what stands in the log behind the time: component, level, and the text made harmless. */
+/** Appends the part of a log line after the time: component, level, and the escaped text. */
 void AppendLine(TextBuffer& buffer, const LogLine& line);
 
-/** What spdlog and the system's logger call a level. */
+/** The level of spdlog, and of the system's logger, that corresponds to a level. */
 spdlog::level::level_enum Severity(KEVRO_Int32 level);
 
 } // namespace kevro

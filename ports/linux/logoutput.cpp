@@ -16,13 +16,13 @@ namespace
 {
 
 /**
- * What a queued line is beside its time and its text.
+ * The parts of a queued line besides its time and its text.
  *
- * spdlog's messages have no field for it, but the queue copies the name of a message's logger next
- * to the text. Nobody needs that name here, so these bytes travel as it.
+ * spdlog's messages have no field for them, but the queue copies the name of a message's logger
+ * next to the text. That name is not used here, so these bytes are passed in its place.
  */
 struct Heading {
-    KEVRO_UInt64 number; ///< the first line has 1
+    KEVRO_UInt64 number; ///< of the line, from 1
     KEVRO_UInt32 component;
     KEVRO_Int32 level;
 
@@ -46,7 +46,7 @@ Output::Output(std::mutex& mutex, std::unique_ptr<spdlog::sinks::sink> destinati
     : m_Destination(std::move(destination)), m_rMutex(mutex)
 {
     if (queueLines != 0) {
-        // The logger lives inside this object and shares nothing with it.
+        // The logger is a member of this object, so its pointer to this object owns nothing.
         const spdlog::sink_ptr self(spdlog::sink_ptr(), this);
         m_Queue = std::make_shared<spdlog::details::thread_pool>(queueLines, 1);
         m_Logger = std::make_shared<spdlog::async_logger>(
@@ -96,14 +96,14 @@ void Output::log(const spdlog::details::log_msg& message)
     const std::string_view text(message.payload.data(), message.payload.size());
 
     Lock lock(m_rMutex);
-    // Not while lines are waiting: each of these reports would cost one of them its place.
+    // Not while lines are waiting: each report could displace one of them.
     const KEVRO_UInt64 lost = m_Queue->queue_size() == 0 ? CountLost(lock) : 0;
     lock.unlock();
     const bool written =
         WriteToDestination({message.time, heading.component, heading.level, text}, lost);
     lock.lock();
-    // The queue keeps the order: the lines before this one are out, or it dropped them.
-    Account(lock, heading.number, written);
+    // The queue keeps the order: every earlier line has been written or dropped.
+    MarkDone(lock, heading.number, written);
 }
 
 void Output::flush()
@@ -128,13 +128,13 @@ void Output::WriteDirectly(Lock& lock, const LogLine& line) noexcept
     lock.unlock();
     const bool written = WriteToDestination(line, lost);
     lock.lock();
-    Account(lock, m_Done + 1, written);
+    MarkDone(lock, m_Done + 1, written);
 }
 
 void Output::Queue(const Lock& /*lock*/, const LogLine& line)
 {
     const Heading heading = {m_Accepted + 1, line.component, line.level};
-    // Not through the logger: some versions of it keep to themselves that memory ran out.
+    // Not through the logger: some of its versions hide that memory ran out.
     m_Queue->post_log(std::shared_ptr<spdlog::async_logger>(m_Logger),
                       spdlog::details::log_msg(
                           line.time, spdlog::source_loc(), heading.AsName(), Severity(line.level),
@@ -166,7 +166,7 @@ bool Output::TryWrite(const LogLine& line) noexcept
 
 void Output::ReportLost(KEVRO_UInt64 lost) noexcept
 {
-    // Another writer may have counted later and come first.
+    // Another writer may have counted later but reported first.
     if (lost <= m_ReportedLost) {
         return;
     }
@@ -179,7 +179,7 @@ void Output::ReportLost(KEVRO_UInt64 lost) noexcept
     }
 }
 
-void Output::Account(const Lock& /*lock*/, KEVRO_UInt64 done, bool written) noexcept
+void Output::MarkDone(const Lock& /*lock*/, KEVRO_UInt64 done, bool written) noexcept
 {
     m_Done = done;
     m_Refused += written ? 0 : 1;

@@ -1,6 +1,6 @@
 /**
  * @file
- * A configured sink with its queue, and the account of what became of every line.
+ * A configured sink with its queue, and the counts of lines accepted, written and lost.
  */
 #ifndef KEVRO_LOGOUTPUT_H
 #define KEVRO_LOGOUTPUT_H
@@ -21,29 +21,29 @@ namespace kevro
 {
 
 /**
- * Takes lines and hands them to a destination, directly or through spdlog's bounded queue.
+ * Takes lines and passes them to a destination, directly or through spdlog's bounded queue.
  *
- * Behind the queue it stands before the destination as a sink of its own: there it composes the
- * line, so that a writer does no more than copy its text, counts what went through, keeps
- * exceptions from spdlog, and writes a line where others were lost.
+ * Between the queue and the destination it is itself a spdlog sink: there it composes the line, so
+ * that a writer only copies its text, counts the lines, keeps exceptions from spdlog, and writes a
+ * line that reports lost ones.
  *
- * Its mutex is its owner's: who picks an output and gives it a line locks once for both. All
- * operations may be called from several threads at once.
+ * Shares its owner's mutex, so choosing an output and writing to it take one lock. All operations
+ * may be called from several threads at once.
  */
 class Output final : private spdlog::sinks::sink
 {
 public:
-    /** Holds the mutex, before and after; an operation that takes its time lets it go meanwhile. */
+    /** Holds the mutex before and after a call; a slow operation releases it in between. */
     using Lock = std::unique_lock<std::mutex>;
 
     /**
-     * @param mutex      guards the account; outlives the output
+     * @param mutex      guards the counts; must outlive the output
      * @param queueLines lines that may wait for the destination; 0 writes each directly
      */
     Output(std::mutex& mutex, std::unique_ptr<spdlog::sinks::sink> destination,
            std::size_t queueLines);
 
-    /** Drain() first. No thread may write any more, and the mutex is free. */
+    /** Drain() first. No thread may write any more, and the mutex must be free. */
     ~Output() override = default;
 
     Output(const Output&) = delete;
@@ -52,13 +52,13 @@ public:
     /** Writes or queues a line. With a queue it never waits for the destination. */
     void Write(Lock& lock, const LogLine& line) noexcept;
 
-    /** Waits until each line given to Write() before is written or lost. */
+    /** Waits until every line passed to Write() so far is written or lost. */
     void Drain(Lock& lock) noexcept;
 
-    /** Counts a line that was lost on its way here. */
+    /** Counts a line that was lost before it reached the output. */
     void AddLost(const Lock& lock) noexcept;
 
-    /** How many lines were lost. */
+    /** The number of lost lines. */
     KEVRO_UInt64 CountLost(const Lock& lock) const noexcept;
 
 private:
@@ -72,20 +72,21 @@ private:
     bool WriteToDestination(const LogLine& line, KEVRO_UInt64 lost) noexcept;
     bool TryWrite(const LogLine& line) noexcept;
     void ReportLost(KEVRO_UInt64 lost) noexcept;
-    void Account(const Lock& lock, KEVRO_UInt64 done, bool written) noexcept;
+    void MarkDone(const Lock& lock, KEVRO_UInt64 done, bool written) noexcept;
 
     const std::unique_ptr<spdlog::sinks::sink> m_Destination;
-    std::mutex m_WriteMutex;         ///< held while the destination takes a line
+    std::mutex m_WriteMutex;         ///< held while the destination writes a line
     KEVRO_UInt64 m_ReportedLost = 0; ///< under m_WriteMutex
 
-    std::mutex& m_rMutex; ///< never held while anything is written
+    std::mutex& m_rMutex; ///< never held while a line is written
     std::condition_variable m_Progress;
-    KEVRO_UInt64 m_Accepted = 0; ///< on their way to the destination, or done
-    KEVRO_UInt64 m_Done = 0;     ///< written or lost; of queued lines the number of the last one
-    KEVRO_UInt64 m_Refused = 0;  ///< lost, but not by the queue
+    KEVRO_UInt64 m_Accepted = 0; ///< lines queued, being written or done
+    KEVRO_UInt64 m_Done = 0;     ///< lines written or lost; with a queue the last one's number
+    KEVRO_UInt64 m_Refused = 0;  ///< lines lost, but not by the queue
 
-    std::shared_ptr<spdlog::async_logger> m_Logger; ///< null, or what leads from the queue here
-    // Last, so that the queue's thread ends before anything it uses goes.
+    std::shared_ptr<spdlog::async_logger>
+        m_Logger; ///< writes queued lines here; null without a queue
+    // Last, so that the queue's thread ends before anything it uses is destroyed.
     std::shared_ptr<spdlog::details::thread_pool> m_Queue; ///< null without a queue
 };
 

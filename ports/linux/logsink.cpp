@@ -15,7 +15,7 @@ namespace kevro
 namespace
 {
 
-/** A number given as `name=number` behind the name of a sink. */
+/** A number given as `name=number` after the name of a sink. */
 struct Option {
     const char* name;
     bool forFilesOnly;
@@ -41,7 +41,7 @@ struct Options {
                 continue;
             }
             if (option->given) {
-                name.Refuse("it once");
+                name.RefuseBecause("given twice");
             }
             const Word value =
                 word.Part(equals == std::string_view::npos ? word.text.size() : equals + 1);
@@ -92,7 +92,7 @@ LogChannel& MakeLogChannel()
     return *new LogChannel(std::move(destination));
 }
 
-// Made at start in any case, so that what is wrong with the environment is told then.
+// Created at start in any case, so that an error in the environment is reported then.
 [[maybe_unused]] const LogChannel& g_rStarted = TheLogChannel();
 
 } // namespace

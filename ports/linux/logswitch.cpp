@@ -20,7 +20,7 @@ namespace
 using LevelSet = KEVRO_UInt32;
 
 constexpr int HiFreqShift = 16;
-static_assert(KEVRO_Log_Level__sizeof <= HiFreqShift, "two bits a level");
+static_assert(KEVRO_Log_Level__sizeof <= HiFreqShift, "two bits per level");
 
 constexpr LevelSet Bit(KEVRO_UInt32 level)
 {
@@ -34,28 +34,28 @@ constexpr LevelSet DefaultLevels =
 constexpr KEVRO_UInt32 FirstComponent = bd::CompIdBdavArchiver;
 constexpr KEVRO_UInt32 ComponentCount = bd::CompId__sizeof - FirstComponent;
 
-/** Where the levels of a component stand; the numbers outside the list share the last place. */
-constexpr std::size_t Place(KEVRO_UInt32 component)
+/** The index of a component in the table; numbers outside the list share the last entry. */
+constexpr std::size_t IndexOf(KEVRO_UInt32 component)
 {
     return std::min(component - FirstComponent, ComponentCount);
 }
 
 struct SwitchWord {
-    // Known to the compiler, so that it is there for the very first constructor that logs.
+    // Initialised at compile time, so that it is valid for the first constructor that logs.
     std::atomic<LevelSet> levels{DefaultLevels};
 };
 
 SwitchWord g_Switch[ComponentCount + 1];
 std::mutex g_ConfigureMutex;
 
-/** Refuses a word that is no name of a list, with the name it may have been meant for. */
+/** Refuses a word that is not a name in the list, and suggests a similar name. */
 [[noreturn]] void RefuseName(const Word& word, const Names& names, const std::string& expected)
 {
     const Names::Entry* const similar = names.FindSimilar(word.text);
     word.Refuse(similar == nullptr ? expected : expected + "; did you mean " + similar->name + "?");
 }
 
-/** The place of the component a word names, or nothing when it names all. */
+/** The index of the component that a word names, or nothing if it names all. */
 std::optional<std::size_t> ReadComponent(const Word& word)
 {
     if (word.text == "*") {
@@ -65,7 +65,7 @@ std::optional<std::size_t> ReadComponent(const Word& word)
     if (component == nullptr) {
         RefuseName(word, Components, "a component or *");
     }
-    return Place(component->number);
+    return IndexOf(component->number);
 }
 
 LevelSet ReadLevel(const Word& word)
@@ -81,7 +81,7 @@ LevelSet ReadLevel(const Word& word)
         levels = Bit(level->number);
     }
     if (parts.size() > 2) {
-        word.Refuse("one + after a level");
+        word.Refuse("at most one + after a level");
     }
     if (parts.size() == 2) {
         if (parts[1].text != "hifreq") {
@@ -101,7 +101,7 @@ void Configure(const char* text)
     const std::vector<Word> entries = whole.text.empty() ? std::vector<Word>() : whole.Split(',');
     for (const Word& entry : entries) {
         const std::vector<Word> sides = entry.Split('=');
-        const std::optional<std::size_t> place = ReadComponent(sides[0]);
+        const std::optional<std::size_t> index = ReadComponent(sides[0]);
         if (sides.size() != 2) {
             entry.Refuse("COMPONENT=LEVEL[|LEVEL...]");
         }
@@ -109,16 +109,16 @@ void Configure(const char* text)
         for (const Word& level : sides[1].Split('|')) {
             levels |= ReadLevel(level);
         }
-        if (place) {
-            named[*place] = named[*place].value_or(0) | levels;
+        if (index) {
+            named[*index] = named[*index].value_or(0) | levels;
         } else {
             others |= levels;
         }
     }
 
     const std::lock_guard<std::mutex> lock(g_ConfigureMutex);
-    for (std::size_t place = 0; place < named.size(); ++place) {
-        g_Switch[place].levels.store(named[place].value_or(others), std::memory_order_relaxed);
+    for (std::size_t index = 0; index < named.size(); ++index) {
+        g_Switch[index].levels.store(named[index].value_or(others), std::memory_order_relaxed);
     }
     g_Switch[ComponentCount].levels.store(others, std::memory_order_relaxed);
 }
@@ -131,12 +131,12 @@ void Configure(const char* text)
 
 KEVRO_Bool KEVRO_Log_IsEnabled(KEVRO_UInt32 component, KEVRO_Int32 level, KEVRO_Bool hiFreq)
 {
-    const auto number = static_cast<KEVRO_UInt32>(level); // a negative one is above all levels
+    const auto number = static_cast<KEVRO_UInt32>(level); // a negative level exceeds all others
     if (number >= KEVRO_Log_Level__sizeof) {
         return 0;
     }
     const kevro::LevelSet levels =
-        kevro::g_Switch[kevro::Place(component)].levels.load(std::memory_order_relaxed);
+        kevro::g_Switch[kevro::IndexOf(component)].levels.load(std::memory_order_relaxed);
     return static_cast<KEVRO_Bool>(
         (levels >> (hiFreq != 0 ? number + kevro::HiFreqShift : number)) & 1);
 }

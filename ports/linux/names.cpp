@@ -88,7 +88,7 @@ char Lower(char c)
     return static_cast<char>(std::tolower(static_cast<unsigned char>(c)));
 }
 
-/** How many letters must be changed, added or taken away to turn one word into the other. */
+/** The number of letters to change, insert or delete to turn one word into the other. */
 std::size_t Distance(std::string_view from, std::string_view to)
 {
     std::vector<std::size_t> row(to.size() + 1);
@@ -124,7 +124,7 @@ const Names::Entry* Names::Find(std::string_view name) const
 const Names::Entry* Names::FindSimilar(std::string_view word) const
 {
     const Entry* similar = nullptr;
-    // More than a third of the letters wrong, and it is another word rather than a slip.
+    // With more than a third of the letters wrong it is another word, not a typing error.
     std::size_t bound = word.size() / 3 + 1;
     for (const Entry& entry : *this) {
         const std::size_t distance = Distance(word, entry.name);

@@ -1,6 +1,6 @@
 /**
  * @file
- * The names of components and levels, as they stand in log lines and configuration texts.
+ * The names of components and levels, as used in log lines and configuration texts.
  */
 #ifndef KEVRO_NAMES_H
 #define KEVRO_NAMES_H
@@ -13,7 +13,7 @@
 namespace kevro
 {
 
-/** A list of names and what they stand for. */
+/** A list of names and their numbers. */
 class Names
 {
 public:
@@ -36,7 +36,7 @@ public:
     /** The entry with this name, or null. */
     const Entry* Find(std::string_view name) const;
 
-    /** The entry somebody may have meant who wrote @p word, or null. */
+    /** The entry that @p word may be a misspelling of, or null. */
     const Entry* FindSimilar(std::string_view word) const;
 
 private:

@@ -1,6 +1,6 @@
 /**
  * @file
- * Text from outside, made harmless for terminals and for whoever reads a log line by line.
+ * Escapes text from outside, so that it cannot control a terminal or break a log line.
  */
 #ifndef KEVRO_PRINTABLE_H
 #define KEVRO_PRINTABLE_H
@@ -12,9 +12,9 @@ namespace kevro
 {
 
 /**
- * Appends a text, every character that is not a printable one of ASCII as an escape sequence of C.
+ * Appends a text with every character but printable ASCII as an escape sequence of C.
  *
- * A backslash is doubled, so that what a line shows can be told from what it was.
+ * A backslash is doubled, so that the original text can be recovered.
  *
  * @tparam Buffer a sequence of char with push_back(), and append() of a range
  */

@@ -60,19 +60,24 @@ long long Word::Number(long long smallest, long long largest) const
 
 void Word::Refuse(const std::string& expected) const
 {
-    std::string reason = "nothing";
+    RefuseBecause("expected " + expected);
+}
+
+void Word::RefuseBecause(const std::string& reason) const
+{
+    std::string word = "nothing";
     if (!text.empty()) {
-        reason = '"';
-        AppendPrintable(reason, text);
-        reason += '"';
+        word = '"';
+        AppendPrintable(word, text);
+        word += '"';
     }
-    throw Refusal(reason + " at character " + std::to_string(position) + ": expected " + expected);
+    throw Refusal(word + " at character " + std::to_string(position) + ": " + reason);
 }
 
 bool Apply(const Setting& setting, const char* text, char* message,
            std::size_t messageSize) noexcept
 {
-    const auto tell = [&](const char* reason) {
+    const auto report = [&](const char* reason) {
         if (message != nullptr) {
             std::snprintf(message, messageSize, "%s", reason);
         }
@@ -82,24 +87,24 @@ bool Apply(const Setting& setting, const char* text, char* message,
             throw Refusal("no text");
         }
         setting(text);
-        tell("");
+        report("");
         return true;
     } catch (const std::exception& reason) {
-        tell(reason.what());
+        report(reason.what());
         return false;
     }
 }
 
 bool ApplyEnvironment(const char* variable, const Setting& setting) noexcept
 {
-    // A program that runs with more rights than its caller does not let the caller choose a file.
+    // A program with more privileges than its caller does not let the caller choose a file.
     const char* const value = secure_getenv(variable);
     if (value == nullptr) {
         return false;
     }
     char message[256];
     if (!Apply(setting, value, message, sizeof(message))) {
-        std::fprintf(stderr, "%s: %s; the default stays\n", variable, message);
+        std::fprintf(stderr, "%s: %s; using the default\n", variable, message);
         return false;
     }
     return true;

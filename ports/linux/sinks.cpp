@@ -21,7 +21,7 @@ namespace
 
 constexpr char LinePattern[] = "%Y-%m-%d %H:%M:%S.%f %v";
 
-/** Standard error. Unlike spdlog's own it says so when a line was not taken. */
+/** Standard error. Unlike spdlog's own sink it throws when a line could not be written. */
 class StderrSink final : public spdlog::sinks::base_sink<std::mutex>
 {
 protected:
@@ -35,7 +35,7 @@ protected:
             if (written >= 0) {
                 rest.remove_prefix(static_cast<std::size_t>(written));
             } else if (errno == EAGAIN) {
-                // Whoever shares the terminal may have made it non-blocking.
+                // Another program may have made the shared terminal non-blocking.
                 pollfd writable = {STDERR_FILENO, POLLOUT, 0};
                 ::poll(&writable, 1, -1);
             } else if (errno != EINTR) {
@@ -48,8 +48,8 @@ protected:
 };
 
 /**
- * The system's log. spdlog's own closes it when it goes, which would take the name from a sink made
- * in the meantime.
+ * The system's log. spdlog's own sink closes it on destruction, which would remove the name of a
+ * sink created in the meantime.
  */
 class SyslogSink final : public spdlog::sinks::base_sink<std::mutex>
 {
@@ -69,7 +69,7 @@ protected:
     void flush_() override {}
 
 private:
-    /** The system keeps the pointer to a name, so a name once given is never freed. */
+    /** The system keeps the pointer to the name, so a name is never freed. */
     static const char* Keep(const std::string& ident)
     {
         static std::mutex& mutex = *new std::mutex;
@@ -109,7 +109,7 @@ std::unique_ptr<spdlog::sinks::sink> MakeFileSink(const std::string& path, std::
 {
     spdlog::file_event_handlers handlers;
     handlers.after_open = [](const spdlog::filename_t&, std::FILE* file) {
-        // Without a buffer a full disk is noticed at the line it costs, and a crash costs none.
+        // Unbuffered, a full disk is noticed at the line that is lost, and a crash loses none.
         std::setvbuf(file, nullptr, _IONBF, 0);
     };
     auto sink =

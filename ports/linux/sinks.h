@@ -1,7 +1,7 @@
 /**
  * @file
- * The destinations of log lines. Each can be used by several threads and throws
- * std::exception when it does not take a line.
+ * The destinations of log lines. Each can be used by several threads and throws a std::exception
+ * when it cannot write a line.
  */
 #ifndef KEVRO_SINKS_H
 #define KEVRO_SINKS_H
@@ -21,7 +21,7 @@ std::unique_ptr<spdlog::sinks::sink> MakeStderrSink();
 std::unique_ptr<spdlog::sinks::sink> MakeFileSink(const std::string& path, std::size_t size,
                                                   std::size_t files);
 
-/** @param ident the name to appear under; empty for the program's */
+/** @param ident the name in the system's log; empty for the program's name */
 std::unique_ptr<spdlog::sinks::sink> MakeSyslogSink(const std::string& ident);
 
 } // namespace kevro

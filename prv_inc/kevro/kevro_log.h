@@ -18,9 +18,9 @@ extern "C" {
 /**
  * Levels of a log line. The values are those of bd::LogLevelDef.
  *
- * The functions below take a level as an integer, so that a caller may name it by either
- * enumeration. A C compiler may choose an unsigned type for a variable of this one: cast such a
- * variable to KEVRO_Int32 where conversions of the sign are reported.
+ * The functions below take a level as an integer, so that a caller may use either enumeration. A C
+ * compiler may give this enumeration an unsigned type: cast a variable of it to KEVRO_Int32 where
+ * the compiler warns about sign conversions.
  */
 typedef enum KEVRO_Log_Level {
     KEVRO_Log_LevelMethod = 0,
@@ -41,7 +41,7 @@ typedef enum KEVRO_Log_Level {
 } KEVRO_Log_Level;
 
 /**
- * Tells whether a line with these attributes would be written.
+ * Returns whether a line with these attributes would be written.
  *
  * Has no side effects and is cheap enough to be called for every event.
  *
@@ -55,8 +55,8 @@ KEVRO_Bool KEVRO_Log_IsEnabled(KEVRO_UInt32 component, KEVRO_Int32 level, KEVRO_
 /**
  * Formats and writes one line; a line that cannot be written is dropped.
  *
- * The caller has asked KEVRO_Log_IsEnabled() before; the port need not ask again. It neither throws
- * nor keeps @p format, @p args or what they point to after it has returned.
+ * The caller has called KEVRO_Log_IsEnabled() first; the port need not check again. The function
+ * does not throw, and does not keep @p format, @p args or what they point to after it returns.
  *
  * @param component a bd::CompIdDef value
  * @param level     a KEVRO_Log_Level or bd::LogLevelDef value

@@ -3,7 +3,7 @@
  * Base integer types of the platform layer. Plain C (C99) and C++.
  *
  * Every width here is exact on every target. The layers above build their identifiers and their
- * binary layouts on them, so a port changes none of these definitions.
+ * binary layouts on these types, so a port must not change their definitions.
  */
 #ifndef KEVRO_KEVRO_TYPES_H
 #define KEVRO_KEVRO_TYPES_H

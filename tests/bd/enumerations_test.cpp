@@ -1,5 +1,5 @@
-// Every enumeration holds exactly the enumerators listed here, each with exactly its value: the
-// values travel to clients, to the platform and into log lines.
+// Every enumeration has exactly the enumerators listed here, each with exactly its value: the
+// values reach clients, the platform and log lines.
 
 #include <gtest/gtest.h>
 
@@ -13,7 +13,7 @@
 #include "database/inavigationcommanddata.h"
 #include "database/iplaylistmark.h"
 
-// An enumerator that a list leaves out, or a value that two of them share, does not compile.
+// An enumerator missing from a list, or a value that two of them share, does not compile.
 #pragma GCC diagnostic error "-Wswitch"
 
 #define CASE(enumerator, value) case enumerator:
@@ -428,7 +428,7 @@ typedef testing::Types<bd::PlayDirectionDef, bd::PlaySpeedDef, bd::TriggerType, 
     SignedEnumerations;
 TYPED_TEST_SUITE(FixedWidthEnumerations, SignedEnumerations, );
 
-TYPED_TEST(FixedWidthEnumerations, RestsOnASigned32BitInteger)
+TYPED_TEST(FixedWidthEnumerations, HasASigned32BitUnderlyingType)
 {
     EXPECT_TRUE((std::is_same_v<std::underlying_type_t<TypeParam>, KEVRO_Int32>));
 }
@@ -443,7 +443,7 @@ TYPED_TEST(FixedWidthEnumerations, CarriesAValueOutsideTheList)
     EXPECT_EQ(-12345, static_cast<KEVRO_Int32>(static_cast<TypeParam>(-12345)));
 }
 
-TEST(Enumerations, CommandRestsOnAnUnsigned32BitInteger)
+TEST(Enumerations, CommandHasAnUnsigned32BitUnderlyingType)
 {
     EXPECT_TRUE((std::is_same_v<std::underlying_type_t<bdmv::INavigationCommandData::Command>,
                                 KEVRO_UInt32>));

@@ -106,7 +106,7 @@ TEST_F(EventDelivery, FinishesOneCallbackBeforeTheNext)
               journal.Take());
 }
 
-TEST_F(EventDelivery, CallsNobodyWhenNobodyIsRegistered)
+TEST_F(EventDelivery, CallsNothingWithoutListeners)
 {
     List empty;
     EventListenerList_FireParam4(empty, &IProbe::Call4, 1, 2, 3, 4);
@@ -116,7 +116,7 @@ TEST_F(EventDelivery, CallsNobodyWhenNobodyIsRegistered)
 
 // Values
 
-TEST_F(EventDelivery, CopiesAValueOnceAndOnceAListener)
+TEST_F(EventDelivery, CopiesAValueOnceAndThenOncePerListener)
 {
     const CountedValue value(1);
     EventListenerList_FireParam1(list, &IProbe::Copy1, value);
@@ -125,7 +125,7 @@ TEST_F(EventDelivery, CopiesAValueOnceAndOnceAListener)
     EXPECT_EQ(1 + 3, CountedValue::copies);
 }
 
-TEST_F(EventDelivery, CopiesEachOfTwoValuesOnceAndOnceAListener)
+TEST_F(EventDelivery, CopiesEachOfTwoValuesOnceAndThenOncePerListener)
 {
     const CountedValue value(1);
     EventListenerList_FireParam2(list, &IProbe::Copy2, value, value);
@@ -133,7 +133,7 @@ TEST_F(EventDelivery, CopiesEachOfTwoValuesOnceAndOnceAListener)
     EXPECT_EQ(2 * (1 + 3), CountedValue::copies);
 }
 
-TEST_F(EventDelivery, CopiesEachOfThreeValuesOnceAndOnceAListener)
+TEST_F(EventDelivery, CopiesEachOfThreeValuesOnceAndThenOncePerListener)
 {
     const CountedValue value(1);
     EventListenerList_FireParam3(list, &IProbe::Copy3, value, value, value);
@@ -141,7 +141,7 @@ TEST_F(EventDelivery, CopiesEachOfThreeValuesOnceAndOnceAListener)
     EXPECT_EQ(3 * (1 + 3), CountedValue::copies);
 }
 
-TEST_F(EventDelivery, CopiesEachOfFourValuesOnceAndOnceAListener)
+TEST_F(EventDelivery, CopiesEachOfFourValuesOnceAndThenOncePerListener)
 {
     const CountedValue value(1);
     EventListenerList_FireParam4(list, &IProbe::Copy4, value, value, value, value);
@@ -149,7 +149,7 @@ TEST_F(EventDelivery, CopiesEachOfFourValuesOnceAndOnceAListener)
     EXPECT_EQ(4 * (1 + 3), CountedValue::copies);
 }
 
-TEST_F(EventDelivery, CopiesAValueOnceWhenNobodyIsRegistered)
+TEST_F(EventDelivery, CopiesAValueOnceWithoutListeners)
 {
     List empty;
     EventListenerList_FireParam1(empty, &IProbe::Copy1, CountedValue(1));
@@ -247,12 +247,12 @@ TEST_F(EventDelivery, ShowsAChangeThroughAReferenceToLaterListenersAndTheCaller)
     EXPECT_EQ(111, number);
 }
 
-// Invokers of one's own
+// Custom invokers
 
 namespace
 {
 
-/** Counts what it does, and cannot be copied. */
+/** Counts its calls, and cannot be copied. */
 class CountingInvoker
 {
 public:
@@ -267,7 +267,7 @@ public:
 
 } // namespace
 
-TEST_F(EventDelivery, WalksWithAnyInvoker)
+TEST_F(EventDelivery, AcceptsAnyInvoker)
 {
     CountingInvoker invoker;
     EventListenerList_FireInvoker(list, invoker);
@@ -288,7 +288,7 @@ TEST_F(EventDelivery, TakesListAndInvokerByReference)
 
 // The lock
 
-TEST_F(EventDelivery, TakesTheLockOnceAWalk)
+TEST_F(EventDelivery, TakesTheLockOncePerWalk)
 {
     bdmv::NavigatorListenerAdapter quiet;
     bd::EventListenerList<bdmv::INavigatorListener> quietList;
@@ -301,7 +301,7 @@ TEST_F(EventDelivery, TakesTheLockOnceAWalk)
     EXPECT_EQ(unlocks + 1, bdmvtest::CountMutexUnlocks());
 }
 
-TEST_F(EventDelivery, TakesTheLockOnceWhenNobodyIsRegistered)
+TEST_F(EventDelivery, TakesTheLockOnceWithoutListeners)
 {
     List empty;
     const std::size_t locks = bdmvtest::CountMutexLocks();
@@ -338,12 +338,12 @@ TEST_F(EventDelivery, HoldsTheLockFromTheFirstCallbackToTheLast)
     EXPECT_EQ(unlocks, last.unlocks);
 }
 
-TEST_F(EventDelivery, CallsNobodyWhenTheLockIsRefused)
+TEST_F(EventDelivery, CallsNoListenerWhenTheLockIsRefused)
 {
     bdmvtest::FailMutexLock(EAGAIN);
     try {
         EventListenerList_FireParam0(list, &IProbe::Call0);
-        ADD_FAILURE() << "nothing was thrown";
+        ADD_FAILURE() << "no exception was thrown";
     } catch (const std::system_error& error) {
         EXPECT_EQ(std::errc::resource_unavailable_try_again, error.code());
     }
@@ -378,7 +378,7 @@ TEST_F(EventDelivery, EndsAtTheListenerThatThrows)
     }
 }
 
-TEST_F(EventDelivery, PassesTheVeryExceptionThatAListenerThrows)
+TEST_F(EventDelivery, PassesOnTheExceptionThatAListenerThrows)
 {
     const std::exception_ptr thrown = std::make_exception_ptr(std::runtime_error("thrown"));
     std::exception_ptr caught;
@@ -445,12 +445,12 @@ TEST_P(ReentrantDelivery, GetsAnExceptionInsideTheCallback)
     }
 }
 
-TEST_P(ReentrantDelivery, ExceptionThatACallbackLetsPassEndsTheWalk)
+TEST_P(ReentrantDelivery, UncaughtExceptionInsideACallbackEndsTheWalk)
 {
     b.onCall = [this] { GetParam().run(list, another); };
     try {
         EventListenerList_FireParam0(list, &IProbe::Call0);
-        ADD_FAILURE() << "nothing was thrown";
+        ADD_FAILURE() << "no exception was thrown";
     } catch (const std::system_error& refusal) {
         EXPECT_EQ(std::errc::resource_deadlock_would_occur, refusal.code());
     }

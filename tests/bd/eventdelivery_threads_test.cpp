@@ -34,7 +34,7 @@ void WaitFor(const std::atomic<bool>& flag)
     }
 }
 
-/** Says when a callback is running, and lets it run until another thread is about to come. */
+/** Signals a running callback, and prolongs it until another thread is about to use the list. */
 class SlowListener : public ITick
 {
 public:
@@ -64,7 +64,7 @@ class DeliveryThreads : public testing::Test
 protected:
     DeliveryThreads() { list.AddListener(&slow); }
 
-    /** Whether the action, begun during a callback, comes back only after it. */
+    /** Whether the action, started during a callback, returns only after the callback. */
     bool WaitsForTheCallback(const std::function<void()>& action)
     {
         std::thread firing([this] { Fire(list); });
@@ -114,7 +114,7 @@ TEST_F(DeliveryThreads, AnotherDeliveryWaitsForTheRunningCallback)
 namespace
 {
 
-/** Lives only while it is registered. Its members are guarded by nothing but the list. */
+/** Lives only while it is registered. Only the list's lock guards its members. */
 class ShortLivedListener : public ITick
 {
 public:

@@ -23,7 +23,7 @@ protected:
     Probe b{journal, "B"};
 };
 
-/** Takes integers that fill their place in an invoker without padding. */
+/** Takes integers of a size that leaves no padding in an invoker. */
 class IWide
 {
 public:
@@ -37,7 +37,7 @@ protected:
     ~IWide() = default;
 };
 
-/** Whether the invoker is made of these arguments, then the method, and nothing else. */
+/** Whether the invoker consists of these arguments, then the method, and nothing else. */
 template <typename Invoker, typename... Arguments>
 bool Consists(const Invoker& invoker, typename Invoker::MethodPointer method,
               Arguments... arguments)
@@ -101,7 +101,7 @@ TEST_F(EventInvoker, CallsTheListenerItIsGiven)
     EXPECT_EQ("B.Call1(1)\nA.Call1(1)\n", journal.Take());
 }
 
-TEST_F(EventInvoker, HoldsAValueAsItWasWhenItWasMade)
+TEST_F(EventInvoker, HoldsTheValueGivenAtConstruction)
 {
     int number = 1;
     bd::EventInvokerParam1<IProbe, int> invoker(&IProbe::Call1, number);
@@ -122,7 +122,7 @@ TEST_F(EventInvoker, HoldsAReferenceToTheCallersObject)
     EXPECT_EQ(std::vector<const int*>{&number}, a.referents);
 }
 
-TEST_F(EventInvoker, CopiesAValueOnceWhenItIsMade)
+TEST_F(EventInvoker, CopiesAValueOnceAtConstruction)
 {
     const CountedValue value(1);
     CountedValue::copies = 0;
@@ -131,7 +131,7 @@ TEST_F(EventInvoker, CopiesAValueOnceWhenItIsMade)
     EXPECT_EQ(1, CountedValue::copies);
 }
 
-TEST_F(EventInvoker, CopiesAValueOnceACall)
+TEST_F(EventInvoker, CopiesAValueOncePerCall)
 {
     const CountedValue value(1);
     bd::EventInvokerParam1<IProbe, CountedValue> invoker(&IProbe::Copy1, value);

@@ -19,10 +19,10 @@ namespace
 
 typedef bd::EventListenerList<IProbe> List;
 
-static_assert(std::is_default_constructible_v<List>, "made empty");
+static_assert(std::is_default_constructible_v<List>, "starts empty");
 static_assert(!std::is_copy_constructible_v<List> && !std::is_copy_assignable_v<List> &&
                   !std::is_move_constructible_v<List> && !std::is_move_assignable_v<List>,
-              "a list stays where its lock is");
+              "a list cannot move away from its lock");
 
 class EventListenerList : public testing::Test
 {
@@ -34,7 +34,7 @@ protected:
         return journal.Take();
     }
 
-    /** Locks and unlocks of the operating system that the action takes, each counted. */
+    /** The numbers of lock and unlock calls of the operating system that the action makes. */
     template <typename Action> static std::pair<std::size_t, std::size_t> LocksOf(Action action)
     {
         const std::size_t locks = bdmvtest::CountMutexLocks();
@@ -54,7 +54,7 @@ const std::pair<std::size_t, std::size_t> Once = {1, 1};
 
 } // namespace
 
-TEST_F(EventListenerList, IsEmptyAtFirst)
+TEST_F(EventListenerList, StartsEmpty)
 {
     EXPECT_FALSE(list.ListenerExists(&a));
     EXPECT_EQ("", Walk());
@@ -83,7 +83,7 @@ TEST_F(EventListenerList, RefusesNull)
     EXPECT_EQ("", Walk());
 }
 
-TEST_F(EventListenerList, RefusesAListenerThatIsInIt)
+TEST_F(EventListenerList, RefusesAListenerThatIsAlreadyRegistered)
 {
     list.AddListener(&a);
     list.AddListener(&b);
@@ -105,7 +105,7 @@ TEST_F(EventListenerList, RemovesAListener)
     EXPECT_EQ("A.Call0()\nC.Call0()\n", Walk());
 }
 
-TEST_F(EventListenerList, DoesNotRemoveAListenerThatIsNotInIt)
+TEST_F(EventListenerList, DoesNotRemoveAnUnregisteredListener)
 {
     list.AddListener(&a);
 
@@ -129,7 +129,7 @@ TEST_F(EventListenerList, DoesNotRemoveNull)
     EXPECT_EQ("A.Call0()\n", Walk());
 }
 
-TEST_F(EventListenerList, AppendsAListenerThatComesBack)
+TEST_F(EventListenerList, AppendsAListenerThatIsAddedAgain)
 {
     list.AddListener(&a);
     list.AddListener(&b);
@@ -139,7 +139,7 @@ TEST_F(EventListenerList, AppendsAListenerThatComesBack)
     EXPECT_EQ("B.Call0()\nA.Call0()\n", Walk());
 }
 
-TEST_F(EventListenerList, KnowsNothingOfAnotherList)
+TEST_F(EventListenerList, IsIndependentOfOtherLists)
 {
     List other;
     list.AddListener(&a);
@@ -186,7 +186,7 @@ TEST_F(EventListenerList, HoldsItsListenersThenItsLock)
               bdmvtest::LastMutexLocked());
 }
 
-TEST_F(EventListenerList, StaysAsItIsWhenThereIsNoMemoryToAppend)
+TEST_F(EventListenerList, IsUnchangedWhenMemoryRunsOut)
 {
     list.AddListener(&a);
     bdmvtest::FailAllocationAfter(0);

@@ -1,5 +1,5 @@
-// Every signature that events fire, with the template arguments deduced and with the ones that name
-// the listener's parameters as it declares them.
+// Every signature that events fire, with deduced template arguments and with explicit ones that
+// name the listener's parameters as declared.
 
 #include <gtest/gtest.h>
 

@@ -13,7 +13,7 @@
 namespace
 {
 
-/** Writes down what is asked of it. */
+/** Records its calls. */
 class FakeLock
 {
 public:
@@ -40,7 +40,7 @@ constexpr bool IsCopied =
     std::is_move_constructible_v<GuardType> || std::is_move_assignable_v<GuardType>;
 
 static_assert(!IsCopied<FakeGuard> && !IsCopied<MutexGuard>, "a guard belongs to its scope");
-static_assert(!std::is_default_constructible_v<MutexGuard>, "a guard has a lock to hold");
+static_assert(!std::is_default_constructible_v<MutexGuard>, "a guard needs a lock");
 
 } // namespace
 
@@ -76,7 +76,7 @@ TEST(Guard, ReleasesEarly)
     EXPECT_EQ("acquire release ", lock.calls);
 }
 
-TEST(Guard, ReleasesNoMoreAfterAnEarlyRelease)
+TEST(Guard, DoesNotReleaseAgainAfterAnEarlyRelease)
 {
     const FakeLock lock;
     {
@@ -88,7 +88,7 @@ TEST(Guard, ReleasesNoMoreAfterAnEarlyRelease)
     EXPECT_EQ("acquire release ", lock.calls);
 }
 
-TEST(Guard, AcquiredAgainReleasesAgain)
+TEST(Guard, ReleasesAgainAfterAcquiringAgain)
 {
     const FakeLock lock;
     {
@@ -101,7 +101,7 @@ TEST(Guard, AcquiredAgainReleasesAgain)
     EXPECT_EQ("acquire release acquire release ", lock.calls);
 }
 
-TEST(Guard, DoesNotReleaseWhatItDidNotGet)
+TEST(Guard, DoesNotReleaseALockItFailedToAcquire)
 {
     FakeLock lock;
     lock.refuses = true;
@@ -110,7 +110,7 @@ TEST(Guard, DoesNotReleaseWhatItDidNotGet)
     EXPECT_EQ("acquire ", lock.calls);
 }
 
-TEST(Guard, DoesNotReleaseWhatItDidNotGetAgain)
+TEST(Guard, DoesNotReleaseALockItFailedToAcquireAgain)
 {
     FakeLock lock;
     {
@@ -123,7 +123,7 @@ TEST(Guard, DoesNotReleaseWhatItDidNotGetAgain)
     EXPECT_EQ("acquire release acquire ", lock.calls);
 }
 
-TEST(Guard, ReleasesWhatItHeldWhenItCannotGetItTwice)
+TEST(Guard, ReleasesTheHeldLockAfterFailingToAcquireItTwice)
 {
     FakeLock lock;
     {
@@ -170,7 +170,7 @@ TEST(Guard, HoldsAThreadMutexForItsScope)
     EXPECT_EQ("", journal.Take());
 }
 
-TEST(Guard, LeavesAThreadMutexThatItDidNotGetToItsHolder)
+TEST(Guard, LeavesAThreadMutexItFailedToAcquireToItsHolder)
 {
     bdmvtest::Journal journal;
     const bdmvtest::FakePlatform platform(&journal);

@@ -1,4 +1,4 @@
-/* The platform's log functions as a program in C calls them. */
+/* Calls of the platform's log functions from C. */
 #include "kevro/kevro_log.h"
 
 KEVRO_Bool IsEnabledFromC(void);

@@ -25,7 +25,7 @@ protected:
         platform.SetLogSwitch([answer](KEVRO_UInt32, KEVRO_Int32, KEVRO_Bool) { return answer; });
     }
 
-    /** An argument of a line whose evaluation leaves a trace. */
+    /** An argument of a line that records its evaluation. */
     int Argument()
     {
         journal.Add("argument");
@@ -50,7 +50,7 @@ TEST_F(Logging, LoggerHoldsItsThreeValuesInOrder)
     EXPECT_EQ(9u, words[2]);
 }
 
-TEST_F(Logging, LoggerHoldsTheSameWhicheverEnumerationNamesItsLevel)
+TEST_F(Logging, LoggerHoldsTheSameLevelFromEitherEnumeration)
 {
     const bd::VargLogger one(bd::CompIdBdmvNavigator, KEVRO_Log_LevelEvent, 0);
     const bd::VargLogger other(bd::CompIdBdmvNavigator, bd::LogEvent, 0);
@@ -67,7 +67,7 @@ TEST_F(Logging, LoggerWritesAtAnyLevelOfItsOwnEnumeration)
     }
 }
 
-TEST_F(Logging, SwitchIsAskedTheSameWhateverNamesTheLevel)
+TEST_F(Logging, SwitchReceivesTheSameLevelFromEitherEnumeration)
 {
     const KEVRO_Log_Level platformLevel = KEVRO_Log_LevelEvent;
     const bd::LogLevelDef ownLevel = bd::LogEvent;
@@ -86,7 +86,7 @@ TEST_F(Logging, SwitchIsAskedTheSameWhateverNamesTheLevel)
               journal.Take());
 }
 
-TEST_F(Logging, SwitchIsAskedTheSameInC)
+TEST_F(Logging, SwitchReceivesTheSameArgumentsFromC)
 {
     EXPECT_EQ(1, IsEnabledFromC());
 
@@ -96,7 +96,7 @@ TEST_F(Logging, SwitchIsAskedTheSameInC)
               journal.Take());
 }
 
-TEST_F(Logging, LineIsWrittenTheSameInC)
+TEST_F(Logging, LineFromCIsTheSame)
 {
     WriteFromC(0, 7);
 
@@ -105,7 +105,7 @@ TEST_F(Logging, LineIsWrittenTheSameInC)
               journal.Take());
 }
 
-TEST_F(Logging, SwitchIsAskedForAnyNumber)
+TEST_F(Logging, SwitchReceivesAnyNumber)
 {
     KEVRO_Log_IsEnabled(57, bd::LogHighFrequency, 0);
     KEVRO_Log_IsEnabled(57, INT32_MIN, 0);
@@ -115,7 +115,7 @@ TEST_F(Logging, SwitchIsAskedForAnyNumber)
               journal.Take());
 }
 
-TEST_F(Logging, MakingAndDroppingALoggerCallsNothing)
+TEST_F(Logging, ConstructingAndDestroyingALoggerCallsNothing)
 {
     {
         const bd::VargLogger logger(57, KEVRO_Log_LevelEvent, 0);
@@ -139,7 +139,7 @@ TEST_F(Logging, LoggerFormatsItsArguments)
     EXPECT_EQ("log 57 5 0: -1 2 4000000000 18446744073709551615 TRUE\n", journal.Take());
 }
 
-TEST_F(Logging, LoggerWritesOneLineACall)
+TEST_F(Logging, LoggerWritesOneLinePerCall)
 {
     bd::VargLogger logger(57, KEVRO_Log_LevelEvent, 0);
     logger.Log("first %d", 1);
@@ -150,7 +150,7 @@ TEST_F(Logging, LoggerWritesOneLineACall)
               journal.Take());
 }
 
-TEST_F(Logging, LoggerDoesNotAskTheSwitch)
+TEST_F(Logging, LoggerDoesNotCheckTheSwitch)
 {
     SwitchAnswers(0);
     bd::VargLogger(57, KEVRO_Log_LevelEvent, 0).Log("text");
@@ -216,7 +216,7 @@ TEST_F(Logging, ArgumentsAreNotEvaluatedWhenOff)
     EXPECT_EQ("log? 57 5 0 -> off\n", journal.Take());
 }
 
-TEST_F(Logging, AnyAnswerButZeroIsOn)
+TEST_F(Logging, AnyNonZeroAnswerIsOn)
 {
     for (const KEVRO_Bool answer : {1, 2, 256, 65536, INT32_MAX, -1, INT32_MIN}) {
         SwitchAnswers(answer);

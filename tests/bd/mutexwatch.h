@@ -1,9 +1,9 @@
 /**
  * @file
- * Watches what the program asks of the operating system's mutexes, and has it refused.
+ * Counts the program's calls of the operating system's mutex functions, and can make them fail.
  *
  * Linking it sends every call of pthread_mutex_lock() and pthread_mutex_unlock() in the program's
- * own code through here. Everything below concerns the calling thread alone.
+ * own code through here. All functions below concern the calling thread alone.
  */
 #ifndef TESTS_BD_MUTEXWATCH_H
 #define TESTS_BD_MUTEXWATCH_H
@@ -13,10 +13,10 @@
 namespace bdmvtest
 {
 
-/** How often a mutex was locked so far, refusals included. */
+/** The number of lock calls so far, failed ones included. */
 std::size_t CountMutexLocks();
 
-/** How often a mutex was unlocked so far, refusals included. */
+/** The number of unlock calls so far, failed ones included. */
 std::size_t CountMutexUnlocks();
 
 /** The mutex that was locked last. */

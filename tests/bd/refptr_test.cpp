@@ -16,7 +16,7 @@
 namespace
 {
 
-/** Says in the journal when it is destroyed; may do something of the test's own before. */
+/** Records its destruction in the journal; may run an action of the test first. */
 class Object
 {
 public:
@@ -57,7 +57,7 @@ protected:
     bdmvtest::FakePlatform platform{&journal};
 };
 
-/** Has the platform calls stand in the journal as well. */
+/** Records the platform calls in the journal as well. */
 class RefPtrCalls : public RefPtr
 {
 protected:
@@ -84,7 +84,7 @@ TEST_F(RefPtr, IsEmptyByDefault)
     ExpectEmpty(pointer);
 }
 
-TEST_F(RefPtr, OfNullIsEmpty)
+TEST_F(RefPtr, IsEmptyWhenConstructedFromNull)
 {
     const ObjectPtr pointer(nullptr);
 
@@ -112,14 +112,14 @@ TEST_F(RefPtr, StartsTheCountAtOne)
     EXPECT_TRUE(pointer.IsUnique());
 }
 
-TEST_F(RefPtr, IsMadeImplicitlyOfARawPointer)
+TEST_F(RefPtr, ConvertsImplicitlyFromARawPointer)
 {
     const auto factory = [this]() -> ObjectPtr { return New("A"); };
 
     EXPECT_EQ("A", factory()->Name());
 }
 
-TEST_F(RefPtr, IsATruthValueOnlyWhenAskedFor)
+TEST_F(RefPtr, ConvertsToBoolOnlyExplicitly)
 {
     EXPECT_TRUE((std::is_constructible_v<bool, const ObjectPtr&>));
     EXPECT_FALSE((std::is_convertible_v<const ObjectPtr&, bool>));
@@ -185,7 +185,7 @@ TEST_F(RefPtr, CopyOfAnEmptyOneIsEmpty)
     ExpectEmpty(copy);
 }
 
-TEST_F(RefPtr, ObjectLivesUntilTheLastOfManyLetsGo)
+TEST_F(RefPtr, ObjectLivesUntilTheLastOfManyReleasesIt)
 {
     ObjectPtr first(New("A"));
     ObjectPtr second(first);
@@ -234,7 +234,7 @@ TEST_F(RefPtr, IsEmptyAfterReleaseByOneOfMany)
     EXPECT_TRUE(copy.IsUnique());
 }
 
-TEST_F(RefPtr, LetsGoWhenAnExceptionLeavesItsScope)
+TEST_F(RefPtr, ReleasesWhenAnExceptionLeavesItsScope)
 {
     try {
         const ObjectPtr pointer(New("A"));
@@ -245,9 +245,9 @@ TEST_F(RefPtr, LetsGoWhenAnExceptionLeavesItsScope)
     EXPECT_EQ("~A\n", journal.Take());
 }
 
-// The calls of the platform: the whole of them, and what is destroyed in between.
+// All calls of the platform, and the destructions between them.
 
-TEST_F(RefPtrCalls, TakingARawPointerMakesNone)
+TEST_F(RefPtrCalls, TakingARawPointerMakesNoCall)
 {
     const ObjectPtr pointer(New("A"));
 
@@ -262,7 +262,7 @@ TEST_F(RefPtrCalls, CopyingAddsOne)
     EXPECT_EQ("atomic add 1 -> 2\n", journal.Take());
 }
 
-TEST_F(RefPtrCalls, CopyingAnEmptyOneMakesNone)
+TEST_F(RefPtrCalls, CopyingAnEmptyOneMakesNoCall)
 {
     const ObjectPtr empty;
     const ObjectPtr copy(empty);
@@ -270,7 +270,7 @@ TEST_F(RefPtrCalls, CopyingAnEmptyOneMakesNone)
     EXPECT_EQ("", journal.Take());
 }
 
-TEST_F(RefPtrCalls, ReleasingAnEmptyOneMakesNone)
+TEST_F(RefPtrCalls, ReleasingAnEmptyOneMakesNoCall)
 {
     ObjectPtr pointer;
     pointer.Release();
@@ -279,7 +279,7 @@ TEST_F(RefPtrCalls, ReleasingAnEmptyOneMakesNone)
     ExpectEmpty(pointer);
 }
 
-TEST_F(RefPtrCalls, ReleasingOneOfTwoTakesOneOffAndDestroysNothing)
+TEST_F(RefPtrCalls, ReleasingOneOfTwoSubtractsOneAndDestroysNothing)
 {
     ObjectPtr pointer(New("A"));
     const ObjectPtr copy(pointer);
@@ -289,7 +289,7 @@ TEST_F(RefPtrCalls, ReleasingOneOfTwoTakesOneOffAndDestroysNothing)
     EXPECT_EQ("atomic add -1 -> 1\n", journal.Take());
 }
 
-TEST_F(RefPtrCalls, ReleasingTheLastTakesOneOffAndDestroysTheObject)
+TEST_F(RefPtrCalls, ReleasingTheLastSubtractsOneAndDestroysTheObject)
 {
     ObjectPtr pointer(New("A"));
     pointer.Release();
@@ -297,7 +297,7 @@ TEST_F(RefPtrCalls, ReleasingTheLastTakesOneOffAndDestroysTheObject)
     EXPECT_EQ("atomic add -1 -> 0\n~A\n", journal.Take());
 }
 
-TEST_F(RefPtrCalls, ReleasingTwiceIsReleasingOnce)
+TEST_F(RefPtrCalls, SecondReleaseMakesNoCall)
 {
     ObjectPtr pointer(New("A"));
     const ObjectPtr copy(pointer);
@@ -318,7 +318,7 @@ TEST_F(RefPtrCalls, DestructionReleases)
     EXPECT_EQ("atomic add -1 -> 0\n~A\n", journal.Take());
 }
 
-TEST_F(RefPtrCalls, DestructionOfAnEmptyOneMakesNone)
+TEST_F(RefPtrCalls, DestructionOfAnEmptyOneMakesNoCall)
 {
     {
         const ObjectPtr pointer;
@@ -327,7 +327,7 @@ TEST_F(RefPtrCalls, DestructionOfAnEmptyOneMakesNone)
     EXPECT_EQ("", journal.Take());
 }
 
-TEST_F(RefPtrCalls, MovingMakesNone)
+TEST_F(RefPtrCalls, MovingMakesNoCall)
 {
     ObjectPtr pointer(New("A"));
     ObjectPtr other(std::move(pointer));
@@ -364,7 +364,7 @@ TEST_F(RefPtrCalls, AssigningARawPointerReleases)
 
 // Assignment
 
-TEST_F(RefPtr, AssignmentLetsGoAndShares)
+TEST_F(RefPtr, AssignmentReleasesAndShares)
 {
     ObjectPtr pointer(New("A"));
     const ObjectPtr other(New("B"));
@@ -375,7 +375,7 @@ TEST_F(RefPtr, AssignmentLetsGoAndShares)
     EXPECT_EQ(2, other.GetCount());
 }
 
-TEST_F(RefPtr, AssignmentLeavesTheObjectToTheOthersThatShareIt)
+TEST_F(RefPtr, AssignmentLeavesASharedObjectAlive)
 {
     ObjectPtr pointer(New("A"));
     const ObjectPtr kept(pointer);
@@ -418,7 +418,7 @@ TEST_F(RefPtr, AssignmentOfNullEmpties)
     ExpectEmpty(pointer);
 }
 
-TEST_F(RefPtr, AssignmentGivesTheRefPtrItself)
+TEST_F(RefPtr, AssignmentReturnsTheRefPtr)
 {
     ObjectPtr pointer;
     const ObjectPtr other(New("A"));
@@ -493,7 +493,7 @@ TEST_F(RefPtr, AssignmentOfAnEmptyOneToItselfChangesNothing)
     ExpectEmpty(pointer);
 }
 
-TEST_F(RefPtr, AssignmentKeepsWhatLiesWithinTheObjectItLetsGo)
+TEST_F(RefPtr, AssignmentKeepsASourceWithinTheReleasedObject)
 {
     ObjectPtr pointer(New("A"));
     pointer->next = New("B");
@@ -506,7 +506,7 @@ TEST_F(RefPtr, AssignmentKeepsWhatLiesWithinTheObjectItLetsGo)
     EXPECT_EQ("C", pointer->next->Name());
 }
 
-TEST_F(RefPtr, MoveAssignmentKeepsWhatLiesWithinTheObjectItLetsGo)
+TEST_F(RefPtr, MoveAssignmentKeepsASourceWithinTheReleasedObject)
 {
     ObjectPtr pointer(New("A"));
     pointer->next = New("B");
@@ -519,7 +519,7 @@ TEST_F(RefPtr, MoveAssignmentKeepsWhatLiesWithinTheObjectItLetsGo)
 
 // Moving
 
-TEST_F(RefPtr, MoveLeavesTheSourceEmptyAndTheCount)
+TEST_F(RefPtr, MoveEmptiesTheSourceAndKeepsTheCount)
 {
     ObjectPtr pointer(New("A"));
     const ObjectPtr copy(pointer);
@@ -530,7 +530,7 @@ TEST_F(RefPtr, MoveLeavesTheSourceEmptyAndTheCount)
     EXPECT_EQ(2, moved.GetCount());
 }
 
-TEST_F(RefPtr, MoveAssignmentLetsGoAndLeavesTheSourceEmpty)
+TEST_F(RefPtr, MoveAssignmentReleasesAndEmptiesTheSource)
 {
     ObjectPtr pointer(New("A"));
     ObjectPtr other(New("B"));
@@ -571,9 +571,9 @@ TEST_F(RefPtr, MovesDoNotThrow)
     EXPECT_TRUE(std::is_nothrow_move_assignable_v<ObjectPtr>);
 }
 
-// Destructors of objects that touch the RefPtr that is letting go of them.
+// Destructors of objects that use the RefPtr that is releasing them.
 
-TEST_F(RefPtr, ObjectMayReadTheOneThatLetsGoOfIt)
+TEST_F(RefPtr, DestructorMayReadTheReleasingRefPtr)
 {
     Object* const object = New("A");
     ObjectPtr pointer(object);
@@ -596,7 +596,7 @@ TEST_F(RefPtr, ObjectMayReadTheOneThatLetsGoOfIt)
     EXPECT_EQ("~A\n", journal.Take());
 }
 
-TEST_F(RefPtr, ObjectMayReleaseTheOneThatLetsGoOfIt)
+TEST_F(RefPtr, DestructorMayReleaseTheReleasingRefPtr)
 {
     ObjectPtr pointer(New("A"));
     pointer->onDestruction = [&pointer] { pointer.Release(); };
@@ -606,7 +606,7 @@ TEST_F(RefPtr, ObjectMayReleaseTheOneThatLetsGoOfIt)
     ExpectEmpty(pointer);
 }
 
-TEST_F(RefPtr, ObjectMayReleaseTheOneThatIsDestroyed)
+TEST_F(RefPtr, DestructorMayReleaseTheDestroyedRefPtr)
 {
     std::unique_ptr<ObjectPtr> pointer(new ObjectPtr(New("A")));
     ObjectPtr& releasing = *pointer;
@@ -616,7 +616,7 @@ TEST_F(RefPtr, ObjectMayReleaseTheOneThatIsDestroyed)
     EXPECT_EQ("~A\n", journal.Take());
 }
 
-TEST_F(RefPtr, ObjectMayAssignNullToTheOneThatLetsGoOfIt)
+TEST_F(RefPtr, DestructorMayAssignNullToTheReleasingRefPtr)
 {
     ObjectPtr pointer(New("A"));
     pointer->onDestruction = [&pointer] { pointer = nullptr; };
@@ -626,7 +626,7 @@ TEST_F(RefPtr, ObjectMayAssignNullToTheOneThatLetsGoOfIt)
     ExpectEmpty(pointer);
 }
 
-TEST_F(RefPtr, ObjectMayAssignToTheOneThatLetsGoOfIt)
+TEST_F(RefPtr, DestructorMayAssignToTheReleasingRefPtr)
 {
     const ObjectPtr other(New("B"));
     ObjectPtr pointer(New("A"));
@@ -638,7 +638,7 @@ TEST_F(RefPtr, ObjectMayAssignToTheOneThatLetsGoOfIt)
     EXPECT_TRUE(other.IsUnique());
 }
 
-TEST_F(RefPtr, ObjectMayAssignARawPointerToTheOneThatLetsGoOfIt)
+TEST_F(RefPtr, DestructorMayAssignARawPointerToTheReleasingRefPtr)
 {
     ObjectPtr pointer(New("A"));
     pointer->onDestruction = [this, &pointer] { pointer = New("B"); };
@@ -648,7 +648,7 @@ TEST_F(RefPtr, ObjectMayAssignARawPointerToTheOneThatLetsGoOfIt)
     ExpectEmpty(pointer);
 }
 
-TEST_F(RefPtr, ObjectMayAssignToTheOneThatIsDestroyed)
+TEST_F(RefPtr, DestructorMayAssignToTheDestroyedRefPtr)
 {
     const ObjectPtr other(New("B"));
     std::unique_ptr<ObjectPtr> pointer(new ObjectPtr(New("A")));
@@ -660,7 +660,7 @@ TEST_F(RefPtr, ObjectMayAssignToTheOneThatIsDestroyed)
     EXPECT_TRUE(other.IsUnique());
 }
 
-TEST_F(RefPtr, ObjectMayMoveIntoTheOneThatLetsGoOfIt)
+TEST_F(RefPtr, DestructorMayMoveIntoTheReleasingRefPtr)
 {
     ObjectPtr other(New("B"));
     ObjectPtr pointer(New("A"));
@@ -672,7 +672,7 @@ TEST_F(RefPtr, ObjectMayMoveIntoTheOneThatLetsGoOfIt)
     ExpectEmpty(other);
 }
 
-TEST_F(RefPtr, AssignmentPrevailsOverWhatTheObjectAssigns)
+TEST_F(RefPtr, AssignmentOverridesThatOfTheDestructor)
 {
     const ObjectPtr intruder(New("B"));
     const ObjectPtr other(New("C"));
@@ -686,7 +686,7 @@ TEST_F(RefPtr, AssignmentPrevailsOverWhatTheObjectAssigns)
     EXPECT_TRUE(intruder.IsUnique());
 }
 
-TEST_F(RefPtr, AssignmentOfARawPointerPrevailsOverWhatTheObjectAssigns)
+TEST_F(RefPtr, AssignmentOfARawPointerOverridesThatOfTheDestructor)
 {
     const ObjectPtr intruder(New("B"));
     ObjectPtr pointer(New("A"));
@@ -704,7 +704,7 @@ TEST_F(RefPtr, AssignmentOfARawPointerPrevailsOverWhatTheObjectAssigns)
 namespace
 {
 
-/** Counts its objects; their memory is not among the blocks that are counted. */
+/** Counts its objects; their memory is not among the counted blocks. */
 struct Uncounted {
     Uncounted() { ++alive; }
     virtual ~Uncounted() { --alive; }
@@ -727,7 +727,7 @@ struct Uncounted {
     }
 
     static int alive;
-    static long blocksWhenFreed; ///< blocks there were when the last object's memory was freed
+    static long blocksWhenFreed; ///< number of blocks when the last object's memory was freed
 };
 
 int Uncounted::alive = 0;
@@ -741,7 +741,7 @@ protected:
     RefPtrMemory() : blocks(bdmvtest::CountLiveBlocks()) { Uncounted::blocksWhenFreed = -1; }
     ~RefPtrMemory() override { bdmvtest::FailAllocationAfter(-1); }
 
-    /** Whether the action fails for want of memory for one block. */
+    /** Whether the action throws when one block cannot be allocated. */
     template <typename Action> static bool LacksMemory(Action action)
     {
         bdmvtest::FailAllocationAfter(0);
@@ -755,12 +755,12 @@ protected:
         return false;
     }
 
-    const long blocks; ///< blocks there were before the test began
+    const long blocks; ///< number of blocks before the test
 };
 
 } // namespace
 
-TEST_F(RefPtrMemory, CounterIsABlockOfItsOwn)
+TEST_F(RefPtrMemory, CounterIsASeparateBlock)
 {
     const UncountedPtr pointer(new Uncounted);
 
@@ -813,7 +813,7 @@ TEST_F(RefPtrMemory, CounterIsFreedAfterTheObject)
     EXPECT_EQ(0, Uncounted::alive);
 }
 
-TEST_F(RefPtrMemory, CounterLivesAsLongAsOneShares)
+TEST_F(RefPtrMemory, CounterLivesUntilTheLastRelease)
 {
     UncountedPtr pointer(new Uncounted);
     UncountedPtr copy(pointer);
@@ -836,14 +836,14 @@ TEST_F(RefPtrMemory, ReplacedCounterIsFreed)
     EXPECT_EQ(1, Uncounted::alive);
 }
 
-TEST_F(RefPtrMemory, ObjectIsDeletedWhenThereIsNoneForTheCounter)
+TEST_F(RefPtrMemory, ObjectIsDeletedWhenTheCounterCannotBeAllocated)
 {
     EXPECT_TRUE(LacksMemory([] { const UncountedPtr pointer(new Uncounted); }));
     EXPECT_EQ(0, Uncounted::alive);
     EXPECT_EQ(blocks, bdmvtest::CountLiveBlocks());
 }
 
-TEST_F(RefPtrMemory, AssignedObjectIsDeletedWhenThereIsNoneForTheCounter)
+TEST_F(RefPtrMemory, AssignedObjectIsDeletedWhenTheCounterCannotBeAllocated)
 {
     UncountedPtr pointer;
     EXPECT_TRUE(LacksMemory([&pointer] { pointer = new Uncounted; }));
@@ -853,7 +853,7 @@ TEST_F(RefPtrMemory, AssignedObjectIsDeletedWhenThereIsNoneForTheCounter)
     EXPECT_EQ(blocks, bdmvtest::CountLiveBlocks());
 }
 
-TEST_F(RefPtrMemory, CurrentObjectStaysWhenThereIsNoneForTheCounterOfAnother)
+TEST_F(RefPtrMemory, CurrentObjectStaysWhenTheNewCounterCannotBeAllocated)
 {
     Uncounted* const object = new Uncounted;
     UncountedPtr pointer(object);

@@ -10,7 +10,7 @@
 namespace
 {
 
-/** Counts how often it is destroyed, and reads what its sharers have written. */
+/** Counts its destructions, and reads the values that its sharers have written. */
 struct Shared {
     Shared(std::atomic<int>& destroyed, std::atomic<long>& sum)
         : written{0, 0}, m_rDestroyed(destroyed), m_rSum(sum)
@@ -33,7 +33,7 @@ private:
     std::atomic<long>& m_rSum;
 };
 
-/** Lets two threads go on at about the same moment. */
+/** Starts two threads at about the same moment. */
 class StartingLine
 {
 public:
@@ -51,7 +51,7 @@ private:
 
 } // namespace
 
-TEST(RefPtrThreads, TwoThatReleaseAtOnceDestroyTheObjectOnce)
+TEST(RefPtrThreads, ConcurrentReleasesDestroyTheObjectOnce)
 {
     const int rounds = 500;
     std::atomic<int> destroyed{0};
@@ -75,7 +75,7 @@ TEST(RefPtrThreads, TwoThatReleaseAtOnceDestroyTheObjectOnce)
     EXPECT_EQ(3L * rounds, sum);
 }
 
-TEST(RefPtrThreads, CopiesMadeAndDroppedOnManyThreadsAreAllCounted)
+TEST(RefPtrThreads, CopiesAndReleasesOnManyThreadsAreAllCounted)
 {
     std::atomic<int> destroyed{0};
     std::atomic<long> sum{0};

@@ -12,8 +12,8 @@
 #include "mutexwatch.h"
 #include "support/fakeplatform.h"
 
-static_assert(!std::is_copy_constructible_v<bd::ThreadMutex>, "a mutex is one of a kind");
-static_assert(!std::is_copy_assignable_v<bd::ThreadMutex>, "a mutex is one of a kind");
+static_assert(!std::is_copy_constructible_v<bd::ThreadMutex>, "a mutex cannot be copied");
+static_assert(!std::is_copy_assignable_v<bd::ThreadMutex>, "a mutex cannot be assigned");
 
 namespace
 {
@@ -21,7 +21,7 @@ namespace
 class ThreadMutex : public testing::Test
 {
 protected:
-    /** The error with which the calling thread does not get the mutex; none when it does. */
+    /** The error with which the calling thread fails to acquire the mutex; none if it succeeds. */
     std::error_code ErrorOfAcquire()
     {
         try {
@@ -45,7 +45,7 @@ protected:
         });
     }
 
-    /** Whether exactly one assertion has been reported since the last look. */
+    /** Whether exactly one assertion has been reported since the last check. */
     bool WasReportedOnce()
     {
         const std::string text = journal.Take();
@@ -61,7 +61,7 @@ const std::errc Deadlock = std::errc::resource_deadlock_would_occur;
 
 } // namespace
 
-TEST_F(ThreadMutex, IsTakenAndLetGoThroughAConstReference)
+TEST_F(ThreadMutex, IsAcquiredAndReleasedThroughAConstReference)
 {
     mutex.Acquire();
     mutex.Release();
@@ -70,7 +70,7 @@ TEST_F(ThreadMutex, IsTakenAndLetGoThroughAConstReference)
     EXPECT_EQ("", journal.Take());
 }
 
-TEST_F(ThreadMutex, CanBeTakenAgainAfterRelease)
+TEST_F(ThreadMutex, CanBeAcquiredAgainAfterRelease)
 {
     mutex.Acquire();
     mutex.Release();
@@ -80,7 +80,7 @@ TEST_F(ThreadMutex, CanBeTakenAgainAfterRelease)
     EXPECT_EQ("", journal.Take());
 }
 
-TEST_F(ThreadMutex, AsksTheOperatingSystemOnceToLockAndOnceToUnlock)
+TEST_F(ThreadMutex, LocksAndUnlocksTheSystemMutexOnce)
 {
     const std::size_t locks = bdmvtest::CountMutexLocks();
     const std::size_t unlocks = bdmvtest::CountMutexUnlocks();
@@ -133,7 +133,7 @@ TEST_F(ThreadMutex, OneThreadAtATimeHoldsIt)
     EXPECT_EQ(2 * turns, number);
 }
 
-TEST_F(ThreadMutex, TakingItTwiceOnOneThreadIsRefused)
+TEST_F(ThreadMutex, AcquiringTwiceOnOneThreadIsRefused)
 {
     mutex.Acquire();
 
@@ -141,7 +141,7 @@ TEST_F(ThreadMutex, TakingItTwiceOnOneThreadIsRefused)
     mutex.Release();
 }
 
-TEST_F(ThreadMutex, ErrorOfTakingItTwiceNamesTheMutexAndTheReason)
+TEST_F(ThreadMutex, ErrorOfAcquiringTwiceNamesTheMutexAndTheReason)
 {
     mutex.Acquire();
 
@@ -155,7 +155,7 @@ TEST_F(ThreadMutex, ErrorOfTakingItTwiceNamesTheMutexAndTheReason)
     mutex.Release();
 }
 
-TEST_F(ThreadMutex, TakingItTwiceNeverReachesTheOperatingSystem)
+TEST_F(ThreadMutex, AcquiringTwiceNeverReachesTheOperatingSystem)
 {
     mutex.Acquire();
     const std::size_t locks = bdmvtest::CountMutexLocks();
@@ -201,7 +201,7 @@ TEST_F(ThreadMutex, ReleaseByAThreadThatDoesNotHoldItLeavesItHeld)
     mutex.Acquire();
     OnAnotherThread([this] {
         mutex.Release();
-        // The journal locks its own for the report.
+        // The journal locks its own mutex for the report.
         EXPECT_EQ(bdmvtest::CountMutexLocks(), bdmvtest::CountMutexUnlocks());
     });
     journal.Take();
@@ -223,7 +223,7 @@ TEST_F(ThreadMutex, ReleaseWhileFreeLeavesItFree)
 {
     OnAnotherThread([this] {
         mutex.Release();
-        // The journal locks its own for the report.
+        // The journal locks its own mutex for the report.
         EXPECT_EQ(bdmvtest::CountMutexLocks(), bdmvtest::CountMutexUnlocks());
     });
     journal.Take();

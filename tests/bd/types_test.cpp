@@ -40,14 +40,14 @@ bd::ZOOM_PARAM_Def SomeZoom()
     return {{1, 2, 3, 4}, {5, 6, 7, 8}, 9};
 }
 
-/** Two values that == and != both call equal. */
+/** Whether == and != both treat two values as equal. */
 template <typename Value> void ExpectEqual(const Value& left, const Value& right)
 {
     EXPECT_TRUE(left == right);
     EXPECT_FALSE(left != right);
 }
 
-/** Changes one member of a copy after the other: each change alone makes the copy differ. */
+/** Changes the members of a copy one by one: each change alone makes the copy differ. */
 template <typename Value, typename... Changes>
 void ExpectEachToDiffer(const Value& original, Changes... changes)
 {
@@ -124,7 +124,7 @@ TEST(Identifiers, OfSixtyFourBits)
     EXPECT_TRUE((Is<bd::TimePosition, bd::UInt64>));
 }
 
-TEST(Constants, NoTimePositionIsAllOnes)
+TEST(Constants, TimePositionNoneIsAllOnes)
 {
     EXPECT_TRUE((Is<decltype(bd::TimePositionNone), const bd::TimePosition>));
     EXPECT_EQ(UINT64_MAX, bd::TimePositionNone);
@@ -177,7 +177,7 @@ TEST(AudioInfoType, IsEqualWhenAllMembersAre)
     ExpectEqual(bd::AudioInfoType(), bd::AudioInfoType());
 }
 
-TEST(AudioInfoType, DiffersByEachMemberAlone)
+TEST(AudioInfoType, DiffersWhenAnyMemberDiffers)
 {
     typedef bd::AudioInfoType Value;
     ExpectEachToDiffer(
@@ -189,7 +189,7 @@ TEST(AudioInfoType, DiffersByEachMemberAlone)
         [](Value& value) { value.u4AudChannelLayout = 0x0001003F; });
 }
 
-TEST(AudioInfoType, IsEqualWhateverItsPaddingHolds)
+TEST(AudioInfoType, IsEqualWhateverItsPaddingContains)
 {
     alignas(bd::AudioInfoType) unsigned char dirty[sizeof(bd::AudioInfoType)];
     for (unsigned char& byte : dirty) {
@@ -227,7 +227,7 @@ TEST(ZoomRectangleDef, IsEqualWhenAllMembersAre)
     ExpectEqual(bd::ZoomRectangleDef{1, 2, 3, 4}, bd::ZoomRectangleDef{1, 2, 3, 4});
 }
 
-TEST(ZoomRectangleDef, DiffersByEachMemberAlone)
+TEST(ZoomRectangleDef, DiffersWhenAnyMemberDiffers)
 {
     typedef bd::ZoomRectangleDef Value;
     ExpectEachToDiffer(
@@ -261,7 +261,7 @@ TEST(ZoomParam, IsEqualWhenAllMembersAre)
     ExpectEqual(SomeZoom(), SomeZoom());
 }
 
-TEST(ZoomParam, DiffersByEachMemberAlone)
+TEST(ZoomParam, DiffersWhenAnyMemberDiffers)
 {
     typedef bd::ZOOM_PARAM_Def Value;
     ExpectEachToDiffer(
@@ -286,7 +286,7 @@ TEST(Trigger, IsEqualWhenItsTypeIs)
     ExpectEqual(bd::Trigger{bd::TRIGGER_B}, bd::Trigger{bd::TRIGGER_B});
 }
 
-TEST(Trigger, DiffersByItsType)
+TEST(Trigger, DiffersWhenItsTypeDiffers)
 {
     ExpectEachToDiffer(bd::Trigger{bd::TRIGGER_B},
                        [](bd::Trigger& value) { value.triggerType = bd::TRIGGER_A; });
@@ -297,7 +297,7 @@ TEST(BDMarkDef, IsEqualWhenAllMembersAre)
     ExpectEqual(bd::BDMarkDef{90000, 2}, bd::BDMarkDef{90000, 2});
 }
 
-TEST(BDMarkDef, DiffersByEachMemberAlone)
+TEST(BDMarkDef, DiffersWhenAnyMemberDiffers)
 {
     typedef bd::BDMarkDef Value;
     ExpectEachToDiffer(
@@ -312,7 +312,7 @@ TEST(BDMarkDef, HasItsFieldsInOrder)
 
     EXPECT_EQ(0u, offsetof(bd::BDMarkDef, time));
     EXPECT_EQ(8u, offsetof(bd::BDMarkDef, chpNo));
-    // The padding behind the chapter depends on how the target aligns 64-bit members.
+    // The padding after the chapter depends on how the target aligns 64-bit members.
     EXPECT_EQ(8u + alignof(bd::BDMarkDef), sizeof(bd::BDMarkDef));
 }
 
@@ -333,7 +333,7 @@ TEST(DataBlockDef, IsEqualWhenAddressAndSizeAre)
     ExpectEqual(bd::DataBlockDef{nullptr, 0}, bd::DataBlockDef{nullptr, 0});
 }
 
-TEST(DataBlockDef, DiffersByEachMemberAlone)
+TEST(DataBlockDef, DiffersWhenAnyMemberDiffers)
 {
     typedef bd::DataBlockDef Value;
     bd::UInt8 bytes[2] = {};
@@ -368,7 +368,7 @@ TEST(PlayMode, IsForwardAtNormalSpeedByDefault)
     EXPECT_EQ(bd::PlaySpeedNormal, mode.Speed());
 }
 
-TEST(PlayMode, HoldsTheDirectionAndTheSpeedItIsMadeOf)
+TEST(PlayMode, HoldsItsDirectionAndSpeed)
 {
     const bd::PlayMode mode(bd::PlayDirectionBackward, bd::PlaySpeedFast3);
 
@@ -394,7 +394,7 @@ TEST(PlayMode, IsEqualWhenDirectionAndSpeedAre)
     EXPECT_FALSE(mode != bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedFast1));
 }
 
-TEST(PlayMode, DiffersByDirectionAlone)
+TEST(PlayMode, DiffersWhenOnlyTheDirectionDiffers)
 {
     const bd::PlayMode mode(bd::PlayDirectionBackward, bd::PlaySpeedFast1);
 
@@ -402,7 +402,7 @@ TEST(PlayMode, DiffersByDirectionAlone)
     EXPECT_TRUE(mode != bd::PlayMode(bd::PlayDirectionForward, bd::PlaySpeedFast1));
 }
 
-TEST(PlayMode, DiffersBySpeedAlone)
+TEST(PlayMode, DiffersWhenOnlyTheSpeedDiffers)
 {
     const bd::PlayMode mode(bd::PlayDirectionBackward, bd::PlaySpeedFast1);
 

@@ -1,4 +1,4 @@
-/* The version as a program in C sees it. */
+/* The version as seen from C. */
 #include "bdmvnavigator/version.h"
 
 const char* VersionFromC(void);

@@ -9,7 +9,7 @@
 namespace
 {
 
-/** The words of a header, with one blank between them. */
+/** The words of a header, separated by single blanks. */
 std::string Header(const std::string& name)
 {
     std::istringstream words(ReadFile(BDMVNAVIGATOR_SOURCE_DIR "/" + name));

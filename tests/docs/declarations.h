@@ -1,6 +1,6 @@
 /**
  * @file
- * What the library's headers declare, read from their text.
+ * The declarations of the library's headers, read from their text.
  */
 #ifndef DOCS_DECLARATIONS_H
 #define DOCS_DECLARATIONS_H
@@ -22,7 +22,7 @@ typedef std::pair<std::string, int> Enumerator;
 /** The enumerators of every enumeration that events carry, by the name of the enumeration. */
 std::map<std::string, std::vector<Enumerator>> DeclaredEnumerations();
 
-/** The number of an enumerator of whatever enumeration. @throw std::out_of_range there is none */
+/** The number of an enumerator of any enumeration. @throw std::out_of_range there is none */
 int NumberOf(const std::string& enumerator);
 
 /** The names of the parameters of a signature, "Name(type name, type name)". */

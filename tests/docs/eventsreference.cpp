@@ -6,8 +6,7 @@
 namespace
 {
 
-/** What has another form, or another number, stands in the place of the step: nothing happens so.
- */
+/** An item with another form or number becomes a step that matches nothing that happens. */
 Step ParseStep(const std::vector<std::string>& item, std::size_t number)
 {
     static const std::regex form("([0-9]+)\\. (?:If (.*?): )?\\*\\*([^*]+)\\*\\*(?: `([^`]+)`)?"

@@ -1,6 +1,6 @@
 /**
  * @file
- * The reference of the events, read into values.
+ * The reference of the events, parsed into values.
  */
 #ifndef DOCS_EVENTSREFERENCE_H
 #define DOCS_EVENTSREFERENCE_H
@@ -11,11 +11,11 @@
 
 #include "docs/markdown.h"
 
-/** A variable of a query: its name, and what the event presets it to; empty for nothing. */
+/** A variable of a query: its name and its preset; empty if it has none. */
 typedef std::pair<std::string, std::string> Variable;
 
 /**
- * What a section says that an event does.
+ * One step of an event as a section describes it.
  *
  *     4. If `fg2ndVid`: **log** `Sending AudioInfo - audioNr: %u`: `%u` `number`
  *           condition    action  code                              explanation
@@ -23,11 +23,11 @@ typedef std::pair<std::string, std::string> Variable;
 struct Step {
     std::string condition; ///< empty when there is none
     std::string action;    ///< query, log, callback and the like
-    std::string code;      ///< what is queried, logged or called; empty for an end
+    std::string code;      ///< the query, log line or callback; empty for an end
     std::string explanation;
     std::vector<std::string> bullets; ///< nested below it
 
-    /** The code without what stands in parentheses behind a name; the whole code of a line. */
+    /** The code without the parentheses after a name; for a log line the whole code. */
     std::string Subject() const;
 
     /** The variables of a query, in order. */

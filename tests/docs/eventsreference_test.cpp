@@ -1,4 +1,4 @@
-// The reference of the events says what the events do: no more, no less, and in that order.
+// The reference of the events describes exactly what the events do, in that order.
 
 #include "docs/eventsreference.h"
 
@@ -17,7 +17,7 @@
 namespace
 {
 
-/** How a condition is worded, and when it holds. */
+/** The wording of a condition, and when it is true. */
 struct Condition {
     const char* wording;
     bool (*holds)(const Context& context);
@@ -76,10 +76,10 @@ bool Holds(const std::string& wording, const Context& context)
             return condition.holds(context);
         }
     }
-    throw std::runtime_error("nobody knows when this holds: " + wording);
+    throw std::runtime_error("unknown condition: " + wording);
 }
 
-/** How a preset is worded, as a journal shows it. */
+/** The value in a journal for a preset's wording. */
 std::string DescribePreset(const std::string& wording)
 {
     if (wording == "all 0") {
@@ -109,10 +109,10 @@ std::string AsNumber(const std::string& value)
                                            : value;
 }
 
-/** What stands behind the conversions of a line in its explanation. */
+/** The explanation of a conversion of a line. */
 struct Shown {
     std::string conversion;
-    std::string name; ///< empty when it is told in words
+    std::string name; ///< empty when the explanation is in words
 };
 
 std::vector<Shown> ExplainedValues(const Step& step)
@@ -131,7 +131,7 @@ bool IsLog(const Step& step)
     return StartsWith(step.action, "log");
 }
 
-/** "Event" and what else has to be said to switch a line on. */
+/** The level that switches a line on, with its suffix. */
 std::string LevelOf(const Step& step)
 {
     return step.action == "log at Warning" ? "Warning" : "Event" + step.action.substr(3);
@@ -178,7 +178,7 @@ const EventClass& ClassOf(const std::string& event)
     return *found;
 }
 
-/** The steps of a section that are made in a situation, the last one possibly an end. */
+/** The steps of a section that are executed in a situation; the last may be an end. */
 std::vector<std::size_t> StepsMade(const EventSection& section, const Situation& situation)
 {
     Context context;
@@ -226,7 +226,7 @@ TEST_F(EventsDocument, HasASectionForEveryEventInTheOrderOfDeclaration)
     EXPECT_EQ(titles.size(), 56U);
 }
 
-TEST_F(EventsDocument, SendsEveryCallbackThereIs)
+TEST_F(EventsDocument, SendsEveryCallback)
 {
     std::set<std::string> sent;
     for (const EventSection& section : reference.sections) {
@@ -285,10 +285,10 @@ TEST_F(EventsDocument, ListsLinesAsTheSectionsHaveThemInTheOrderOfTheirBytes)
     EXPECT_EQ(reference.ChapterOf("Log lines").TableRows(), expected);
 }
 
-TEST_F(EventsDocument, GivesNumbersTheNamesThatTheyHave)
+TEST_F(EventsDocument, NamesNumbersAsDeclared)
 {
     const std::map<std::string, std::vector<Enumerator>> declared = DeclaredEnumerations();
-    std::set<std::string> told;
+    std::set<std::string> listed;
     for (const TableRow& row : reference.ChapterOf("Numbers").TableRows()) {
         SCOPED_TRACE(row.front());
         const std::string type =
@@ -298,15 +298,15 @@ TEST_F(EventsDocument, GivesNumbersTheNamesThatTheyHave)
             expected.push_back(std::to_string(enumerator.second) + " `" + enumerator.first + "`");
         }
         EXPECT_EQ(row.at(1), CommaSeparated(expected));
-        told.insert(type);
+        listed.insert(type);
     }
 
-    EXPECT_EQ(told,
+    EXPECT_EQ(listed,
               (std::set<std::string>{"FinishedReason", "PlayDirectionDef", "PlaySpeedDef",
                                      "TriggerType", "VideoAspectRatioType", "VideoFormatType"}));
 }
 
-TEST_F(EventsDocument, LinksToWhatThereIs)
+TEST_F(EventsDocument, HasOnlyValidLinks)
 {
     std::set<std::string> anchors;
     for (const Chapter& chapter : reference.chapters) {
@@ -373,7 +373,7 @@ TEST_F(EventsDocument, DecidesAboutEveryTriggerAsItsTableSays)
     EXPECT_EQ(used.size(), section.table.size()) << "a row never decides";
 }
 
-/** The section about the event that is the parameter. */
+/** The section about the event named by the parameter. */
 class EventsDocumentSection : public EventsDocument, public testing::WithParamInterface<std::string>
 {
 public:
@@ -383,7 +383,7 @@ protected:
     const EventSection& section = reference.SectionOf(GetParam());
     const EventClass& eventClass = ClassOf(GetParam());
 
-    /** Calls back with every step that is made, and what then happens, in every situation. */
+    /** Calls the action with every executed step and its effects, in every situation. */
     template <typename Action> void ForEachStepMade(Action action)
     {
         for (const Situation& situation : AllSituations()) {
@@ -398,8 +398,8 @@ protected:
     }
 
     /**
-     * The value that a name stands for at a point of a dispatch: that of the next callback with
-     * such an argument, or else of the last query with such a variable.
+     * The value of a name at a point of a dispatch: that of the next callback with such an
+     * argument, or else of the last query with such a variable.
      */
     std::string ValueOf(const std::string& name, const std::vector<Happening>& happenings,
                         std::size_t at)
@@ -427,7 +427,7 @@ protected:
                 }
             }
         }
-        return "nothing is called " + name;
+        return "no value named " + name;
     }
 };
 
@@ -491,7 +491,7 @@ TEST_P(EventsDocumentSection, HasTheSignaturesOfTheListenerAndExplainsEveryArgum
     }
 }
 
-TEST_P(EventsDocumentSection, TellsWhatEveryConversionShows)
+TEST_P(EventsDocumentSection, ExplainsEveryConversion)
 {
     for (const Step& step : section.steps) {
         if (IsLog(step)) {
@@ -519,7 +519,7 @@ TEST_P(EventsDocumentSection, TellsWhatEveryConversionShows)
         });
 }
 
-TEST_P(EventsDocumentSection, TellsWhatVariablesArePresetTo)
+TEST_P(EventsDocumentSection, StatesThePresetsOfVariables)
 {
     ForEachStepMade([](const Step& step, const std::vector<Happening>& happenings, std::size_t i) {
         if (step.action == "query") {

@@ -41,7 +41,7 @@ std::size_t EndOfConversion(const std::string& format, std::size_t begin)
     return last + 1;
 }
 
-/** What a line shows where its format has conversions: flags and unsigned numbers. */
+/** The values that a line shows for the conversions of its format: flags, unsigned numbers. */
 std::vector<std::string> ShownValues(const std::string& format, const std::string& line)
 {
     std::vector<std::string> values;
@@ -69,7 +69,7 @@ std::string LogAction(const std::string& tag)
                              : "log with tag " + tag;
 }
 
-/** Reads "Name(value, value)", and " -> value, value" behind it. */
+/** Reads "Name(value, value)", and " -> value, value" after it. */
 Happening ParseCall(const std::string& action, const std::string& call)
 {
     const std::size_t open = call.find('(');
@@ -81,7 +81,7 @@ Happening ParseCall(const std::string& action, const std::string& call)
 }
 
 /** Turns the entries of a journal into happenings. */
-std::vector<Happening> Understand(const std::string& journal)
+std::vector<Happening> ParseJournal(const std::string& journal)
 {
     std::vector<Happening> happenings;
     std::string format;
@@ -226,7 +226,7 @@ std::vector<Happening> WhatHappens(const EventClass& event, const Situation& sit
 
     event.make(context)->Dispatch(listeners);
 
-    return Understand(journal.Take());
+    return ParseJournal(journal.Take());
 }
 
 std::vector<std::string> Conversions(const std::string& format)

@@ -1,6 +1,6 @@
 /**
  * @file
- * What the events really do, in enough situations to see all of it.
+ * The actual effects of the events, in enough situations to see all of them.
  */
 #ifndef DOCS_HAPPENINGS_H
 #define DOCS_HAPPENINGS_H
@@ -14,29 +14,29 @@
 
 typedef bdmvtest::ScriptablePlaybackContext Context;
 
-/** One thing that an event did, in the words of the reference. */
+/** One action of an event, in the words of the reference. */
 struct Happening {
     std::string action;               ///< query, log, callback and the like
     std::string subject;              ///< the operation, the format, the callback
-    std::vector<std::string> values;  ///< a query's variables when it was asked, what a line shows,
+    std::vector<std::string> values;  ///< a query's variables before it, the values in a line, or
                                       ///< a callback's arguments
-    std::vector<std::string> answers; ///< a query's variables when it was answered
+    std::vector<std::string> answers; ///< a query's variables after it
 };
 
-/** What the context holds. */
+/** A state of the context. */
 struct Situation {
     std::string name;
     std::function<void(Context&)> arrange;
 };
 
-/** Every way an event may go is taken in one of them. */
+/** Together they cover every path of every event. */
 std::vector<Situation> AllSituations();
 
-/** Holds a trigger situation, with a trigger of its own set. */
+/** A situation with a trigger kind and repeat states, and another trigger set. */
 Situation TriggerSituation(bd::TriggerType kind, bd::TriggerType abState,
                            bd::TriggerType chpTitleState);
 
-/** A context in which all numbers differ, and then the situation. */
+/** Makes all numbers of the context differ, then applies the situation. */
 void Arrange(Context& context, const Situation& situation);
 
 /** Dispatches an event of the class to one listener, with the log on. */

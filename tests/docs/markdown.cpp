@@ -22,7 +22,7 @@ bool IsNumbered(const std::string& line)
     return end != 0 && end != std::string::npos && line.compare(end, 2, ". ") == 0;
 }
 
-/** The cells of a line of a table. A bar with a backslash before it belongs to its cell. */
+/** The cells of a line of a table. A bar after a backslash belongs to its cell. */
 TableRow CellsOf(const std::string& line)
 {
     TableRow cells;

@@ -1,6 +1,6 @@
 /**
  * @file
- * As much Markdown as the documents of this project use.
+ * The part of Markdown that the documents of this project use.
  */
 #ifndef DOCS_MARKDOWN_H
 #define DOCS_MARKDOWN_H
@@ -8,13 +8,13 @@
 #include <string>
 #include <vector>
 
-/** The cells of a row, as they stand between the bars. */
+/** The cells of a row, without the bars. */
 typedef std::vector<std::string> TableRow;
 
 /** A heading and the lines below it, up to the next heading. */
 struct Chapter {
-    std::string title; ///< without the # before it; empty for what stands before the first heading
-    int level = 0;     ///< how many # there are
+    std::string title; ///< without the leading #; empty for the text before the first heading
+    int level = 0;     ///< the number of #
     std::vector<std::string> lines;
 
     /** The name by which links reach it. */
@@ -24,8 +24,8 @@ struct Chapter {
     std::vector<TableRow> TableRows() const;
 
     /**
-     * The items of its numbered list, each in one line: "1. text". Its nested bullets follow, each
-     * in one line: "- text".
+     * The items of its numbered list, each on one line: "1. text". Its nested bullets follow, each
+     * on one line: "- text".
      */
     std::vector<std::vector<std::string>> NumberedItems() const;
 };

@@ -1,5 +1,5 @@
-// A program without run-time type information: it implements a listener and a context, has an event
-// of the library delivered, and catches what the library throws.
+// A program without run-time type information: it implements a listener and a context, dispatches
+// an event of the library, and catches an exception of the library.
 
 #include <cstdio>
 #include <memory>

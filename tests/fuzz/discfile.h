@@ -1,6 +1,6 @@
 /**
  * @file
- * What every fuzz target for a file of a disc does.
+ * The common part of the fuzz targets for files of a disc.
  */
 #ifndef FUZZ_DISCFILE_H
 #define FUZZ_DISCFILE_H
@@ -17,8 +17,8 @@ namespace fuzz
 {
 
 /**
- * Gives a file of these bytes to @p use, which reads it and works with what it says. It may refuse
- * the file in the way a reader does; any other exception ends the program as a finding.
+ * Passes a file of these bytes to @p use, which reads it and works with its contents. It may refuse
+ * the file with FormatError; any other exception ends the program as a finding.
  *
  * @return what LLVMFuzzerTestOneInput() returns
  */

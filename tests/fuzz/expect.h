@@ -1,6 +1,6 @@
 /**
  * @file
- * Turns a broken promise into a finding of the fuzzer.
+ * Reports a failed expectation as a finding of the fuzzer.
  */
 #ifndef FUZZ_EXPECT_H
 #define FUZZ_EXPECT_H

@@ -1,4 +1,4 @@
-// Reads any bytes as a play list, lays it out, and looks up the clip of every stream.
+// Reads any bytes as a play list, computes its time line, and looks up the clip of every stream.
 
 #include "disc/playlist.h"
 #include "disc/timeline.h"

@@ -10,7 +10,7 @@ namespace
 
 using namespace deskplayer;
 
-/** Every way that patterns can be alike, and every placeholder. */
+/** Every kind of similarity between patterns, and every placeholder. */
 const std::vector<CommandSyntax> Syntaxes = {
     {"play", ""},
     {"chapter next", ""},
@@ -25,7 +25,7 @@ const std::vector<CommandSyntax> Syntaxes = {
     {"repeat TIME to TIME times NUMBER", ""},
 };
 
-/** The values each of them has. */
+/** The number of values of each pattern. */
 const std::vector<std::size_t> ValueCounts = {0, 0, 0, 1, 1, 0, 0, 1, 1, 1, 3};
 
 void ExpectSteps(const std::vector<ScriptStep>& steps)

@@ -121,8 +121,7 @@ std::vector<std::string> operator+(std::vector<std::string> left,
     return left;
 }
 
-/** What each folder may include besides its own files. A folder has the row of its nearest parent.
- */
+/** What each folder may include besides its own files; a folder without a row has its parent's. */
 const std::map<std::string, std::vector<std::string>> Allowed = {
     {"prv_inc", {}},
     {"inc", {"prv_inc"}},
@@ -155,7 +154,7 @@ std::string RowOf(const std::string& file)
 
 typedef std::map<std::string, std::set<std::string>> Graph;
 
-/** Every file, or every folder, and what it includes of others. */
+/** Maps every file, or every folder, to the others that it includes. */
 Graph IncludeGraph(std::string (*nodeOf)(const std::string& file))
 {
     Graph graph;
@@ -168,7 +167,8 @@ Graph IncludeGraph(std::string (*nodeOf)(const std::string& file))
     return graph;
 }
 
-/** Takes away what includes nothing that is left: what remains lies on a circle or leads to one. */
+/** Removes nodes that include none of the remaining ones: those left are on a circle or lead to it.
+ */
 Graph WithoutEnds(Graph graph)
 {
     for (bool changed = true; changed;) {
@@ -219,12 +219,12 @@ TEST(Includes, LeadOnlyToFoldersBelow)
     }
 }
 
-TEST(Includes, OfFilesHaveNoCircle)
+TEST(Includes, OfFilesFormNoCircle)
 {
     EXPECT_EQ(NamesIn(WithoutEnds(IncludeGraph(FileItself))), "");
 }
 
-TEST(Includes, OfFoldersHaveNoCircle)
+TEST(Includes, OfFoldersFormNoCircle)
 {
     EXPECT_EQ(NamesIn(WithoutEnds(IncludeGraph(FolderOf))), "");
 }

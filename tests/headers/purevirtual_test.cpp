@@ -1,5 +1,5 @@
-// Interfaces hold nothing but operations without a body: whoever implements one is told by the
-// compiler what is missing.
+// Interfaces have nothing but pure virtual operations: the compiler names the operations that an
+// implementation lacks.
 
 #include <gtest/gtest.h>
 

@@ -1,4 +1,4 @@
-# Installs into a prefix that is empty before.
+# Installs into an empty prefix.
 file(REMOVE_RECURSE ${PREFIX})
 execute_process(
   COMMAND ${CMAKE_COMMAND} --install ${BUILD} --prefix ${PREFIX}
@@ -7,8 +7,8 @@ if(result)
   message(FATAL_ERROR "the installation failed")
 endif()
 
-# All headers stand under one root.
+# All headers lie under one root.
 file(GLOB roots RELATIVE ${PREFIX}/include ${PREFIX}/include/*)
 if(NOT roots STREQUAL "bdmvnavigator")
-  message(FATAL_ERROR "include/ holds ${roots}, not bdmvnavigator alone")
+  message(FATAL_ERROR "include/ contains ${roots} instead of bdmvnavigator alone")
 endif()

@@ -1,6 +1,6 @@
 #include "bd/logging.h"
 
-/** Gives a line an argument that its format does not name. */
+/** Passes a line an argument that does not fit its format. */
 void WriteNumberAsText(bd::VargLogger& logger)
 {
     logger.Log("%s", 1);

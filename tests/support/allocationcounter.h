@@ -1,6 +1,6 @@
 /**
  * @file
- * Counts what the program takes from the heap.
+ * Counts the program's heap allocations.
  *
  * Linking it replaces the global operator new and operator delete of the whole program.
  */
@@ -12,16 +12,16 @@
 namespace bdmvtest
 {
 
-/** How often the calling thread has called the global operator new so far. */
+/** The number of calls of the global operator new by the calling thread so far. */
 std::size_t CountAllocations();
 
-/** How many of the blocks the calling thread allocated or freed are still there. */
+/** The blocks that the calling thread has allocated, less those that it has freed. */
 long CountLiveBlocks();
 
 /**
  * Makes an allocation of the calling thread fail with std::bad_alloc.
  *
- * @param countdown how many allocations still succeed before; a negative value ends it
+ * @param countdown the number of allocations that still succeed first; negative for no failure
  */
 void FailAllocationAfter(long countdown);
 

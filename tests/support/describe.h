@@ -38,13 +38,13 @@ std::string Describe(const bd::ZOOM_PARAM_Def& zoom);
 std::string Describe(const bd::AudioInfoType& info);
 std::string Describe(const bd::DataBlockDef& block);
 
-/** The mask as it is reported. */
+/** The mask in its reported form. */
 std::string Describe(const bdmv::UOMaskTable& mask);
 
-/** Whether there is a program, and how many RefPtr objects share it. */
+/** The number of RefPtr objects that share the program, or that there is none. */
 std::string Describe(const bdmv::IProgramData::RefPtr& program);
 
-/** The bytes of a block and their number, in decimal. */
+/** The bytes of a block and its size, in decimal. */
 std::string DescribeBytes(const void* data, bd::UInt32 size);
 
 /** The values, separated by commas. */

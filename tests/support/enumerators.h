@@ -1,6 +1,6 @@
 /**
  * @file
- * Names of enumerators, found by the compiler, so that no table has to follow the declarations.
+ * Names of enumerators, supplied by the compiler, so that no table repeats the declarations.
  */
 #ifndef SUPPORT_ENUMERATORS_H
 #define SUPPORT_ENUMERATORS_H
@@ -17,7 +17,7 @@ namespace bdmvtest
 /**
  * The name of a constant as the compiler spells it in the signature of this function.
  *
- * g++ and clang++ print an enumerator by its qualified name, and a value that has none as a cast:
+ * g++ and clang++ print an enumerator by its qualified name, and any other value as a cast:
  * "value = bd::PlaySpeedNormal;" or "value = (bd::PlaySpeedDef)99]".
  */
 template <typename Enumeration, Enumeration value> constexpr std::string_view NameOfConstant()
@@ -31,7 +31,7 @@ template <typename Enumeration, Enumeration value> constexpr std::string_view Na
     return text.front() == '(' ? std::string_view() : text.substr(text.rfind(':') + 1);
 }
 
-/** Names of the values from 0, each empty where no enumerator has the value. */
+/** The names of the values from 0; empty where no enumerator has the value. */
 template <typename Enumeration, std::size_t... values>
 constexpr std::array<std::string_view, sizeof...(values)>
 NamesOfConstants(std::index_sequence<values...>)

@@ -27,7 +27,7 @@ std::string DescribeTag(KEVRO_UInt32 component, KEVRO_Int32 level, KEVRO_Bool hi
 
 } // namespace
 
-/** Lets the platform functions see the inside of the platform in place. */
+/** Gives the platform functions access to the installed fake platform. */
 struct FakePlatformAccess {
     static KEVRO_Bool IsEnabled(const FakePlatform& platform, KEVRO_UInt32 component,
                                 KEVRO_Int32 level, KEVRO_Bool hiFreq)
@@ -77,7 +77,7 @@ FakePlatform::FakePlatform(Journal* journal)
 {
     FakePlatform* none = nullptr;
     if (!installed.compare_exchange_strong(none, this)) {
-        std::fputs("bdmvtest::FakePlatform: there is one already\n", stderr);
+        std::fputs("bdmvtest::FakePlatform: already installed\n", stderr);
         std::abort();
     }
 }

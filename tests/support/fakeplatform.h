@@ -1,6 +1,6 @@
 /**
  * @file
- * A platform that records what is asked of it.
+ * A platform that records the calls it receives.
  *
  * Entries in the journal:
  *
@@ -22,10 +22,10 @@ namespace bdmvtest
 {
 
 /**
- * Stands behind the platform functions for as long as it lives. One at a time.
+ * Handles the calls of the platform functions while it lives. Only one may exist at a time.
  *
- * With no fake platform in place the log switch is off, the atomic addition works, and an assertion
- * ends the program, so that none goes unnoticed.
+ * Without a fake platform the log switch is off, the atomic addition works, and a failed assertion
+ * aborts the program, so that none is missed.
  *
  * Set it up before other threads use it. The functions themselves may be called from several
  * threads at once.
@@ -39,27 +39,27 @@ public:
     /**
      * Installs itself, with the log switch on for everything.
      *
-     * @param journal receives the entries; null for none: lines are then formatted and forgotten
-     *                without allocating
+     * @param journal receives the entries; if null, lines are formatted and discarded without
+     *                allocating
      */
     explicit FakePlatform(Journal* journal);
 
-    /** Takes itself out and clears ::g_u1Bduopmask. */
+    /** Uninstalls itself and clears ::g_u1Bduopmask. */
     ~FakePlatform();
 
     FakePlatform(const FakePlatform&) = delete;
     FakePlatform& operator=(const FakePlatform&) = delete;
 
-    /** Decides about every line; what it returns is what the caller of the switch gets. */
+    /** Replaces the log switch; its caller receives the value that @p logSwitch returns. */
     void SetLogSwitch(LogSwitch logSwitch);
 
     /** Switches everything off. */
     void DisableLog();
 
-    /** Has the format of every line stand in the journal before the line. */
+    /** Records the format of every line before the line. */
     void RecordFormats();
 
-    /** Has atomic additions stand in the journal as well, other than those that only read. */
+    /** Records atomic additions as well, except those that only read. */
     void RecordAtomicAdds();
 
     /** Called by Assert() after it has written its entry; may throw. */

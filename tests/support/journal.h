@@ -1,9 +1,9 @@
 /**
  * @file
- * What happened, in order.
+ * A record of calls, in order.
  *
- * The fake platform, the scriptable context and the recording listeners of a test write one shared
- * journal, so that the test states the whole interleaving and not fragments of it:
+ * The fake platform, the scriptable context and the recording listeners of a test share one
+ * journal, so that the test states the whole sequence instead of fragments:
  *
  * @code
  * bdmvtest::Journal journal;
@@ -29,13 +29,13 @@
 namespace bdmvtest
 {
 
-/** A text of one line an entry. May be written by several threads at once. */
+/** A text with one line per entry. Several threads may write to it at once. */
 class Journal
 {
 public:
     void Add(const std::string& entry);
 
-    /** The entries since the last call, each ended by a line end. */
+    /** Returns the entries since the last call, each followed by a line end. */
     std::string Take();
 
 private:

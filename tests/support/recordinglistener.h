@@ -20,13 +20,13 @@
 namespace bdmvtest
 {
 
-/** Records every callback; may do something of the test's own after that. */
+/** Records every callback, then may run an action of the test. */
 class RecordingListener : public bdmv::INavigatorListener
 {
 public:
     /**
      * @param journal receives the entries; must outlive the listener
-     * @param name    stands before the callbacks
+     * @param name    the prefix of the callbacks
      */
     RecordingListener(Journal& journal, std::string name);
 

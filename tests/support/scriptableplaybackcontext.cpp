@@ -18,7 +18,7 @@ ScriptablePlaybackContext::Output<Value> ScriptablePlaybackContext::Out(Value& t
     return {target, value};
 }
 
-/** Calls the test first: it may change the value that is answered. */
+/** Calls the action of the test first, which may change the answer. */
 template <typename Value, typename... Arguments>
 const Value& ScriptablePlaybackContext::Answer(const char* operation, const Value& value,
                                                const Arguments&... arguments)

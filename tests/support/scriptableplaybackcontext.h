@@ -1,9 +1,9 @@
 /**
  * @file
- * A playback context that answers what a test has written into it.
+ * A playback context that answers with the values that a test has set.
  *
- * Entries in the journal: the operation, what its output parameters held when it was called, and
- * what it answered:
+ * Entries in the journal: the operation, the values of its output parameters at the call, and its
+ * answer:
  *
  *     context.GetPlayListId() -> 800
  *     context.GetAudioInfo(0, 0) -> 2, 3
@@ -24,11 +24,11 @@
 namespace bdmvtest
 {
 
-/** Answers from public fields, one for every value that an operation gives. */
+/** Answers from public fields, one for every value that an operation returns. */
 class ScriptablePlaybackContext : public bdmv::IPlaybackContext
 {
 public:
-    /** A stream that is selected, and how many there are of its kind. */
+    /** The selected stream, and the number of streams of its kind. */
     struct Stream {
         bd::StreamNumberDef number = 0;
         bd::UInt8 count = 0;
@@ -37,7 +37,7 @@ public:
     /** @param journal receives the entries; must outlive the context */
     explicit ScriptablePlaybackContext(Journal& journal);
 
-    /** Keeps no journal: it then answers without allocating, to several threads at once. */
+    /** Without a journal, it answers without allocating, and to several threads at once. */
     ScriptablePlaybackContext() = default;
 
     bd::DataBlockDef systemResumeData = {nullptr, 0};
@@ -86,10 +86,10 @@ public:
     bool prev2ndVid = false;
     bool prev2ndAud = false;
 
-    /** Operations that leave their output parameters as they are. */
+    /** Operations that do not write their output parameters. */
     std::set<std::string> untouched;
 
-    /** Called before an operation answers, with its name. */
+    /** Called with the name of an operation before it answers. */
     std::function<void(const std::string& operation)> onQuery;
 
     const bd::DataBlockDef& GetSystemResumeData() override;

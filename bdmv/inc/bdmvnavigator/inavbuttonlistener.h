@@ -1,6 +1,6 @@
 /**
  * @file
- * The callback that has a button executed.
+ * The callback that requests the execution of a button.
  */
 #ifndef BDMVNAVIGATOR_INAVBUTTONLISTENER_H
 #define BDMVNAVIGATOR_INAVBUTTONLISTENER_H
@@ -28,12 +28,12 @@ public:
     /**
      * A button was activated: its navigation program is to be executed. Sent by ExecuteButtonEvent.
      *
-     * All listeners see the one RefPtr that the event holds. A listener that keeps the program
-     * copies it; one that resets it changes what the listeners behind it see.
+     * All listeners receive the same RefPtr, which belongs to the event. A listener that keeps the
+     * program copies it; a listener that resets it changes what the listeners after it receive.
      *
      * @param ticket   identifies the request
      * @param buttonId the activated button
-     * @param program  the button's navigation program; empty when none is pending
+     * @param program  the button's navigation program; empty when no execution is pending
      */
     virtual void ExecuteButton(bd::UInt32 ticket, bd::ButtonId buttonId,
                                IProgramData::RefPtr& program) = 0;

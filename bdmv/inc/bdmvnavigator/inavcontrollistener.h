@@ -1,6 +1,6 @@
 /**
  * @file
- * Callbacks that tell how playback itself is going.
+ * Callbacks that report the state of playback.
  */
 #ifndef BDMVNAVIGATOR_INAVCONTROLLISTENER_H
 #define BDMVNAVIGATOR_INAVCONTROLLISTENER_H
@@ -11,7 +11,7 @@ namespace bdmv
 {
 
 /**
- * How playback itself is going: started, paused, stopped, finished, standby and the like.
+ * The state of playback: started, paused, stopped, finished, standby and the like.
  *
  * INavigatorListener states the rules that all callbacks share. Their order is part of the binary
  * interface.
@@ -43,8 +43,7 @@ public:
      * Playback continues. Sent by ContinuedEvent.
      *
      * @param direction direction of the play mode that is set
-     * @param speed     speed of the play mode that is set; the mode that playback currently runs in
-     * may still differ
+     * @param speed     speed of the play mode that is set; the current play mode may still differ
      */
     virtual void Continued(bd::PlayDirectionDef direction, bd::PlaySpeedDef speed) = 0;
 
@@ -75,8 +74,8 @@ public:
     /**
      * A zoom was set. Sent by ZoomModeSetEvent.
      *
-     * @param zoom the clip and destination rectangles, and the delay; none has a settled unit, see
-     *             bd::ZOOM_PARAM_Def
+     * @param zoom the clip and destination rectangles, and the delay; their units are unspecified,
+     *             see bd::ZOOM_PARAM_Def
      */
     virtual void ZoomModeSet(bd::ZOOM_PARAM_Def zoom) = 0;
 
@@ -108,8 +107,8 @@ public:
     /**
      * The system goes into standby. Sent by SystemSuspendedEvent.
      *
-     * The block is discarded right after the last listener has returned: a listener that is to keep
-     * it copies the bytes during the call.
+     * The block is discarded as soon as the last listener has returned: a listener that needs it
+     * later copies the bytes during the call.
      *
      * @param data first byte of the system resume data; may be null, whatever the size
      * @param size its size in bytes
@@ -117,14 +116,14 @@ public:
     virtual void SystemSuspended(const void* data, bd::UInt32 size) = 0;
 
     /**
-     * The system came back from standby. Sent by SystemResumedEvent.
+     * The system returned from standby. Sent by SystemResumedEvent.
      *
      * @param playing whether playback is running again
      */
     virtual void SystemResumed(bool playing) = 0;
 
     /**
-     * The system came back from standby, and playback could not be restored. Sent by
+     * The system returned from standby, and playback could not be restored. Sent by
      * SystemResumeFailedEvent.
      */
     virtual void SystemResumeFailed() = 0;

@@ -1,6 +1,6 @@
 /**
  * @file
- * Callbacks that tell the state of the interactive-graphics plane.
+ * Callbacks that report the state of the interactive-graphics plane.
  */
 #ifndef BDMVNAVIGATOR_INAVINTERACTIVELISTENER_H
 #define BDMVNAVIGATOR_INAVINTERACTIVELISTENER_H

@@ -1,6 +1,6 @@
 /**
  * @file
- * Callbacks that tell where playback stands and which streams are selected.
+ * Callbacks that report the playback position and the selected streams.
  */
 #ifndef BDMVNAVIGATOR_INAVSETTINGSLISTENER_H
 #define BDMVNAVIGATOR_INAVSETTINGSLISTENER_H
@@ -12,7 +12,7 @@ namespace bdmv
 {
 
 /**
- * Where playback stands in the title, which streams are selected, and what is available.
+ * The position of playback in the title, the selected streams, and what is available.
  *
  * INavigatorListener states the rules that all callbacks share. Their order is part of the binary
  * interface.
@@ -26,14 +26,14 @@ public:
     INavSettingsListener& operator=(const INavSettingsListener&) = default;
 
     /**
-     * A play list is in playback. Sent by PlaylistEvent.
+     * A play list is being played. Sent by PlaylistEvent.
      *
      * @param playListId its number
      */
     virtual void Playlist(bd::PlayListIdDef playListId) = 0;
 
     /**
-     * A play item is in playback. Sent by PlayItemEvent.
+     * A play item is being played. Sent by PlayItemEvent.
      *
      * @param playListId  number of its play list
      * @param playItemId  its number within the play list
@@ -47,8 +47,8 @@ public:
     /**
      * The play mode changed. Sent by PlayModeEvent.
      *
-     * @param direction direction in which playback currently runs
-     * @param speed     speed at which playback currently runs
+     * @param direction the current direction of playback
+     * @param speed     the current speed of playback
      */
     virtual void PlayMode(bd::PlayDirectionDef direction, bd::PlaySpeedDef speed) = 0;
 
@@ -85,7 +85,8 @@ public:
      * PresentationGraphicsInfoEvent.
      *
      * @param number    its stream number
-     * @param available whether it is available: shown, and there is at least one
+     * @param available whether it is available: subtitles are shown, and there is at least one
+     *                  stream
      */
     virtual void PresentationGraphicsInfo(bd::StreamNumberDef number, bool available) = 0;
 
@@ -130,12 +131,12 @@ public:
     /**
      * Text subtitle user styles are available. Sent by TextSubtitleStylesAvailableEvent.
      *
-     * @param numberOfStyles how many
+     * @param numberOfStyles their number
      */
     virtual void TextSubtitleStylesAvailable(bd::UInt8 numberOfStyles) = 0;
 
     /**
-     * The user operations that are forbidden changed. Sent by UOMaskEvent.
+     * The set of forbidden user operations changed. Sent by UOMaskEvent.
      *
      * @param mask the mask now in force
      */
@@ -212,7 +213,7 @@ public:
     virtual void SecondaryAudioDisplay(bd::StreamNumberDef number, bool shown) = 0;
 
     /**
-     * The picture-in-picture subtitle was picked or not. Sent by PipPgTextSelectEvent.
+     * The picture-in-picture subtitle was selected or deselected. Sent by PipPgTextSelectEvent.
      *
      * @param pick whether the subtitle stream is taken from the picture-in-picture selection
      */

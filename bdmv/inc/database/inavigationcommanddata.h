@@ -14,7 +14,7 @@ namespace bdmv
 class INavigationCommandData
 {
 public:
-    /** The command codes. A code outside the list may come from a disc and travels unchanged. */
+    /** The command codes. A disc may contain a code outside the list; it is passed on unchanged. */
     enum Command : KEVRO_UInt32 {
         CommandNop = 0x00000000,
         CommandGoTo = 0x20010000,
@@ -72,8 +72,8 @@ public:
     virtual Command GetCommand() const = 0;
 
     /**
-     * Writes the two operands, each a flag and a value. What a flag means is not settled: the
-     * program's author and whatever executes it agree on it.
+     * Writes the two operands, each a flag and a value. The meaning of a flag is unspecified: the
+     * program's author and its interpreter agree on it.
      *
      * @param[out] flag1    the flag of the first operand
      * @param[out] operand1 its value

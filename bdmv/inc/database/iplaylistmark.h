@@ -17,7 +17,7 @@ public:
     /** Kind of a mark, numbered as the disc's mark-type field. */
     enum MarkType : KEVRO_Int32 {
         MarkTypeEntryMark = 1, ///< a chapter starts here
-        MarkTypeLinkPoint = 2  ///< a place that navigation programs jump to
+        MarkTypeLinkPoint = 2  ///< a jump target of navigation programs
     };
 
     IPlayListMark() = default;

@@ -58,7 +58,7 @@ public:
         return *this;
     }
 
-    /** Compares the masks as stored; ::g_u1Bduopmask has no part in it. */
+    /** Compares the masks as stored; ignores ::g_u1Bduopmask. */
     bool operator==(const UOMaskTable& other) const { return m_UOMaskTable == other.m_UOMaskTable; }
 
     /**
@@ -94,8 +94,8 @@ public:
     /**
      * Loads the mask field of a disc.
      *
-     * @param field #UO_MASK_TABLE_SIZE bytes, the first operation in the top bit of the first; null
-     *              is reported through Assert() and leaves nothing forbidden
+     * @param field #UO_MASK_TABLE_SIZE bytes, the first operation in the top bit of the first byte;
+     *              null is reported through Assert() and leaves nothing forbidden
      */
     void Init(const bd::UInt8* field);
 

@@ -19,9 +19,9 @@ struct EventClass {
 };
 
 /**
- * Makes an event of a class, and has the compiler hold the class to what all have in common.
+ * Creates an event of a class, and makes the compiler check what all event classes share.
  *
- * @tparam Frozen what the constructor takes besides the context
+ * @tparam Frozen the constructor's parameters after the context
  */
 template <typename Event, typename... Frozen>
 std::unique_ptr<bdmv::INavigatorEvent> Make(bdmv::IPlaybackContext& context)
@@ -35,11 +35,11 @@ std::unique_ptr<bdmv::INavigatorEvent> Make(bdmv::IPlaybackContext& context)
     static_assert(!std::is_default_constructible<Event>::value, "");
     static_assert(std::is_constructible<Event, bdmv::IPlaybackContext&>::value ==
                       (sizeof...(Frozen) == 0),
-                  "takes the context alone or with all that it freezes");
+                  "takes the context and every value that it stores");
     static_assert(!std::is_constructible<Event, bdmv::IPlaybackContext&, Frozen..., int>::value,
                   "takes no more than that");
     static_assert(sizeof...(Frozen) != 0 || sizeof(Event) == sizeof(bdmv::NavigatorEvent),
-                  "holds nothing but what it freezes");
+                  "has no other members than the values it stores");
     return std::make_unique<Event>(context, Frozen()...);
 }
 

@@ -14,7 +14,7 @@ static_assert(std::is_abstract<bdmv::NavigatorEvent>::value, "");
 static_assert(std::has_virtual_destructor<bdmv::INavigatorEvent>::value, "");
 static_assert(std::has_virtual_destructor<bdmv::NavigatorEvent>::value, "");
 static_assert(sizeof(bdmv::INavigatorEvent) == sizeof(void*), "");
-static_assert(sizeof(bdmv::NavigatorEvent) == 2 * sizeof(void*), "the context and no more");
+static_assert(sizeof(bdmv::NavigatorEvent) == 2 * sizeof(void*), "only the context");
 static_assert(std::is_constructible<bdmv::TriggerSetEvent, bdmv::IPlaybackContext&, bd::TriggerType,
                                     bool>::value,
               "");
@@ -77,7 +77,7 @@ TEST_F(AllEventClasses, FireTheirCallbacksAndNoOthers)
     }
 }
 
-TEST_F(AllEventClasses, TakeAnyNonZeroAnswerOfTheLogSwitchForOn)
+TEST_F(AllEventClasses, TreatAnyNonZeroAnswerOfTheLogSwitchAsOn)
 {
     for (const EventClass& eventClass : AllEvents()) {
         WhenTheLogSwitchIsAsked(1, [] {});
@@ -90,7 +90,7 @@ TEST_F(AllEventClasses, TakeAnyNonZeroAnswerOfTheLogSwitchForOn)
     }
 }
 
-/** Keeps the addresses of the objects that reach it by reference. */
+/** Keeps the addresses of its reference arguments. */
 class AddressListener : public bdmv::NavigatorListenerAdapter
 {
 public:
@@ -118,7 +118,7 @@ public:
     std::vector<const void*> addresses;
 };
 
-TEST_F(AllEventClasses, ShowEveryListenerTheSameObjectsByReference)
+TEST_F(AllEventClasses, PassEveryListenerTheSameObjectsByReference)
 {
     const std::set<std::string> byReference = {
         "SteppedEvent",  "TriggerReachedEvent",      "UOMaskEvent",       "ChapterEvent",

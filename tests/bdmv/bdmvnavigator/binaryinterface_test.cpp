@@ -1,8 +1,8 @@
 // The order of the virtual operations is part of the binary interface: an implementation compiled
-// elsewhere is called by slot number. Two things prove it, in every ABI that follows the Itanium
-// C++ ABI. A caller: pointers to members hold the slot that a call by name uses. And an object: its
-// own virtual table is read, each entry called for what it is, a function whose first argument is
-// the object, and the override that ran has recorded its name.
+// elsewhere is called by slot number. The tests prove it from both sides, in every ABI that follows
+// the Itanium C++ ABI. The caller: a pointer to member contains the slot that a call by name uses.
+// The object: its virtual table is read, each entry is called as a function whose first argument is
+// the object, and the override records its name.
 
 #include <gtest/gtest.h>
 
@@ -40,8 +40,8 @@ constexpr long DeletingDestructorSlot = 1;
 constexpr long DestructorSlots = 2;
 constexpr long NotVirtual = -1;
 
-// Where the lowest bit of a function's address is not free, the mark of a virtual function stands
-// in the adjustment of the object, which is doubled.
+// Where the lowest bit of a function's address is in use, the adjustment of the object is doubled
+// and its lowest bit marks a virtual function.
 #if defined(__arm__) || defined(__aarch64__) || defined(__mips__)
 constexpr bool MarkIsInAdjustment = true;
 #else
@@ -68,7 +68,7 @@ template <typename Function> long SlotOf(Function function)
     return (parts.pointer & 1) != 0 ? (parts.pointer - 1) / size : NotVirtual;
 }
 
-/** What stands in a slot of the virtual table of an object, as a function. */
+/** The function in a slot of an object's virtual table. */
 template <typename Function> Function TableEntry(const void* object, long slot)
 {
     const void* const* table = nullptr;
@@ -78,7 +78,7 @@ template <typename Function> Function TableEntry(const void* object, long slot)
     return function;
 }
 
-/** Something to pass: a value, or what a reference or a pointer refers to. */
+/** An argument: a value, or the object that a reference or a pointer refers to. */
 template <typename Parameter> struct Argument {
     std::remove_const_t<std::remove_reference_t<Parameter>> value = {};
     operator Parameter() { return static_cast<Parameter>(value); }
@@ -93,7 +93,7 @@ template <> struct Argument<const void*> {
     operator const void*() { return nullptr; }
 };
 
-/** Calls the operation of a signature that stands in a slot of an object's table. */
+/** Calls the operation of a signature in a slot of an object's table. */
 template <typename Signature> struct TableCall;
 
 template <typename Result, typename... Parameters> struct TableCall<Result(Parameters...)> {
@@ -113,7 +113,7 @@ CALLS_TABLE_ENTRY void CallDestructor(void* object, long slot)
     TableEntry<void (*)(void*)>(object, slot)(object);
 }
 
-/** An operation, the slot that callers use, and how to call what an object has in a slot. */
+/** An operation, the slot that callers use, and a function that calls a slot of an object. */
 struct Operation {
     std::string name;
     long slot;
@@ -128,8 +128,8 @@ Operation Op(const char* name, Signature Interface::*function)
 }
 
 /**
- * Callers find the operations behind the two slots of the destructor, in this order, and there
- * the object has them.
+ * Callers expect the operations after the two slots of the destructor, in this order, and the
+ * object has them there.
  *
  * @param object  implements the interface, and writes what is called into the journal
  * @param journal has entries such as "name.Operation(arguments)"
@@ -150,18 +150,18 @@ void ExpectInThisOrder(Interface& object, bdmvtest::Journal& journal,
     }
 }
 
-/** Adds an operation of its own, which stands behind those of the interface. */
+/** Adds an operation, which follows those of the interface. */
 template <typename Interface> struct Extended : Interface {
     virtual void Next() = 0;
 };
 
-/** How many operations an interface has besides its destructor. */
+/** The number of operations of an interface besides its destructor. */
 template <typename Interface> long CountOperations()
 {
     return SlotOf(&Extended<Interface>::Next) - DestructorSlots;
 }
 
-struct NotVirtualAtAll {
+struct PlainClass {
     void Plain() {}
 };
 
@@ -225,11 +225,10 @@ private:
     bdmvtest::Journal& m_rJournal;
 };
 
-/** Counts how often it is destroyed, and how often its memory is given back, which is not its own.
- */
-template <typename Implementation> struct Doomed : Implementation {
+/** Counts its destructions and its deletions; does not own its memory. */
+template <typename Implementation> struct CountedDestruction : Implementation {
     using Implementation::Implementation;
-    ~Doomed() override { ++destroyed; }
+    ~CountedDestruction() override { ++destroyed; }
     static void operator delete(void*) { ++deleted; }
 
     static inline int destroyed = 0;
@@ -241,7 +240,7 @@ template <typename Interface, typename Implementation, typename... Arguments>
 void ExpectDestructorFirst(const char* name, Arguments&&... arguments)
 {
     SCOPED_TRACE(name);
-    typedef Doomed<Implementation> Object;
+    typedef CountedDestruction<Implementation> Object;
     Object::destroyed = 0;
     Object::deleted = 0;
 
@@ -264,7 +263,7 @@ struct Mark : bdmv::IPlayListMark {
 
 TEST_F(BinaryInterface, OrdinaryMemberFunctionsHaveNoSlot)
 {
-    EXPECT_EQ(NotVirtual, SlotOf(&NotVirtualAtAll::Plain));
+    EXPECT_EQ(NotVirtual, SlotOf(&PlainClass::Plain));
 }
 
 TEST_F(BinaryInterface, BeginsWithTheDestructor)

@@ -12,8 +12,8 @@ namespace
 const int rounds = 200;
 
 /**
- * The list must not let two threads in at once: it counts without a lock, and the one atomic orders
- * nothing, so that a thread checker sees every missing lock.
+ * The list must never call it on two threads at once: it counts without a lock, and its only atomic
+ * is relaxed, so that ThreadSanitizer detects every missing lock.
  */
 class CountingListener : public bdmv::NavigatorListenerAdapter
 {
@@ -35,7 +35,7 @@ private:
     std::atomic<bool> m_IsInside{false};
 };
 
-/** Must not be called while it is not in a list. */
+/** Counts the calls it receives while it is in no list. */
 class VisitingListener : public bdmv::NavigatorListenerAdapter
 {
 public:
@@ -45,7 +45,7 @@ public:
     int callsWhileAbsent = 0;
 };
 
-TEST(ConcurrentDispatch, DeliversEveryEventOnceWhileListenersComeAndGo)
+TEST(ConcurrentDispatch, DeliversEveryEventOnceWhileListenersAreAddedAndRemoved)
 {
     bdmvtest::FakePlatform platform(nullptr);
     Context context;
@@ -63,7 +63,7 @@ TEST(ConcurrentDispatch, DeliversEveryEventOnceWhileListenersComeAndGo)
         }
         --dispatching;
     };
-    const auto comeAndGo = [&](VisitingListener& visitor) {
+    const auto addAndRemove = [&](VisitingListener& visitor) {
         while (dispatching != 0) {
             visitor.isListed = true;
             EXPECT_TRUE(listeners.AddListener(&visitor));
@@ -75,8 +75,8 @@ TEST(ConcurrentDispatch, DeliversEveryEventOnceWhileListenersComeAndGo)
     std::vector<std::thread> threads;
     threads.emplace_back(dispatchAll);
     threads.emplace_back(dispatchAll);
-    threads.emplace_back(comeAndGo, std::ref(visitors[0]));
-    threads.emplace_back(comeAndGo, std::ref(visitors[1]));
+    threads.emplace_back(addAndRemove, std::ref(visitors[0]));
+    threads.emplace_back(addAndRemove, std::ref(visitors[1]));
     for (std::thread& thread : threads) {
         thread.join();
     }

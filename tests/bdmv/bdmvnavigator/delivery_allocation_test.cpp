@@ -20,7 +20,7 @@ public:
     }
 };
 
-/** A parameter that is true has every event take its longest way. */
+/** With a true parameter every event takes its longest path. */
 class DeliveryAllocation : public testing::TestWithParam<bool>
 {
 protected:
@@ -53,7 +53,7 @@ protected:
     bd::EventListenerList<bdmv::INavigatorListener> listeners;
 };
 
-INSTANTIATE_TEST_SUITE_P(Ways, DeliveryAllocation, testing::Bool());
+INSTANTIATE_TEST_SUITE_P(Paths, DeliveryAllocation, testing::Bool());
 
 TEST_P(DeliveryAllocation, NoEventAllocatesWithTheLogOn)
 {
@@ -67,7 +67,7 @@ TEST_P(DeliveryAllocation, NoEventAllocatesWithTheLogOff)
     ExpectNoAllocation();
 }
 
-TEST_P(DeliveryAllocation, DeletingAnEventThroughItsInterfaceFreesWhatMakingItTook)
+TEST_P(DeliveryAllocation, DeletingAnEventThroughItsInterfaceFreesItsMemory)
 {
     for (const EventClass& eventClass : AllEvents()) {
         const long before = bdmvtest::CountLiveBlocks();
@@ -80,7 +80,7 @@ TEST_P(DeliveryAllocation, DeletingAnEventThroughItsInterfaceFreesWhatMakingItTo
     }
 }
 
-TEST_P(DeliveryAllocation, AnAllocationInACallbackIsNoticed)
+TEST_P(DeliveryAllocation, AnAllocationInACallbackIsDetected)
 {
     struct AllocatingListener : bdmv::NavigatorListenerAdapter {
         void Paused() override { block.reset(new int); }

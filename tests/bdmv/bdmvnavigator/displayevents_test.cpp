@@ -171,7 +171,7 @@ INSTANTIATE_TEST_SUITE_P(Availability, EventScenario, testing::ValuesIn(availabi
 class SuppressedEvents : public EventTest
 {
 protected:
-    /** Has A dispatch an event on the list while the list is held for another one. */
+    /** Makes A dispatch an event on the list while the list is locked for another event. */
     template <typename Event> std::string DispatchWhileTheListIsHeld()
     {
         a.onCallback = [this](const std::string&) {
@@ -189,7 +189,7 @@ private:
     std::string m_Inner;
 };
 
-TEST_F(SuppressedEvents, PipUnavailableDoesNotTouchTheLock)
+TEST_F(SuppressedEvents, PipUnavailableDoesNotTakeTheLock)
 {
     HasAsyncVideo(context);
 
@@ -198,7 +198,7 @@ TEST_F(SuppressedEvents, PipUnavailableDoesNotTouchTheLock)
                   Logged("Not send unavailable for async 2nd video"));
 }
 
-TEST_F(SuppressedEvents, SecondaryAudioUnavailableDoesNotTouchTheLock)
+TEST_F(SuppressedEvents, SecondaryAudioUnavailableDoesNotTakeTheLock)
 {
     HasAsyncAudio(context);
 
@@ -207,7 +207,7 @@ TEST_F(SuppressedEvents, SecondaryAudioUnavailableDoesNotTouchTheLock)
                   Logged("Not send unavailable for async 2nd audio"));
 }
 
-TEST_F(SuppressedEvents, PresentationGraphicsInfoDoesNotTouchTheLock)
+TEST_F(SuppressedEvents, PresentationGraphicsInfoDoesNotTakeTheLock)
 {
     context.rPgTextStResult = bdmv::INavError::ErrNotAllowed;
 

@@ -5,7 +5,7 @@
 
 #include "eventtest.h"
 
-// What holds for every scenario of every event. The families instantiate it.
+// Tests that apply to every scenario of every event. Each family of events instantiates them.
 
 namespace
 {
@@ -48,7 +48,7 @@ std::string WithTheLogOff(const std::string& journal)
     return kept;
 }
 
-/** For every callback in the journal, in order, the journal up to and with it. */
+/** For every callback in the journal, in order, the journal up to and including it. */
 std::vector<std::string> UpToEachCallback(const std::string& journal)
 {
     std::vector<std::string> prefixes;
@@ -62,7 +62,7 @@ std::vector<std::string> UpToEachCallback(const std::string& journal)
     return prefixes;
 }
 
-/** What a callback must not do with the list that is calling it. */
+/** An operation that a callback must not perform on the list that is calling it. */
 struct Reentry {
     const char* name;
     void (*reenter)(Listeners& listeners, bdmv::INavigatorListener& listener);
@@ -90,11 +90,11 @@ TEST_P(EventScenario, HappensInThisOrder)
     EXPECT_EQ(journal.Take(), GetParam().journal);
 }
 
-TEST_P(EventScenario, DiffersOnlyInTheCallbacksWhenNobodyListens)
+TEST_P(EventScenario, DiffersOnlyInTheCallbacksWithoutListeners)
 {
-    Listeners nobody;
+    Listeners empty;
 
-    DispatchScenario(nobody);
+    DispatchScenario(empty);
 
     EXPECT_EQ(journal.Take(), WithoutCallbacks(GetParam().journal));
 }
@@ -108,7 +108,7 @@ TEST_P(EventScenario, DiffersOnlyInTheLinesWhenTheLogIsOff)
     EXPECT_EQ(journal.Take(), WithTheLogOff(GetParam().journal));
 }
 
-TEST_P(EventScenario, TouchesNothingWhenItIsMadeAndDeleted)
+TEST_P(EventScenario, DoesNothingWhenCreatedAndDeleted)
 {
     GetParam().arrange(context);
     platform.RecordAtomicAdds();
@@ -171,7 +171,7 @@ TEST_P(EventScenario, EndsAtTheCallbackThatReentersTheList)
     ExpectTheListToBeSound();
 }
 
-TEST_P(EventScenario, GoesOnWhenTheCallbackHandlesTheRefusal)
+TEST_P(EventScenario, ContinuesWhenTheCallbackHandlesTheRefusal)
 {
     const std::size_t callbacks = UpToEachCallback(GetParam().journal).size();
     for (std::size_t i = 0; i < callbacks; ++i) {

@@ -1,6 +1,6 @@
 /**
  * @file
- * What the tests of all events share.
+ * Fixtures and journal entries that the tests of all events share.
  *
  * Every test states the whole journal of a dispatch. The three shapes that make up most of a
  * journal have a function each:
@@ -38,7 +38,7 @@ inline std::string Queried(const std::string& query)
     return "context." + query + "\n";
 }
 
-/** The entries of a line that is written, and of the look at the log switch before it. */
+/** The entries of a line that is written, and of the check of the log switch before it. */
 inline std::string Logged(const std::string& line, const std::string& tag = "57 5 0")
 {
     return "log? " + tag + " -> on\nlog " + tag + ": " + line + "\n";
@@ -56,7 +56,7 @@ inline std::string Fired(const std::string& callback)
     return "A." + callback + "\nB." + callback + "\nC." + callback + "\n";
 }
 
-/** A context, the listeners A, B and C in this order, and the journal of all that happens. */
+/** A context, the listeners A, B and C in this order, and the journal of all calls. */
 class EventTest : public testing::Test
 {
 protected:
@@ -67,7 +67,8 @@ protected:
         listeners.AddListener(&c);
     }
 
-    /** Makes the event, dispatches it to A, B and C, and deletes it. Returns the whole journal. */
+    /** Creates the event, dispatches it to A, B and C, and deletes it. Returns the whole journal.
+     */
     template <typename Event> std::string Dispatch()
     {
         const std::unique_ptr<bdmv::INavigatorEvent> event(new Event(context));
@@ -75,7 +76,7 @@ protected:
         return journal.Take();
     }
 
-    /** Has the log switch do something of the test's own whenever it is asked. */
+    /** Runs an action of the test whenever the log switch is called. */
     void WhenTheLogSwitchIsAsked(KEVRO_Bool answer, std::function<void()> action)
     {
         platform.SetLogSwitch(
@@ -95,7 +96,7 @@ protected:
 };
 
 /**
- * An event, what the context holds when it is dispatched, and all that must happen then.
+ * An event, the state of the context when it is dispatched, and the journal that must result.
  *
  * A family states its events as scenarios of EventScenario, which dispatches each with and
  * without listeners, with and without a log, and through every failure of a listener.
@@ -113,14 +114,14 @@ inline void PrintTo(const Scenario& scenario, std::ostream* stream)
     *stream << scenario.name;
 }
 
-/** Makes an event of a class, with the values that it freezes at its construction. */
+/** Creates an event of a class, with the values that it stores at construction. */
 template <typename Event, typename... Frozen>
 std::function<bdmv::INavigatorEvent*(bdmv::IPlaybackContext&)> New(Frozen... frozen)
 {
     return [=](bdmv::IPlaybackContext& context) { return new Event(context, frozen...); };
 }
 
-/** An event that asks the context nothing: a line and a callback without arguments. */
+/** An event without queries: a line and a callback without arguments. */
 template <typename Event>
 Scenario Notification(const std::string& line, const std::string& callback)
 {
@@ -138,7 +139,7 @@ public:
     }
 
 protected:
-    /** The event exists before the context holds its values: it must read them later. */
+    /** The event is created before the context has its values: it must read them later. */
     void DispatchScenario(Listeners& list)
     {
         const std::unique_ptr<bdmv::INavigatorEvent> event(GetParam().make(context));
@@ -146,7 +147,7 @@ protected:
         event->Dispatch(list);
     }
 
-    /** Has one callback, counted over all listeners from 0, do something. */
+    /** Makes one callback, counted over all listeners from 0, run an action. */
     void OnCallback(std::size_t number, const std::function<void()>& action)
     {
         m_Callbacks = 0;
@@ -157,7 +158,7 @@ protected:
         };
     }
 
-    /** Nothing is left behind: the same event reaches the same listeners once more. */
+    /** The list still works: the same event reaches the same listeners again. */
     void ExpectTheListToBeSound()
     {
         a.onCallback = b.onCallback = c.onCallback = nullptr;

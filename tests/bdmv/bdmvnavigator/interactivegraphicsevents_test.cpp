@@ -8,7 +8,7 @@ namespace
 
 typedef bdmv::IPlaybackContext::RefPtr ProgramPtr;
 
-/** A program without commands that tells when it goes. */
+/** A program without commands that reports its destruction. */
 class Program : public bdmv::IProgramData
 {
 public:
@@ -81,7 +81,7 @@ INSTANTIATE_TEST_SUITE_P(InteractiveGraphics, EventScenario, testing::ValuesIn(s
 class ButtonExecution : public EventTest
 {
 protected:
-    /** Does something of the test's own with the program that it receives. */
+    /** Runs an action of the test with the program that it receives. */
     struct ProgramListener : bdmv::NavigatorListenerAdapter {
         void ExecuteButton(bd::UInt32, bd::ButtonId, ProgramPtr& program) override
         {
@@ -102,7 +102,7 @@ protected:
     }
 
     /** Puts a listener between A and B. */
-    void AddBehindA(ProgramListener& listener)
+    void AddAfterA(ProgramListener& listener)
     {
         listeners.RemoveListener(&b);
         listeners.RemoveListener(&c);
@@ -125,7 +125,7 @@ TEST_F(ButtonExecution, TakesOneReferenceAndReleasesItAfterTheLastListener)
                   Fired("ExecuteButton(0, 0, program shared by 2)") + "atomic add -1 -> 1\n");
 }
 
-TEST_F(ButtonExecution, TakesNoReferenceWhenTheContextLeavesTheProgram)
+TEST_F(ButtonExecution, TakesNoReferenceWhenTheContextWritesNoProgram)
 {
     platform.RecordAtomicAdds();
     context.untouched = {"GetExecuteButtonData"};
@@ -138,10 +138,10 @@ TEST_F(ButtonExecution, TakesNoReferenceWhenTheContextLeavesTheProgram)
 
 TEST_F(ButtonExecution, ReleasesTheProgramWithoutListeners)
 {
-    Listeners nobody;
+    Listeners empty;
     platform.RecordAtomicAdds();
 
-    bdmv::ExecuteButtonEvent(context).Dispatch(nobody);
+    bdmv::ExecuteButtonEvent(context).Dispatch(empty);
 
     EXPECT_EQ(journal.Take(), "atomic add 1 -> 2\n" + m_QueriedAndLogged + "atomic add -1 -> 1\n");
 }
@@ -161,7 +161,7 @@ TEST_F(ButtonExecution, ReleasesTheProgramWhenAListenerThrows)
                                   "atomic add -1 -> 1\n");
 }
 
-TEST_F(ButtonExecution, DestroysTheProgramAtTheEndWhenTheContextLetsGoOfIt)
+TEST_F(ButtonExecution, DestroysTheProgramAtTheEndWhenTheContextReleasesIt)
 {
     a.onCallback = [this](const std::string&) { context.executeButtonProgram.Release(); };
 
@@ -180,7 +180,7 @@ TEST_F(ButtonExecution, LeavesTheProgramToAListenerThatCopiesTheHandle)
         kept = program;
         context.executeButtonProgram.Release();
     };
-    AddBehindA(keeper);
+    AddAfterA(keeper);
 
     EXPECT_EQ(Dispatch<bdmv::ExecuteButtonEvent>(),
               m_QueriedAndLogged + Fired("ExecuteButton(0, 0, program shared by 2)"));
@@ -190,11 +190,11 @@ TEST_F(ButtonExecution, LeavesTheProgramToAListenerThatCopiesTheHandle)
     EXPECT_EQ(journal.Take(), "gone\n");
 }
 
-TEST_F(ButtonExecution, ShowsTheListenersBehindThatOneResetTheHandle)
+TEST_F(ButtonExecution, ShowsLaterListenersThatTheHandleWasReset)
 {
     ProgramListener resetter;
     resetter.onProgram = [](ProgramPtr& program) { program.Release(); };
-    AddBehindA(resetter);
+    AddAfterA(resetter);
 
     EXPECT_EQ(Dispatch<bdmv::ExecuteButtonEvent>(), m_QueriedAndLogged +
                                                         "A.ExecuteButton(0, 0, program shared by "
@@ -204,23 +204,23 @@ TEST_F(ButtonExecution, ShowsTheListenersBehindThatOneResetTheHandle)
     EXPECT_TRUE(context.executeButtonProgram.IsUnique());
 }
 
-TEST_F(ButtonExecution, ReleasesTheProgramThatAListenerPutInPlace)
+TEST_F(ButtonExecution, ReleasesTheProgramThatAListenerAssigned)
 {
     ProgramListener replacer;
     replacer.onProgram = [this](ProgramPtr& program) {
-        program = ProgramPtr(new Program([this] { journal.Add("replacement gone"); }));
+        program = ProgramPtr(new Program([this] { journal.Add("replacement destroyed"); }));
     };
-    AddBehindA(replacer);
+    AddAfterA(replacer);
 
     EXPECT_EQ(Dispatch<bdmv::ExecuteButtonEvent>(),
               m_QueriedAndLogged + "A.ExecuteButton(0, 0, program shared by 2)\n"
                                    "B.ExecuteButton(0, 0, program shared by 1)\n"
                                    "C.ExecuteButton(0, 0, program shared by 1)\n"
-                                   "replacement gone\n");
+                                   "replacement destroyed\n");
     EXPECT_TRUE(context.executeButtonProgram.IsUnique());
 }
 
-TEST_F(ButtonExecution, LetsTheProgramUseTheListWhenItGoes)
+TEST_F(ButtonExecution, LetsTheProgramUseTheListInItsDestructor)
 {
     HoldAProgram([this] {
         listeners.RemoveListener(&b);
@@ -237,7 +237,7 @@ TEST_F(ButtonExecution, LetsTheProgramUseTheListWhenItGoes)
                   "A.ButtonActivationDone()\nC.ButtonActivationDone()\n");
 }
 
-TEST_F(ButtonExecution, RefusesTheListToAProgramThatGoesInsideACallback)
+TEST_F(ButtonExecution, RefusesTheListToAProgramDestroyedInsideACallback)
 {
     HoldAProgram([this] {
         EXPECT_THROW(listeners.RemoveListener(&a), std::system_error);
@@ -248,7 +248,7 @@ TEST_F(ButtonExecution, RefusesTheListToAProgramThatGoesInsideACallback)
         context.executeButtonProgram.Release();
         program.Release();
     };
-    AddBehindA(resetter);
+    AddAfterA(resetter);
 
     EXPECT_EQ(Dispatch<bdmv::ExecuteButtonEvent>(), m_QueriedAndLogged +
                                                         "A.ExecuteButton(0, 0, program shared by "

@@ -19,7 +19,7 @@ struct EmptyProgram : bdmv::IProgramData {
 
 } // namespace
 
-TEST(NavigatorListenerAdapter, IsAListenerThatCanBeMade)
+TEST(NavigatorListenerAdapter, IsAConcreteListener)
 {
     EXPECT_TRUE((std::is_base_of_v<bdmv::INavigatorListener, bdmv::NavigatorListenerAdapter>));
     EXPECT_FALSE(std::is_abstract_v<bdmv::NavigatorListenerAdapter>);
@@ -31,7 +31,7 @@ TEST(NavigatorListenerAdapter, CanBeCopied)
     EXPECT_TRUE(std::is_copy_assignable_v<bdmv::NavigatorListenerAdapter>);
 }
 
-TEST(NavigatorListenerAdapter, LeavesTheOtherCallbacksToTheOneThatIsOverridden)
+TEST(NavigatorListenerAdapter, CanOverrideASingleCallback)
 {
     struct FrontPanel : bdmv::NavigatorListenerAdapter {
         void Paused() override { ++pauses; }

@@ -111,7 +111,7 @@ TEST_F(PlaybackStateEvents, SteppedWritesThisJournal)
               "C.Stepped(900000, PlayDirectionBackward)\n");
 }
 
-TEST_F(PlaybackStateEvents, ContinuedReportsThePlayModesAsTheyWereWhenAskedFor)
+TEST_F(PlaybackStateEvents, ContinuedReportsThePlayModesAsTheyWereWhenQueried)
 {
     context.onQuery = [this](const std::string& operation) {
         if (operation == "GetPlayMode") {

@@ -1,5 +1,5 @@
-// The interfaces hold nothing but their virtual operations, are destroyed through their base, and
-// can be copied by what implements them.
+// The interfaces have nothing but virtual operations, are destroyed through their base, and can be
+// copied by their implementations.
 
 #include <gtest/gtest.h>
 
@@ -16,7 +16,7 @@
 namespace
 {
 
-/** Uses the special members of an interface as an implementation of it does. */
+/** Uses the special members of an interface as an implementation does. */
 template <typename Interface> struct Implementation : Interface {
     Implementation() : Interface() {}
     Implementation(const Implementation& other) : Interface(other) {}

@@ -83,7 +83,7 @@ const Scenario plainScenarios[] = {
 INSTANTIATE_TEST_SUITE_P(PlainStreams, EventScenario, testing::ValuesIn(plainScenarios),
                          EventScenario::Name);
 
-/** A subtitle selection, differing between the two queries for it. */
+/** A subtitle selection that differs between the two queries for it. */
 std::function<void(Context&)> Subtitles(bdmv::INavError::ErrCode result, bool shown, Stream stream)
 {
     return [=](Context& context) {
@@ -361,7 +361,7 @@ class StreamInfoEvents : public EventTest
 {
 };
 
-TEST_F(StreamInfoEvents, PresentationGraphicsInfoGoesOnAfterEveryResultButNotAllowed)
+TEST_F(StreamInfoEvents, PresentationGraphicsInfoContinuesAfterEveryResultButNotAllowed)
 {
     for (const int result : {0, 1, 2, 3, 4, 5, 6, 8, -1}) {
         Subtitles(static_cast<bdmv::INavError::ErrCode>(result), true, {4, 3})(context);
@@ -375,7 +375,7 @@ TEST_F(StreamInfoEvents, PresentationGraphicsInfoGoesOnAfterEveryResultButNotAll
     }
 }
 
-TEST_F(StreamInfoEvents, SecondaryAudioInfoAsksForTheDisplayAfterTheLastListenerHasTheStream)
+TEST_F(StreamInfoEvents, SecondaryAudioInfoQueriesTheDisplayAfterTheLastListenerReceivesTheStream)
 {
     context.secondaryAudio = Stream{2, 3};
     c.onCallback = [this](const std::string&) {
@@ -392,7 +392,7 @@ TEST_F(StreamInfoEvents, SecondaryAudioInfoAsksForTheDisplayAfterTheLastListener
                   Fired("SecondaryAudioDisplay(2, true)"));
 }
 
-TEST_F(StreamInfoEvents, SecondaryVideoInfoAsksForTheDisplayAfterTheLastListenerHasTheStream)
+TEST_F(StreamInfoEvents, SecondaryVideoInfoQueriesTheDisplayAfterTheLastListenerReceivesTheStream)
 {
     context.secondaryVideo = Stream{2, 3};
     c.onCallback = [this](const std::string&) {
@@ -410,7 +410,7 @@ TEST_F(StreamInfoEvents, SecondaryVideoInfoAsksForTheDisplayAfterTheLastListener
                   Fired("SecondaryVideoDisplay(2, true)"));
 }
 
-TEST_F(StreamInfoEvents, SecondaryStreamsLeaveTheListFreeForChangesBetweenTheirCallbacks)
+TEST_F(StreamInfoEvents, SecondaryStreamsAllowListChangesBetweenTheirCallbacks)
 {
     context.onQuery = [this](const std::string& operation) {
         if (operation == "GetSecondaryAudioDisplay") {

@@ -56,7 +56,7 @@ protected:
     bd::UInt8 m_Second[1] = {9};
 };
 
-TEST_F(SystemSuspension, LogsTheSizeThatTheDescriptorHoldsOnceTheSwitchIsOn)
+TEST_F(SystemSuspension, LogsTheSizeInTheDescriptorAfterTheSwitchCheck)
 {
     context.systemResumeData = {m_First, 2};
     WhenTheLogSwitchIsAsked(1, [this] { context.systemResumeData = {m_Second, 1}; });
@@ -67,7 +67,7 @@ TEST_F(SystemSuspension, LogsTheSizeThatTheDescriptorHoldsOnceTheSwitchIsOn)
                   Fired("SystemSuspended(bytes 9, 1)") + Queried("CleanupSystemResumeData()"));
 }
 
-TEST_F(SystemSuspension, FiresWhatTheDescriptorHoldsAfterTheLogCheck)
+TEST_F(SystemSuspension, FiresTheValuesInTheDescriptorAfterTheLogCheck)
 {
     context.systemResumeData = {m_First, 2};
     WhenTheLogSwitchIsAsked(0, [this] { context.systemResumeData = {m_Second, 1}; });
@@ -77,7 +77,7 @@ TEST_F(SystemSuspension, FiresWhatTheDescriptorHoldsAfterTheLogCheck)
                   Fired("SystemSuspended(bytes 9, 1)") + Queried("CleanupSystemResumeData()"));
 }
 
-TEST_F(SystemSuspension, TellsEveryListenerTheSameWhenOneChangesTheDescriptor)
+TEST_F(SystemSuspension, PassesEveryListenerTheSameValuesWhenOneChangesTheDescriptor)
 {
     context.systemResumeData = {m_First, 2};
     a.onCallback = [this](const std::string&) { context.systemResumeData = {m_Second, 1}; };
@@ -88,7 +88,7 @@ TEST_F(SystemSuspension, TellsEveryListenerTheSameWhenOneChangesTheDescriptor)
                   Fired("SystemSuspended(bytes 1 2, 2)") + Queried("CleanupSystemResumeData()"));
 }
 
-TEST_F(SystemSuspension, HandsEveryListenerTheBlockOfTheContextItself)
+TEST_F(SystemSuspension, PassesEveryListenerTheContextsOwnBlock)
 {
     struct Keeper : bdmv::NavigatorListenerAdapter {
         void SystemSuspended(const void* data, bd::UInt32 size) override

@@ -77,7 +77,7 @@ const Scenario scenarios[] = {
 INSTANTIATE_TEST_SUITE_P(TitlePosition, EventScenario, testing::ValuesIn(scenarios),
                          EventScenario::Name);
 
-/** What the current and the previous play item have of a secondary stream, and what is sent. */
+/** A secondary stream in the current and the previous play item, and the notification sent. */
 struct Secondary {
     const char* name;
     bool currentAsync;
@@ -176,7 +176,7 @@ class TitlePositionEvents : public EventTest
 {
 };
 
-TEST_F(TitlePositionEvents, PlayItemAsksForTheFlagsAfterTheLastListenerHasThePlayItem)
+TEST_F(TitlePositionEvents, PlayItemQueriesTheFlagsAfterTheLastListenerReceivesThePlayItem)
 {
     PlaysItem(context);
     c.onCallback = [this](const std::string&) { context.async2ndAud = true; };
@@ -188,7 +188,7 @@ TEST_F(TitlePositionEvents, PlayItemAsksForTheFlagsAfterTheLastListenerHasThePla
                   audioAvailable);
 }
 
-TEST_F(TitlePositionEvents, PlayItemAsksForTheFlagsOnce)
+TEST_F(TitlePositionEvents, PlayItemQueriesTheFlagsOnce)
 {
     PlaysItem(context);
     context.prev2ndVid = context.prev2ndAud = true;
@@ -205,7 +205,7 @@ TEST_F(TitlePositionEvents, PlayItemAsksForTheFlagsOnce)
                   pipUnavailable + audioUnavailable);
 }
 
-TEST_F(TitlePositionEvents, PlayItemLeavesTheListFreeForChangesBetweenItsCallbacks)
+TEST_F(TitlePositionEvents, PlayItemAllowsListChangesBetweenItsCallbacks)
 {
     PlaysItem(context);
     context.prev2ndVid = true;
@@ -237,7 +237,7 @@ TEST_F(TitlePositionEvents, UOMaskComputesTheReportedFormOnceTheSwitchIsOn)
                   Fired("UOMask(18446744073709551615)"));
 }
 
-TEST_F(TitlePositionEvents, UOMaskHandsOutTheStoredMaskWhateverTheOverrideReports)
+TEST_F(TitlePositionEvents, UOMaskPassesTheStoredMaskWhateverTheOverride)
 {
     struct Keeper : bdmv::NavigatorListenerAdapter {
         void UOMask(const bdmv::UOMaskTable& mask) override { masks.push_back(mask); }

@@ -11,7 +11,7 @@ using bdmvtest::Describe;
 
 enum Asked { Nothing, States, StatesAndTrigger };
 
-/** A trigger that is reached, the repeat states at that moment, and what is reported then. */
+/** A trigger that is reached, the repeat states at that time, and the trigger reported. */
 struct Reached {
     std::string name;
     TriggerType typeByTime;
@@ -39,7 +39,7 @@ const Reached reachedTriggers[] = {
      TRIGGER_B},
     {"BWithABWithoutChapter", TRIGGER_B, TRIGGER_B, TRIGGER_NONE, TRIGGER_A, States, TRIGGER_B},
 
-    // A time without a trigger of its own.
+    // A time without a trigger.
     {"InvalidInABWithChapter", TRIGGER_INVALID, TRIGGER_B, TRIGGER_CHP, TRIGGER_A, States,
      TRIGGER_B},
     {"InvalidInABWithoutChapter", TRIGGER_INVALID, TRIGGER_B, TRIGGER_NONE, TRIGGER_A, States,
@@ -106,7 +106,7 @@ std::vector<Scenario> TriggerReachedScenarios()
     return scenarios;
 }
 
-/** All kinds that are reported as they are, one that is in no list among them. */
+/** All kinds that are reported unchanged, among them one outside the list. */
 std::vector<Scenario> OtherTriggerReachedScenarios()
 {
     std::vector<Scenario> scenarios;
@@ -298,7 +298,7 @@ class PlayModeEvents : public EventTest
 {
 };
 
-TEST_F(PlayModeEvents, WithdrawsAsyncStreamsAtEverySpeedButTheNormalOne)
+TEST_F(PlayModeEvents, WithdrawsAsyncStreamsAtEverySpeedButNormal)
 {
     for (int speed = PlaySpeedSlow5; speed <= PlaySpeedFast12; ++speed) {
         for (const PlayDirectionDef direction : {PlayDirectionForward, PlayDirectionBackward}) {
@@ -317,7 +317,7 @@ TEST_F(PlayModeEvents, WithdrawsAsyncStreamsAtEverySpeedButTheNormalOne)
     }
 }
 
-TEST_F(PlayModeEvents, DecidesByTheSpeedItReportedAndTheFlagsOfAfterwards)
+TEST_F(PlayModeEvents, DecidesByTheReportedSpeedAndTheLaterFlags)
 {
     WhenTheLogSwitchIsAsked(
         1, [this] { context.currentPlayMode = PlayMode(PlayDirectionBackward, PlaySpeedFast1); });
@@ -327,7 +327,7 @@ TEST_F(PlayModeEvents, DecidesByTheSpeedItReportedAndTheFlagsOfAfterwards)
               normalPlay + AsyncFlags("true, false, false, false") + pipAvailable);
 }
 
-TEST_F(PlayModeEvents, AsksForTheFlagsOnce)
+TEST_F(PlayModeEvents, QueriesTheFlagsOnce)
 {
     Plays(PlayDirectionForward, PlaySpeedNormal, true, true)(context);
     b.onCallback = [this](const std::string& callback) {
@@ -340,7 +340,7 @@ TEST_F(PlayModeEvents, AsksForTheFlagsOnce)
               normalPlay + AsyncFlags("true, true, false, false") + pipAvailable + audioAvailable);
 }
 
-TEST_F(PlayModeEvents, LeavesTheListFreeForChangesBetweenItsCallbacks)
+TEST_F(PlayModeEvents, AllowsListChangesBetweenItsCallbacks)
 {
     Plays(PlayDirectionForward, PlaySpeedNormal, true, false)(context);
     context.onQuery = [this](const std::string& operation) {

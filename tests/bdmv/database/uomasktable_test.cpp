@@ -33,7 +33,7 @@ const std::vector<bd::UInt64>& SomeMasks()
     return masks;
 }
 
-/** The bits in reverse order, by exchanging ever larger neighbours. */
+/** The bits in reverse order, by swapping ever larger groups of them. */
 bd::UInt64 Reversed(bd::UInt64 value)
 {
     value = ((value & 0x5555555555555555u) << 1) | ((value >> 1) & 0x5555555555555555u);
@@ -53,17 +53,17 @@ class UOMask : public testing::Test
 {
 protected:
     bdmvtest::Journal journal;
-    bdmvtest::FakePlatform platform{&journal}; ///< clears g_u1Bduopmask in the end
+    bdmvtest::FakePlatform platform{&journal}; ///< clears g_u1Bduopmask at the end
 };
 
 } // namespace
 
-TEST_F(UOMask, ForbidsNothingAtFirst)
+TEST_F(UOMask, StartsWithNothingForbidden)
 {
     EXPECT_EQ(0u, UOMaskTable().GetUOMaskTable());
 }
 
-TEST_F(UOMask, IsMadeOfANumberOnlyExplicitly)
+TEST_F(UOMask, ConvertsFromANumberOnlyExplicitly)
 {
     EXPECT_TRUE((std::is_constructible_v<UOMaskTable, bd::UInt64>));
     EXPECT_FALSE((std::is_convertible_v<bd::UInt64, UOMaskTable>));
@@ -167,7 +167,7 @@ TEST_F(UOMask, OverrideTwoReportsEverythingForbidden)
     }
 }
 
-TEST_F(UOMask, AnyOtherOverrideReportsTheMaskAsItIs)
+TEST_F(UOMask, AnyOtherOverrideReportsTheMaskUnchanged)
 {
     for (const int other : {0, 3, 4, -1, -2, 257, 258, 65537, INT_MAX, INT_MIN}) {
         g_u1Bduopmask = other;
@@ -205,7 +205,7 @@ TEST_F(UOMask, AndForbidsWhatBothForbid)
     EXPECT_TRUE(mask == UOMaskTable(0x000F00F0));
 }
 
-TEST_F(UOMask, OrAndAndGiveTheTableItself)
+TEST_F(UOMask, OrAndAndReturnTheTable)
 {
     UOMaskTable mask(3);
 
@@ -259,7 +259,7 @@ TEST_F(UOMask, InitTakesTheFirstByteAsTheMostSignificant)
     EXPECT_TRUE(mask == UOMaskTable(0x0123456789ABCDEFu));
 }
 
-TEST_F(UOMask, InitReadsEightBytesWhereverTheyStand)
+TEST_F(UOMask, InitReadsEightBytesAtAnyAddress)
 {
     const bd::UInt8 bytes[] = {0xEE, 0x80, 0, 0, 0, 0, 0, 0, 0x01, 0xEE};
     UOMaskTable mask;
@@ -268,7 +268,7 @@ TEST_F(UOMask, InitReadsEightBytesWhereverTheyStand)
     EXPECT_TRUE(mask == UOMaskTable(0x8000000000000001u));
 }
 
-TEST_F(UOMask, InitReplacesWhatWasThere)
+TEST_F(UOMask, InitReplacesTheEarlierMask)
 {
     const bd::UInt8 field[8] = {};
     UOMaskTable mask(AllOnes);
@@ -314,7 +314,7 @@ TEST_F(UOMask, ReportOfInitNamesItsFileRelativeToTheSources)
 
 // Single operations
 
-TEST_F(UOMask, IsSetTellsNamedOperations)
+TEST_F(UOMask, IsSetReportsNamedOperations)
 {
     // Chapter search, stop and pop-up on: positions 2, 7 and 24 from the most significant bit.
     const UOMaskTable mask(0x2100008000000000u);

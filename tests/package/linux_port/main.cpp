@@ -1,4 +1,4 @@
-// A program that takes the Linux port as it comes.
+// A program that uses the Linux port unchanged.
 #include "bd/logging.h"
 #include "database/uomasktable.h"
 #include "kevro_linux.h"

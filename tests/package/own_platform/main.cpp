@@ -1,4 +1,4 @@
-// A product with a platform interface of its own.
+// A product with its own implementation of the platform interface.
 #include <cstdio>
 #include <cstring>
 

@@ -1,4 +1,4 @@
-/* The header says the version that the package was found by. */
+/* The version in the header is that of the package found. */
 #include <string.h>
 
 #include "bdmvnavigator/version.h"

@@ -1,4 +1,4 @@
-// A program of the library and the example port: it links, and what must work without a log does.
+// The library with the example port: it links, and everything but the log works.
 #include "bd/logging.h"
 #include "bd/refptr.h"
 #include "database/uomasktable.h"

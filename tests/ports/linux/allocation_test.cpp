@@ -1,4 +1,4 @@
-// What a line costs the heap, and what happens when the heap has nothing to give.
+// The heap allocations of log lines, and what happens when an allocation fails.
 #include <string>
 
 #include "porttesting.h"
@@ -14,7 +14,7 @@ class LogAllocation : public porttesting::LogFileTest
 {
 };
 
-/** What a line of the calling thread takes from the heap once the port has warmed up. */
+/** The heap allocations of a line of the calling thread, after earlier lines. */
 std::size_t AllocationsOfALine(const std::string& text)
 {
     porttesting::EventLogger().Log("%s", text.c_str());
@@ -46,7 +46,7 @@ TEST_F(LogAllocation, IsNoneWhenTheQueueDropsLines)
     EXPECT_EQ(bdmvtest::CountAllocations() - before, 0U);
 }
 
-TEST_F(LogAllocation, IsNoneToAskTheSwitch)
+TEST_F(LogAllocation, IsNoneToCheckTheSwitch)
 {
     const std::size_t before = bdmvtest::CountAllocations();
     KEVRO_Log_IsEnabled(bd::CompIdBdmvNavigator, KEVRO_Log_LevelEvent, 0);
@@ -102,7 +102,7 @@ TEST_F(LogAllocation, RefusesAConfigurationWhenItFails)
     EXPECT_TRUE(KEVRO_Log_Configure("*=Exception|Warning|Fatal", nullptr, 0));
 }
 
-TEST_F(LogAllocation, RefusesASinkWhenItFailsAndKeepsTheOneInForce)
+TEST_F(LogAllocation, RefusesASinkWhenItFailsAndKeepsTheOldOne)
 {
     const std::string other = m_Directory.Path("other");
     const std::string text = "file:" + other + ",queue=10";

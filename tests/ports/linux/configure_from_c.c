@@ -1,4 +1,4 @@
-/* The port's header as a program in C sees it. */
+/* The port's header as seen from C. */
 #include "kevro_linux.h"
 
 bool ConfigureFromC(const char* text);

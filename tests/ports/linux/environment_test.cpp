@@ -1,4 +1,4 @@
-// What the port reads from the environment when a program starts, and what it does when one ends.
+// The environment that the port reads at the start of a program, and its actions at the end.
 #include <csignal>
 #include <string>
 #include <vector>
@@ -19,7 +19,7 @@ Outcome RunHelper(std::vector<std::string> arguments, const std::vector<std::str
     return porttesting::Run(arguments, environment);
 }
 
-TEST(Environment, IsNotNeeded)
+TEST(Environment, IsOptional)
 {
     EXPECT_EQ(RunHelper({"enabled", "57", "3", "0"}, {}).output, "1\n");
     EXPECT_EQ(RunHelper({"enabled", "57", "5", "0"}, {}).output, "0\n");
@@ -46,10 +46,10 @@ TEST(Environment, ReportsAnUnreadableSwitchInOneLineAndKeepsTheDefault)
     const Outcome outcome = RunHelper({"enabled", "57", "3", "0"}, {"KEVRO_LOG=Jpi=Evnt"});
     EXPECT_EQ(outcome.output, "1\n");
     EXPECT_EQ(outcome.errors, "KEVRO_LOG: \"Evnt\" at character 5: expected a level or *; "
-                              "did you mean Event?; the default stays\n");
+                              "did you mean Event?; using the default\n");
 }
 
-TEST(Environment, WritesToStandardErrorUnlessToldOtherwise)
+TEST(Environment, WritesToStandardErrorByDefault)
 {
     const auto lines = SplitLines(RunHelper({"write", "2"}, {}).errors);
     ASSERT_EQ(lines.size(), 2U);
@@ -70,7 +70,7 @@ TEST(Environment, ReportsAnUnreadableSinkInOneLineAndKeepsStandardError)
     const auto lines = SplitLines(RunHelper({"write", "1"}, {"KEVRO_LOG_SINK=paper"}).errors);
     ASSERT_EQ(lines.size(), 2U);
     EXPECT_EQ(lines[0], "KEVRO_LOG_SINK: \"paper\" at character 1: expected stderr, file:PATH, "
-                        "syslog or syslog:IDENT; the default stays");
+                        "syslog or syslog:IDENT; using the default");
     EXPECT_EQ(WithoutTime(lines[1]), "BdmvNavigator Event: a line");
 }
 
@@ -96,13 +96,13 @@ TEST(Environment, ReportsAnUnreadableUserOperationMaskInOneLineAndKeepsZero)
     }
 }
 
-TEST(EndOfProgram, WritesWhatIsStillQueued)
+TEST(EndOfProgram, WritesLinesStillQueued)
 {
     const Outcome outcome = RunHelper({"write", "500"}, {"KEVRO_LOG_SINK=stderr,queue=1000"});
     EXPECT_EQ(SplitLines(outcome.errors).size(), 500U);
 }
 
-TEST(EndOfProgram, WritesWhatALateDestructorQueues)
+TEST(EndOfProgram, WritesLinesQueuedByALateDestructor)
 {
     for (const char* sink : {"stderr", "stderr,queue=10"}) {
         const auto lines =
@@ -114,17 +114,17 @@ TEST(EndOfProgram, WritesWhatALateDestructorQueues)
 
 constexpr char ReportedAssertion[] = "Common Fatal: Assertion failed: a > b (some/file.cpp:12)";
 
-TEST(AssertInAProgram, ReturnsUnlessToldOtherwise)
+TEST(AssertInAProgram, ReturnsByDefault)
 {
     const Outcome outcome = RunHelper({"assert", "0"}, {"KEVRO_LOG="});
-    EXPECT_EQ(outcome.output, "went on\n");
+    EXPECT_EQ(outcome.output, "continued\n");
     EXPECT_EQ(outcome.exitCode, 0);
     const auto lines = SplitLines(outcome.errors);
     ASSERT_EQ(lines.size(), 1U);
     EXPECT_EQ(WithoutTime(lines[0]), ReportedAssertion);
 }
 
-TEST(AssertInAProgram, AbortsOnRequestWhenTheReportIsOut)
+TEST(AssertInAProgram, AbortsOnRequestAfterTheReport)
 {
     for (const char* sink : {"stderr", "stderr,queue=1000"}) {
         const Outcome outcome = RunHelper(
@@ -140,10 +140,10 @@ TEST(AssertInAProgram, AbortsOnRequestWhenTheReportIsOut)
 TEST(AssertInAProgram, ReportsAnUnreadableRequestInOneLineAndReturns)
 {
     const Outcome outcome = RunHelper({"assert", "0"}, {"KEVRO_ASSERT=stop"});
-    EXPECT_EQ(outcome.output, "went on\n");
+    EXPECT_EQ(outcome.output, "continued\n");
     const auto lines = SplitLines(outcome.errors);
     ASSERT_EQ(lines.size(), 2U);
-    EXPECT_EQ(lines[0], "KEVRO_ASSERT: \"stop\" at character 1: expected abort; the default stays");
+    EXPECT_EQ(lines[0], "KEVRO_ASSERT: \"stop\" at character 1: expected abort; using the default");
 }
 
 } // namespace

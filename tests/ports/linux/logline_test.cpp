@@ -1,4 +1,4 @@
-// What a line looks like.
+// The format of a line.
 #include <cstdarg>
 #include <cwchar>
 #include <regex>
@@ -25,7 +25,7 @@ protected:
     }
 };
 
-/** Writes past the logger, whose level is one of the list. */
+/** Writes without the logger, which restricts levels to those in the list. */
 BD_PRINTF_FORMAT(2, 3) void WriteAtLevel(KEVRO_Int32 level, const char* format, ...)
 {
     va_list args;
@@ -62,26 +62,26 @@ TEST_F(LogLine, ShowsTheLargestNumbers)
     EXPECT_EQ(TheLine(), "4294967295 Fatal: x");
 }
 
-TEST_F(LogLine, IsWrittenWhateverTheSwitchSays)
+TEST_F(LogLine, IsWrittenWhateverTheSwitch)
 {
     ASSERT_EQ(KEVRO_Log_IsEnabled(bd::CompIdJpi, KEVRO_Log_LevelMethod, 0), 0);
     bd::VargLogger(bd::CompIdJpi, KEVRO_Log_LevelMethod, 0).Log("x");
     EXPECT_EQ(TheLine(), "Jpi Method: x");
 }
 
-TEST_F(LogLine, EscapesWhatIsNoPrintableAscii)
+TEST_F(LogLine, EscapesAllButPrintableAscii)
 {
     EventLogger().Log("%s", "a\nb\rc\td\x1B[31m\x7F\xC3\xA9\x01~");
     EXPECT_EQ(TheLine(), R"(BdmvNavigator Event: a\nb\rc\td\x1B[31m\x7F\xC3\xA9\x01~)");
 }
 
-TEST_F(LogLine, EscapesACharacterOfZero)
+TEST_F(LogLine, EscapesANulCharacter)
 {
     EventLogger().Log("a%cb", 0);
     EXPECT_EQ(TheLine(), R"(BdmvNavigator Event: a\x00b)");
 }
 
-TEST_F(LogLine, TellsABackslashFromAnEscapeSequence)
+TEST_F(LogLine, DistinguishesABackslashFromAnEscapeSequence)
 {
     EventLogger().Log("%s", R"(\n)");
     EXPECT_EQ(TheLine(), R"(BdmvNavigator Event: \\n)");
@@ -93,13 +93,13 @@ TEST_F(LogLine, MayBeEmpty)
     EXPECT_EQ(TheLine(), "BdmvNavigator Event: ");
 }
 
-TEST_F(LogLine, IsNotTakenForAFormatAgain)
+TEST_F(LogLine, IsNotFormattedAgain)
 {
     EventLogger().Log("%s", "100% %s {} {0}");
     EXPECT_EQ(TheLine(), "BdmvNavigator Event: 100% %s {} {0}");
 }
 
-TEST_F(LogLine, IsNeverCut)
+TEST_F(LogLine, IsNeverTruncated)
 {
     for (const char* queue : {"", ",queue=8"}) {
         for (const std::size_t length :

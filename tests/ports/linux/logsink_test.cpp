@@ -1,4 +1,4 @@
-// Where lines go: the sinks, the queue, and the account of what was lost.
+// The destinations of lines: the sinks, the queue, and the count of lost lines.
 #include <atomic>
 #include <cstdio>
 #include <ctime>
@@ -34,7 +34,7 @@ std::string RefusalOf(const std::string& text)
     return message;
 }
 
-/** What a terminal received: the lines written, and what was told of those that were lost. */
+/** The lines that a terminal received, and the losses reported among them. */
 struct Received {
     explicit Received(const std::vector<std::string>& lines)
     {
@@ -57,7 +57,7 @@ struct Received {
     KEVRO_UInt64 lost = 0;
 };
 
-/** A pipe that takes nothing until it is read, as a terminal that has been stopped. */
+/** A pipe that accepts nothing until it is read, like a stopped terminal. */
 class StoppedPipe
 {
 public:
@@ -96,7 +96,8 @@ public:
         }
     }
 
-    /** Begins to read; the lines written to the pipe are there once both write ends are closed. */
+    /** Starts reading; the lines written to the pipe are available once both write ends are closed.
+     */
     std::future<std::vector<std::string>> StartReading()
     {
         return std::async(std::launch::async,
@@ -143,7 +144,7 @@ TEST_F(LogSink, AppendsToAFile)
     EXPECT_EQ(WithoutTime(lines[1]), "BdmvNavigator Event: added");
 }
 
-TEST_F(LogSink, MakesTheDirectoriesOfAFile)
+TEST_F(LogSink, CreatesTheDirectoriesOfAFile)
 {
     const std::string file = m_Directory.Path("one/two/log");
     ConfigureSink("file:" + file);
@@ -151,7 +152,7 @@ TEST_F(LogSink, MakesTheDirectoriesOfAFile)
     EXPECT_EQ(ReadLines(file).size(), 1U);
 }
 
-TEST_F(LogSink, RotatesAFileAndKeepsTheYoungest)
+TEST_F(LogSink, RotatesAFileAndKeepsTheNewest)
 {
     ConfigureSink("file:" + m_LogFile + ", size=110, files=2");
     for (int i = 1; i <= 5; ++i) {
@@ -198,7 +199,7 @@ TEST_F(LogSink, RefusesAnUnreadableTextWithTheWordItsPositionAndWhatWasExpected)
         {"stderr,queue=-1", "\"-1\" at character 14: expected a number from 1 to 65536"},
         {"stderr,queue=99999999999999999999",
          "\"99999999999999999999\" at character 14: expected a number from 1 to 65536"},
-        {"stderr,queue=5,queue=6", "\"queue\" at character 16: expected it once"},
+        {"stderr,queue=5,queue=6", "\"queue\" at character 16: given twice"},
         {"stderr,size=5", "\"size\" at character 8: expected queue=LINES"},
         {"syslog,files=5", "\"files\" at character 8: expected queue=LINES"},
         {"stderr,", "nothing at character 8: expected queue=LINES"},
@@ -223,14 +224,14 @@ TEST_F(LogSink, RefusesAFileThatCannotBeOpenedAndNamesIt)
     EXPECT_EQ(ReadLines(m_LogFile).size(), 1U);
 }
 
-TEST_F(LogSink, RefusesNoTextAtAll)
+TEST_F(LogSink, RefusesANullText)
 {
     char message[64] = "";
     EXPECT_FALSE(KEVRO_Log_ConfigureSink(nullptr, message, sizeof(message)));
     EXPECT_STREQ(message, "no text");
 }
 
-TEST_F(LogSink, FlushesWhatIsQueued)
+TEST_F(LogSink, FlushesQueuedLines)
 {
     ConfigureSink("file:" + m_LogFile + ",queue=100");
     for (std::size_t round = 1; round <= 50; ++round) {
@@ -242,7 +243,7 @@ TEST_F(LogSink, FlushesWhatIsQueued)
     }
 }
 
-TEST_F(LogSink, WritesWhatIsQueuedBeforeAnotherSinkIsInForce)
+TEST_F(LogSink, WritesQueuedLinesBeforeChangingTheSink)
 {
     for (std::size_t round = 1; round <= 50; ++round) {
         ConfigureSink("file:" + m_LogFile + ",queue=100");
@@ -281,7 +282,7 @@ std::string Now()
     return text;
 }
 
-TEST_F(LogSink, ShowsTheTimeAtWhichAQueuedLineWasGiven)
+TEST_F(LogSink, ShowsTheTimeAtWhichAQueuedLineWasLogged)
 {
     StoppedPipe terminal;
     std::string before;
@@ -290,9 +291,9 @@ TEST_F(LogSink, ShowsTheTimeAtWhichAQueuedLineWasGiven)
     {
         const StderrRedirection redirection(terminal.WriteEnd());
         ConfigureSink("stderr,queue=10");
-        EventLogger().Log("the terminal does not take it");
+        EventLogger().Log("blocks at the terminal");
         before = Now();
-        EventLogger().Log("nor this one behind it");
+        EventLogger().Log("waits in the queue");
         after = Now();
         reading = terminal.StartReading();
         ConfigureSink("file:" + m_LogFile);
@@ -305,7 +306,7 @@ TEST_F(LogSink, ShowsTheTimeAtWhichAQueuedLineWasGiven)
     EXPECT_LE(shown, after);
 }
 
-TEST_F(LogSink, DropsTheOldestQueuedLinesInsteadOfWaitingAndSaysHowMany)
+TEST_F(LogSink, DropsTheOldestQueuedLinesInsteadOfWaitingAndReportsTheirNumber)
 {
     constexpr int Queue = 10;
     constexpr int Written = 100;
@@ -316,7 +317,7 @@ TEST_F(LogSink, DropsTheOldestQueuedLinesInsteadOfWaitingAndSaysHowMany)
         const StderrRedirection redirection(terminal.WriteEnd());
         ConfigureSink("stderr,queue=" + std::to_string(Queue));
         for (int i = 0; i < Written; ++i) {
-            EventLogger().Log("%d", i); // a writer that waited would never come back
+            EventLogger().Log("%d", i); // a writer that waited would never return
         }
         reading = terminal.StartReading();
         ConfigureSink("file:" + m_LogFile);
@@ -330,13 +331,14 @@ TEST_F(LogSink, DropsTheOldestQueuedLinesInsteadOfWaitingAndSaysHowMany)
     EXPECT_EQ(received.lost, dropped);
     EXPECT_EQ(received.reports, 1);
     ASSERT_EQ(received.texts.size(), Written - dropped);
-    EXPECT_EQ(received.linesBeforeReport, received.texts.size() - 1) << "told when caught up";
+    EXPECT_EQ(received.linesBeforeReport, received.texts.size() - 1)
+        << "the report comes once the queue has caught up";
     for (std::size_t i = 1; i <= Queue; ++i) {
         EXPECT_EQ(received.texts[received.texts.size() - i], std::to_string(Written - i));
     }
 }
 
-TEST_F(LogSink, CountsDroppedLinesOnAcrossSinks)
+TEST_F(LogSink, KeepsCountingDroppedLinesAcrossSinks)
 {
     StoppedPipe terminal;
     const KEVRO_UInt64 before = KEVRO_Log_GetDroppedLines();
@@ -357,7 +359,7 @@ TEST_F(LogSink, CountsDroppedLinesOnAcrossSinks)
     EXPECT_EQ(received.lost, 10 - received.texts.size());
 }
 
-TEST_F(LogSink, LetsWritersGoOnAndKeepsItsCountWhileTheSinkBeforeIsStillWriting)
+TEST_F(LogSink, LetsWritersContinueAndKeepsItsCountWhileThePreviousSinkStillWrites)
 {
     StoppedPipe terminal;
     const KEVRO_UInt64 before = KEVRO_Log_GetDroppedLines();
@@ -380,7 +382,7 @@ TEST_F(LogSink, LetsWritersGoOnAndKeepsItsCountWhileTheSinkBeforeIsStillWriting)
     EXPECT_EQ(KEVRO_Log_GetDroppedLines(), before + Received(reading.get()).lost);
 }
 
-TEST_F(LogSink, DoesNotEndAFlushBeforeTheSinkBeforeHasWritten)
+TEST_F(LogSink, DoesNotEndAFlushBeforeThePreviousSinkHasWritten)
 {
     StoppedPipe terminal;
     std::future<std::vector<std::string>> reading;
@@ -402,7 +404,7 @@ TEST_F(LogSink, DoesNotEndAFlushBeforeTheSinkBeforeHasWritten)
         });
         line.Wait();
         for (int i = 0; i < 1000; ++i) {
-            EventLogger().Log("time in which a flush that did not wait would have ended");
+            EventLogger().Log("gives a flush that does not wait time to return");
             std::this_thread::yield();
         }
         EXPECT_FALSE(flushed);
@@ -415,7 +417,7 @@ TEST_F(LogSink, DoesNotEndAFlushBeforeTheSinkBeforeHasWritten)
     EXPECT_FALSE(reading.get().empty());
 }
 
-TEST_F(LogSink, CountsLinesThatTheSinkDoesNotTake)
+TEST_F(LogSink, CountsLinesThatTheSinkRejects)
 {
     const KEVRO_UInt64 before = KEVRO_Log_GetDroppedLines();
     for (const char* sink : {"file:/dev/full", "file:/dev/full,queue=10"}) {
@@ -427,7 +429,7 @@ TEST_F(LogSink, CountsLinesThatTheSinkDoesNotTake)
     EXPECT_EQ(KEVRO_Log_GetDroppedLines(), before + 4);
 }
 
-TEST_F(LogSink, SaysHowManyLinesWereLostWhenItTakesLinesAgain)
+TEST_F(LogSink, ReportsTheNumberOfLostLinesWhenItAcceptsLinesAgain)
 {
     const int full = open("/dev/full", O_WRONLY);
     const int file = open(m_LogFile.c_str(), O_WRONLY | O_CREAT, 0600);
@@ -437,16 +439,16 @@ TEST_F(LogSink, SaysHowManyLinesWereLostWhenItTakesLinesAgain)
         EventLogger().Log("lost");
         EventLogger().Log("lost, too");
         dup2(file, STDERR_FILENO);
-        EventLogger().Log("back");
-        EventLogger().Log("and on");
+        EventLogger().Log("written");
+        EventLogger().Log("written, too");
     }
     close(full);
     close(file);
     const auto lines = ReadLines(m_LogFile);
     ASSERT_EQ(lines.size(), 3U);
     EXPECT_EQ(WithoutTime(lines[0]), "Common Warning: lines lost: 2");
-    EXPECT_EQ(TextOf(lines[1]), "back");
-    EXPECT_EQ(TextOf(lines[2]), "and on");
+    EXPECT_EQ(TextOf(lines[1]), "written");
+    EXPECT_EQ(TextOf(lines[2]), "written, too");
 }
 
 TEST_F(LogSink, WaitsForANonBlockingTerminal)

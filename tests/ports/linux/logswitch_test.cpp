@@ -1,4 +1,4 @@
-// Which lines are switched on: the texts, what they mean, and how an unreadable one is refused.
+// The log switch: its configuration texts, their meaning, and the refusal of unreadable ones.
 #include <array>
 #include <string>
 #include <utility>
@@ -134,7 +134,7 @@ protected:
     ~LogSwitch() override { Configure("*=Exception|Warning|Fatal"); }
 };
 
-TEST(LogSwitchAtStart, IsOnForExceptionWarningAndFatalOfEveryNumber)
+TEST(LogSwitchAtStart, IsOnForExceptionWarningAndFatalOfEveryComponent)
 {
     for (KEVRO_UInt32 component = 0; component < 100; ++component) {
         EXPECT_EQ(LevelsOf(component), DefaultLevels) << component;
@@ -146,7 +146,7 @@ TEST(LogSwitchAtStart, HasItsDefaultBeforeConstructorsRun)
     EXPECT_EQ(g_LevelsBeforeConstructors, DefaultLevels);
 }
 
-TEST_F(LogSwitch, SwitchesEachLevelOfEachComponentByItself)
+TEST_F(LogSwitch, SwitchesEachLevelOfEachComponentSeparately)
 {
     for (const Name& component : ComponentNames) {
         for (const Name& level : LevelNames) {
@@ -174,7 +174,7 @@ TEST_F(LogSwitch, TakesAnyNonZeroValueForHighFrequency)
     }
 }
 
-TEST_F(LogSwitch, GivesHighFrequencyOnlyToTheLevelItStandsBehind)
+TEST_F(LogSwitch, GivesHighFrequencyOnlyToTheLevelBeforeIt)
 {
     Configure("BdmvNavigator=Event+hifreq|Warning");
     EXPECT_EQ(LevelsOf(BdmvNavigator), Bit(Event) | Bit(Event) << 16 | Bit(Warning));
@@ -187,7 +187,7 @@ TEST_F(LogSwitch, TakesAStarForAllLevels)
     EXPECT_EQ(LevelsOf(Common), AllLevels | AllLevels << 16);
 }
 
-TEST_F(LogSwitch, GovernsNumbersWithoutANameByTheStarAlone)
+TEST_F(LogSwitch, AppliesOnlyTheStarToNumbersWithoutAName)
 {
     Configure("BdmvNavigator=Event,*=Fatal+hifreq");
     for (const KEVRO_UInt32 component : NamelessComponents) {
@@ -219,7 +219,7 @@ TEST_F(LogSwitch, IsOffForEverythingAfterAnEmptyText)
     }
 }
 
-TEST_F(LogSwitch, LetsAStarGovernOnlyComponentsThatAreNotNamed)
+TEST_F(LogSwitch, AppliesAStarOnlyToComponentsNotInTheText)
 {
     for (const char* text : {"*=Fatal,Jpi=Event", "Jpi=Event,*=Fatal"}) {
         Configure(text);
@@ -258,7 +258,7 @@ TEST_F(LogSwitch, RefusesAnUnreadableTextWithTheWordItsPositionAndWhatWasExpecte
         {"Jpi=Event+fast", R"("fast" at character 11: expected hifreq)"},
         {"Jpi=Event+", R"(nothing at character 11: expected hifreq)"},
         {"Jpi=Event+hifreq+hifreq",
-         R"("Event+hifreq+hifreq" at character 5: expected one + after a level)"},
+         R"("Event+hifreq+hifreq" at character 5: expected at most one + after a level)"},
         {"Jpi", R"("Jpi" at character 1: expected COMPONENT=LEVEL[|LEVEL...])"},
         {"Jpi=Event=Info",
          R"("Jpi=Event=Info" at character 1: expected COMPONENT=LEVEL[|LEVEL...])"},
@@ -280,7 +280,7 @@ TEST_F(LogSwitch, RefusesAnUnreadableTextWithTheWordItsPositionAndWhatWasExpecte
     }
 }
 
-TEST_F(LogSwitch, CutsTheMessageToFit)
+TEST_F(LogSwitch, TruncatesTheMessageToFit)
 {
     char message[8] = "#######";
     EXPECT_FALSE(KEVRO_Log_Configure("Foo=Event", message, 6));
@@ -288,7 +288,7 @@ TEST_F(LogSwitch, CutsTheMessageToFit)
     EXPECT_EQ(message[6], '#');
 }
 
-TEST_F(LogSwitch, NeedsNoPlaceForTheMessage)
+TEST_F(LogSwitch, NeedsNoBufferForTheMessage)
 {
     char untouched = '#';
     EXPECT_FALSE(KEVRO_Log_Configure("Foo=Event", nullptr, 0));
@@ -298,7 +298,7 @@ TEST_F(LogSwitch, NeedsNoPlaceForTheMessage)
     EXPECT_TRUE(KEVRO_Log_Configure("Jpi=Event", nullptr, 0));
 }
 
-TEST_F(LogSwitch, RefusesNoTextAtAll)
+TEST_F(LogSwitch, RefusesANullText)
 {
     char message[64] = "";
     EXPECT_FALSE(KEVRO_Log_Configure(nullptr, message, sizeof(message)));

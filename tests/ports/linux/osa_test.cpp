@@ -26,7 +26,7 @@ TEST(AtomicAdd, WrapsAround)
     EXPECT_EQ(KEVRO_Osa_TaskAtomicAdd(&counter, 1), std::numeric_limits<KEVRO_Int32>::min());
 }
 
-TEST(AtomicAdd, GivesEachThreadAValueOfItsOwn)
+TEST(AtomicAdd, GivesEachThreadADistinctValue)
 {
     constexpr int ThreadCount = 2;
     constexpr int Additions = 100000;
@@ -91,7 +91,7 @@ TEST_F(AssertReport, IsAFatalLineOfTheCommonComponent)
               "Common Fatal: Assertion failed: count < 3 (bdmv/some.cpp:885)");
 }
 
-TEST_F(AssertReport, IsWrittenWhateverTheSwitchSays)
+TEST_F(AssertReport, IsWrittenWhateverTheSwitch)
 {
     ASSERT_TRUE(KEVRO_Log_Configure("", nullptr, 0));
     Assert("count < 3", "bdmv/some.cpp", 885);

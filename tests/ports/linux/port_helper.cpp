@@ -1,4 +1,4 @@
-// Does one thing with the port and ends, so that a test can look at the start and the end of a
+// Runs one command with the port and ends, so that a test can check the start and the end of a
 // program: port_helper COMMAND [ARGUMENT...]
 #include <cstdio>
 #include <cstdlib>
@@ -24,11 +24,11 @@ void WriteEvents(int count)
     }
 }
 
-/** Made before the port's own static objects and gone after them. */
-class Bystander
+/** Constructed before the port's static objects and destroyed after them. */
+class EarlyStatic
 {
 public:
-    ~Bystander()
+    ~EarlyStatic()
     {
         if (m_WriteAtEnd) {
             WriteEvent("from a destructor");
@@ -37,7 +37,7 @@ public:
     bool m_WriteAtEnd = false;
 };
 
-Bystander g_Bystander;
+EarlyStatic g_EarlyStatic;
 
 } // namespace
 
@@ -50,11 +50,11 @@ int main(int argc, char** argv)
     } else if (std::strcmp(command, "write") == 0 && argc > 2) {
         WriteEvents(std::atoi(argv[2]));
     } else if (std::strcmp(command, "write-at-end") == 0) {
-        g_Bystander.m_WriteAtEnd = true;
+        g_EarlyStatic.m_WriteAtEnd = true;
     } else if (std::strcmp(command, "assert") == 0 && argc > 2) {
         WriteEvents(std::atoi(argv[2]));
         Assert("a > b", "some/file.cpp", 12);
-        std::puts("went on");
+        std::puts("continued");
     } else if (std::strcmp(command, "uopmask") == 0) {
         std::printf("%d\n", g_u1Bduopmask);
     } else {

@@ -1,6 +1,6 @@
 /**
  * @file
- * What several tests of the port need: files, standard error, programs with an environment.
+ * Helpers for tests of the port: files, standard error, programs with an environment.
  */
 #ifndef TESTS_PORTS_LINUX_PORTTESTING_H
 #define TESTS_PORTS_LINUX_PORTTESTING_H
@@ -18,7 +18,7 @@
 namespace porttesting
 {
 
-/** A directory that goes, with everything in it, when the object does. */
+/** A directory that is deleted with all its contents when the object is destroyed. */
 class TemporaryDirectory
 {
 public:
@@ -51,7 +51,7 @@ std::string ReadToEnd(int descriptor);
 
 std::vector<std::string> SplitLines(const std::string& text);
 
-/** Sends standard error to a descriptor, which stays the caller's, while the object lives. */
+/** Redirects standard error to a descriptor, still owned by the caller, while the object lives. */
 class StderrRedirection
 {
 public:
@@ -65,24 +65,24 @@ private:
     int m_Saved;
 };
 
-/** What became of a program. */
+/** The outcome of a program. */
 struct Outcome {
     int exitCode; ///< -1 when a signal ended it, 124 when it took more than 30 s
-    int signal;   ///< 0 when it ended by itself
+    int signal;   ///< the signal that ended it, or 0
     std::string output;
     std::string errors; ///< standard error
 };
 
-/** Runs a program; its environment holds @p environment and nothing else of the port's. */
+/** Runs a program; its environment contains @p environment and no other variable of the port. */
 Outcome Run(const std::vector<std::string>& command, const std::vector<std::string>& environment);
 
-/** Lets threads go on at the same moment, as often as they like. */
+/** A reusable barrier: releases the threads at the same moment. */
 class StartLine
 {
 public:
     explicit StartLine(unsigned threads) : m_Threads(threads) {}
 
-    /** Returns when every thread has called it as often as this one. */
+    /** Returns once every thread has called it as often as this thread. */
     void Wait()
     {
         const unsigned round = m_Arrived++ / m_Threads;
@@ -99,7 +99,7 @@ private:
 /** Configures the sink; a refusal fails the test. */
 void ConfigureSink(const std::string& text);
 
-/** Lines go to a file of the test's own. */
+/** Directs log lines to a file of the test. */
 class LogFileTest : public testing::Test
 {
 protected:

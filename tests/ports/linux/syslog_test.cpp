@@ -1,4 +1,4 @@
-// The system's log, whose functions this program replaces by its own to see what they are given.
+// The system's log. This program replaces its functions to record their arguments.
 #include <cstdarg>
 #include <cstdio>
 #include <map>
@@ -46,7 +46,7 @@ void syslog(int priority, const char* format, ...)
     va_end(args);
 }
 
-// What the same call is turned into where the compiler checks format strings at run time.
+// The function that replaces the same call where format strings are checked at run time.
 BD_PRINTF_FORMAT(3, 4) void __syslog_chk(int priority, int, const char* format, ...)
 {
     va_list args;
@@ -94,7 +94,7 @@ TEST_F(Syslog, GetsTheProgramsNameOrTheGivenOne)
     EXPECT_EQ(g_Ident, "player");
 }
 
-TEST_F(Syslog, KeepsTheNameWhenTheSinkBeforeGoes)
+TEST_F(Syslog, KeepsTheNameWhenThePreviousSinkIsDestroyed)
 {
     porttesting::ConfigureSink("syslog:first");
     porttesting::ConfigureSink("syslog:second");

@@ -1,4 +1,4 @@
-// Everything at once, from several threads; the thread sanitizer looks on.
+// All operations at once, from several threads; run under ThreadSanitizer as well.
 #include <algorithm>
 #include <atomic>
 #include <string>
@@ -50,7 +50,7 @@ TEST(Threads, LoseNoLineWhileTheSinkIsChanged)
         }
     });
     while (writing != 0) {
-        // Room for more lines than there are, so that none may be dropped.
+        // The queue is larger than the number of lines, so none may be dropped.
         porttesting::ConfigureSink("file:" + second +
                                    ",queue=" + std::to_string(2 * WriterCount * LinesPerWriter));
         porttesting::ConfigureSink("file:" + first);
@@ -106,7 +106,7 @@ TEST(Threads, CountEveryLineThatIsNotWritten)
               static_cast<KEVRO_UInt64>(WriterCount * LinesPerWriter - written));
 }
 
-TEST(Threads, NeverSeeTheSwitchOffForWhatOldAndNewConfigurationHaveOn)
+TEST(Threads, NeverSeeALineOffThatOldAndNewConfigurationHaveOn)
 {
     ASSERT_TRUE(KEVRO_Log_Configure("BdmvNavigator=Event|Info", nullptr, 0));
     std::atomic<bool> stop{false};
