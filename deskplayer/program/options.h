@@ -1,0 +1,38 @@
+/**
+ * @file
+ * The command line of the program.
+ */
+#ifndef DESKPLAYER_PROGRAM_OPTIONS_H
+#define DESKPLAYER_PROGRAM_OPTIONS_H
+
+#include <CLI/CLI.hpp>
+
+#include <cstdint>
+#include <optional>
+#include <string>
+
+namespace deskplayer
+{
+
+/** What the command line asks for. */
+struct Options {
+    std::string disc;
+    std::optional<std::uint32_t> playList;
+    bool list = false;
+    std::optional<std::uint32_t> describe;
+    std::string session;
+    bool realTime = false;
+    bool remote = false;
+    std::string format = "text";
+    std::string output;
+    std::string listen;
+    std::string only;
+    std::optional<std::string> log;
+};
+
+/** Declares every option, its help and its conflicts. @param options receives the values */
+void AddOptions(CLI::App& app, Options& options);
+
+} // namespace deskplayer
+
+#endif
