@@ -79,7 +79,7 @@ TEST_F(FaultyDisc, IsRefusedWhenTheClipInformationIsTruncated)
     ExpectRefused("CLIPINF/00002\\.clpi: offset \\d+: .*expected");
 }
 
-TEST_F(FaultyDisc, IsRefusedWhenThereIsNoPlayList)
+TEST_F(FaultyDisc, IsRefusedIfThereIsNoPlayList)
 {
     fs::remove(playList);
     ExpectRefused("PLAYLIST: .*expected");

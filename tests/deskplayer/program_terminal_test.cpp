@@ -11,7 +11,7 @@ namespace
 
 using DeskPlayerTerminal = ScratchDisc;
 
-TEST_F(DeskPlayerTerminal, ShowsProgressWhenPlaybackTakesLong)
+TEST_F(DeskPlayerTerminal, ShowsProgressIfPlaybackTakesLong)
 {
     MakeShort(45 * 1500);
 

@@ -18,7 +18,7 @@ bd::PlayMode Mode(bd::PlayDirectionDef direction, bd::PlaySpeedDef speed)
     return bd::PlayMode(direction, speed);
 }
 
-/** An item that can do everything and ends in a still, and another one. */
+/** An item that supports every operation and ends in a still, and another one. */
 PlayList Everything()
 {
     return ListOf(
@@ -73,7 +73,7 @@ struct StatusRule {
 
 typedef std::pair<const char*, Operation> NamedOperation;
 
-/** Operations on what is on the screen that no mask can forbid. */
+/** Operations that need a picture and that no mask can forbid. */
 const NamedOperation Unmaskable[] = {
     {"Suspend", [](TestDesk& d) { return d.navigator.Suspend(); }},
     {"SetPointA", [](TestDesk& d) { return d.navigator.SetPointA(); }},
@@ -161,7 +161,7 @@ std::vector<StatusRule> StatusRules()
     return rules;
 }
 
-TEST(Refusals, SayWhichStatusAnOperationNeeds)
+TEST(Refusals, NameTheRequiredStatus)
 {
     for (const StatusRule& rule : StatusRules()) {
         for (const auto& [status, name] : AllStatuses) {
@@ -183,7 +183,7 @@ TEST(Refusals, SayWhichStatusAnOperationNeeds)
     }
 }
 
-TEST(Refusals, SayThatNoMenuIsOpen)
+TEST(Refusals, NameTheClosedMenu)
 {
     const Operation operations[] = {
         [](TestDesk& d) { return d.navigator.ClosePopUpMenu(); },
@@ -206,7 +206,7 @@ TEST(Refusals, SayThatNoMenuIsOpen)
     }
 }
 
-/** Operations that a disc can forbid, where nothing else stands in their way. */
+/** An operation that a disc can forbid, and a preparation after which nothing else refuses it. */
 struct MaskRule {
     bd::UserOperationMaskDef operation;
     const char* name;
@@ -300,7 +300,7 @@ std::unique_ptr<TestDesk> DeskForbidding(std::uint64_t byPlayList, std::uint64_t
     return desk;
 }
 
-TEST(Refusals, SayWhoForbidsAnOperation)
+TEST(Refusals, NameThePlayListOrItemThatForbidsAnOperation)
 {
     for (const MaskRule& rule : MaskRules()) {
         SCOPED_TRACE(rule.name);
@@ -326,13 +326,13 @@ TEST(Refusals, SayWhoForbidsAnOperation)
     }
 }
 
-TEST(Refusals, ComeFromTheBitOfTheOperationAndNoOther)
+TEST(Refusals, DependOnlyOnTheBitOfTheOperation)
 {
     for (const MaskRule& rule : MaskRules()) {
         SCOPED_TRACE(rule.name);
         std::uint64_t others = ~MaskOf({rule.operation});
         if (rule.operation != bd::UserOperationPopupOn) {
-            others &= ~MaskOf({bd::UserOperationPopupOn}); // which the preparation needs
+            others &= ~MaskOf({bd::UserOperationPopupOn}); // needed by the preparation
         }
         const auto desk = DeskForbidding(others, others);
         rule.prepare(*desk);
@@ -343,7 +343,7 @@ TEST(Refusals, ComeFromTheBitOfTheOperationAndNoOther)
     }
 }
 
-TEST(Refusals, NameTheMaskBeforeAnythingElseThatIsWrong)
+TEST(Refusals, NameTheMaskBeforeOtherReasons)
 {
     const auto desk = DeskForbidding(~std::uint64_t{0}, 0);
 
@@ -353,7 +353,7 @@ TEST(Refusals, NameTheMaskBeforeAnythingElseThatIsWrong)
     EXPECT_EQ(desk->navigator.ClosePopUpMenu().Reason(), "PopupOff is forbidden by play list 7");
 }
 
-TEST(Refusals, NameTheItemInPlayback)
+TEST(Refusals, NameTheActiveItem)
 {
     TestDesk desk(ListOf({Item(1), Forbidding(Item(1), {bd::UserOperationStop})}));
     desk.Start(Second);
@@ -361,7 +361,7 @@ TEST(Refusals, NameTheItemInPlayback)
     EXPECT_EQ(desk.navigator.Stop().Reason(), "Stop is forbidden by play item 1");
 }
 
-TEST(Refusals, DoNotComeFromTheMaskOfAPlaybackThatIsOver)
+TEST(Refusals, IgnoreTheMaskOnceNothingPlays)
 {
     for (const Status status : {Status::Stopped, Status::Standby, Status::Finished}) {
         PlayList playList = Everything();
@@ -372,7 +372,7 @@ TEST(Refusals, DoNotComeFromTheMaskOfAPlaybackThatIsOver)
     }
 }
 
-TEST(Refusals, DoNotMeetWhatNoMaskCanForbid)
+TEST(Refusals, ExcludeOperationsThatNoMaskCanForbid)
 {
     std::vector<NamedOperation> operations(std::begin(Unmaskable), std::end(Unmaskable));
     operations.emplace_back("normal speed",
@@ -385,7 +385,7 @@ TEST(Refusals, DoNotMeetWhatNoMaskCanForbid)
     }
 }
 
-TEST(Refusals, ContinueAndStepAreNotAmongThem)
+TEST(Refusals, ExcludeContinueAndStep)
 {
     PlayList playList = ListOf({Item(10), Item(10)});
     playList.playItems.back().uoMask = ~std::uint64_t{0};

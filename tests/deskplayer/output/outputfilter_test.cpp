@@ -56,7 +56,7 @@ TEST(OutputFilter, KeepsCallbacksByName)
     EXPECT_TRUE(filter.Passes(CallbackId::AudioInfo));
 }
 
-TEST(OutputFilter, KeepsWhatIsNamedTwiceOnce)
+TEST(OutputFilter, AcceptsANameTwice)
 {
     OutputFilter filter;
     filter.KeepCallbacks("PlayItem,PlayItem");
@@ -77,7 +77,7 @@ TEST(OutputFilter, NarrowsWithEveryOperation)
     EXPECT_EQ(CountPassing(filter), 0U);
 }
 
-TEST(OutputFilter, NamesAnUnknownInterfaceAndThoseThereAre)
+TEST(OutputFilter, NamesAnUnknownInterfaceAndAllInterfaces)
 {
     OutputFilter filter;
 
@@ -86,7 +86,7 @@ TEST(OutputFilter, NamesAnUnknownInterfaceAndThoseThereAre)
               "interactive");
 }
 
-TEST(OutputFilter, NamesAnUnknownCallbackAndThoseThereAre)
+TEST(OutputFilter, NamesAnUnknownCallbackAndAllCallbacks)
 {
     OutputFilter filter;
     const std::string message = MessageOf([&] { filter.KeepCallbacks("PlayItem,playitem"); });
@@ -106,7 +106,7 @@ TEST(OutputFilter, RefusesEmptyWords)
     }
 }
 
-TEST(OutputFilter, StaysAsItIsWhenAWordIsWrong)
+TEST(OutputFilter, IsUnchangedIfAWordIsInvalid)
 {
     OutputFilter filter;
     EXPECT_THROW(filter.KeepCallbacks("Paused,?"), std::invalid_argument);
