@@ -26,7 +26,7 @@ PlayList Everything()
         {Entry(0, Ticks(0)), Entry(0, 5 * Second), Entry(1, Ticks(0)), Entry(1, 5 * Second)});
 }
 
-/** Brings a navigator over Everything() into a status. */
+/** Brings a navigator that plays Everything() to a status. */
 void Bring(TestDesk& desk, Status status)
 {
     if (status == Status::Stopped) {
@@ -289,7 +289,8 @@ std::vector<MaskRule> MaskRules()
     };
 }
 
-/** Everything() played into its second chapter, forbidden by item 0, by the play list, or not. */
+/** Plays Everything() to its second chapter, with operations forbidden by item 0 or the play list.
+ */
 std::unique_ptr<TestDesk> DeskForbidding(std::uint64_t byPlayList, std::uint64_t byItem)
 {
     PlayList playList = Everything();

@@ -102,7 +102,8 @@ TEST(OutputFilter, RefusesEmptyWords)
 {
     for (const char* list : {"", ",control", "control,", "control,,button"}) {
         OutputFilter filter;
-        EXPECT_EQ(MessageOf([&] { filter.KeepInterfaces(list); }).rfind("'' is no", 0), 0U) << list;
+        EXPECT_EQ(MessageOf([&] { filter.KeepInterfaces(list); }).rfind("'' is not a", 0), 0U)
+            << list;
     }
 }
 
@@ -118,8 +119,8 @@ TEST(OutputFilter, MakesWordsInMessagesPrintable)
 {
     OutputFilter filter;
 
-    EXPECT_EQ(MessageOf([&] { filter.KeepInterfaces("\033[31m"); }).rfind("'\\x1B[31m' is no", 0),
-              0U);
+    EXPECT_EQ(
+        MessageOf([&] { filter.KeepInterfaces("\033[31m"); }).rfind("'\\x1B[31m' is not a", 0), 0U);
 }
 
 } // namespace

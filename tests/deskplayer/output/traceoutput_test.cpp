@@ -362,7 +362,7 @@ TEST(TraceOutput, ShowsEveryStateByItsNumberOrName)
 TEST(TraceOutput, EndsTheSliceWhenNothingIsSelected)
 {
     typedef bdmv::INavigatorListener Listener;
-    const std::map<std::string, std::function<void(Listener&, bd::UInt8)>> tell = {
+    const std::map<std::string, std::function<void(Listener&, bd::UInt8)>> callbacks = {
         {"chapter", [](Listener& l, bd::UInt8 number) { l.ChapterNumber(number); }},
         {"video", [](Listener& l, bd::UInt8 number) { l.VideoInfo(number); }},
         {"audio", [](Listener& l, bd::UInt8 number) { l.AudioInfo(number); }},
@@ -375,10 +375,10 @@ TEST(TraceOutput, EndsTheSliceWhenNothingIsSelected)
         {"secondary audio", [](Listener& l, bd::UInt8 number) { l.SecondaryAudioInfo(number); }},
         {"picture-in-picture subtitles",
          [](Listener& l, bd::UInt8 number) { l.PipPgTextStInfo(number, true); }}};
-    for (const auto& [track, tellOf] : tell) {
+    for (const auto& [track, callBack] : callbacks) {
         TracedSession session;
         for (const bd::UInt8 number : std::vector<bd::UInt8>{0, 1, 0}) {
-            tellOf(*session.operator->(), number);
+            callBack(*session.operator->(), number);
             session.PassSecond();
         }
 
