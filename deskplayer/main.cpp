@@ -70,7 +70,7 @@ struct Options {
     std::optional<std::string> log;
 };
 
-void Complain(const std::string& message)
+void PrintMessage(const std::string& message)
 {
     std::cerr << "bdmv-deskplayer: " << message << '\n';
 }
@@ -165,7 +165,7 @@ deskplayer::LoadedPlayList Load(const deskplayer::Disc& disc, const Options& opt
     }
     deskplayer::LongestPlayList longest = disc.FindLongestPlayList();
     for (const std::string& line : longest.unreadable) {
-        Complain("skipped: " + line);
+        PrintMessage("skipped: " + line);
     }
     return deskplayer::LoadPlayList(disc, longest.number, std::move(longest.playList));
 }
@@ -222,7 +222,7 @@ void Play(deskplayer::LoadedPlayList playList, const std::vector<deskplayer::Scr
 
     if (options.remote) {
         std::cerr << deskplayer::RemoteHelp();
-        deskplayer::PlayByRemote(desk, STDIN_FILENO, Complain);
+        deskplayer::PlayByRemote(desk, STDIN_FILENO, PrintMessage);
         return;
     }
 
@@ -239,8 +239,8 @@ void Play(deskplayer::LoadedPlayList playList, const std::vector<deskplayer::Scr
         }
     };
     hooks.onRefused = [&options, &desk](std::size_t line, const std::string& reason) {
-        Complain(options.session + ":" + std::to_string(line) + ": refused at " +
-                 deskplayer::TimeText(desk.Clock().Now()) + ": " + reason);
+        PrintMessage(options.session + ":" + std::to_string(line) + ": refused at " +
+                     deskplayer::TimeText(desk.Clock().Now()) + ": " + reason);
     };
     if (options.session.empty()) {
         deskplayer::PlayFromStartToEnd(desk, hooks);
@@ -419,16 +419,16 @@ int main(int argc, char** argv)
         ConfigureLog(options);
         return Run(options);
     } catch (const deskplayer::DiscError& error) {
-        Complain(error.what());
+        PrintMessage(error.what());
         return ExitDisc;
     } catch (const deskplayer::ScriptError& error) {
-        Complain(error.what());
+        PrintMessage(error.what());
         return ExitUsage;
     } catch (const UsageError& error) {
-        Complain(error.what());
+        PrintMessage(error.what());
         return ExitUsage;
     } catch (const OutputError& error) {
-        Complain(error.what());
+        PrintMessage(error.what());
         return ExitOutput;
     }
 }
