@@ -299,7 +299,7 @@ TEST(Commands, RefuseTheNextStreamIfThereIsNone)
               "no audio stream 1; there are no audio streams");
     EXPECT_EQ(Perform(desk, "subtitle next").Reason(),
               "no subtitle stream 1; there are no subtitle streams");
-    EXPECT_TRUE(Perform(desk, "angle next").IsDone()) << "there is always one";
+    EXPECT_TRUE(Perform(desk, "angle next").IsDone()) << "every play item has one";
     EXPECT_EQ(desk.Take(), "");
 }
 
