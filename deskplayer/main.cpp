@@ -63,7 +63,7 @@ LoadedPlayList Load(const Disc& disc, const Options& options)
     }
     LongestPlayList longest = disc.FindLongestPlayList();
     for (const std::string& line : longest.unreadable) {
-        Complain("skipped: " + line);
+        PrintMessage("skipped: " + line);
     }
     return LoadPlayList(disc, longest.number, std::move(longest.playList));
 }
@@ -77,7 +77,7 @@ void Play(LoadedPlayList playList, const std::vector<ScriptStep>& steps, const O
 
     if (options.remote) {
         std::cerr << RemoteHelp();
-        PlayByRemote(desk, STDIN_FILENO, Complain);
+        PlayByRemote(desk, STDIN_FILENO, PrintMessage);
         return;
     }
 
@@ -94,8 +94,8 @@ void Play(LoadedPlayList playList, const std::vector<ScriptStep>& steps, const O
         }
     };
     hooks.onRefused = [&options, &desk](std::size_t line, const std::string& reason) {
-        Complain(options.session + ":" + std::to_string(line) + ": refused at " +
-                 TimeText(desk.Clock().Now()) + ": " + reason);
+        PrintMessage(options.session + ":" + std::to_string(line) + ": refused at " +
+                     TimeText(desk.Clock().Now()) + ": " + reason);
     };
     if (options.session.empty()) {
         PlayFromStartToEnd(desk, hooks);
@@ -163,16 +163,16 @@ int main(int argc, char** argv)
         deskplayer::ConfigureLog(options);
         return deskplayer::Run(options);
     } catch (const deskplayer::DiscError& error) {
-        deskplayer::Complain(error.what());
+        deskplayer::PrintMessage(error.what());
         return deskplayer::ExitDisc;
     } catch (const deskplayer::ScriptError& error) {
-        deskplayer::Complain(error.what());
+        deskplayer::PrintMessage(error.what());
         return deskplayer::ExitUsage;
     } catch (const deskplayer::UsageError& error) {
-        deskplayer::Complain(error.what());
+        deskplayer::PrintMessage(error.what());
         return deskplayer::ExitUsage;
     } catch (const deskplayer::OutputError& error) {
-        deskplayer::Complain(error.what());
+        deskplayer::PrintMessage(error.what());
         return deskplayer::ExitOutput;
     }
 }

@@ -75,7 +75,7 @@ constexpr std::uint8_t StillModeTimed = 1;
 constexpr std::uint8_t StillModeEndless = 2;
 
 struct PlayItem {
-    ClipReference clip; ///< angle 1 of several
+    ClipReference clip; ///< of angle 1
     std::uint8_t connectionCondition = 0;
     std::uint32_t inTime = 0;
     std::uint32_t outTime = 0; ///< not before inTime; applies to all angles, like inTime

@@ -19,8 +19,7 @@
 namespace deskplayer
 {
 
-/** Sends events for everything that differs from the last announcement. Does not affect playback.
- */
+/** Sends events for everything that differs from the last announcement. Never changes playback. */
 class Announcer
 {
 public:

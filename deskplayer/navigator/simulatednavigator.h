@@ -105,8 +105,7 @@ public:
 
     Outcome SetPointA();
 
-    /** Repeats from A to this position; listeners are notified of a failure unless A is before it.
-     */
+    /** Repeats from A to this position. Reports a failure to listeners unless A is before it. */
     Outcome SetPointB();
     Outcome EndABRepeat();
     Outcome RepeatChapter();

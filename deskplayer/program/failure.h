@@ -33,7 +33,7 @@ public:
 };
 
 /** Writes one line to standard error, after the name of the program. */
-inline void Complain(const std::string& message)
+inline void PrintMessage(const std::string& message)
 {
     std::cerr << "bdmv-deskplayer: " << message << '\n';
 }

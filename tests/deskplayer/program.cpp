@@ -31,10 +31,10 @@ std::string Quoted(const std::string& word)
     return quoted + "'";
 }
 
-/** More than any run takes, on a slow machine and in an emulator. */
+/** Longer than any run, even on a slow machine or in an emulator. */
 const char* const SecondsOfARun = "30";
 
-/** What coreutils' timeout exits with when it had to end the program. */
+/** Exit status of coreutils' timeout after it has killed the program. */
 constexpr int TimedOut = 124;
 
 ProgramResult ResultOf(int status, std::string output, std::string errors)
@@ -49,7 +49,7 @@ ProgramResult ResultOf(int status, std::string output, std::string errors)
     return result;
 }
 
-/** @param preparation a command of the shell that comes first */
+/** @param preparation a shell command to run first */
 ProgramResult Run(const std::string& preparation, const std::vector<std::string>& arguments,
                   const std::string& output)
 {
@@ -83,7 +83,7 @@ ProgramResult RunDeskPlayerOnTerminal(const std::vector<std::string>& arguments)
     int screen = -1;
     const pid_t program = forkpty(&screen, nullptr, nullptr, nullptr);
     if (program == 0) {
-        // In the foreground, so that the program may use the terminal.
+        // In the foreground, so that the program can use the terminal.
         std::vector<std::string> words = {"timeout", "--foreground", SecondsOfARun,
                                           BDMVNAVIGATOR_DESKPLAYER};
         words.insert(words.end(), arguments.begin(), arguments.end());

@@ -1,6 +1,6 @@
 /**
  * @file
- * Running a program and catching what it prints.
+ * Runs programs and captures their output.
  */
 #ifndef TESTS_DESKPLAYER_PROGRAM_H
 #define TESTS_DESKPLAYER_PROGRAM_H
@@ -8,25 +8,25 @@
 #include <string>
 #include <vector>
 
-/** What a program left behind. One that does not end within 30 s is ended. */
+/** The result of a program. Programs are killed after 30 s. */
 struct ProgramResult {
-    int status = -1; ///< exit status; -1 when a signal ended it, 124 when the test did
+    int status = -1; ///< exit status; -1 if ended by a signal, 124 if killed by the test
     std::string output;
     std::string errors;
 };
 
 /**
- * Runs the desk player with these arguments and nothing to read, and waits for its end.
+ * Runs the desk player with these arguments and empty input, and waits until it ends.
  *
- * @param output where its standard output goes; into the result unless given
+ * @param output file for its standard output; by default, the result has it
  */
 ProgramResult RunDeskPlayer(const std::vector<std::string>& arguments,
                             const std::string& output = {});
 
-/** The same on a terminal, for input and all output: the result holds what the screen shows. */
+/** The same with a terminal for input and all output; the result has the screen's contents. */
 ProgramResult RunDeskPlayerOnTerminal(const std::vector<std::string>& arguments);
 
-/** The same with so many KiB of address space at the most. */
+/** The same with a limited address space. */
 ProgramResult RunDeskPlayerInLittleMemory(const std::vector<std::string>& arguments,
                                           unsigned long kibibytes);
 

@@ -16,8 +16,8 @@ TEST_F(FaultyDisc, IsRefusedWhenTheFolderDoesNotExist)
 
     EXPECT_EQ(result.status, 3);
     EXPECT_EQ(result.output, "");
-    EXPECT_EQ(result.errors, "bdmv-deskplayer: no/such/folder: no disc, expected a folder that "
-                             "holds BDMV or is it\n");
+    EXPECT_EQ(result.errors, "bdmv-deskplayer: no/such/folder: not a disc, expected a BDMV folder "
+                             "or its parent\n");
 }
 
 TEST_F(FaultyDisc, IsRefusedWhenTheNamedPlayListIsMissing)
@@ -79,7 +79,7 @@ TEST_F(FaultyDisc, IsRefusedWhenTheClipInformationIsTruncated)
     ExpectRefused("CLIPINF/00002\\.clpi: offset \\d+: .*expected");
 }
 
-TEST_F(FaultyDisc, IsRefusedWhenThereIsNoPlayList)
+TEST_F(FaultyDisc, IsRefusedIfThereIsNoPlayList)
 {
     fs::remove(playList);
     ExpectRefused("PLAYLIST: .*expected");

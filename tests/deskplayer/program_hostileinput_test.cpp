@@ -15,7 +15,7 @@
 namespace
 {
 
-// A sanitizer takes more memory than the program may have.
+// Sanitizers need more memory than the program is limited to.
 #if defined(__SANITIZE_ADDRESS__) || defined(__SANITIZE_THREAD__)
 constexpr bool Sanitized = true;
 #elif !defined(__has_feature)
@@ -26,7 +26,7 @@ constexpr bool Sanitized = true;
 constexpr bool Sanitized = false;
 #endif
 
-/** How long children of this process have computed. */
+/** The CPU time of the children of this process. */
 double SecondsOfChildren()
 {
     rusage usage = {};
@@ -37,7 +37,7 @@ double SecondsOfChildren()
     return seconds(usage.ru_utime) + seconds(usage.ru_stime);
 }
 
-/** Runs in 64 MiB, and says in one line what is wrong before it has computed for a second. */
+/** Expects a message of one line within 64 MiB and a second of CPU time. */
 class HostileInput : public ScratchDisc
 {
 protected:
@@ -61,7 +61,7 @@ protected:
         EXPECT_NE(result.errors.find(message), std::string::npos) << result.errors;
     }
 
-    /** Whether the play list is named, looked for or described. */
+    /** Whether the play list is named, searched for or described. */
     void ExpectRefusedPlayList(const std::string& message) const
     {
         ExpectFault({disc}, 3, message);
@@ -122,7 +122,7 @@ TEST_F(HostileInput, MayBeThePlayListThatTakesTheMostMemory)
     }
 }
 
-TEST_F(HostileInput, MayNameALargeClipInEveryPlayItem)
+TEST_F(HostileInput, MayReferToALargeClipInEveryPlayItem)
 {
     using namespace deskplayer;
     PlayItemBytes item;

@@ -32,7 +32,7 @@ TEST_F(DeskPlayerListing, DescribesAPlayList)
     EXPECT_NE(result.output.find("00020"), std::string::npos) << "its clip";
 }
 
-TEST_F(DeskPlayerListing, ListsWhatCanBeReadOfADamagedDisc)
+TEST_F(DeskPlayerListing, ListsTheReadablePlayListsOfADamagedDisc)
 {
     fs::copy_file(disc / "BDMV/index.bdmv", disc / "BDMV/PLAYLIST/00003.mpls");
 

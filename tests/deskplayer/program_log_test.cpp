@@ -9,7 +9,7 @@
 namespace
 {
 
-/** The line of every event, with its values made alike. */
+/** The line of every event, with every number replaced by #. */
 const std::set<std::string> LinesOfEvents = {
     "Sending AngleInfo - angleNr: #",
     "Sending AudioChannelsChanged",

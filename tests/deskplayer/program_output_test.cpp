@@ -32,7 +32,7 @@ TEST_F(DeskPlayerOutput, IsOneJsonObjectPerLine)
     }
 }
 
-/** Reads a trace as a viewer does: track by track. */
+/** Reads a trace track by track, as a viewer does. */
 void ExpectTraceThatAViewerCanShow(const std::string& output)
 {
     struct Track {
@@ -98,10 +98,10 @@ TEST_F(DeskPlayerOutput, GoesToTheNamedFile)
 
     EXPECT_EQ(result.status, 0);
     EXPECT_EQ(result.output, "");
-    EXPECT_EQ(ContentOf(file), RunDeskPlayer({SampleDisc}).output);
+    EXPECT_EQ(ReadContents(file), RunDeskPlayer({SampleDisc}).output);
 }
 
-TEST_F(DeskPlayerOutput, LeavesTheFileUntouchedWhenAnInputIsRefused)
+TEST_F(DeskPlayerOutput, LeavesTheFileUnchangedIfAnInputIsRefused)
 {
     const std::string file = WriteFile("precious.txt", "precious");
     const std::string wrong = WriteFile("wrong.session", "nxt");
@@ -131,7 +131,7 @@ TEST_F(DeskPlayerOutput, LeavesTheFileUntouchedWhenAnInputIsRefused)
             arguments.insert(arguments.end(), {"--output", output});
             EXPECT_EQ(RunDeskPlayer(arguments).status, fault.status);
         }
-        EXPECT_EQ(ContentOf(file), "precious");
+        EXPECT_EQ(ReadContents(file), "precious");
         EXPECT_FALSE(fs::exists(folder / "new.txt"));
     }
 }
@@ -171,7 +171,7 @@ TEST_F(DeskPlayerOutput, RefusesUnknownFormatsInterfacesAndCallbacks)
         << result.errors;
 }
 
-TEST_F(DeskPlayerOutput, ThatCannotBeWrittenEndsWithStatus1)
+TEST_F(DeskPlayerOutput, IsReportedWithStatus1IfItCannotBeWritten)
 {
     for (const std::vector<std::string>& arguments : std::vector<std::vector<std::string>>{
              {SampleDisc}, {SampleDisc, "--list"}, {SampleDisc, "--describe", "1"}}) {

@@ -14,7 +14,7 @@ namespace
 
 using DeskPlayerPlayback = ScratchDisc;
 
-TEST_F(DeskPlayerPlayback, PlaysThePlayListThatIsNamedFromStartToEnd)
+TEST_F(DeskPlayerPlayback, PlaysTheNamedPlayListFromStartToEnd)
 {
     const ProgramResult result = RunDeskPlayer({SampleDisc, "--playlist", "2"});
 
@@ -83,7 +83,7 @@ TEST_F(DeskPlayerPlayback, PlaysEveryDiscToTheEndOfItsMedia)
     EXPECT_GE(discs, 15);
 }
 
-TEST_F(DeskPlayerPlayback, LastsAsLongAsThePlayListInRealTime)
+TEST_F(DeskPlayerPlayback, TakesTheDurationOfThePlayListInRealTime)
 {
     MakeShort(45 * 250);
     const auto start = std::chrono::steady_clock::now();

@@ -14,7 +14,7 @@ namespace
 
 using DeskPlayerSession = ScratchFolder;
 
-TEST_F(DeskPlayerSession, OfAllEventsCallsEveryCallback)
+TEST_F(DeskPlayerSession, WithAllEventsCallsEveryCallback)
 {
     const ProgramResult result = RunDeskPlayer({SampleDisc, "--session", AllEvents});
 
@@ -35,7 +35,7 @@ TEST_F(DeskPlayerSession, OfAllEventsCallsEveryCallback)
     EXPECT_EQ(called, all);
 }
 
-TEST_F(DeskPlayerSession, OfAnEveningPlaysToTheEnd)
+TEST_F(DeskPlayerSession, WithTheEveningSessionPlaysToTheEnd)
 {
     const ProgramResult result = RunDeskPlayer({SampleDisc, "--session", Evening});
 
@@ -47,7 +47,7 @@ TEST_F(DeskPlayerSession, OfAnEveningPlaysToTheEnd)
               "08:03:35.000  Finished                    reason=EndOfMedia");
 }
 
-TEST_F(DeskPlayerSession, HasTheSameOutputEveryTime)
+TEST_F(DeskPlayerSession, AlwaysHasTheSameOutput)
 {
     for (const char* const format : {"text", "json", "trace"}) {
         const std::vector<std::string> arguments = {SampleDisc, "--session", AllEvents, "--format",
@@ -60,7 +60,7 @@ TEST_F(DeskPlayerSession, HasTheSameOutputEveryTime)
     }
 }
 
-TEST_F(DeskPlayerSession, ThatCannotBeReadIsRefused)
+TEST_F(DeskPlayerSession, IsRefusedIfItCannotBeRead)
 {
     const std::string wrong = WriteFile("wrong.session", "play\n  nxt 3\n");
     const ProgramResult result = RunDeskPlayer({SampleDisc, "--session", wrong});
@@ -83,7 +83,7 @@ TEST_F(DeskPlayerSession, ThatCannotBeReadIsRefused)
     ExpectUsageError({SampleDisc, "--session", "/dev/zero"}, "/dev/zero" + tooLong);
 }
 
-TEST_F(DeskPlayerSession, OfTheLargestSizeIsAccepted)
+TEST_F(DeskPlayerSession, IsAcceptedUpToTheMaximumSize)
 {
     const std::string script = WriteFile("a.session", std::string(1024 * 1024 - 4, '\n') + "play");
 
@@ -94,7 +94,7 @@ TEST_F(DeskPlayerSession, OfTheLargestSizeIsAccepted)
     EXPECT_EQ(result.output, "00:00:00.000  PlayStarted\n");
 }
 
-TEST_F(DeskPlayerSession, OfTwoHoursPlaysToTheEnd)
+TEST_F(DeskPlayerSession, PlaysTwoHoursToTheEnd)
 {
     const std::string script =
         WriteFile("a.session", "play\nrepeat title\nafter 2h repeat off\nafter 1s stop\n");

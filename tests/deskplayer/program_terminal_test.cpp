@@ -11,7 +11,7 @@ namespace
 
 using DeskPlayerTerminal = ScratchDisc;
 
-TEST_F(DeskPlayerTerminal, ShowsProgressWhenPlaybackTakesLong)
+TEST_F(DeskPlayerTerminal, ShowsProgressIfPlaybackTakesLong)
 {
     MakeShort(45 * 1500);
 
@@ -19,7 +19,7 @@ TEST_F(DeskPlayerTerminal, ShowsProgressWhenPlaybackTakesLong)
         RunDeskPlayerOnTerminal({disc, "--realtime", "--output", folder / "out.txt"});
 
     EXPECT_EQ(result.status, 0);
-    EXPECT_EQ(result.output, "\r00:00:01.000\r             \r") << "and nothing in the end";
+    EXPECT_EQ(result.output, "\r00:00:01.000\r             \r") << "erased at the end";
 }
 
 TEST_F(DeskPlayerTerminal, IsNeededForProgress)

@@ -9,7 +9,7 @@
 namespace
 {
 
-TEST(DeskPlayerUsage, IsExplained)
+TEST(DeskPlayerUsage, IsDescribedByHelp)
 {
     const ProgramResult help = RunDeskPlayer({"--help"});
     EXPECT_EQ(help.status, 0);
@@ -34,7 +34,7 @@ TEST(DeskPlayerUsage, IsExplained)
               "fail stream                         make the stream run out of data");
 }
 
-TEST(DeskPlayerUsage, IsRefusedWithStatus2WhenWrong)
+TEST(DeskPlayerUsage, IsRefusedWithStatus2WhenInvalid)
 {
     const std::vector<std::vector<std::string>> wrong = {
         {},

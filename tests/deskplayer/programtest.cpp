@@ -40,7 +40,7 @@ std::string Without(const std::string& pattern, const std::string& text)
     return rest;
 }
 
-std::string ContentOf(const fs::path& path)
+std::string ReadContents(const fs::path& path)
 {
     std::ifstream file(path, std::ios::binary);
     return {std::istreambuf_iterator<char>(file), {}};

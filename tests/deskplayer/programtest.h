@@ -1,7 +1,7 @@
 /**
  * @file
- * What the tests of the program share: its sample disc and sessions, folders and discs to change,
- * and the lines it prints.
+ * Shared by the tests of the program: sample disc, sessions, scratch folders and discs, and
+ * operations on lines.
  */
 #ifndef TESTS_DESKPLAYER_PROGRAMTEST_H
 #define TESTS_DESKPLAYER_PROGRAMTEST_H
@@ -30,12 +30,12 @@ std::string LastLine(const std::string& text);
 /** The lines of @p text that do not contain @p pattern. */
 std::string Without(const std::string& pattern, const std::string& text);
 
-std::string ContentOf(const fs::path& path);
+std::string ReadContents(const fs::path& path);
 
-/** Wrong usage is explained in one line, nothing is played, and the exit status is 2. */
+/** Expects a message of one line, no output, and exit status 2. */
 void ExpectUsageError(const std::vector<std::string>& arguments, const std::string& message);
 
-/** Gives a file a size without filling it; it may be larger than what a test may write. */
+/** Sets a file's size without writing data; it may exceed the limit of what a test may write. */
 void ResizeSparsely(const fs::path& file, std::uintmax_t size);
 
 /** A folder for the files of a test. */
@@ -57,13 +57,13 @@ class ScratchDisc : public ScratchFolder
 protected:
     ScratchDisc();
 
-    /** Writes over bytes of the play list. */
+    /** Overwrites bytes of the play list. */
     void Patch(std::streamoff offset, const std::string& bytes) const;
 
-    /** Replaces the film by the trailer, shortened or extended to so many ticks of 45 kHz. */
+    /** Replaces the film by the trailer, shortened or extended to @p ticks of 45 kHz. */
     void MakeShort(std::uint32_t ticks) const;
 
-    /** The desk player says in one line what is wrong, plays nothing, and exits with status 3. */
+    /** Expects a message of one line, no output, and exit status 3. */
     void ExpectRefused(const std::string& message,
                        const std::vector<std::string>& furtherArguments = {}) const;
 

@@ -14,7 +14,7 @@ namespace deskplayer
 namespace
 {
 
-/** A session of two hours, second by second, takes half of it. */
+/** Twice the steps of a session of two hours that reports every second. */
 constexpr int MostSteps = 30000;
 
 std::string TimeOf(Ticks time)
@@ -24,7 +24,7 @@ std::string TimeOf(Ticks time)
     return rest == Ticks(0) ? seconds : seconds + "+" + std::to_string(rest.count());
 }
 
-/** As in a file, which counts from ten minutes in the clips of these tests. */
+/** The time as in a file, since clips in these tests start at ten minutes. */
 std::uint32_t TimeInClip(Ticks time)
 {
     return static_cast<std::uint32_t>((600 * Second + time).count());
@@ -136,7 +136,7 @@ TestDesk::TestDesk(PlayList playList) : desk(LayOut(7, std::move(playList)))
 {
     m_Listener.onCallback = [this](const std::string& callback) {
         CountStep(callback);
-        m_Heard += TimeOf(clock.Now()) + " " + callback + "\n";
+        m_Received += TimeOf(clock.Now()) + " " + callback + "\n";
     };
     desk.Listeners().AddListener(&m_Listener);
 }
@@ -152,22 +152,20 @@ void TestDesk::CountStep(const std::string& step)
 SessionHooks TestDesk::Hooks()
 {
     SessionHooks hooks;
-    hooks.beforeTimePasses = [this](Ticks time) {
-        CountStep("pass " + TimeOf(time) + " s");
-    };
+    hooks.beforeTimePasses = [this](Ticks time) { CountStep("pass " + TimeOf(time) + " s"); };
     return hooks;
 }
 
 std::string TestDesk::Take()
 {
-    return std::exchange(m_Heard, "");
+    return std::exchange(m_Received, "");
 }
 
 std::string TestDesk::TakeWithoutPositions()
 {
-    std::istringstream heard(Take());
+    std::istringstream received(Take());
     std::string others;
-    for (std::string line; std::getline(heard, line);) {
+    for (std::string line; std::getline(received, line);) {
         if (line.find(" CurrentTimePosition(") == std::string::npos) {
             others += line + "\n";
         }
@@ -201,13 +199,14 @@ std::string TestDesk::Snapshot()
     std::ostringstream text;
     PrintTo(navigator.CurrentStatus(), &text);
     text << " item " << navigator.Context().GetPlayItemId() << " position "
-         << navigator.Context().GetCurrentTimePosition() << " chapter " << navigator.Context().GetCurrentChapter()
-         << " mode " << Describe(navigator.Context().GetPlayMode()) << " current mode "
+         << navigator.Context().GetCurrentTimePosition() << " chapter "
+         << navigator.Context().GetCurrentChapter() << " mode "
+         << Describe(navigator.Context().GetPlayMode()) << " current mode "
          << Describe(navigator.Context().GetCurrentPlayMode()) << " repeat "
          << Describe(navigator.Context().GetCurrentABRepeatState()) << " "
-         << Describe(navigator.Context().GetCurrentChpTitleRepeatState()) << " " << navigator.IsRepeating()
-         << " trigger " << Describe(navigator.Context().GetTrigger()) << " at "
-         << navigator.TimeToNextChange().value_or(Ticks::max()).count();
+         << Describe(navigator.Context().GetCurrentChpTitleRepeatState()) << " "
+         << navigator.IsRepeating() << " trigger " << Describe(navigator.Context().GetTrigger())
+         << " at " << navigator.TimeToNextChange().value_or(Ticks::max()).count();
     for (const Kind& kind : {Kind{"video", &PlaybackContext::GetVideoInfo},
                              Kind{"audio", &PlaybackContext::GetAudioInfo},
                              Kind{"subtitle", &PlaybackContext::GetPgTextStInfo},

@@ -1,7 +1,7 @@
 /**
  * @file
- * A desk to test the navigator on: play lists made for the purpose, a session, and a listener that
- * writes down what it hears and when.
+ * A desk for tests of the navigator: play lists, sessions, and a listener that records callbacks
+ * with their times.
  */
 #ifndef TESTS_DESKPLAYER_TESTDESK_H
 #define TESTS_DESKPLAYER_TESTDESK_H
@@ -28,44 +28,45 @@ constexpr std::uint8_t CodingGraphics = 0x90;
 constexpr std::uint8_t CodingMenu = 0x91;
 constexpr std::uint8_t CodingTextSubtitle = 0x92;
 
-/** A stream of the clip of the play item. */
+/** A stream in the clip of the play item. */
 Stream StreamOf(std::uint8_t codingType, std::uint16_t pid = 0);
 
-/** A stream that a sub path brings. */
+/** A stream that a sub path carries. */
 Stream StreamOfSubPath(std::uint8_t codingType, std::uint8_t subPath);
 
-/** A play item of this duration that has one video, of 50 Hz. Its clip starts at ten minutes. */
+/** A play item with one video stream, of 50 Hz. Its clip starts at ten minutes. */
 PlayItem ItemOfTicks(Ticks duration);
 
-/** The same in seconds. */
+/** The same with a duration in seconds. */
 PlayItem Item(std::uint32_t seconds);
 
 PlayItem WithTimedStill(PlayItem item, std::uint16_t seconds);
 PlayItem WithEndlessStill(PlayItem item);
 
-/** The item with a bit of its mask set for each of @p operations. */
+/** The item with a mask that forbids @p operations. */
 PlayItem Forbidding(PlayItem item, const std::vector<bd::UserOperationMaskDef>& operations);
 
-/** The mask as it stands in a file. */
+/** The mask as it is in a file. */
 std::uint64_t MaskOf(const std::vector<bd::UserOperationMaskDef>& operations);
 
 /**
- * A play item of @p seconds with two of every kind of stream, in step, the second subtitle as text.
+ * A play item of @p seconds with two streams of every kind, all synchronous; the second subtitle
+ * stream is text.
  */
 PlayItem RichItem(std::uint32_t seconds);
 
-/** A mark of type entry, at @p time after the start of the play item. */
+/** An entry mark at @p time after the start of the play item. */
 Mark Entry(std::uint16_t item, Ticks time);
 
-/** A mark of type link. */
+/** A link mark at @p time after the start of the play item. */
 Mark Link(std::uint16_t item, Ticks time);
 
 PlayList ListOf(std::vector<PlayItem> items, std::vector<Mark> marks = {});
 
 /**
- * A navigator over a play list, number 7, on a clock of its own, and what its listener receives.
+ * A navigator with play list number 7, and a listener that records callbacks.
  *
- * Throws out of playback that does not end: after many times the callbacks of the longest test.
+ * Throws if playback does not end, after many times the callbacks of the longest test.
  */
 class TestDesk
 {
@@ -76,24 +77,24 @@ public:
     TestDesk& operator=(const TestDesk&) = delete;
 
     /**
-     * The callbacks since the last call, one a line, each behind the second of the session it came
-     * at and the ticks beyond it, if there are any: "0+900 Stepped(900, PlayDirectionForward)".
+     * The callbacks since the last call, one per line, each after its session time in seconds and
+     * remaining ticks, if any: "0+900 Stepped(900, PlayDirectionForward)".
      */
     std::string Take();
 
     /** The same without CurrentTimePosition(). */
     std::string TakeWithoutPositions();
 
-    /** Hooks for a session on this desk; they throw out of one that does not end. */
+    /** Hooks for a session on this desk; they throw if it does not end. */
     SessionHooks Hooks();
 
-    /** Plays from the start, lets so much time pass, and forgets what was heard. */
+    /** Plays from the start for @p time and discards the callbacks. */
     void Start(Ticks time = Ticks(0));
 
-    /** Takes an operation to have been carried out, and forgets what was heard of it. */
+    /** Expects an operation to have been carried out, and discards its callbacks. */
     void Do(const Outcome& outcome);
 
-    /** All answers of the navigator that an operation can change, as a text. */
+    /** All answers of the navigator that an operation can change, as text. */
     std::string Snapshot();
 
     Desk desk;
@@ -101,16 +102,16 @@ public:
     const VirtualClock& clock = desk.Clock();
 
 private:
-    /** @throw std::runtime_error when there have been too many */
+    /** @throw std::runtime_error after too many steps */
     void CountStep(const std::string& step);
 
     bdmvtest::Journal m_Journal;
     bdmvtest::RecordingListener m_Listener{m_Journal, "A"};
-    std::string m_Heard;
-    int m_Steps = 0; ///< callbacks and passes of time
+    std::string m_Received;
+    int m_Steps = 0; ///< callbacks, and advances of time
 };
 
-/** Shows outcomes and statuses in the messages of tests. */
+/** Prints outcomes and statuses in test messages. */
 void PrintTo(const Outcome& outcome, std::ostream* stream);
 void PrintTo(Status status, std::ostream* stream);
 

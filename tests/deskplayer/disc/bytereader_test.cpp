@@ -35,21 +35,21 @@ TEST(ByteReader, KnowsItsOffsetAndTheBytesLeft)
     EXPECT_EQ(reader.BytesLeft(), 7u);
 }
 
-TEST(ByteReader, DropsTheNulBytesAtTheEndOfTextOnly)
+TEST(ByteReader, DropsOnlyTrailingNulBytesOfText)
 {
     const Bytes bytes{'a', 0, 'b', 0, 0};
     ByteReader reader(bytes, FileName);
     EXPECT_EQ(reader.Text(5, "text"), std::string("a\0b", 3));
 }
 
-TEST(ByteReader, MakesEmptyTextOfNulBytes)
+TEST(ByteReader, ReadsNulBytesAsEmptyText)
 {
     const Bytes bytes = Zeros(3);
     ByteReader reader(bytes, FileName);
     EXPECT_EQ(reader.Text(3, "text"), "");
 }
 
-TEST(ByteReader, RefusesANumberThatIsCutOff)
+TEST(ByteReader, RefusesATruncatedNumber)
 {
     const Bytes bytes = Zeros(5);
     ByteReader reader(bytes, FileName);
@@ -58,7 +58,7 @@ TEST(ByteReader, RefusesANumberThatIsCutOff)
               "file: offset 2: file has 3 bytes left, but expected 4 bytes for IN time");
 }
 
-TEST(ByteReader, RefusesTextThatIsCutOff)
+TEST(ByteReader, RefusesTruncatedText)
 {
     const Bytes bytes = Zeros(1);
     ByteReader reader(bytes, FileName);
@@ -74,7 +74,7 @@ TEST(ByteReader, RefusesToSkipBeyondTheEnd)
               "file: offset 0: file has 1 byte left, but expected 2 bytes for padding");
 }
 
-TEST(ByteReader, StandsWhereItWasAfterARefusal)
+TEST(ByteReader, KeepsItsOffsetAfterARefusal)
 {
     const Bytes bytes{1, 2, 3};
     ByteReader reader(bytes, FileName);
@@ -111,7 +111,7 @@ TEST(ByteReader, KeepsAPartWithinItsLength)
               "file: offset 1: play item 3 has 1 byte left, but expected 2 bytes for number");
 }
 
-TEST(ByteReader, RefusesAPartThatIsLongerThanWhatHoldsIt)
+TEST(ByteReader, RefusesAPartLongerThanTheEnclosingOne)
 {
     const Bytes bytes = Join({Part16(Join({U16(3), Zeros(2)})), Zeros(5)});
     ByteReader reader(bytes, FileName);
@@ -123,7 +123,7 @@ TEST(ByteReader, RefusesAPartThatIsLongerThanWhatHoldsIt)
               "play list section");
 }
 
-TEST(ByteReader, RefusesTheGreatestLengthThereIs)
+TEST(ByteReader, RefusesTheMaximumLength)
 {
     const Bytes bytes = U32(0xFFFFFFFF);
     ByteReader reader(bytes, FileName);
@@ -132,7 +132,7 @@ TEST(ByteReader, RefusesTheGreatestLengthThereIs)
               "in file");
 }
 
-TEST(ByteReader, TakesAPartAtAnAddressAndGoesOnBehindTheAddress)
+TEST(ByteReader, TakesAPartAtAnAddressAndContinuesAfterTheAddress)
 {
     const Bytes bytes = Join({U32(6), U16(9), Part32({1, 2}), Zeros(3)});
     ByteReader reader(bytes, FileName);
@@ -152,7 +152,7 @@ TEST(ByteReader, RefusesAnAddressBelowTheLowest)
               "the end of the file");
 }
 
-TEST(ByteReader, RefusesAnAddressBehindTheEndOfTheFile)
+TEST(ByteReader, RefusesAnAddressPastTheEndOfTheFile)
 {
     const Bytes bytes = U32(5);
     ByteReader reader(bytes, FileName);
@@ -161,7 +161,7 @@ TEST(ByteReader, RefusesAnAddressBehindTheEndOfTheFile)
               "of the file");
 }
 
-TEST(ByteReader, RefusesAnAddressOfTheEndOfTheFileBecauseNoLengthIsThere)
+TEST(ByteReader, RefusesTheEndOfTheFileAsAnAddressBecauseNoLengthFollows)
 {
     const Bytes bytes = U32(4);
     ByteReader reader(bytes, FileName);
@@ -169,7 +169,7 @@ TEST(ByteReader, RefusesAnAddressOfTheEndOfTheFileBecauseNoLengthIsThere)
               "file: offset 4: file has 0 bytes left, but expected 4 bytes for length");
 }
 
-TEST(ByteReader, TakesAddressZeroOfAnOptionalPartForNoPart)
+TEST(ByteReader, TreatsAddressZeroOfAnOptionalPartAsNoPart)
 {
     const Bytes bytes = U32(0);
     ByteReader reader(bytes, FileName);
@@ -201,7 +201,7 @@ TEST(ByteReader, RefusesACountOfMoreEntriesThanFit)
               "in file");
 }
 
-TEST(FormatError, TellsFileOffsetWhatWasFoundAndWhatWasExpected)
+TEST(FormatError, ReportsFileOffsetWhatWasFoundAndWhatWasExpected)
 {
     const FormatError error("BDMV/index.bdmv", 12, "length 3", "2");
     EXPECT_EQ(error.FileName(), "BDMV/index.bdmv");

@@ -112,7 +112,7 @@ Bytes PlayItemBytes::Make() const
 {
     return Part16(Join({Ascii(clip), Ascii("M2TS"), U16(angleAndConnection), U8(stcSequence),
                         U32(inTime), U32(outTime), U64(uoMask), U8(randomAccess), U8(stillMode),
-                        U16(stillTime), angleTable, streamTable, behind}));
+                        U16(stillTime), angleTable, streamTable, trailing}));
 }
 
 Bytes SubPlayItemBytes::Make() const

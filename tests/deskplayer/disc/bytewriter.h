@@ -1,6 +1,6 @@
 /**
  * @file
- * Makes the bytes of metadata files, right ones and wrong ones.
+ * Makes the bytes of valid and invalid metadata files.
  */
 #ifndef TESTS_DESKPLAYER_DISC_BYTEWRITER_H
 #define TESTS_DESKPLAYER_DISC_BYTEWRITER_H
@@ -25,27 +25,27 @@ Bytes Zeros(std::size_t count);
 Bytes Join(std::initializer_list<Bytes> pieces);
 Bytes Repeat(std::size_t count, const Bytes& piece);
 
-/** @p body behind its length in one, two or four bytes. */
+/** @p body after its length of one, two or four bytes. */
 Bytes Part8(const Bytes& body);
 Bytes Part16(const Bytes& body);
 Bytes Part32(const Bytes& body);
 
-/** Puts @p replacement over the bytes of @p bytes at @p offset. */
+/** Overwrites @p bytes at @p offset with @p replacement. */
 void Overwrite(Bytes& bytes, std::size_t offset, const Bytes& replacement);
 
 /** A stream entry of type 1. */
 Bytes StreamEntry(unsigned pid);
 
-/** Stream attributes: coding type and the four bytes behind it. */
+/** Stream attributes: coding type and the four bytes after it. */
 Bytes StreamAttributesBytes(unsigned codingType, const Bytes& details);
 
 /** An audio stream without language, entry and attributes. */
 Bytes AudioStream(unsigned pid);
 
-/** A stream table of @p counts, which are those of the file's layout, eight of them. */
+/** A stream table. @p counts are the eight counts in file order. */
 Bytes StreamTableBytes(const Bytes& counts, const Bytes& streams);
 
-/** What a play item is made of; by default an ordinary one of ten ticks without streams. */
+/** The fields of a play item; by default an ordinary one of ten ticks without streams. */
 struct PlayItemBytes {
     std::string clip = "00001";
     unsigned angleAndConnection = 1;
@@ -58,12 +58,12 @@ struct PlayItemBytes {
     unsigned stillTime = 0;
     Bytes angleTable = {};
     Bytes streamTable = StreamTableBytes(Zeros(8), {});
-    Bytes behind = {}; ///< further bytes at the end of its body
+    Bytes trailing = {}; ///< further bytes at the end of its body
 
     Bytes Make() const;
 };
 
-/** What a sub play item is made of. */
+/** The fields of a sub play item. */
 struct SubPlayItemBytes {
     std::string clip = "00002";
     std::uint32_t connectionAndClips = 1 << 1;
@@ -85,7 +85,7 @@ Bytes MarkBytes(unsigned type, unsigned playItem, std::uint32_t time);
 /** An entry of an angle or clip table. */
 Bytes FurtherClip(const std::string& clip, const std::string& codec, unsigned stcSequence);
 
-/** What a play list is made of; by default one without play items and marks. */
+/** The fields of a play list; by default without play items and marks. */
 struct PlayListBytes {
     std::string version = "0200";
     Bytes applicationInfo = Part32(Zeros(14));
@@ -106,15 +106,15 @@ PlayListBytes WithItem(const PlayItemBytes& item);
 PlayListBytes WithStreams(const Bytes& counts, const Bytes& streams);
 
 /**
- * The densest play list there can be, whose values take the most memory: streams of four bytes, in
- * as many items as fit into the greatest file that is read.
+ * The densest possible play list, whose values take the most memory: streams of four bytes, in as
+ * many items as fit into the largest file that is read.
  */
 PlayListBytes DensePlayList();
 
 /** A program of clip information with @p count streams. */
 Bytes ProgramBytes(unsigned count, const Bytes& streams);
 
-/** Clip information with @p count programs, and with nothing else of interest. */
+/** Clip information with @p count programs and otherwise minimal content. */
 Bytes ClipInfoOf(unsigned count, const Bytes& programs);
 
 } // namespace deskplayer

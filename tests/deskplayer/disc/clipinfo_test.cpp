@@ -58,7 +58,7 @@ StreamAttributes AttributesOf(const Bytes& codingInfo)
     return WithStream(codingInfo).programs.at(0).streams.at(0).attributes;
 }
 
-TEST(ParseClipInfo, ReadsTheArrivalTimeOffsetFlagBesidePadding)
+TEST(ParseClipInfo, ReadsTheArrivalTimeOffsetFlagNextToPadding)
 {
     ClipInfoBytes bytes;
     bytes.clipInfo = Part32(Join({U16(0xFFFF), U8(2), U8(3), U32(1), U32(4), U32(5)}));
@@ -99,7 +99,7 @@ TEST(ParseClipInfo, RefusesAnStcSequenceThatEndsBeforeItStarts)
               "least the start time 10");
 }
 
-TEST(ParseClipInfo, RefusesMoreSequencesThanThereAre)
+TEST(ParseClipInfo, RefusesMoreSequencesThanFollow)
 {
     EXPECT_EQ(FormatErrorOf([] {
                   WithSequences(Join({U8(2), Zeros(11)}));
@@ -125,7 +125,7 @@ TEST(ParseClipInfo, ReadsSeveralPrograms)
     EXPECT_EQ(clipInfo.programs[1].streams.size(), 2u);
 }
 
-TEST(ParseClipInfo, RefusesMoreProgramsThanThereAre)
+TEST(ParseClipInfo, RefusesMoreProgramsThanFollow)
 {
     EXPECT_EQ(FormatErrorOf([] {
                   WithPrograms(Join({U8(2), Zeros(15)}));
@@ -134,7 +134,7 @@ TEST(ParseClipInfo, RefusesMoreProgramsThanThereAre)
               "1 in the 15 bytes left in program info");
 }
 
-TEST(ParseClipInfo, RefusesMoreStreamsThanThereAre)
+TEST(ParseClipInfo, RefusesMoreStreamsThanFollow)
 {
     EXPECT_EQ(FormatErrorOf([] {
                   WithPrograms(Join({U8(1), Zeros(6), U8(2), Zeros(7)}));
@@ -152,7 +152,7 @@ TEST(ParseClipInfo, RefusesCodingInfoThatLacksTheAspectRatio)
               "expected 1 byte for aspect ratio");
 }
 
-TEST(ParseClipInfo, ReadsVideoBesidePadding)
+TEST(ParseClipInfo, ReadsVideoNextToPadding)
 {
     const ClipInfo clipInfo = WithStream(Part8(Join({{0x1B, 0x64, 0x3D, 0xFF, 0xFF}})));
     const ProgramStream& stream = clipInfo.programs.at(0).streams.at(0);
@@ -202,7 +202,7 @@ TEST(ParseClipInfo, KeepsAStreamOfUnknownCodingType)
     EXPECT_EQ(AttributesOf(Part8({0x7F})).codingType, 0x7Fu);
 }
 
-TEST(ParseClipInfo, RefusesAnAddressBehindTheEnd)
+TEST(ParseClipInfo, RefusesAnAddressPastTheEnd)
 {
     Bytes bytes = ClipInfoBytes().Make();
     Overwrite(bytes, 12, U32(0xFFFFFFFF));
@@ -219,7 +219,7 @@ TEST(ClipDuration, IsTheSumOverAllStcSequencesInSixtyFourBits)
     EXPECT_EQ(Duration(clipInfo), Ticks(2u * 0xFFFFFFFFull + 2u));
 }
 
-TEST(AspectRatiosOf, AreThoseOfTheVideoStreamsOfAllProgramsByPid)
+TEST(AspectRatiosOf, AreSortedByPidOverTheVideoStreamsOfAllPrograms)
 {
     const auto video = [](unsigned pid, unsigned ratio) {
         return Join({U16(pid), Part8({0x1B, 0x61, static_cast<std::uint8_t>(ratio << 4)})});
@@ -229,7 +229,7 @@ TEST(AspectRatiosOf, AreThoseOfTheVideoStreamsOfAllProgramsByPid)
         WithPrograms(Join({U8(2), Zeros(6), U8(2), U8(0), video(4, 3), audio, Zeros(6), U8(2),
                            U8(0), video(1, 2), video(4, 2)}));
     const std::vector<std::pair<std::uint16_t, std::uint8_t>> expected = {{1, 2}, {4, 3}};
-    EXPECT_EQ(AspectRatiosOf(clipInfo), expected) << "of two with a PID the first";
+    EXPECT_EQ(AspectRatiosOf(clipInfo), expected) << "the first of two with the same PID";
 }
 
 } // namespace

@@ -9,7 +9,7 @@ namespace deskplayer
 namespace
 {
 
-TEST(Codes, KnowTheKindOfEveryCodingType)
+TEST(Codes, GiveTheKindOfEveryCodingType)
 {
     for (const std::uint8_t codingType : Bytes{0x01, 0x02, 0x1B, 0x20, 0x24, 0xEA}) {
         EXPECT_EQ(KindOfStream(codingType), StreamKindVideo) << unsigned(codingType);
@@ -59,7 +59,7 @@ TEST(LanguageName, IsThePrintableCodeOfAnUncommonLanguage)
     EXPECT_EQ(LanguageName("\x1B[2"), "\\x1B[2");
 }
 
-TEST(LanguageName, SaysThatNoneWasGiven)
+TEST(LanguageName, IsNoLanguageForAnEmptyCode)
 {
     EXPECT_EQ(LanguageName(""), "no language");
 }

@@ -6,33 +6,33 @@
 namespace
 {
 
-thread_local std::size_t g_BytesAskedFor = 0;
+thread_local std::size_t g_AllocatedBytes = 0;
 
 } // namespace
 
 namespace deskplayer
 {
 
-std::size_t BytesAskedFor()
+std::size_t AllocatedBytes()
 {
-    return g_BytesAskedFor;
+    return g_AllocatedBytes;
 }
 
 } // namespace deskplayer
 
 void* operator new(std::size_t size)
 {
-    g_BytesAskedFor += size;
+    g_AllocatedBytes += size;
     if (void* const memory = std::malloc(size)) {
         return memory;
     }
     throw std::bad_alloc();
 }
 
-// Sorting asks this one for its buffer.
+// Used by std::stable_sort for its buffer.
 void* operator new(std::size_t size, const std::nothrow_t& /*nothrow*/) noexcept
 {
-    g_BytesAskedFor += size;
+    g_AllocatedBytes += size;
     return std::malloc(size);
 }
 

@@ -1,6 +1,6 @@
 /**
  * @file
- * Counts the memory a test asks for.
+ * Counts the memory that a test allocates.
  */
 #ifndef TESTS_DESKPLAYER_DISC_COUNTINGNEW_H
 #define TESTS_DESKPLAYER_DISC_COUNTINGNEW_H
@@ -11,7 +11,7 @@ namespace deskplayer
 {
 
 /** Sum of the sizes given to operator new so far, on this thread. */
-std::size_t BytesAskedFor();
+std::size_t AllocatedBytes();
 
 } // namespace deskplayer
 

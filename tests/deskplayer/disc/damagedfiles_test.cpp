@@ -17,10 +17,10 @@ namespace
 
 using nlohmann::json;
 
-/** How to read a kind of file. */
+/** The readers of a kind of file. */
 struct FileKind {
     const char* extension;
-    std::function<json(const Bytes&)> toJson; ///< all that the file says
+    std::function<json(const Bytes&)> toJson; ///< all values of the file
     std::function<void(const Bytes&)> parse;  ///< the same without the cost of JSON
 };
 
@@ -62,7 +62,7 @@ json BdmvToJson(const Bytes& bytes)
     return isIndex ? ToJson(ParseIndex(bytes, "file")) : ToJson(ParseMovieObjects(bytes, "file"));
 }
 
-/** Calls @p visit with the content of every file of every disc, and how to read it. */
+/** Calls @p visit with the contents of every file of every disc, and its readers. */
 void ForEveryFile(const std::function<void(const Bytes&, const FileKind&)>& visit)
 {
     static const FileKind kinds[] = {{".mpls", PlayListToJson, UsePlayList},
@@ -73,14 +73,14 @@ void ForEveryFile(const std::function<void(const Bytes&, const FileKind&)>& visi
             for (const FileKind& kind : kinds) {
                 for (const auto& path : FilesBelow(disc, kind.extension)) {
                     SCOPED_TRACE(path.string());
-                    visit(ContentOf(path), kind);
+                    visit(ReadContents(path), kind);
                 }
             }
         }
     }
 }
 
-/** Calls @p read and says if it did not refuse. Anything else that is thrown fails the test. */
+/** Calls @p read and returns whether it succeeded. Any exception but a refusal fails the test. */
 bool IsAccepted(const std::function<void()>& read)
 {
     try {
@@ -91,7 +91,7 @@ bool IsAccepted(const std::function<void()>& read)
     }
 }
 
-TEST(DamagedFiles, AreRefusedWhenCutOffUnlessTheMissingBytesSayNothing)
+TEST(DamagedFiles, AreRefusedWhenTruncatedUnlessTheMissingBytesAreInsignificant)
 {
     std::size_t refused = 0;
     ForEveryFile([&](const Bytes& bytes, const FileKind& kind) {
@@ -100,7 +100,7 @@ TEST(DamagedFiles, AreRefusedWhenCutOffUnlessTheMissingBytesSayNothing)
             const Bytes begin(bytes.begin(), bytes.begin() + std::ptrdiff_t(size));
             json value;
             if (IsAccepted([&] { value = kind.toJson(begin); })) {
-                ASSERT_EQ(value, whole) << "cut off after " << size << " bytes";
+                ASSERT_EQ(value, whole) << "truncated to " << size << " bytes";
             } else {
                 ++refused;
             }
@@ -109,7 +109,7 @@ TEST(DamagedFiles, AreRefusedWhenCutOffUnlessTheMissingBytesSayNothing)
     EXPECT_GT(refused, 10000u);
 }
 
-TEST(DamagedFiles, AreReadOrRefusedWhicheverByteIsWrong)
+TEST(DamagedFiles, AreReadOrRefusedWhicheverByteIsDamaged)
 {
     std::size_t accepted = 0;
     std::size_t refused = 0;
@@ -127,15 +127,15 @@ TEST(DamagedFiles, AreReadOrRefusedWhicheverByteIsWrong)
     EXPECT_GT(refused, 1000u);
 }
 
-/** What ParsePlayList() asks for, whether it refuses the file or not. */
+/** The memory that ParsePlayList() allocates, even if it refuses the file. */
 std::size_t MemoryForPlayList(const Bytes& bytes)
 {
-    const std::size_t before = BytesAskedFor();
+    const std::size_t before = AllocatedBytes();
     IsAccepted([&] { ParsePlayList(bytes, "file"); });
-    return BytesAskedFor() - before;
+    return AllocatedBytes() - before;
 }
 
-TEST(DamagedFiles, DoNotGetMemoryForWhatTheyOnlyAnnounce)
+TEST(DamagedFiles, DoNotGetMemoryForMissingContent)
 {
     PlayListBytes items = WithItem(PlayItemBytes());
     items.itemCount = 0xFFFF;
@@ -152,7 +152,7 @@ TEST(DamagedFiles, DoNotGetMemoryForWhatTheyOnlyAnnounce)
     EXPECT_LT(MemoryForPlayList(WithStreams(Repeat(8, {0xFF}), AudioStream(1)).Make()), 4000u);
 }
 
-TEST(DamagedFiles, GetMemoryInProportionToTheirSizeAtMost)
+TEST(DamagedFiles, GetAtMostMemoryInProportionToTheirSize)
 {
     const Bytes dense = DensePlayList().Make();
     ASSERT_GT(dense.size(), LargestPlayListFile * 9 / 10);

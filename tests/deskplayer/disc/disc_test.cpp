@@ -16,7 +16,7 @@ namespace
 
 namespace fs = std::filesystem;
 
-/** A folder of its own for each test, with an empty disc in it. */
+/** A scratch folder for each test, with an empty disc. */
 class DiscFiles : public testing::Test
 {
 protected:
@@ -51,7 +51,7 @@ protected:
     fs::path m_Folder;
 };
 
-TEST_F(DiscFiles, IsFoundFromTheFolderThatHoldsBdmvAndFromBdmvItself)
+TEST_F(DiscFiles, IsFoundFromTheBdmvFolderAndFromItsParent)
 {
     EXPECT_EQ(Disc(TestDisc("titles")).PlayListNumbers().size(), 5u);
     EXPECT_EQ(Disc(TestDisc("titles") / "BDMV").PlayListNumbers().size(), 5u);
@@ -94,7 +94,7 @@ TEST_F(DiscFiles, ReportsAMissingFile)
                   ": No such file or directory, expected a file");
 }
 
-TEST_F(DiscFiles, ReportsWhatIsNotARegularFile)
+TEST_F(DiscFiles, ReportsAPathThatIsNotARegularFile)
 {
     fs::create_directory(PathOf("index.bdmv"));
     EXPECT_EQ(FileErrorOf([&] { MakeDisc().ReadIndex(); }),
@@ -118,14 +118,14 @@ TEST_F(DiscFiles, RefusesAFileThatIsTooLarge)
                   ": has 1048577 bytes, expected at most 1048576");
 }
 
-TEST_F(DiscFiles, ReadsAFileOfTheGreatestSize)
+TEST_F(DiscFiles, ReadsAFileOfTheMaximumSize)
 {
     Write("PLAYLIST/00000.mpls", WithItem(PlayItemBytes()).Make());
     fs::resize_file(PathOf("PLAYLIST/00000.mpls"), LargestPlayListFile);
     EXPECT_EQ(MakeDisc().ReadPlayList(0).playItems.size(), 1u);
 }
 
-// The sanitizer itself opens files while the test lets nobody do so.
+// The sanitizer itself opens files while the test makes opening fail.
 #if defined(__has_feature)
 #define UNDEFINED_BEHAVIOR_SANITIZER __has_feature(undefined_behavior_sanitizer)
 #else
@@ -149,7 +149,7 @@ TEST_F(DiscFiles, ReportsAFileThatCannotBeOpened)
 }
 #endif
 
-TEST_F(DiscFiles, NamesAFileWithinTheDiscWhenItsContentIsWrong)
+TEST_F(DiscFiles, NamesAMalformedFileRelativeToTheDisc)
 {
     Write("index.bdmv", Ascii("nonsense"));
     EXPECT_EQ(FormatErrorOf([&] { MakeDisc().ReadIndex(); }),
@@ -207,13 +207,13 @@ TEST_F(AspectRatioLookup, ComesFromTheClipThatTheSubPathNames)
     EXPECT_EQ(Find().code, 2);
 }
 
-TEST_F(AspectRatioLookup, IsNotKnownWithoutClipInformation)
+TEST_F(AspectRatioLookup, IsUnknownWithoutClipInformation)
 {
     fs::remove(PathOf("CLIPINF/00000.clpi"));
     ExpectNotKnown("00000.clpi: No such file or directory", false);
 }
 
-TEST_F(AspectRatioLookup, IsNotKnownIfTheClipHasNoSuchStream)
+TEST_F(AspectRatioLookup, IsUnknownIfTheClipHasNoSuchStream)
 {
     Video().pid = 1;
     ExpectNotKnown("not in the clip information", false);
@@ -221,13 +221,13 @@ TEST_F(AspectRatioLookup, IsNotKnownIfTheClipHasNoSuchStream)
     ExpectNotKnown("not in the clip information", false);
 }
 
-TEST_F(AspectRatioLookup, IsNotKnownIfNoClipIsNamed)
+TEST_F(AspectRatioLookup, IsUnknownIfNoClipIsNamed)
 {
     Video().entryType = EntryTypeSubPath;
     ExpectNotKnown("its clip is not known", false);
 }
 
-TEST_F(AspectRatioLookup, IsNotKnownIfTheClipInformationIsDamaged)
+TEST_F(AspectRatioLookup, IsUnknownIfTheClipInformationIsDamaged)
 {
     fs::resize_file(PathOf("CLIPINF/00000.clpi"), 50);
     ExpectNotKnown("BDMV/CLIPINF/00000.clpi: offset ", true);
@@ -242,7 +242,7 @@ TEST_F(AspectRatioLookup, IsReadOncePerClip)
     EXPECT_EQ(ratios.Find(m_PlayList, 0, Video()).code, 2);
 }
 
-TEST_F(DiscFiles, FindsThePlayListThatPlaysLongest)
+TEST_F(DiscFiles, FindsTheLongestPlayList)
 {
     WritePlayList("00000", 10);
     WritePlayList("00001", 30);
@@ -253,7 +253,7 @@ TEST_F(DiscFiles, FindsThePlayListThatPlaysLongest)
     EXPECT_TRUE(longest.unreadable.empty());
 }
 
-TEST_F(DiscFiles, FindsTheLowestOfThePlayListsThatPlayLongest)
+TEST_F(DiscFiles, FindsTheLowestNumberAmongTheLongestPlayLists)
 {
     WritePlayList("00002", 20);
     WritePlayList("00001", 20);
@@ -261,13 +261,13 @@ TEST_F(DiscFiles, FindsTheLowestOfThePlayListsThatPlayLongest)
     EXPECT_EQ(MakeDisc().FindLongestPlayList().number, 1u);
 }
 
-TEST_F(DiscFiles, FindsAPlayListThatPlaysNothingIfThereIsNoOther)
+TEST_F(DiscFiles, FindsAnEmptyPlayListIfThereIsNoOther)
 {
     Write("PLAYLIST/00003.mpls", PlayListBytes().Make());
     EXPECT_EQ(MakeDisc().FindLongestPlayList().number, 3u);
 }
 
-TEST_F(DiscFiles, SaysWhichPlayListsWereLeftOutOfTheSearch)
+TEST_F(DiscFiles, ReportsTheSkippedPlayLists)
 {
     Write("PLAYLIST/00000.mpls", Ascii("damaged"));
     WritePlayList("00001", 10);

@@ -1,6 +1,6 @@
 /**
  * @file
- * Expecting exceptions with a certain message.
+ * Returns the messages of expected exceptions.
  */
 #ifndef TESTS_DESKPLAYER_DISC_EXPECTEDERROR_H
 #define TESTS_DESKPLAYER_DISC_EXPECTEDERROR_H
@@ -11,10 +11,10 @@
 namespace deskplayer
 {
 
-/** what() of the FormatError that @p operation throws; a failure if it throws none. */
+/** what() of the FormatError that @p operation throws; fails the test if it throws none. */
 std::string FormatErrorOf(const std::function<void()>& operation);
 
-/** what() of the FileError that @p operation throws; a failure if it throws none. */
+/** what() of the FileError that @p operation throws; fails the test if it throws none. */
 std::string FileErrorOf(const std::function<void()>& operation);
 
 } // namespace deskplayer

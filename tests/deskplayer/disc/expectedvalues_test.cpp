@@ -21,7 +21,7 @@ class EveryDisc : public testing::TestWithParam<std::filesystem::path>
 protected:
     EveryDisc() : m_Disc(GetParam()) { std::ifstream(GetParam() / "expected.json") >> m_Expected; }
 
-    /** Says where two values differ, as a patch that turns the value read into the expected one. */
+    /** Reports differences as a patch that converts the value read to the expected one. */
     static void Compare(const json& read, const json& expected)
     {
         EXPECT_EQ(json::diff(read, expected).dump(1), "[]");

@@ -26,7 +26,7 @@ Bytes WithTitle(const Bytes& title)
     return IndexBytes(Part32(Zeros(34)), Part32(Join({Nothing, Nothing, U16(1), title})));
 }
 
-TEST(ParseIndex, ReadsWhatIsPreferredAndPresent)
+TEST(ParseIndex, ReadsPreferenceAndPresenceOfStereoscopicContent)
 {
     const Bytes indexes = Part32(Join({Nothing, Nothing, U16(0)}));
     Index index = ParseIndex(IndexBytes(Part32({0x40, 0x84}), indexes), FileName);
@@ -40,7 +40,7 @@ TEST(ParseIndex, ReadsWhatIsPreferredAndPresent)
     EXPECT_TRUE(index.stereoscopicContent);
 }
 
-TEST(ParseIndex, ReadsAMovieObjectTitleBesidePadding)
+TEST(ParseIndex, ReadsAMovieObjectTitleNextToPadding)
 {
     const Bytes title = Join({U32(0x6FFFFFFF), U16(0x7FFF), U16(0x1234), U32(0xFFFFFFFF)});
     const Index index = ParseIndex(WithTitle(title), FileName);
@@ -64,7 +64,7 @@ TEST(ParseIndex, ReadsAJavaTitle)
     EXPECT_EQ(index.titles[0].movieObject, 0u);
 }
 
-TEST(ParseIndex, TellsFirstPlaybackFromTopMenu)
+TEST(ParseIndex, DistinguishesFirstPlaybackFromTopMenu)
 {
     const auto object = [](unsigned number) {
         return Join({U32(0x40000000), U16(0), U16(number), U32(0)});
@@ -76,7 +76,7 @@ TEST(ParseIndex, TellsFirstPlaybackFromTopMenu)
     EXPECT_TRUE(index.titles.empty());
 }
 
-TEST(ParseIndex, RefusesMoreTitlesThanThereAre)
+TEST(ParseIndex, RefusesMoreTitlesThanFollow)
 {
     const Bytes bytes =
         IndexBytes(Part32(Zeros(34)), Part32(Join({Nothing, Nothing, U16(65535), Nothing})));

@@ -1,6 +1,6 @@
 /**
  * @file
- * What the reader gives, in the form of the discs' expected.json.
+ * Converts the reader's values to the form of the discs' expected.json.
  */
 #ifndef TESTS_DESKPLAYER_DISC_JSON_H
 #define TESTS_DESKPLAYER_DISC_JSON_H
@@ -18,7 +18,7 @@
 namespace deskplayer
 {
 
-/** Tells the aspect ratio of a video stream of a play item. */
+/** Returns the aspect ratio of a video stream of a play item. */
 using AspectRatioLookup =
     std::function<std::optional<std::uint8_t>(std::size_t playItem, const Stream& stream)>;
 

@@ -18,7 +18,7 @@ Bytes MovieObjectBytes(unsigned count, const Bytes& objects)
     return Join({Ascii("MOBJ0200"), Zeros(32), Part32(Join({Zeros(4), U16(count), objects}))});
 }
 
-TEST(ParseMovieObjects, ReadsEachFlagBesidePadding)
+TEST(ParseMovieObjects, ReadsEachFlagNextToPadding)
 {
     const MovieObjects movieObjects = ParseMovieObjects(
         MovieObjectBytes(3, Join({U16(0x9FFF), U16(0), U16(0x5FFF), U16(0), U16(0x3FFF), U16(0)})),
@@ -35,7 +35,7 @@ TEST(ParseMovieObjects, ReadsEachFlagBesidePadding)
     EXPECT_TRUE(movieObjects.objects[2].titleSearchMask);
 }
 
-TEST(ParseMovieObjects, PassesOverCommands)
+TEST(ParseMovieObjects, SkipsCommands)
 {
     const MovieObjects movieObjects = ParseMovieObjects(
         MovieObjectBytes(2, Join({U16(0), U16(2), Repeat(24, {0xFF}), U16(0x8000), U16(0)})),
@@ -45,7 +45,7 @@ TEST(ParseMovieObjects, PassesOverCommands)
     EXPECT_TRUE(movieObjects.objects[1].resumeIntention);
 }
 
-TEST(ParseMovieObjects, RefusesMoreObjectsThanThereAre)
+TEST(ParseMovieObjects, RefusesMoreObjectsThanFollow)
 {
     EXPECT_EQ(
         FormatErrorOf([&] { ParseMovieObjects(MovieObjectBytes(65535, Zeros(8)), FileName); }),
@@ -53,7 +53,7 @@ TEST(ParseMovieObjects, RefusesMoreObjectsThanThereAre)
         "most 2 in the 8 bytes left in movie object section");
 }
 
-TEST(ParseMovieObjects, RefusesMoreCommandsThanThereAre)
+TEST(ParseMovieObjects, RefusesMoreCommandsThanFollow)
 {
     const Bytes objects = Join({U16(0), U16(2), Zeros(23)});
     EXPECT_EQ(FormatErrorOf([&] { ParseMovieObjects(MovieObjectBytes(1, objects), FileName); }),

@@ -14,7 +14,7 @@ namespace
 
 const std::string FileName = "BDMV/PLAYLIST/00000.mpls";
 
-// Where things are in the files PlayListBytes makes.
+// Offsets in the files that PlayListBytes makes.
 constexpr std::size_t SectionOffset = 58;
 constexpr std::size_t FirstItemOffset = SectionOffset + 10;
 
@@ -28,7 +28,7 @@ PlayItem ParseItem(const PlayItemBytes& item)
     return Parse(WithItem(item)).playItems.at(0);
 }
 
-/** The only stream of a play item, which is audio by its place. */
+/** The only stream of a play item, listed as audio. */
 Stream ParseStream(const Bytes& entry, const Bytes& attributes)
 {
     return Parse(WithStreams({0, 1, 0, 0, 0, 0, 0, 0}, Join({entry, attributes})))
@@ -113,7 +113,7 @@ TEST(ParsePlayList, RefusesAnEmptyFile)
               "type indicator");
 }
 
-TEST(ParsePlayList, RefusesAddressesInTheHeaderOrBehindTheEnd)
+TEST(ParsePlayList, RefusesAddressesInTheHeaderOrPastTheEnd)
 {
     for (const unsigned field : {8u, 12u, 16u}) {
         for (const std::uint32_t address : {1u, 39u, 1000u, 0x80000000u, 0xFFFFFFFFu}) {
@@ -124,7 +124,7 @@ TEST(ParsePlayList, RefusesAddressesInTheHeaderOrBehindTheEnd)
     }
 }
 
-TEST(ParsePlayList, NamesTheAddressThatIsWrong)
+TEST(ParsePlayList, NamesTheInvalidAddress)
 {
     Bytes bytes = PlayListBytes().Make();
     Overwrite(bytes, 12, U32(3));
@@ -150,7 +150,7 @@ TEST(ParsePlayList, ReadsSectionsInAnyOrderAndWithGaps)
     EXPECT_EQ(playList.marks[0].time, 1005u);
 }
 
-TEST(ParsePlayList, ReadsEachFlagOfTheApplicationInfoBesidePadding)
+TEST(ParsePlayList, ReadsEachFlagOfTheApplicationInfoNextToPadding)
 {
     const auto parse = [](unsigned flags) {
         PlayListBytes bytes;
@@ -169,7 +169,7 @@ TEST(ParsePlayList, ReadsEachFlagOfTheApplicationInfoBesidePadding)
     EXPECT_EQ(parse(0).uoMask, 1u);
 }
 
-TEST(ParsePlayList, ReadsThePlaybackCountOfRandomAndShuffleOnly)
+TEST(ParsePlayList, ReadsThePlaybackCountOnlyOfRandomAndShuffle)
 {
     const auto countWith = [](unsigned playbackType) {
         PlayListBytes bytes;
@@ -181,7 +181,7 @@ TEST(ParsePlayList, ReadsThePlaybackCountOfRandomAndShuffleOnly)
     EXPECT_EQ(countWith(PlaybackTypeShuffle), 1234u);
 }
 
-TEST(ParsePlayList, ReadsAPlayItemBesidePadding)
+TEST(ParsePlayList, ReadsAPlayItemNextToPadding)
 {
     PlayItemBytes bytes;
     bytes.clip = "98765";
@@ -208,7 +208,7 @@ TEST(ParsePlayList, ReadsAPlayItemBesidePadding)
     EXPECT_TRUE(item.furtherAngles.empty());
 }
 
-TEST(ParsePlayList, IgnoresPaddingBesideTheRandomAccessFlagOfAPlayItem)
+TEST(ParsePlayList, IgnoresPaddingNextToTheRandomAccessFlagOfAPlayItem)
 {
     PlayItemBytes bytes;
     bytes.randomAccess = 0x7F;
@@ -262,17 +262,17 @@ TEST(ParsePlayList, ShowsARefusedClipNameInPrintableForm)
                               "\"\\x1B[2J\\x0A\", but expected five digits");
 }
 
-TEST(ParsePlayList, SkipsWhatFollowsTheKnownPartOfAPlayItem)
+TEST(ParsePlayList, SkipsUnknownContentAtTheEndOfAPlayItem)
 {
     PlayItemBytes bytes;
-    bytes.behind = Repeat(100, {0xEE});
+    bytes.trailing = Repeat(100, {0xEE});
     PlayListBytes playList;
     playList.itemCount = 2;
     playList.items = Join({bytes.Make(), PlayItemBytes().Make()});
     EXPECT_EQ(Parse(playList).playItems.at(1).clip.name, "00001");
 }
 
-TEST(ParsePlayList, ReadsAnAngleTableAndTheStreamsBehindIt)
+TEST(ParsePlayList, ReadsAnAngleTableAndTheStreamsAfterIt)
 {
     PlayItemBytes bytes;
     bytes.angleAndConnection = 0x0015;
@@ -297,7 +297,7 @@ TEST(ParsePlayList, ReadsAnAngleTableAndTheStreamsBehindIt)
     EXPECT_TRUE(item.seamlessAngleChange);
 }
 
-TEST(ParsePlayList, TakesAnAngleCountOfZeroOrOneForNoFurtherAngles)
+TEST(ParsePlayList, TreatsAnAngleCountOfZeroOrOneAsNoFurtherAngles)
 {
     for (const unsigned count : {0u, 1u}) {
         PlayItemBytes bytes;
@@ -318,7 +318,7 @@ TEST(ParsePlayList, RefusesAnAngleThatIsNotAClip)
                               "expected five digits");
 }
 
-TEST(ParsePlayList, RefusesMoreAnglesThanThereAre)
+TEST(ParsePlayList, RefusesMoreAnglesThanFollow)
 {
     PlayItemBytes bytes;
     bytes.angleAndConnection = 0x0011;
@@ -329,13 +329,13 @@ TEST(ParsePlayList, RefusesMoreAnglesThanThereAre)
 
 TEST(ParsePlayList, ReadsTheKindsOfStreamsInFileOrder)
 {
-    // The counts come in another order than the streams.
+    // The order of the counts differs from that of the streams.
     const Bytes counts{1, 2, 3, 4, 5, 6, 7, 8};
     Bytes streams;
     unsigned pid = 0;
-    const auto add = [&](unsigned count, const Bytes& behind) {
+    const auto add = [&](unsigned count, const Bytes& references) {
         for (; count > 0; --count) {
-            streams = Join({streams, AudioStream(++pid), behind});
+            streams = Join({streams, AudioStream(++pid), references});
         }
     };
     add(1, {});       // primary video
@@ -359,7 +359,7 @@ TEST(ParsePlayList, ReadsTheKindsOfStreamsInFileOrder)
     EXPECT_EQ(PidsOf(table.enhancementVideo), (Pids{29, 30, 31, 32, 33, 34, 35, 36}));
 }
 
-TEST(ParsePlayList, TakesTheEighthStreamCountForPaddingBeforeVersion0300)
+TEST(ParsePlayList, TreatsTheEighthStreamCountAsPaddingBeforeVersion0300)
 {
     for (const char* const version : {"0100", "0200", "0240"}) {
         PlayListBytes bytes = WithStreams({0, 0, 0, 0, 0, 0, 0, 255}, AudioStream(1));
@@ -368,7 +368,7 @@ TEST(ParsePlayList, TakesTheEighthStreamCountForPaddingBeforeVersion0300)
     }
 }
 
-TEST(ParsePlayList, RefusesMoreStreamsThanThereAre)
+TEST(ParsePlayList, RefusesMoreStreamsThanFollow)
 {
     for (std::size_t kind = 0; kind < 8; ++kind) {
         Bytes counts = Zeros(8);
@@ -380,7 +380,7 @@ TEST(ParsePlayList, RefusesMoreStreamsThanThereAre)
     }
 }
 
-TEST(ParsePlayList, NamesTheStreamThatIsCutOff)
+TEST(ParsePlayList, NamesTheTruncatedStream)
 {
     const Bytes entry = Part8({EntryTypePlayItem, 0x11});
     const Bytes streams = Join({AudioStream(0x1100), entry, StreamAttributesBytes(0x81, Zeros(4))});
@@ -431,7 +431,7 @@ TEST(ParsePlayList, KeepsAStreamOfReservedEntryType)
     EXPECT_EQ(stream.attributes.codingType, 0x80u);
 }
 
-TEST(ParsePlayList, ReadsVideoAttributesBesidePadding)
+TEST(ParsePlayList, ReadsVideoAttributesNextToPadding)
 {
     const StreamAttributes attributes = ParseAttributes(0x1B, {0x64, 0xFF, 0xFF, 0xFF});
     EXPECT_EQ(attributes.videoFormat, 6u);
@@ -501,7 +501,7 @@ TEST(ParsePlayList, ReadsReferenceListsOfOddAndEvenLength)
     EXPECT_TRUE(table.secondaryVideo[0].primaryAudioReferences.empty());
 }
 
-TEST(ParsePlayList, RefusesMoreReferencesThanThereAre)
+TEST(ParsePlayList, RefusesMoreReferencesThanFollow)
 {
     EXPECT_EQ(ErrorOf(WithStreams({0, 0, 0, 0, 1, 0, 0, 0}, Join({AudioStream(1), {200, 0, 1}}))),
               "BDMV/PLAYLIST/00000.mpls: offset 134: number of references is 200, but expected at "
@@ -525,7 +525,7 @@ TEST(ParsePlayList, RefusesAPlayItemLongerThanTheSection)
               "most the 48 bytes left in play list section");
 }
 
-TEST(ParsePlayList, RefusesMorePlayItemsThanThereAre)
+TEST(ParsePlayList, RefusesMorePlayItemsThanFollow)
 {
     PlayListBytes bytes = WithItem(PlayItemBytes());
     bytes.itemCount = 65535;
@@ -533,7 +533,7 @@ TEST(ParsePlayList, RefusesMorePlayItemsThanThereAre)
                               "but expected at most 1 in the 52 bytes left in play list section");
 }
 
-TEST(ParsePlayList, RefusesMoreSubPathsThanThereAre)
+TEST(ParsePlayList, RefusesMoreSubPathsThanFollow)
 {
     PlayListBytes bytes = WithItem(PlayItemBytes());
     bytes.subPathCount = 1;
@@ -554,7 +554,7 @@ TEST(ParsePlayList, IgnoresSubPathsBeyondTheCount)
     EXPECT_EQ(playList.subPaths[0].type, 5u);
 }
 
-TEST(ParsePlayList, ReadsTheRepeatFlagOfASubPathBesidePadding)
+TEST(ParsePlayList, ReadsTheRepeatFlagOfASubPathNextToPadding)
 {
     PlayListBytes bytes;
     bytes.subPathCount = 2;
@@ -564,7 +564,7 @@ TEST(ParsePlayList, ReadsTheRepeatFlagOfASubPathBesidePadding)
     EXPECT_FALSE(playList.subPaths.at(1).repeat);
 }
 
-TEST(ParsePlayList, ReadsASubPlayItemBesidePadding)
+TEST(ParsePlayList, ReadsASubPlayItemNextToPadding)
 {
     SubPlayItemBytes bytes;
     bytes.clip = "00077";
@@ -581,7 +581,7 @@ TEST(ParsePlayList, ReadsASubPlayItemBesidePadding)
     EXPECT_EQ(item.connectionCondition, 5u);
     EXPECT_EQ(item.inTime, 11u);
     EXPECT_EQ(item.outTime, 22u);
-    EXPECT_EQ(item.syncPlayItem, 333u) << "kept, though there is no such play item";
+    EXPECT_EQ(item.syncPlayItem, 333u) << "kept, although there is no such play item";
     EXPECT_EQ(item.syncTime, 44u);
     EXPECT_TRUE(item.furtherClips.empty());
 }
@@ -607,7 +607,7 @@ TEST(ParsePlayList, RefusesASubPlayItemThatEndsBeforeItStarts)
     EXPECT_THROW(ParseSubPlayItem(bytes), FormatError);
 }
 
-TEST(ParsePlayList, RefusesMoreSubPlayItemsThanThereAre)
+TEST(ParsePlayList, RefusesMoreSubPlayItemsThanFollow)
 {
     PlayListBytes bytes;
     bytes.subPathCount = 1;
@@ -626,20 +626,20 @@ TEST(ParsePlayList, ReadsMarks)
     EXPECT_EQ(playList.marks[0].type, MarkTypeEntry);
     EXPECT_EQ(playList.marks[0].pid, MarkForAllStreams);
     EXPECT_EQ(playList.marks[1].type, MarkTypeLink);
-    EXPECT_EQ(playList.marks[1].playItem, 500u) << "kept, though there is no such play item";
+    EXPECT_EQ(playList.marks[1].playItem, 500u) << "kept, although there is no such play item";
     EXPECT_EQ(playList.marks[1].time, 1001u);
     EXPECT_EQ(playList.marks[1].pid, 0x1011u);
     EXPECT_EQ(playList.marks[1].duration, 45000u);
 }
 
-TEST(ParsePlayList, TakesAMarkSectionOfLengthZeroForNoMarks)
+TEST(ParsePlayList, TreatsAMarkSectionOfLengthZeroAsNoMarks)
 {
     PlayListBytes bytes;
     bytes.marks = Join({U32(0), U16(7)});
     EXPECT_TRUE(Parse(bytes).marks.empty());
 }
 
-TEST(ParsePlayList, RefusesMoreMarksThanThereAre)
+TEST(ParsePlayList, RefusesMoreMarksThanFollow)
 {
     PlayListBytes bytes;
     bytes.marks = Part32(Join({U16(65535), MarkBytes(1, 0, 0)}));
@@ -661,21 +661,21 @@ TEST(ParsePlayList, ReadsTheDirectoryOfTheExtensionData)
     EXPECT_EQ(playList.extensionBlocks[1].size, 0xFFFFFFFFu) << "kept, because it is not read";
 }
 
-TEST(ParsePlayList, TakesExtensionDataOfLengthZeroForAnEmptyDirectory)
+TEST(ParsePlayList, TreatsExtensionDataOfLengthZeroAsAnEmptyDirectory)
 {
     PlayListBytes bytes;
     bytes.extension = Join({U32(0), Repeat(20, {1})});
     EXPECT_TRUE(Parse(bytes).extensionBlocks.empty());
 }
 
-TEST(ParsePlayList, RefusesMoreExtensionBlocksThanThereAre)
+TEST(ParsePlayList, RefusesMoreExtensionBlocksThanFollow)
 {
     PlayListBytes bytes;
     bytes.extension = Part32(Join({Zeros(7), U8(2), Zeros(23)}));
     EXPECT_THROW(Parse(bytes), FormatError);
 }
 
-/** A play list whose streams come from all the places there are. */
+/** A play list with streams from every possible source. */
 class ClipLookup : public testing::Test
 {
 protected:
@@ -726,7 +726,7 @@ TEST_F(ClipLookup, IsTheClipOfTheFirstSubPlayItemThatStartsInThePlayItem)
     EXPECT_EQ(Clip(1, EntryTypeSubPath), "00010");
 }
 
-TEST_F(ClipLookup, IsTheClipOfTheOnlySubPlayItemWhereverThatStarts)
+TEST_F(ClipLookup, IsTheClipOfTheOnlySubPlayItemWhereverItStarts)
 {
     EXPECT_EQ(Clip(1, EntryTypeSubPath, 1), "00020");
 }
@@ -737,7 +737,7 @@ TEST_F(ClipLookup, IsTheClipOfTheSubPlayItemThatTheStreamNames)
     EXPECT_EQ(Clip(0, EntryTypeSubPath, 1, 2), "00022");
 }
 
-TEST_F(ClipLookup, IsNothingIfThereIsNoSuchThing)
+TEST_F(ClipLookup, IsNothingIfTheReferenceIsInvalid)
 {
     EXPECT_EQ(Clip(2, EntryTypePlayItem), std::nullopt) << "no such play item";
     EXPECT_EQ(Clip(0, EntryTypeSubPath), std::nullopt) << "none of the sub play items starts there";

@@ -55,7 +55,7 @@ std::vector<fs::path> FilesBelow(const fs::path& folder, const std::string& exte
     return files;
 }
 
-Bytes ContentOf(const fs::path& path)
+Bytes ReadContents(const fs::path& path)
 {
     std::ifstream stream(path, std::ios::binary);
     return Bytes(std::istreambuf_iterator<char>(stream), std::istreambuf_iterator<char>());

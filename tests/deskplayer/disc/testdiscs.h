@@ -1,7 +1,7 @@
 /**
  * @file
- * The discs the tests read: those in tests/discs, and those in the folder that the environment
- * variable BDMVNAVIGATOR_DISCS names, if it does.
+ * The discs that the tests read: those in tests/discs, and those in the folder named by the
+ * environment variable BDMVNAVIGATOR_DISCS, if it is set.
  */
 #ifndef TESTS_DESKPLAYER_DISC_TESTDISCS_H
 #define TESTS_DESKPLAYER_DISC_TESTDISCS_H
@@ -15,10 +15,10 @@
 namespace deskplayer
 {
 
-/** Folders of the discs in tests/discs, each with BDMV and expected.json in it. */
+/** Folders of the discs in tests/discs, each with BDMV and expected.json. */
 std::vector<std::filesystem::path> TestDiscs();
 
-/** Folders of the discs in the folder that BDMVNAVIGATOR_DISCS names; none if it is not set. */
+/** Folders of the discs in the folder named by BDMVNAVIGATOR_DISCS; none if it is not set. */
 std::vector<std::filesystem::path> FurtherDiscs();
 
 /** The folder of the disc @p name of tests/discs. */
@@ -28,9 +28,9 @@ std::filesystem::path TestDisc(const std::string& name);
 std::vector<std::filesystem::path> FilesBelow(const std::filesystem::path& folder,
                                               const std::string& extension);
 
-Bytes ContentOf(const std::filesystem::path& path);
+Bytes ReadContents(const std::filesystem::path& path);
 
-/** Makes the file, or writes it anew. */
+/** Creates or replaces the file. */
 void WriteBytes(const std::filesystem::path& path, const Bytes& bytes);
 
 } // namespace deskplayer

@@ -8,7 +8,7 @@ namespace deskplayer
 namespace
 {
 
-/** A play list of two items of 100 and 50 ticks, whose clips start at 1000 and 5000. */
+/** A play list of two items of 100 and 50 ticks whose clips start at 1000 and 5000. */
 class TimeLines : public testing::Test
 {
 protected:
@@ -36,7 +36,7 @@ protected:
     PlayList m_PlayList;
 };
 
-TEST_F(TimeLines, PutsItemsBehindEachOther)
+TEST_F(TimeLines, PutsItemsInSequence)
 {
     const TimeLine timeLine = BuildTimeLine(m_PlayList);
     EXPECT_EQ(timeLine.itemStarts, (std::vector<Ticks>{Ticks(0), Ticks(100)}));
@@ -61,27 +61,27 @@ TEST_F(TimeLines, HasDurationsThatDoNotFitInThirtyTwoBits)
     EXPECT_EQ(timeLine.itemStarts.back(), Ticks(65534u * 0xFFFFFFFFull));
 }
 
-TEST_F(TimeLines, PutsAMarkWhereItsClipTimePlays)
+TEST_F(TimeLines, PutsAMarkAtThePositionOfItsClipTime)
 {
     EXPECT_EQ(PositionOfMark(0, 1000), Ticks(0));
     EXPECT_EQ(PositionOfMark(0, 1099), Ticks(99));
     EXPECT_EQ(PositionOfMark(1, 5020), Ticks(120));
 }
 
-TEST_F(TimeLines, CountsOutAsPartOfTheItem)
+TEST_F(TimeLines, TreatsOutAsPartOfTheItem)
 {
     EXPECT_EQ(PositionOfMark(0, 1100), Ticks(100));
     EXPECT_EQ(PositionOfMark(1, 5050), Ticks(150));
 }
 
-TEST_F(TimeLines, HasNoPositionForAMarkOutsideOfItsItem)
+TEST_F(TimeLines, HasNoPositionForAMarkOutsideItsItem)
 {
     EXPECT_EQ(PositionOfMark(0, 999), std::nullopt);
     EXPECT_EQ(PositionOfMark(0, 1101), std::nullopt);
     EXPECT_EQ(PositionOfMark(2, 1000), std::nullopt) << "no such play item";
 }
 
-TEST_F(TimeLines, MakesChaptersOfMarksOfTypeEntryOnly)
+TEST_F(TimeLines, MakesChaptersOnlyOfEntryMarks)
 {
     AddMark(MarkTypeEntry, 0, 1000);
     AddMark(MarkTypeLink, 0, 1030);
@@ -98,7 +98,7 @@ TEST_F(TimeLines, MakesChaptersOfMarksOfTypeEntryOnly)
     EXPECT_EQ(timeLine.chapters[1].end, Ticks(150u));
 }
 
-TEST_F(TimeLines, KeepsTheNumberOfAChapterBehindAMarkWithoutPosition)
+TEST_F(TimeLines, KeepsTheNumberOfAChapterAfterAMarkWithoutPosition)
 {
     AddMark(MarkTypeEntry, 0, 1000);
     AddMark(MarkTypeEntry, 0, 0);
@@ -109,7 +109,7 @@ TEST_F(TimeLines, KeepsTheNumberOfAChapterBehindAMarkWithoutPosition)
     EXPECT_EQ(timeLine.chapters[1].number, 3u);
 }
 
-TEST_F(TimeLines, MakesAChapterEmptyIfTheNextMarkLiesBeforeIt)
+TEST_F(TimeLines, MakesAChapterEmptyIfTheNextMarkIsBeforeIt)
 {
     AddMark(MarkTypeEntry, 1, 5000);
     AddMark(MarkTypeEntry, 0, 1000);

@@ -22,10 +22,10 @@ touch "$folder"/disc/BDMV/PLAYLIST/{00000,00008,00080,00800,12345}.mpls \
     "$folder"/{evening.session,evening.json,notes.txt}
 cd "$folder" || exit 1
 
-# Options of readline belong to a completion that is going on.
+# The real compopt works only during a completion.
 compopt() { readline_options+=("$2"); }
 
-# complete_words WORD...: completes the last of the words behind the program.
+# complete_words WORD...: completes the last of the words after the program.
 complete_words() {
     COMP_WORDS=(bdmv-deskplayer "$@")
     COMP_CWORD=$#
@@ -33,7 +33,7 @@ complete_words() {
     _bdmv_deskplayer
 }
 
-# expect OFFERED WORD...: what completing the last of the words offers, in any order.
+# expect OFFERED WORD...: completing the last of the words must offer OFFERED, in any order.
 expect() {
     local expected=$1
     shift
@@ -45,7 +45,7 @@ expect() {
     exit 1
 }
 
-# same WHAT ONE OTHER: two lists of lines.
+# same WHAT ONE OTHER: two lists of lines must be equal.
 same() {
     [ -n "$2" ] && [ "$2" = "$3" ] && return
     printf '%s\n' "$1 differ:"
@@ -71,7 +71,7 @@ OffersPlayListsOfTheDiscOnTheCommandLine() {
     expect '0 12345 8 80 800' --format = json disc --playlist =
 }
 
-OffersPlayListsOfADiscWithBlanksInItsName() {
+OffersPlayListsOfADiscWithABlankInItsName() {
     expect '7' 'a\ disc' --playlist ''
     expect '7' '"a disc"' --playlist ''
 }
@@ -87,7 +87,7 @@ OffersNoPlayListsWithoutADisc() {
     expect '' missing --playlist ''
 }
 
-RunsNothingThatIsOnTheCommandLine() {
+ExecutesNothingFromTheCommandLine() {
     for word in '$(touch run)' '`touch run`' '"$(touch run)"' 'a[$(touch run)]'; do
         for option in --playlist --describe --session --format --output --listen --only --log --l; do
             complete_words "$word" $option ''
@@ -148,7 +148,7 @@ OffersFoldersForTheDisc() {
     [[ ${readline_options[*]} == filenames ]]
 }
 
-OffersNothingBehindTheDisc() {
+OffersNothingAfterTheDisc() {
     expect '' disc ''
     expect '' --playlist 1 disc d
 }
@@ -158,7 +158,7 @@ OffersNothingForTheLog() {
     expect '' --log e
 }
 
-StaysInTheWordOfAList() {
+KeepsCompletingTheSameWordInAList() {
     complete_words --only ''
     [[ ${readline_options[*]} == nospace ]] || exit 1
     complete_words --listen control,

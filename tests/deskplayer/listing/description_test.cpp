@@ -29,7 +29,7 @@ std::string DescriptionOf(const Disc& disc, std::uint32_t number)
     return output.str();
 }
 
-/** What a play list with @p bytes is described as, on the disc "pip". */
+/** The description of a play list with @p bytes on the disc "pip". */
 std::string DescriptionOf(const Bytes& bytes)
 {
     const ScratchDisc scratch("pip");
@@ -89,7 +89,7 @@ TEST(DescribePlayList, ShowsEveryValueOfEveryPlayList)
     EXPECT_GE(playLists, 23u);
 }
 
-/** Nobody knows whether a stream of a reserved entry type belongs to a sub path. */
+/** It is unknown whether a stream of a reserved entry type belongs to a sub path. */
 void RemoveSubPathsOfReservedEntryTypes(json& playList)
 {
     for (json& item : playList.at("items")) {
@@ -103,7 +103,7 @@ void RemoveSubPathsOfReservedEntryTypes(json& playList)
     }
 }
 
-/** A play list with two of everything, of the kinds that discs seldom have too. */
+/** A play list with two of everything, including kinds that are rare on discs. */
 Bytes RichPlayList()
 {
     const Bytes counts{2, 1, 3, 1, 1, 1, 1, 1};
@@ -189,7 +189,7 @@ Bytes RichPlayList()
     return playList.Make();
 }
 
-TEST(DescribePlayList, ShowsWhicheverByteIsChanged)
+TEST(DescribePlayList, ShowsAChangeOfAnyByte)
 {
     const ScratchDisc scratch("pip");
     const Disc disc = scratch.Read();
@@ -221,7 +221,7 @@ TEST(DescribePlayList, ShowsWhicheverByteIsChanged)
     EXPECT_GT(compared, 800u);
 }
 
-TEST(DescribePlayList, SaysWhatTheValuesMean)
+TEST(DescribePlayList, ExplainsTheValues)
 {
     EXPECT_EQ(
         DescriptionOf(RichPlayList()),
@@ -292,7 +292,7 @@ TEST(DescribePlayList, MarksReservedCodes)
     }
 }
 
-TEST(DescribePlayList, IsSafeToPrintWhateverTheTextOfADiscIs)
+TEST(DescribePlayList, IsSafeToPrintForAnyTextOnADisc)
 {
     PlayItemBytes item;
     item.angleAndConnection = 0x11;
@@ -320,7 +320,7 @@ std::string AspectOfVideo(const ScratchDisc& scratch, unsigned pid, const std::s
     return text.substr(begin, text.find('\n', begin) - begin);
 }
 
-TEST(DescribePlayList, SaysWhyAnAspectRatioIsNotKnown)
+TEST(DescribePlayList, GivesTheReasonForAnUnknownAspectRatio)
 {
     const ScratchDisc scratch("pip");
     EXPECT_EQ(AspectOfVideo(scratch, 0x1011, "00000"), "aspect 3 (16:9)");
@@ -335,7 +335,7 @@ TEST(DescribePlayList, SaysWhyAnAspectRatioIsNotKnown)
               0u);
 }
 
-TEST(DescribePlayList, LooksForAnAspectRatioInTheClipOfThePlayItem)
+TEST(DescribePlayList, LooksUpAnAspectRatioInTheClipOfThePlayItem)
 {
     PlayItemBytes item;
     item.clip = "00009";
@@ -355,7 +355,7 @@ Bytes VideoOfProgram(unsigned pid, unsigned aspect)
     return Join({U16(pid), Part8(Join({U8(0x1B), U8(0x61), U8(aspect << 4), Zeros(18)}))});
 }
 
-TEST(DescribePlayList, TakesTheFirstOfTwoVideoStreamsWithAPid)
+TEST(DescribePlayList, UsesTheFirstOfTwoVideoStreamsWithTheSamePid)
 {
     const ScratchDisc scratch("pip");
     const Bytes videos = Join({VideoOfProgram(0x1011, 2), VideoOfProgram(0x1011, 3)});
@@ -363,7 +363,7 @@ TEST(DescribePlayList, TakesTheFirstOfTwoVideoStreamsWithAPid)
     EXPECT_EQ(AspectOfVideo(scratch, 0x1011, "00000"), "aspect 2 (4:3)");
 }
 
-/** A play list of almost LargestPlayListFile bytes, as full of play items or marks as it can be. */
+/** A play list of almost LargestPlayListFile bytes, filled with play items or marks. */
 Bytes GreatPlayList(const Bytes& item, const Bytes& mark)
 {
     PlayListBytes playList;
@@ -375,7 +375,7 @@ Bytes GreatPlayList(const Bytes& item, const Bytes& mark)
     return playList.Make();
 }
 
-TEST(DescribePlayList, WritesTheGreatestPlayListsPromptlyAndBitByBit)
+TEST(DescribePlayList, WritesTheLargestPlayListsPromptlyAndInSmallPieces)
 {
     PlayItemBytes item;
     item.clip = "00000";
@@ -398,7 +398,7 @@ TEST(DescribePlayList, WritesTheGreatestPlayListsPromptlyAndBitByBit)
         DescribePlayList(output, disc, 0, disc.ReadPlayList(0));
         EXPECT_LT((std::clock() - before) / CLOCKS_PER_SEC, 30);
         EXPECT_GT(buffer.Size(), 2500000u);
-        EXPECT_LT(buffer.GreatestPiece(), 1000u);
+        EXPECT_LT(buffer.LargestWrite(), 1000u);
     }
 }
 

@@ -1,6 +1,6 @@
 /**
  * @file
- * A place for output that nobody looks at.
+ * A stream buffer that discards its output.
  */
 #ifndef TESTS_DESKPLAYER_LISTING_DISCARDINGBUFFER_H
 #define TESTS_DESKPLAYER_LISTING_DISCARDINGBUFFER_H
@@ -12,12 +12,12 @@
 namespace deskplayer
 {
 
-/** Keeps nothing of what is written but how much it was, and how much at once. */
+/** Discards everything written; records the total size and the largest single write. */
 class DiscardingBuffer : public std::streambuf
 {
 public:
     std::size_t Size() const { return m_Size; }
-    std::size_t GreatestPiece() const { return m_GreatestPiece; }
+    std::size_t LargestWrite() const { return m_LargestWrite; }
 
 private:
     int_type overflow(int_type character) override
@@ -35,11 +35,11 @@ private:
     void Add(std::size_t size)
     {
         m_Size += size;
-        m_GreatestPiece = std::max(m_GreatestPiece, size);
+        m_LargestWrite = std::max(m_LargestWrite, size);
     }
 
     std::size_t m_Size = 0;
-    std::size_t m_GreatestPiece = 0;
+    std::size_t m_LargestWrite = 0;
 };
 
 } // namespace deskplayer

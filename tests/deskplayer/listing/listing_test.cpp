@@ -35,7 +35,7 @@ std::string ListingOf(const Disc& disc)
     return output.str();
 }
 
-/** What stands under the headings, for the play list with @p bytes and number 0. */
+/** The row of play list 0 with @p bytes. */
 Lines RowsOf(const Bytes& bytes)
 {
     const ScratchDisc scratch("pip");
@@ -62,7 +62,7 @@ Bytes WithSubtitles(const Lines& languages)
     return WithStreams({0, 0, count, 0, 0, 0, 0, 0}, streams).Make();
 }
 
-/** What an index says, taken from its lines. */
+/** The values of an index, parsed from its lines. */
 class ListedIndex
 {
 public:
@@ -198,7 +198,7 @@ void AddLanguageLine(Lines& lines, const std::string& label, const json& streams
     }
 }
 
-/** The lines of a play list without the one that tells of other streams; see there. */
+/** The lines of a play list without the one about other streams, which has its own tests. */
 Lines ExpectedStreams(const json& streams)
 {
     Lines lines;
@@ -223,7 +223,7 @@ Lines ExpectedStreams(const json& streams)
     return lines;
 }
 
-/** The whole part of the listing that is about a play list. */
+/** The complete row of a play list in the listing. */
 std::string ExpectedRows(const std::string& number, const json& playList)
 {
     std::size_t chapters = 0;
@@ -295,7 +295,7 @@ Number  Duration      Items  Chapters  Angles  Streams
 )");
 }
 
-TEST(ListPlayLists, TellsThatOtherPlayItemsHaveOtherStreamsThanTheLongest)
+TEST(ListPlayLists, CountsPlayItemsWithOtherStreamsThanTheLongest)
 {
     PlayItemBytes shorter;
     PlayItemBytes alike;
@@ -313,7 +313,7 @@ TEST(ListPlayLists, TellsThatOtherPlayItemsHaveOtherStreamsThanTheLongest)
     EXPECT_EQ(rows[1], std::string(47, ' ') + "other streams in 1 of 3 play items");
 }
 
-TEST(ListPlayLists, DoesNotTellOfOtherStreamsIfOnlyPidsDiffer)
+TEST(ListPlayLists, IgnoresDifferencesInPidsOnly)
 {
     PlayItemBytes item;
     item.streamTable = StreamTableBytes({0, 1, 0, 0, 0, 0, 0, 0}, AudioStream(0x1100));
@@ -370,7 +370,7 @@ TEST(ListPlayLists, BreaksLongListsOfLanguages)
     EXPECT_EQ(rows[1], std::string(58, ' ') + "Japanese, Dutch, Swedish");
 }
 
-TEST(ListPlayLists, BreaksALineBeforeItIsTooLong)
+TEST(ListPlayLists, BreaksALineBeforeItBecomesTooLong)
 {
     const Lines rows = RowsOf(WithSubtitles({"eng", "fra", "deu", "spa", "est", "ita"}));
     ASSERT_EQ(rows.size(), 2u);
@@ -391,7 +391,7 @@ TEST(ListPlayLists, ShowsAPlayListWithoutPlayItems)
               Lines{"00000   00:00:00.000      0         0       0"});
 }
 
-TEST(ListPlayLists, SaysThatAnAspectRatioIsNotKnown)
+TEST(ListPlayLists, ReportsAnUnknownAspectRatio)
 {
     const Bytes video = Join({StreamEntry(0x1011), StreamAttributesBytes(0x1B, {0x61, 0, 0, 0})});
     const Lines rows = RowsOf(WithStreams({1, 0, 0, 0, 0, 0, 0, 0}, video).Make());
@@ -399,7 +399,7 @@ TEST(ListPlayLists, SaysThatAnAspectRatioIsNotKnown)
               "video: H.264 video, 1080p, 23.976 Hz, aspect ratio not known");
 }
 
-TEST(ListPlayLists, LooksForAnAspectRatioInTheClipOfThePlayItem)
+TEST(ListPlayLists, LooksUpAnAspectRatioInTheClipOfThePlayItem)
 {
     PlayItemBytes item;
     item.clip = "00009";
@@ -416,7 +416,7 @@ TEST(ListPlayLists, LooksForAnAspectRatioInTheClipOfThePlayItem)
               "video: H.264 video, 1080p, 23.976 Hz, 16:9");
 }
 
-TEST(ListPlayLists, CountsThePlayListsThatCannotBeReadAndSaysWhy)
+TEST(ListPlayLists, CountsUnreadablePlayListsAndGivesTheReasons)
 {
     const ScratchDisc scratch("pip");
     scratch.Write("PLAYLIST/00001.mpls", Ascii("INDX"));
@@ -435,14 +435,14 @@ TEST(ListPlayLists, CountsThePlayListsThatCannotBeReadAndSaysWhy)
         << listing;
 }
 
-TEST(ListPlayLists, CountsNothingIfAllPlayListsCanBeRead)
+TEST(ListPlayLists, CountsNoUnreadablePlayListsIfAllCanBeRead)
 {
     const Disc disc(TestDisc("titles"));
     std::ostringstream output;
     EXPECT_EQ(ListPlayLists(output, disc, disc.PlayListNumbers()), 0u);
 }
 
-TEST(ListPlayLists, GoesOnWithoutAnIndex)
+TEST(ListPlayLists, ContinuesWithoutAnIndex)
 {
     const ScratchDisc scratch("pip");
     scratch.Remove("index.bdmv");
@@ -452,7 +452,7 @@ TEST(ListPlayLists, GoesOnWithoutAnIndex)
             "^Index {11}[^\n]*index\\.bdmv: [^\n]+\n\nNumber [^\n]*\n00000   00:01:00\\.018")));
 }
 
-TEST(ListPlayLists, GoesOnBehindAnIndexThatCannotBeRead)
+TEST(ListPlayLists, ContinuesAfterAnUnreadableIndex)
 {
     const ScratchDisc scratch("pip");
     scratch.Write("index.bdmv", Ascii("MOBJ0200"));
@@ -467,7 +467,7 @@ Bytes IndexObjectBytes(unsigned objectType, unsigned playbackType)
                  Zeros(3)});
 }
 
-TEST(ListPlayLists, ShowsAnIndexOfWhateverValues)
+TEST(ListPlayLists, ShowsAnIndexWithAnyValues)
 {
     const Bytes info = Part32(Join({U8(0x60), U8(0x59), Zeros(32)}));
     const Bytes titles = Join({IndexObjectBytes(1, 2), IndexObjectBytes(2, 3)});
@@ -487,7 +487,7 @@ TEST(ListPlayLists, ShowsAnIndexOfWhateverValues)
               "Title 2         Java object ab\\x1B, interactive, title search permitted\n");
 }
 
-TEST(ListPlayLists, SaysThatThereIsNoPlayList)
+TEST(ListPlayLists, ReportsThatThereAreNoPlayLists)
 {
     const ScratchDisc scratch("pip");
     scratch.Remove("PLAYLIST/00000.mpls");
@@ -495,7 +495,7 @@ TEST(ListPlayLists, SaysThatThereIsNoPlayList)
     EXPECT_EQ(listing.substr(listing.find("\n\n")), "\n\nThere are no play lists.\n");
 }
 
-TEST(ListPlayLists, WritesTheGreatestPlayListsPromptly)
+TEST(ListPlayLists, WritesTheLargestPlayListsPromptly)
 {
     PlayItemBytes item;
     item.clip = "00000";

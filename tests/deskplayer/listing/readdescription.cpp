@@ -28,7 +28,7 @@ std::string WithoutMeanings(const std::string& text)
     return rest;
 }
 
-/** Turns \xNN into the byte it stands for. */
+/** Converts \xNN to the byte it represents. */
 std::string Unescaped(const std::string& text)
 {
     std::string bytes;
@@ -43,7 +43,7 @@ std::string Unescaped(const std::string& text)
     return bytes;
 }
 
-/** A line taken apart: how deep it stands, "mark", "3", and its fields. */
+/** A parsed line: its depth, "mark", "3", and its fields. */
 class Line
 {
 public:
@@ -103,7 +103,7 @@ public:
         return text == "yes";
     }
 
-    /** Numbers from 0, of numbers from 1. */
+    /** Converts numbers from 1 to numbers from 0. */
     json Numbers(const std::string& name) const
     {
         json numbers = json::array();
@@ -217,7 +217,7 @@ const std::map<std::string, const char*> g_StreamKinds = {
     {"enhancement video", "dv"},
 };
 
-/** Appends to a list; the line must have the number that is due. */
+/** Appends to a list; the line must have the next number. */
 void Append(json& list, const Line& line, std::size_t first, const json& value)
 {
     if (line.Number() != list.size() + first) {

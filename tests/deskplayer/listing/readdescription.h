@@ -1,6 +1,6 @@
 /**
  * @file
- * Takes a description of a play list apart again.
+ * Parses a description of a play list.
  */
 #ifndef TESTS_DESKPLAYER_LISTING_READDESCRIPTION_H
 #define TESTS_DESKPLAYER_LISTING_READDESCRIPTION_H
@@ -13,10 +13,10 @@ namespace deskplayer
 {
 
 /**
- * The values a description shows, in the form of a play list in a disc's expected.json, and its
- * chapters besides. What stands in parentheses is passed over.
+ * The values in a description, in the form of a play list in a disc's expected.json, and its
+ * chapters. Text in parentheses is skipped.
  *
- * @throw std::runtime_error a line or a value is not as it should be
+ * @throw std::runtime_error a line or a value is malformed
  */
 nlohmann::json ReadDescription(const std::string& description);
 

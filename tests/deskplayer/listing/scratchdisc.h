@@ -1,6 +1,6 @@
 /**
  * @file
- * A disc of its own for every test, a copy of one of tests/discs, to be changed.
+ * A copy of a disc in tests/discs that a test can change.
  */
 #ifndef TESTS_DESKPLAYER_LISTING_SCRATCHDISC_H
 #define TESTS_DESKPLAYER_LISTING_SCRATCHDISC_H
@@ -13,7 +13,7 @@
 namespace deskplayer
 {
 
-/** Lies in the folder for temporary files, and leaves nothing there. */
+/** A temporary folder, deleted by the destructor. */
 class ScratchDisc
 {
 public:
@@ -23,7 +23,7 @@ public:
     ScratchDisc(const ScratchDisc&) = delete;
     ScratchDisc& operator=(const ScratchDisc&) = delete;
 
-    /** Replaces or adds a file, "PLAYLIST/00000.mpls". */
+    /** Replaces or adds a file, such as "PLAYLIST/00000.mpls". */
     void Write(const std::string& name, const Bytes& content) const;
 
     void Remove(const std::string& name) const;

@@ -4,7 +4,7 @@
 
 #include <sstream>
 
-#include "rooms.h"
+#include "parts.h"
 
 namespace deskplayer
 {
@@ -22,16 +22,16 @@ PlayItem PoorItem(std::uint32_t seconds)
 class AnnouncerOnThreeItems : public testing::Test
 {
 protected:
-    EventRooms rooms{ListOf({RichItem(10), RichItem(10), PoorItem(10)},
+    EventParts parts{ListOf({RichItem(10), RichItem(10), PoorItem(10)},
                             {Entry(0, Ticks(0)), Entry(1, Ticks(0))})};
-    Announcer announcer{rooms.playhead, rooms.state, rooms.context, rooms.sender};
+    Announcer announcer{parts.playhead, parts.state, parts.context, parts.sender};
 
     /** The names of the callbacks since the last call. */
     std::string TakeNames()
     {
-        std::istringstream heard(rooms.Take());
+        std::istringstream received(parts.Take());
         std::string names;
-        for (std::string line; std::getline(heard, line);) {
+        for (std::string line; std::getline(received, line);) {
             names += line.substr(2, line.find('(') - 2) + " ";
         }
         return names;
@@ -54,7 +54,7 @@ TEST_F(AnnouncerOnThreeItems, AnnouncesOnlyTheItemWhenNothingElseDiffers)
 {
     announcer.AnnounceItem();
     TakeNames();
-    rooms.playhead.Enter(1);
+    parts.playhead.Enter(1);
 
     announcer.AnnounceItem();
 
@@ -72,11 +72,11 @@ TEST_F(AnnouncerOnThreeItems, AnnouncesEverythingAgainAfterForgetting)
     EXPECT_EQ(TakeNames(), first);
 }
 
-TEST_F(AnnouncerOnThreeItems, AnnouncesThatStreamsAreGone)
+TEST_F(AnnouncerOnThreeItems, AnnouncesMissingStreams)
 {
     announcer.AnnounceItem();
     TakeNames();
-    rooms.playhead.Enter(2);
+    parts.playhead.Enter(2);
 
     announcer.AnnounceStreams();
 
@@ -87,12 +87,12 @@ TEST_F(AnnouncerOnThreeItems, AnnouncesThatStreamsAreGone)
               "TextSubtitleStylesAvailable ");
 }
 
-TEST_F(AnnouncerOnThreeItems, AnnouncesSyncStreamsAtNormalSpeedOnly)
+TEST_F(AnnouncerOnThreeItems, AnnouncesSyncStreamsOnlyAtNormalSpeed)
 {
     announcer.AnnounceSyncStreams();
     EXPECT_EQ(TakeNames(), "PictureInPictureAvailable SecondaryAudioAvailable ");
 
-    rooms.state.currentPlayMode = bd::PlayMode(bd::PlayDirectionForward, bd::PlaySpeedFast1);
+    parts.state.currentPlayMode = bd::PlayMode(bd::PlayDirectionForward, bd::PlaySpeedFast1);
     announcer.AnnounceSyncStreams();
     EXPECT_EQ(TakeNames(), "PictureInPictureUnavailable SecondaryAudioUnavailable ");
 
@@ -104,7 +104,7 @@ TEST_F(AnnouncerOnThreeItems, AnnouncesAChangeOfTheSelectedAudio)
 {
     announcer.AnnounceItem();
     TakeNames();
-    rooms.state.selection.audio = 2;
+    parts.state.selection.audio = 2;
 
     announcer.AnnounceStreams();
 
@@ -117,7 +117,7 @@ TEST_F(AnnouncerOnThreeItems, AnnouncesTheMenuWhenItsAvailabilityChanges)
     announcer.AnnounceMenu();
     EXPECT_EQ(TakeNames(), "PopUpMenuAvailable ");
 
-    rooms.playhead.Enter(2);
+    parts.playhead.Enter(2);
     announcer.AnnounceMenu();
     EXPECT_EQ(TakeNames(), "PopUpMenuUnavailable ");
 }
@@ -129,7 +129,7 @@ TEST_F(AnnouncerOnThreeItems, AnnouncesAChapterOnce)
     announcer.AnnounceChapter();
     announcer.AnnounceChapter();
 
-    EXPECT_EQ(rooms.Take(), "A.ChapterNumber(1)\n");
+    EXPECT_EQ(parts.Take(), "A.ChapterNumber(1)\n");
     EXPECT_EQ(announcer.AnnouncedChapter(), 1);
 }
 

@@ -30,7 +30,7 @@ private:
     const Desk& m_rDesk;
 };
 
-TEST(Desk, WakesUpWithTheResumeDataThatItKeeps)
+TEST(Desk, WakesUpWithTheResumeDataThatItStored)
 {
     Desk desk(LayOut(7, ListOf({Item(10)})));
     ResumeCounter counter(desk);
@@ -45,7 +45,7 @@ TEST(Desk, WakesUpWithTheResumeDataThatItKeeps)
     desk.Listeners().RemoveListener(&counter);
 }
 
-TEST(Desk, KeepsTheResumeDataBeforeAnyOtherListenerIsNotified)
+TEST(Desk, StoresTheResumeDataBeforeOtherListenersAreNotified)
 {
     Desk desk(LayOut(7, ListOf({Item(10)})));
     ResumeCounter counter(desk);

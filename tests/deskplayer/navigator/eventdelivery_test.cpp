@@ -32,7 +32,7 @@ protected:
     }
 };
 
-TEST_F(DeliveryThread, DeliversInOrderOnAThreadOfItsOwn)
+TEST_F(DeliveryThread, DeliversInOrderOnItsOwnThread)
 {
     std::thread::id thread;
     listener.onCallback = [&thread](const std::string&) { thread = std::this_thread::get_id(); };
@@ -48,14 +48,14 @@ TEST_F(DeliveryThread, DeliversInOrderOnAThreadOfItsOwn)
     EXPECT_NE(thread, std::this_thread::get_id());
 }
 
-TEST_F(DeliveryThread, SettlesAtOnceWhenNothingIsUnderWay)
+TEST_F(DeliveryThread, SettlesAtOnceIfNothingWasPosted)
 {
     delivery->Settle();
 
     EXPECT_EQ(journal.Take(), "");
 }
 
-TEST_F(DeliveryThread, HandsOnWhatAListenerThrewAndGoesOnDelivering)
+TEST_F(DeliveryThread, RethrowsTheExceptionOfAListenerAndContinuesDelivering)
 {
     listener.onCallback = [](const std::string& callback) {
         if (callback == "Paused()") {
@@ -74,7 +74,7 @@ TEST_F(DeliveryThread, HandsOnWhatAListenerThrewAndGoesOnDelivering)
     EXPECT_NO_THROW(delivery->Settle());
 }
 
-TEST_F(DeliveryThread, DeliversWhatIsQueuedBeforeItEnds)
+TEST_F(DeliveryThread, DeliversQueuedEventsBeforeItEnds)
 {
     for (int i = 0; i < 100; ++i) {
         Post<bdmv::PausedEvent>();

@@ -44,7 +44,7 @@ TEST(LoadedPlayList, TakesAspectRatiosFromTheClips)
     EXPECT_EQ(trailer.aspectRatios, std::vector<std::optional<std::uint8_t>>(1, 2));
 }
 
-TEST(LoadedPlayList, NeedsNoClips)
+TEST(LoadedPlayList, LoadsWithoutClips)
 {
     PlayItem withoutVideo = Item(10);
     withoutVideo.streams.primaryVideo.clear();
@@ -54,7 +54,7 @@ TEST(LoadedPlayList, NeedsNoClips)
     EXPECT_EQ(loaded.aspectRatios, std::vector<std::optional<std::uint8_t>>(2, std::nullopt));
 }
 
-/** A play list of the longest duration and @p more. */
+/** A play list that is @p more longer than the maximum. */
 PlayList LongestAnd(Ticks more)
 {
     std::vector<PlayItem> items(10, Item(10 * 3600));
@@ -62,7 +62,7 @@ PlayList LongestAnd(Ticks more)
     return ListOf(items);
 }
 
-TEST(LoadedPlayList, LastsAHundredHoursAtMost)
+TEST(LoadedPlayList, LastsAtMostAHundredHours)
 {
     const LoadedPlayList longest = LoadPlayList(SampleDisc(), 1, LongestAnd(Ticks(0)));
     EXPECT_EQ(longest.timeLine.duration, LongestDuration);

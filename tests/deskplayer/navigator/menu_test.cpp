@@ -9,7 +9,7 @@ namespace deskplayer
 namespace
 {
 
-/** A rich item with chapters at 0, 3 and 6 seconds, and one without a menu behind it. */
+/** A rich item with chapters at 0, 3 and 6 seconds, followed by an item without a menu. */
 PlayList ThreeChapters()
 {
     return ListOf({RichItem(10), Item(10)}, {Entry(0, Ticks(0)), Link(0, Second),
@@ -29,8 +29,8 @@ std::string Activation(int ticket, int button)
            "1 JumpOccurred()\n";
 }
 
-/** Keeps the programs of buttons. */
-class ProgramKeeper : public bdmv::NavigatorListenerAdapter
+/** Records the programs of buttons. */
+class ProgramRecorder : public bdmv::NavigatorListenerAdapter
 {
 public:
     void ExecuteButton(bd::UInt32 /*ticket*/, bd::ButtonId /*buttonId*/,
@@ -56,7 +56,7 @@ TEST(Menu, IsOpenedAndClosed)
     EXPECT_TRUE(desk.navigator.OpenPopUpMenu().IsDone());
 }
 
-TEST(Menu, IsRefusedWhenItIsOpenOrWhenThereIsNone)
+TEST(Menu, IsRefusedIfAlreadyOpenOrMissing)
 {
     TestDesk desk(ThreeChapters());
     desk.Start();
@@ -68,7 +68,7 @@ TEST(Menu, IsRefusedWhenItIsOpenOrWhenThereIsNone)
     EXPECT_EQ(desk.Take(), "");
 }
 
-TEST(Menu, IsClosedByAnItemWithoutOne)
+TEST(Menu, IsClosedByAnItemWithoutAMenu)
 {
     TestDesk desk(ThreeChapters());
     desk.Start();
@@ -76,16 +76,16 @@ TEST(Menu, IsClosedByAnItemWithoutOne)
 
     desk.navigator.Advance(10 * Second);
 
-    const std::string heard = desk.Take();
-    EXPECT_NE(heard.find("10 InteractiveGraphicsInvisible()\n"
-                         "10 InteractiveGraphicsInactive()\n"
-                         "10 PopUpMenuUnavailable()\n"),
+    const std::string received = desk.Take();
+    EXPECT_NE(received.find("10 InteractiveGraphicsInvisible()\n"
+                            "10 InteractiveGraphicsInactive()\n"
+                            "10 PopUpMenuUnavailable()\n"),
               std::string::npos)
-        << heard;
+        << received;
     EXPECT_EQ(desk.navigator.ClosePopUpMenu().Reason(), "no menu is open");
 }
 
-TEST(Menu, StaysOpenInTheNextItemThatHasOne)
+TEST(Menu, StaysOpenIfTheNextItemHasAMenu)
 {
     TestDesk desk(ListOf({RichItem(1), RichItem(1)}));
     desk.Start();
@@ -111,7 +111,7 @@ TEST(Menu, IsClosedByStop)
                            "1 Stopped()\n");
 }
 
-TEST(Menu, ActivatesTheButtonOfTheChapterInPlayback)
+TEST(Menu, ActivatesTheButtonOfTheCurrentChapter)
 {
     TestDesk desk(ThreeChapters());
     desk.Start();
@@ -126,7 +126,7 @@ TEST(Menu, ActivatesTheButtonOfTheChapterInPlayback)
     EXPECT_EQ(desk.navigator.ActivateButton().Reason(), "no menu is open");
 }
 
-TEST(Menu, MovesBetweenButtonsWithoutTelling)
+TEST(Menu, MovesBetweenButtonsWithoutCallbacks)
 {
     TestDesk desk(ThreeChapters());
     desk.Start(Second);
@@ -178,7 +178,7 @@ TEST(Menu, SelectsAButtonAndActivatesIt)
                                               "1 CurrentTimePosition(270000)\n");
 }
 
-TEST(Menu, GivesEveryActivationATicketOfItsOwn)
+TEST(Menu, GivesEveryActivationItsOwnTicket)
 {
     TestDesk desk(ThreeChapters());
     desk.Start(Second);
@@ -189,11 +189,11 @@ TEST(Menu, GivesEveryActivationATicketOfItsOwn)
     }
 }
 
-TEST(Menu, HandsOutAProgramThatClosesTheMenuAndPlaysTheMarkOfTheChapter)
+TEST(Menu, PassesOnAProgramThatClosesTheMenuAndPlaysTheMarkOfTheChapter)
 {
     TestDesk desk(ListOf({RichItem(10)}, {Entry(0, Ticks(0)), Link(0, Ticks(1)), Link(0, Ticks(2)),
                                           Entry(0, 3 * Second)}));
-    ProgramKeeper keeper;
+    ProgramRecorder keeper;
     desk.desk.Listeners().AddListener(&keeper);
     desk.Start();
     desk.Do(desk.navigator.OpenPopUpMenu());
@@ -229,9 +229,9 @@ TEST(Menu, SelectsTheFirstButtonBeforeTheFirstChapter)
     EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), 3 * Second);
 }
 
-TEST(Menu, CountsItsButtonsWithoutGapsWhereChapterNumbersHaveThem)
+TEST(Menu, NumbersItsButtonsWithoutGapsEvenIfChapterNumbersHaveGaps)
 {
-    // The first mark has no position, so that the chapters are number 2 and 3.
+    // The first mark has no position, so the chapters are numbered 2 and 3.
     TestDesk desk(
         ListOf({RichItem(10)}, {Entry(9, Ticks(0)), Entry(0, Ticks(0)), Entry(0, 6 * Second)}));
     desk.Start();
@@ -244,7 +244,7 @@ TEST(Menu, CountsItsButtonsWithoutGapsWhereChapterNumbersHaveThem)
     EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), 6 * Second);
 }
 
-TEST(Menu, HasNoButtonsWhereThereAreNoChapters)
+TEST(Menu, HasNoButtonsWithoutChapters)
 {
     TestDesk desk(ListOf({RichItem(10)}));
     desk.Start();
@@ -255,7 +255,7 @@ TEST(Menu, HasNoButtonsWhereThereAreNoChapters)
     EXPECT_EQ(desk.Take(), "");
 }
 
-TEST(Menu, WaitsWhilePlaybackIsSuspended)
+TEST(Menu, RefusesOperationsWhilePlaybackIsSuspended)
 {
     TestDesk desk(ThreeChapters());
     desk.Start();
@@ -275,7 +275,7 @@ TEST(Menu, WaitsWhilePlaybackIsSuspended)
     EXPECT_TRUE(desk.navigator.ClosePopUpMenu().IsDone());
 }
 
-TEST(ButtonProgram, HasNoCommandBehindItsLast)
+TEST(ButtonProgram, HasNoCommandAfterItsLast)
 {
     const ButtonProgram program({ButtonCommand(bdmv::INavigationCommandData::CommandNop)});
 
@@ -293,7 +293,7 @@ TEST(ButtonProgram, CanBeEmpty)
     EXPECT_EQ(program.GetNavigationCommandData(0), nullptr);
 }
 
-TEST(ButtonCommand, HasZeroForOperandsThatAreNotGiven)
+TEST(ButtonCommand, HasZeroForOmittedOperands)
 {
     const ButtonCommand command(bdmv::INavigationCommandData::CommandStillOff);
     bool isImmediate1 = false;

@@ -1,4 +1,4 @@
-// Play lists as no studio makes them, but as a file can say.
+// Play lists that no studio makes but that a file can contain.
 
 #include <gtest/gtest.h>
 
@@ -82,7 +82,7 @@ TEST(OddPlayList, PlaysThroughMarksThatAreNotInOrder)
                                            "3 Finished(EndOfMedia)\n");
 }
 
-TEST(OddPlayList, LeavesOutMarksThatAreNowhere)
+TEST(OddPlayList, IgnoresMarksWithoutAPosition)
 {
     TestDesk desk(
         ListOf({Item(1)}, {Entry(5, Ticks(0)), Link(0, 2 * Second), Entry(0, Ticks(10))}));
@@ -95,7 +95,7 @@ TEST(OddPlayList, LeavesOutMarksThatAreNowhere)
                                            "1 Finished(EndOfMedia)\n");
 }
 
-TEST(OddPlayList, TellsTheMarksWhereAnItemEndsAndTheNextStartsEachInItsItem)
+TEST(OddPlayList, AnnouncesMarksWhereTwoItemsMeetEachInItsItem)
 {
     TestDesk desk(ListOf({WithTimedStill(Item(1), 5), Item(1)},
                          {Entry(1, Ticks(0)), Link(0, Second), Link(1, Ticks(0))}));
@@ -113,7 +113,7 @@ TEST(OddPlayList, TellsTheMarksWhereAnItemEndsAndTheNextStartsEachInItsItem)
               "6 ChapterNumber(1)\n");
 }
 
-TEST(OddPlayList, TellsAChapterAtTheEndOfAnItemWithItsMark)
+TEST(OddPlayList, AnnouncesAChapterAtTheEndOfAnItemWithItsMark)
 {
     TestDesk desk(ListOf({Item(1), Item(1)}, {Entry(0, Ticks(0)), Entry(0, Second)}));
     desk.Start();
@@ -140,7 +140,7 @@ TEST(OddPlayList, TellsAChapterAtTheEndOfAnItemWithItsMark)
               "1+3 ChapterNumber(2)\n");
 }
 
-TEST(OddPlayList, TellsAChapterAtTheEndOfThePlayListOnceWithItsMark)
+TEST(OddPlayList, AnnouncesAChapterAtTheEndOfThePlayListOnceWithItsMark)
 {
     TestDesk desk(ListOf({Item(2)}, {Entry(0, Ticks(0)), Entry(0, 2 * Second)}));
     desk.Start();
@@ -160,7 +160,7 @@ TEST(OddPlayList, TellsAChapterAtTheEndOfThePlayListOnceWithItsMark)
                            "2 Finished(EndOfMedia)\n");
 }
 
-TEST(OddPlayList, HasAllStreamsThereCanBe)
+TEST(OddPlayList, HandlesTheMaximumNumberOfStreams)
 {
     PlayItem item = Item(1);
     item.streams.primaryAudio.assign(255, StreamOf(CodingAc3));
@@ -173,7 +173,7 @@ TEST(OddPlayList, HasAllStreamsThereCanBe)
 }
 
 /**
- * A play list drawn by lot: short items, some without length, some with stills, and marks anywhere.
+ * A random play list: short items, some without length, some with stills, and marks anywhere.
  */
 PlayList DrawPlayList(std::mt19937& lot)
 {
@@ -196,7 +196,7 @@ PlayList DrawPlayList(std::mt19937& lot)
     return playList;
 }
 
-/** Carries out an operation drawn by lot, whatever becomes of it. */
+/** Carries out a random operation, which may be refused. */
 void PerformAny(TestDesk& desk, std::mt19937& lot)
 {
     const Command& command = Commands()[lot() % Commands().size()];

@@ -2,7 +2,7 @@
 
 #include <gtest/gtest.h>
 
-#include "rooms.h"
+#include "parts.h"
 
 namespace deskplayer
 {
@@ -21,18 +21,18 @@ PlayList ForbiddingList()
 class PermissionWhilePlaying : public testing::Test
 {
 protected:
-    PermissionWhilePlaying() { rooms.state.status = Status::Playing; }
+    PermissionWhilePlaying() { parts.state.status = Status::Playing; }
 
-    StateRooms rooms{ForbiddingList()};
-    const Permission permission{rooms.playhead, rooms.state};
+    StateParts parts{ForbiddingList()};
+    const Permission permission{parts.playhead, parts.state};
 };
 
-TEST_F(PermissionWhilePlaying, IsGivenForWhatNothingForbids)
+TEST_F(PermissionWhilePlaying, IsGivenIfNothingForbidsTheOperation)
 {
     EXPECT_TRUE(permission.CheckMask(bd::UserOperationChapterSearch).IsDone());
 }
 
-TEST_F(PermissionWhilePlaying, NamesWhatForbidsAnOperation)
+TEST_F(PermissionWhilePlaying, NamesThePlayListOrItemThatForbidsAnOperation)
 {
     EXPECT_EQ(permission.CheckMask(bd::UserOperationTimeSearch).Reason(),
               "TimeSearch is forbidden by play list 7");
@@ -45,11 +45,11 @@ TEST_F(PermissionWhilePlaying, NamesWhatForbidsAnOperation)
 TEST_F(PermissionWhilePlaying, IsGivenWhileNothingPlays)
 {
     for (const Status status : {Status::Stopped, Status::Standby, Status::Finished}) {
-        rooms.state.status = status;
+        parts.state.status = status;
         EXPECT_TRUE(permission.CheckMask(bd::UserOperationStop).IsDone());
     }
     for (const Status status : {Status::Paused, Status::Still, Status::Suspended}) {
-        rooms.state.status = status;
+        parts.state.status = status;
         EXPECT_FALSE(permission.CheckMask(bd::UserOperationStop).IsDone());
     }
 }
@@ -62,15 +62,15 @@ TEST_F(PermissionWhilePlaying, DependsOnTheStatus)
               "not paused or in a still, but playing");
 }
 
-TEST_F(PermissionWhilePlaying, IsActiveWhileThereIsAPicture)
+TEST_F(PermissionWhilePlaying, IsActiveWhileAPictureIsShown)
 {
     for (const Status status : {Status::Playing, Status::Paused, Status::Still}) {
-        rooms.state.status = status;
+        parts.state.status = status;
         EXPECT_TRUE(permission.CheckActive().IsDone());
     }
     for (const Status status :
          {Status::Stopped, Status::Suspended, Status::Standby, Status::Finished}) {
-        rooms.state.status = status;
+        parts.state.status = status;
         EXPECT_FALSE(permission.CheckActive().IsDone());
     }
 }

@@ -8,7 +8,7 @@ namespace deskplayer
 namespace
 {
 
-TEST(Playback, TellsEverythingAboutTheFirstItemWhenItStarts)
+TEST(Playback, AnnouncesEverythingAboutTheFirstItemAtTheStart)
 {
     TestDesk desk(ListOf({RichItem(10)}, {Entry(0, Ticks(0))}));
 
@@ -44,7 +44,7 @@ TEST(Playback, TellsEverythingAboutTheFirstItemWhenItStarts)
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Playing);
 }
 
-TEST(Playback, LeavesOutWhatThePlayListDoesNotHave)
+TEST(Playback, DoesNotAnnounceWhatThePlayListLacks)
 {
     TestDesk desk(ListOf({Item(10)}));
 
@@ -60,7 +60,7 @@ TEST(Playback, LeavesOutWhatThePlayListDoesNotHave)
                            "0 CurrentTimePosition(0)\n");
 }
 
-TEST(Playback, PlaysItsItemsOneAfterTheOtherAndFinishes)
+TEST(Playback, PlaysItsItemsInSequenceAndFinishes)
 {
     TestDesk desk(ListOf({Item(2), Item(1)}));
     desk.Start();
@@ -76,7 +76,7 @@ TEST(Playback, PlaysItsItemsOneAfterTheOtherAndFinishes)
     EXPECT_EQ(desk.clock.Now(), 3 * Second);
 }
 
-TEST(Playback, TellsAtTheNextItemOnlyWhatIsDifferentThere)
+TEST(Playback, AnnouncesOnlyTheDifferencesAtTheNextItem)
 {
     PlayItem other = Forbidding(RichItem(1), {bd::UserOperationStop});
     other.streams.primaryAudio.pop_back();
@@ -95,7 +95,7 @@ TEST(Playback, TellsAtTheNextItemOnlyWhatIsDifferentThere)
               "2 PopUpMenuUnavailable()\n");
 }
 
-TEST(Playback, TellsThePositionAtEveryFullSecondOfIt)
+TEST(Playback, AnnouncesThePositionEverySecond)
 {
     TestDesk desk(ListOf({Item(10)}));
     desk.Start();
@@ -107,7 +107,7 @@ TEST(Playback, TellsThePositionAtEveryFullSecondOfIt)
                            "1+22500 CurrentTimePosition(90000)\n");
 }
 
-TEST(Playback, TellsMarksAndChaptersWhereTheyLie)
+TEST(Playback, AnnouncesMarksAndChaptersAtTheirPositions)
 {
     TestDesk desk(ListOf({Item(2), Item(2)},
                          {Entry(0, Ticks(0)), Link(0, Ticks(100)), Entry(1, Ticks(100))}));
@@ -122,7 +122,7 @@ TEST(Playback, TellsMarksAndChaptersWhereTheyLie)
               "2+100 ChapterNumber(2)\n");
 }
 
-TEST(Playback, TellsEveryMarkOfOnePositionInTheOrderOfThePlayList)
+TEST(Playback, AnnouncesMarksAtTheSamePositionInPlayListOrder)
 {
     TestDesk desk(
         ListOf({Item(2)}, {Link(0, Ticks(100)), Entry(0, Ticks(100)), Link(0, Ticks(100))}));
@@ -136,7 +136,7 @@ TEST(Playback, TellsEveryMarkOfOnePositionInTheOrderOfThePlayList)
                            "0+100 ChapterNumber(1)\n");
 }
 
-TEST(Playback, TellsTheMarkAtTheStartOfAnItemWithThatItem)
+TEST(Playback, AnnouncesTheMarkAtTheStartOfAnItemWithThatItem)
 {
     TestDesk desk(ListOf({Item(1), Item(1)}, {Entry(1, Ticks(0))}));
     desk.Start();
@@ -149,7 +149,7 @@ TEST(Playback, TellsTheMarkAtTheStartOfAnItemWithThatItem)
               "1 ChapterNumber(1)\n");
 }
 
-TEST(Playback, StartsFromTheBeginningAfterAStopAndTellsEverythingAgain)
+TEST(Playback, StartsFromTheBeginningAfterAStopAndAnnouncesEverythingAgain)
 {
     TestDesk desk(ListOf({Item(10)}, {Entry(0, Ticks(0))}));
     desk.navigator.Play();
@@ -173,7 +173,7 @@ TEST(Playback, StartsFromTheBeginningAfterAStopAndTellsEverythingAgain)
     EXPECT_EQ(desk.Take(), secondStart);
 }
 
-TEST(Playback, StartsAtNormalSpeedAndWithoutRepeatButWithTheStreamsThatWereChosen)
+TEST(Playback, StartsAtNormalSpeedWithoutRepeatAndWithTheSelectedStreams)
 {
     TestDesk desk(ListOf({RichItem(10)}, {Entry(0, Ticks(0))}));
     desk.Start();
@@ -210,7 +210,7 @@ TEST(Playback, FinishesAtOnceWhenThereIsNothingToPlay)
     EXPECT_EQ(desk.navigator.Advance(Second), Second);
 }
 
-TEST(Playback, FailsToStartOnceWhenToldTo)
+TEST(Playback, FailsToStartOnceOnRequest)
 {
     TestDesk desk(ListOf({Item(10)}));
     desk.navigator.FailNextPlay();
@@ -223,7 +223,7 @@ TEST(Playback, FailsToStartOnceWhenToldTo)
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Playing);
 }
 
-TEST(Playback, StandsStillWhilePaused)
+TEST(Playback, HoldsItsPositionWhilePaused)
 {
     TestDesk desk(ListOf({Item(10)}));
     desk.Start(4 * Second);
@@ -254,7 +254,7 @@ TEST(Playback, StepsByOnePictureInTheDirectionOfPlay)
                            "1 Stepped(45900, PlayDirectionBackward)\n");
 }
 
-TEST(Playback, StepsAsLongAsAPictureIsShown)
+TEST(Playback, StepsByTheDurationOfAPicture)
 {
     const struct {
         std::uint8_t frameRate;
@@ -274,7 +274,7 @@ TEST(Playback, StepsAsLongAsAPictureIsShown)
     }
 }
 
-TEST(Playback, TellsAllThatAStepPasses)
+TEST(Playback, AnnouncesEverythingThatAStepPasses)
 {
     TestDesk desk(
         ListOf({Item(10)}, {Entry(0, Ticks(0)), Entry(0, Second - Ticks(500)),
@@ -304,7 +304,7 @@ TEST(Playback, TellsAllThatAStepPasses)
                            "0+44500 Stepped(45399, PlayDirectionBackward)\n");
 }
 
-TEST(Playback, TellsWhatLiesWhereAStepEnds)
+TEST(Playback, AnnouncesMarksAndChaptersWhereAStepEnds)
 {
     TestDesk desk(ListOf({Item(10)}, {Entry(0, Ticks(0)), Entry(0, Ticks(900))}));
     desk.Start();
@@ -373,7 +373,7 @@ TEST(Playback, RefusesToStepOutOfAnItem)
     EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), Second);
 }
 
-TEST(Playback, LeavesATimedStillByItself)
+TEST(Playback, LeavesATimedStillAfterItsTime)
 {
     TestDesk desk(ListOf({WithTimedStill(Item(1), 5), Item(1)}));
     desk.Start();
@@ -387,7 +387,7 @@ TEST(Playback, LeavesATimedStillByItself)
               "7 Finished(EndOfMedia)\n");
 }
 
-TEST(Playback, CountsATimedStillInTimeOfTheSessionAtAnySpeed)
+TEST(Playback, MeasuresATimedStillInSessionTimeAtAnySpeed)
 {
     TestDesk desk(ListOf({WithTimedStill(Item(4), 5)}));
     desk.Start();
@@ -435,7 +435,7 @@ TEST(Playback, EndsATimedStillEarly)
               "3 Finished(EndOfMedia)\n");
 }
 
-TEST(Playback, LeavesAStillByProgramEvenWhereTheViewerMayNot)
+TEST(Playback, LeavesAStillByProgramEvenIfTheMaskForbidsIt)
 {
     TestDesk desk(
         ListOf({Forbidding(WithEndlessStill(Item(1)), {bd::UserOperationStillOff}), Item(1)}));
@@ -448,7 +448,7 @@ TEST(Playback, LeavesAStillByProgramEvenWhereTheViewerMayNot)
                            "1 UOMask(0)\n");
 }
 
-TEST(Playback, HasNoStillToLeaveByProgramWhilePlaying)
+TEST(Playback, IgnoresLeavingAStillWhilePlaying)
 {
     TestDesk desk(ListOf({Item(10)}));
     desk.Start(Second);
@@ -460,7 +460,7 @@ TEST(Playback, HasNoStillToLeaveByProgramWhilePlaying)
     EXPECT_EQ(desk.Snapshot(), before);
 }
 
-TEST(Playback, GoesOnAfterASuspendWhereItWas)
+TEST(Playback, ResumesAfterASuspendAtTheSamePosition)
 {
     TestDesk desk(ListOf({WithTimedStill(Item(3), 5)}));
     desk.Start(2 * Second);
@@ -477,7 +477,7 @@ TEST(Playback, GoesOnAfterASuspendWhereItWas)
     EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), 2 * Second);
 }
 
-TEST(Playback, GoesOnWithAPauseOrAStillAfterASuspend)
+TEST(Playback, ResumesIntoAPauseOrAStillAfterASuspend)
 {
     TestDesk desk(ListOf({WithTimedStill(Item(3), 5)}));
     desk.Start();
@@ -495,7 +495,7 @@ TEST(Playback, GoesOnWithAPauseOrAStillAfterASuspend)
     EXPECT_EQ(desk.navigator.TimeToNextChange(), 4 * Second);
 }
 
-TEST(Playback, StopsWhenToldToFailTheResumeAndClosesTheMenu)
+TEST(Playback, StopsAndClosesTheMenuWhenTheResumeFails)
 {
     TestDesk desk(ListOf({RichItem(10)}, {Entry(0, Ticks(0))}));
     desk.navigator.FailNextResume();
@@ -516,7 +516,7 @@ TEST(Playback, StopsWhenToldToFailTheResumeAndClosesTheMenu)
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Playing);
 }
 
-TEST(Playback, GoesOnAfterAPreloadThatFailed)
+TEST(Playback, ContinuesAfterAFailedPreload)
 {
     TestDesk desk(ListOf({Item(10)}));
     desk.Start();
@@ -528,7 +528,7 @@ TEST(Playback, GoesOnAfterAPreloadThatFailed)
     EXPECT_EQ(desk.Snapshot(), before);
 }
 
-TEST(Playback, FinishesWhenTheStreamRunsDryAndClosesTheMenu)
+TEST(Playback, FinishesAndClosesTheMenuOnDataStarvation)
 {
     TestDesk desk(ListOf({RichItem(10)}, {Entry(0, Ticks(0))}));
     desk.Start(Second);
@@ -544,7 +544,7 @@ TEST(Playback, FinishesWhenTheStreamRunsDryAndClosesTheMenu)
               bdstreaming::FinishedReasonDataStarvation);
 }
 
-TEST(Playback, FinishesForTheRightReasonAfterAStarvation)
+TEST(Playback, FinishesAtTheEndOfMediaAfterAnEarlierStarvation)
 {
     TestDesk desk(ListOf({Item(1)}));
     desk.Start();
@@ -556,7 +556,7 @@ TEST(Playback, FinishesForTheRightReasonAfterAStarvation)
     EXPECT_EQ(desk.TakeWithoutPositions(), "1 Finished(EndOfMedia)\n");
 }
 
-TEST(Playback, HandsOnWhatAListenerThrows)
+TEST(Playback, RethrowsTheExceptionOfAListener)
 {
     class Thrower : public bdmv::NavigatorListenerAdapter
     {

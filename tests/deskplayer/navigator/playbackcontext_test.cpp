@@ -12,7 +12,7 @@ namespace deskplayer
 namespace
 {
 
-/** A stream that is selected, and how many there are of its kind. */
+/** The selected stream and the number of streams of its kind. */
 typedef std::pair<int, int> NumberAndCount;
 typedef void (PlaybackContext::*StreamQuery)(bd::StreamNumberDef*, bd::UInt8*);
 
@@ -24,7 +24,7 @@ NumberAndCount Ask(PlaybackContext& context, StreamQuery query)
     return {number, count};
 }
 
-/** Two rich items with an aspect ratio, and one that has nothing, with marks. */
+/** Two rich items with an aspect ratio and one without streams, with marks. */
 LoadedPlayList ThreeItems()
 {
     PlayItem poor = Item(10);
@@ -57,7 +57,7 @@ TEST_F(PlaybackContextQueries, HasTheResumeDataUntilItIsCleanedUp)
     EXPECT_EQ(context.GetSystemResumeData().size, 0);
 }
 
-TEST_F(PlaybackContextQueries, TellsWhetherItPlaysAfterAResume)
+TEST_F(PlaybackContextQueries, ReportsWhetherItPlaysAfterAResume)
 {
     EXPECT_FALSE(context.IsPlayingAfterSystemResume());
     state.playingAfterSystemResume = true;
@@ -72,7 +72,7 @@ TEST_F(PlaybackContextQueries, NumbersPlayListAndPlayItem)
     EXPECT_EQ(context.GetPlayItemId(), 2);
 }
 
-TEST_F(PlaybackContextQueries, TellsThePlayModeThatIsSetFromTheOneInForce)
+TEST_F(PlaybackContextQueries, DistinguishesTheRequestedPlayModeFromTheCurrentOne)
 {
     state.playMode = bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedFast1);
 
@@ -80,7 +80,7 @@ TEST_F(PlaybackContextQueries, TellsThePlayModeThatIsSetFromTheOneInForce)
     EXPECT_EQ(context.GetCurrentPlayMode(), bd::PlayMode());
 }
 
-TEST_F(PlaybackContextQueries, TellsTheTriggerAndWhenItWasReached)
+TEST_F(PlaybackContextQueries, ReportsTheTriggerAndWhenItWasReached)
 {
     EXPECT_EQ(context.GetTrigger().triggerType, bd::TRIGGER_NONE);
     state.trigger = bd::TRIGGER_CHP;
@@ -90,7 +90,7 @@ TEST_F(PlaybackContextQueries, TellsTheTriggerAndWhenItWasReached)
     EXPECT_EQ(context.GetTriggerReachedTime(), 0x100000000);
 }
 
-TEST_F(PlaybackContextQueries, TellsTheRepeatStates)
+TEST_F(PlaybackContextQueries, ReportsTheRepeatStates)
 {
     EXPECT_EQ(context.GetCurrentABRepeatState(), bd::TRIGGER_AB_NONE);
     EXPECT_EQ(context.GetCurrentChpTitleRepeatState(), bd::TRIGGER_NONE);
@@ -121,20 +121,20 @@ TEST_F(PlaybackContextQueries, KnowsTheTriggerAtATime)
     EXPECT_EQ(context.GetTriggerTypeByTime(20), bd::TRIGGER_INVALID);
 }
 
-TEST_F(PlaybackContextQueries, TellsTheChapterOfThePosition)
+TEST_F(PlaybackContextQueries, ReportsTheChapterAtThePosition)
 {
     EXPECT_EQ(context.GetCurrentChapter(), 1);
     state.position = 10 * Second - Ticks(1);
     EXPECT_EQ(context.GetCurrentChapter(), 1);
     state.position = 10 * Second;
-    EXPECT_EQ(context.GetCurrentChapter(), 1) << "which is where the play item ends";
+    EXPECT_EQ(context.GetCurrentChapter(), 1) << "at the end of the play item";
     state.item = 1;
     EXPECT_EQ(context.GetCurrentChapter(), 2);
     state.position = 30 * Second;
     EXPECT_EQ(context.GetCurrentChapter(), 2);
 }
 
-TEST_F(PlaybackContextQueries, TellsTheMarkThatWasPassedLast)
+TEST_F(PlaybackContextQueries, ReportsTheMarkThatWasPassedLast)
 {
     bd::TimePosition time = bd::TimePositionNone;
     EXPECT_EQ(context.GetCurrentPLMarkId(time), 0);
@@ -145,7 +145,7 @@ TEST_F(PlaybackContextQueries, TellsTheMarkThatWasPassedLast)
     EXPECT_EQ(Ticks(time), 10 * Second);
 }
 
-TEST_F(PlaybackContextQueries, TellsStreamsAndTheirCount)
+TEST_F(PlaybackContextQueries, ReportsStreamsAndTheirCount)
 {
     const StreamQuery queries[] = {&PlaybackContext::GetVideoInfo,
                                    &PlaybackContext::GetAudioInfo,
@@ -158,19 +158,19 @@ TEST_F(PlaybackContextQueries, TellsStreamsAndTheirCount)
         &StreamSelection::pg,    &StreamSelection::secondaryAudio, &StreamSelection::pipPg};
     for (std::size_t i = 0; i < std::size(queries); ++i) {
         SCOPED_TRACE(i);
-        const int count = i == 0 ? 1 : 2; // there is one video
+        const int count = i == 0 ? 1 : 2; // only one video stream
         state = PlaybackState();
         EXPECT_EQ(Ask(context, queries[i]), NumberAndCount(1, count));
         state.selection.*fields[i] = 2;
         EXPECT_EQ(Ask(context, queries[i]), NumberAndCount(count, count));
         state.selection.*fields[i] = 3;
-        EXPECT_EQ(Ask(context, queries[i]), NumberAndCount(count, count)) << "the last instead";
+        EXPECT_EQ(Ask(context, queries[i]), NumberAndCount(count, count)) << "the last one instead";
         state.item = 2;
         EXPECT_EQ(Ask(context, queries[i]), NumberAndCount(0, 0));
     }
 }
 
-TEST_F(PlaybackContextQueries, TellsSubtitlesWithAResult)
+TEST_F(PlaybackContextQueries, ReportsSubtitlesWithAResult)
 {
     bd::StreamNumberDef number = 99;
     bd::UInt8 count = 99;
@@ -180,7 +180,7 @@ TEST_F(PlaybackContextQueries, TellsSubtitlesWithAResult)
     EXPECT_EQ(count, 2);
 }
 
-TEST_F(PlaybackContextQueries, TellsSecondaryVideoAndWhetherItRunsOnItsOwn)
+TEST_F(PlaybackContextQueries, ReportsSecondaryVideoAndWhetherItIsAsync)
 {
     bd::StreamNumberDef number = 99;
     bd::UInt8 count = 99;
@@ -198,7 +198,7 @@ TEST_F(PlaybackContextQueries, TellsSecondaryVideoAndWhetherItRunsOnItsOwn)
     EXPECT_FALSE(async);
 }
 
-TEST_F(PlaybackContextQueries, TellsAnglesOfWhichThereIsAlwaysOne)
+TEST_F(PlaybackContextQueries, ReportsAtLeastOneAngle)
 {
     bd::AngleNumberDef number = 99;
     bd::UInt8 count = 99;
@@ -213,7 +213,7 @@ TEST_F(PlaybackContextQueries, TellsAnglesOfWhichThereIsAlwaysOne)
     EXPECT_EQ(count, 1);
 }
 
-TEST_F(PlaybackContextQueries, TellsVideoFormatAndAspectRatioAsTheyAreOnTheDisc)
+TEST_F(PlaybackContextQueries, ReportsVideoFormatAndAspectRatioAsOnTheDisc)
 {
     bd::VideoFormatType format = bd::VideoFormatType480i;
     bd::VideoAspectRatioType ratio = bd::VideoAspectRatioType16x9;
@@ -224,15 +224,15 @@ TEST_F(PlaybackContextQueries, TellsVideoFormatAndAspectRatioAsTheyAreOnTheDisc)
     state.item = 1;
     context.GetVideoAttributes(format, ratio);
     EXPECT_EQ(format, bd::VideoFormatType1080p);
-    EXPECT_EQ(ratio, bd::VideoAspectRatioTypeNoInfo) << "no clip tells it";
+    EXPECT_EQ(ratio, bd::VideoAspectRatioTypeNoInfo) << "not in any clip information";
 
     state.item = 2;
     context.GetVideoAttributes(format, ratio);
-    EXPECT_EQ(format, bd::VideoFormatTypeNoInfo) << "there is no video";
+    EXPECT_EQ(format, bd::VideoFormatTypeNoInfo) << "no video stream";
     EXPECT_EQ(ratio, bd::VideoAspectRatioTypeNoInfo);
 }
 
-TEST_F(PlaybackContextQueries, TellsWhatIsShown)
+TEST_F(PlaybackContextQueries, ReportsWhichStreamsAreShown)
 {
     EXPECT_TRUE(context.GetPgTextStDisplay());
     EXPECT_FALSE(context.GetSecondaryVideoDisplay());
@@ -251,7 +251,7 @@ TEST_F(PlaybackContextQueries, TellsWhatIsShown)
     EXPECT_TRUE(context.GetPipPgTextStSelect());
 }
 
-TEST(PlaybackContext, JoinsTheMasksOfPlayListAndItem)
+TEST(PlaybackContext, CombinesTheMasksOfPlayListAndItem)
 {
     PlayList playList = ListOf({Forbidding(Item(10), {bd::UserOperationStop}), Item(10)});
     playList.applicationInfo.uoMask = MaskOf({bd::UserOperationPauseOn});
@@ -269,7 +269,7 @@ TEST(PlaybackContext, JoinsTheMasksOfPlayListAndItem)
     EXPECT_EQ(mask, bdmv::UOMaskTable(MaskOf({bd::UserOperationPauseOn})));
 }
 
-TEST_F(PlaybackContextQueries, TellsThePosition)
+TEST_F(PlaybackContextQueries, ReportsThePosition)
 {
     state.position = Ticks(0x100000000);
     EXPECT_EQ(context.GetCurrentTimePosition(), 0x100000000);
@@ -292,7 +292,7 @@ TEST_F(PlaybackContextQueries, SharesTheProgramOfTheButton)
     EXPECT_EQ(button, 6);
 }
 
-TEST_F(PlaybackContextQueries, TellsTheStyleAndHowManyThereAre)
+TEST_F(PlaybackContextQueries, ReportsTheStyleAndTheNumberOfStyles)
 {
     state.selection.style = 3;
     EXPECT_EQ(context.GetCurrentTextSubtitleStyleNumber(), 3);
@@ -301,14 +301,14 @@ TEST_F(PlaybackContextQueries, TellsTheStyleAndHowManyThereAre)
     EXPECT_EQ(context.GetNumberOfTextSubtitleStyles(), 0);
 }
 
-TEST_F(PlaybackContextQueries, TellsWhyPlaybackFinished)
+TEST_F(PlaybackContextQueries, ReportsTheReasonWhyPlaybackFinished)
 {
     EXPECT_EQ(context.GetFinishedReason(), bdstreaming::FinishedReasonEndOfMedia);
     state.finishedReason = bdstreaming::FinishedReasonDataStarvation;
     EXPECT_EQ(context.GetFinishedReason(), bdstreaming::FinishedReasonDataStarvation);
 }
 
-TEST_F(PlaybackContextQueries, TellsTheZoom)
+TEST_F(PlaybackContextQueries, ReportsTheZoom)
 {
     state.zoom = {{1, 2, 3, 4}, {5, 6, 7, 8}, 9};
     bd::ZOOM_PARAM_Def zoom = {};
@@ -318,7 +318,7 @@ TEST_F(PlaybackContextQueries, TellsTheZoom)
     EXPECT_EQ(zoom.u4Delay, 9);
 }
 
-/** What IsAsyncPipInCurrentPlayItem() says, in the order of its parameters. */
+/** The results of IsAsyncPipInCurrentPlayItem(), in the order of its parameters. */
 std::vector<bool> AsyncFlagsOf(PlaybackContext& context)
 {
     bool video = true;
@@ -329,7 +329,7 @@ std::vector<bool> AsyncFlagsOf(PlaybackContext& context)
     return {video, audio, previousVideo, previousAudio};
 }
 
-TEST(PlaybackContext, TellsWhichSecondaryStreamsRunOnTheirOwn)
+TEST(PlaybackContext, ReportsAsyncSecondaryStreams)
 {
     PlayItem onItsOwn = Item(1);
     onItsOwn.streams.secondaryVideo = {StreamOf(0x1B), StreamOfSubPath(0x1B, 0)};
@@ -367,7 +367,7 @@ TEST(PlaybackContext, TellsWhichSecondaryStreamsRunOnTheirOwn)
     EXPECT_TRUE(async) << "the second one";
 }
 
-TEST(PlaybackContext, HasNothingToTellWithoutPlayItems)
+TEST(PlaybackContext, ReportsNothingWithoutPlayItems)
 {
     PlayList playList;
     playList.applicationInfo.uoMask = MaskOf({bd::UserOperationStop});

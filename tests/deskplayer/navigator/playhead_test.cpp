@@ -10,7 +10,7 @@ namespace deskplayer
 namespace
 {
 
-/** On two items of ten seconds, with chapters at 0, 5.5 and 10 s and a link where the items meet. */
+/** Two items of ten seconds, with chapters at 0, 5.5 and 10 s and a link where they meet. */
 class PlayheadOnTwoItems : public testing::Test
 {
 protected:
@@ -61,7 +61,7 @@ TEST_F(PlayheadOnTwoItems, StopsAtPointBAndAtTheTrigger)
     EXPECT_EQ(StopFrom(0, Ticks(0)), Second / 4);
 }
 
-TEST_F(PlayheadOnTwoItems, PassesPointAAndWhatLiesBehind)
+TEST_F(PlayheadOnTwoItems, IgnoresPointAAndStopsAlreadyPassed)
 {
     state.pointA = Second / 2;
     state.pointB = Ticks(5);
@@ -69,13 +69,13 @@ TEST_F(PlayheadOnTwoItems, PassesPointAAndWhatLiesBehind)
     EXPECT_EQ(StopFrom(0, Ticks(10)), Second);
 }
 
-TEST_F(PlayheadOnTwoItems, LeavesAnItemBackwardAtTheLastPositionBeforeIt)
+TEST_F(PlayheadOnTwoItems, LeavesAnItemBackwardToTheLastPositionBeforeIt)
 {
     PlayBackward();
     EXPECT_EQ(StopFrom(1, 10 * Second), 10 * Second - Ticks(1));
 }
 
-TEST_F(PlayheadOnTwoItems, LeavesAChapterBackwardAtTheLastPositionBeforeIt)
+TEST_F(PlayheadOnTwoItems, LeavesAChapterBackwardToTheLastPositionBeforeIt)
 {
     PlayBackward();
     EXPECT_EQ(StopFrom(0, 6 * Second), 5 * Second + Second / 2) << "at its mark first";
@@ -103,20 +103,20 @@ TEST_F(PlayheadOnTwoItems, NeedsLessTimeWhenPlayIsFast)
     EXPECT_EQ(playhead.TimeToNextStop(), Ticks(Second.count() / 4));
 }
 
-TEST_F(PlayheadOnTwoItems, RoundsTheTimeToTheNextStopUp)
+TEST_F(PlayheadOnTwoItems, RoundsUpTheTimeToTheNextStop)
 {
     state.currentPlayMode = bd::PlayMode(bd::PlayDirectionForward, bd::PlaySpeedFast12);
     state.position = Second - Ticks(1);
     EXPECT_EQ(playhead.TimeToNextStop(), Ticks(1));
 }
 
-TEST_F(PlayheadOnTwoItems, PassesNoFurtherThanToTheNextStop)
+TEST_F(PlayheadOnTwoItems, PassesNoFurtherThanTheNextStop)
 {
     EXPECT_EQ(playhead.Pass(3 * Second), Second);
     EXPECT_EQ(state.position, Second);
 }
 
-TEST_F(PlayheadOnTwoItems, KeepsTimeThatIsTooShortForATick)
+TEST_F(PlayheadOnTwoItems, KeepsARemainderOfLessThanATick)
 {
     state.currentPlayMode = bd::PlayMode(bd::PlayDirectionForward, bd::PlaySpeedSlow1);
 
@@ -126,7 +126,7 @@ TEST_F(PlayheadOnTwoItems, KeepsTimeThatIsTooShortForATick)
     EXPECT_EQ(state.position, Ticks(1));
 }
 
-TEST_F(PlayheadOnTwoItems, ForgetsThatTimeWhenAsked)
+TEST_F(PlayheadOnTwoItems, DropsTheRemainderOnRequest)
 {
     state.currentPlayMode = bd::PlayMode(bd::PlayDirectionForward, bd::PlaySpeedSlow1);
     playhead.Pass(Ticks(1));
@@ -136,7 +136,7 @@ TEST_F(PlayheadOnTwoItems, ForgetsThatTimeWhenAsked)
     EXPECT_EQ(playhead.Pass(Ticks(1)), Ticks(0));
 }
 
-TEST_F(PlayheadOnTwoItems, ForgetsThatTimeWhenItJumps)
+TEST_F(PlayheadOnTwoItems, DropsTheRemainderWhenItJumps)
 {
     state.currentPlayMode = bd::PlayMode(bd::PlayDirectionForward, bd::PlaySpeedSlow1);
     playhead.Pass(Ticks(1));
@@ -187,7 +187,7 @@ TEST_F(PlayheadOnTwoItems, FindsTheLaterItemWhereTwoMeet)
     EXPECT_EQ(playhead.ItemAt(10 * Second), 1U);
 }
 
-TEST_F(PlayheadOnTwoItems, FindsMarksAtThePositionFromAnItemOn)
+TEST_F(PlayheadOnTwoItems, FindsMarksAtThePositionStartingFromAnItem)
 {
     state.position = 10 * Second;
     EXPECT_EQ(playhead.MarksHere(0), (std::vector<std::size_t>{2})) << "not those of a later item";
@@ -216,7 +216,7 @@ TEST_F(PlayheadOnTwoItems, FindsChaptersByNumber)
     EXPECT_EQ(playhead.FindChapter(4), nullptr);
 }
 
-TEST_F(PlayheadOnTwoItems, RepeatsTheTitleForEver)
+TEST_F(PlayheadOnTwoItems, RepeatsTheTitleForever)
 {
     EXPECT_FALSE(playhead.IsRepeating());
     state.chapterTitleRepeat = bd::TRIGGER_TITLE;

@@ -2,7 +2,7 @@
 
 #include <gtest/gtest.h>
 
-#include "rooms.h"
+#include "parts.h"
 
 namespace deskplayer
 {
@@ -13,21 +13,21 @@ namespace
 class MenuOfThreeChapters : public testing::Test
 {
 protected:
-    // The mark outside of its play item takes chapter number 2, and has no button.
-    EventRooms rooms{ListOf({RichItem(10)}, {Entry(0, Ticks(0)), Entry(0, 60 * Second),
+    // The mark outside its play item uses up chapter number 2 and has no button.
+    EventParts parts{ListOf({RichItem(10)}, {Entry(0, Ticks(0)), Entry(0, 60 * Second),
                                              Entry(0, 5 * Second), Entry(0, 8 * Second)})};
-    PopUpMenu menu{rooms.playhead, rooms.state, rooms.sender};
+    PopUpMenu menu{parts.playhead, parts.state, parts.sender};
 };
 
 TEST_F(MenuOfThreeChapters, OpensWithTheButtonOfTheCurrentChapter)
 {
-    rooms.state.position = 6 * Second;
+    parts.state.position = 6 * Second;
 
     menu.Open();
 
     EXPECT_TRUE(menu.IsOpen());
     EXPECT_EQ(menu.SelectedButton(), 2);
-    EXPECT_EQ(rooms.Take(), "A.InteractiveGraphicsActive()\n"
+    EXPECT_EQ(parts.Take(), "A.InteractiveGraphicsActive()\n"
                             "A.InteractiveGraphicsVisible()\n");
 }
 
@@ -39,40 +39,40 @@ TEST_F(MenuOfThreeChapters, HasAButtonForEachChapter)
 TEST_F(MenuOfThreeChapters, ClosesOnce)
 {
     menu.Open();
-    rooms.Take();
+    parts.Take();
 
     menu.Close();
     menu.Close();
 
     EXPECT_FALSE(menu.IsOpen());
-    EXPECT_EQ(rooms.Take(), "A.InteractiveGraphicsInvisible()\n"
+    EXPECT_EQ(parts.Take(), "A.InteractiveGraphicsInvisible()\n"
                             "A.InteractiveGraphicsInactive()\n");
 }
 
-TEST_F(MenuOfThreeChapters, HandsOverTheProgramAndReturnsTheChapter)
+TEST_F(MenuOfThreeChapters, PassesOnTheProgramAndReturnsTheChapter)
 {
     menu.Open();
     menu.Select(3);
-    rooms.Take();
+    parts.Take();
 
     const Chapter& chapter = menu.ExecuteSelectedButton();
 
     EXPECT_EQ(chapter.number, 4U);
-    EXPECT_FALSE(rooms.state.button.program) << "released once it was handed over";
-    const std::string heard = rooms.Take();
-    EXPECT_EQ(heard.substr(0, heard.find('(')), "A.ButtonActivationBusy");
-    EXPECT_NE(heard.find("A.ExecuteButton(1, 3, "), std::string::npos);
-    EXPECT_EQ(heard.substr(heard.find("A.ButtonActivationDone")),
+    EXPECT_FALSE(parts.state.button.program) << "released after it was passed on";
+    const std::string received = parts.Take();
+    EXPECT_EQ(received.substr(0, received.find('(')), "A.ButtonActivationBusy");
+    EXPECT_NE(received.find("A.ExecuteButton(1, 3, "), std::string::npos);
+    EXPECT_EQ(received.substr(received.find("A.ButtonActivationDone")),
               "A.ButtonActivationDone()\n"
               "A.InteractiveGraphicsInvisible()\n"
               "A.InteractiveGraphicsInactive()\n");
-    EXPECT_EQ(rooms.state.position, Ticks(0)) << "the jump is its caller's";
+    EXPECT_EQ(parts.state.position, Ticks(0)) << "the caller performs the jump";
 }
 
 TEST(Menu, SelectsTheFirstButtonBeforeTheFirstChapter)
 {
-    EventRooms rooms(ListOf({RichItem(10)}, {Entry(0, 5 * Second)}));
-    PopUpMenu menu(rooms.playhead, rooms.state, rooms.sender);
+    EventParts parts(ListOf({RichItem(10)}, {Entry(0, 5 * Second)}));
+    PopUpMenu menu(parts.playhead, parts.state, parts.sender);
 
     menu.Open();
 

@@ -26,7 +26,7 @@ TEST(Position, JumpsWithinAnItem)
                            "1 CurrentTimePosition(90001)\n");
 }
 
-TEST(Position, JumpsToAnotherItemAndTellsAllThatIsDifferentThere)
+TEST(Position, JumpsToAnotherItemAndAnnouncesTheDifferences)
 {
     TestDesk desk(FourChapters());
     desk.Start(Second);
@@ -78,7 +78,7 @@ TEST(Position, ForgetsTheFractionOfATickWhenItJumps)
     EXPECT_EQ(desk.navigator.TimeToNextChange(), 32 * Second);
 }
 
-TEST(Position, RefusesATimeAtOrBehindTheEnd)
+TEST(Position, RefusesATimeAtOrPastTheEnd)
 {
     TestDesk desk(FourChapters());
     desk.Start();
@@ -106,7 +106,7 @@ TEST(Position, GoesToAChapter)
                            "1 CurrentTimePosition(225000)\n");
 }
 
-TEST(Position, TellsNoChapterAgainWhenItJumpsToTheOneInPlayback)
+TEST(Position, DoesNotAnnounceTheCurrentChapterAgainWhenItJumpsThere)
 {
     TestDesk desk(FourChapters());
     desk.Start(Second);
@@ -132,7 +132,7 @@ TEST(Position, SkipsToTheNextChapter)
                            "9 CurrentTimePosition(450000)\n");
 }
 
-TEST(Position, SkipsFromBeforeTheFirstChapterToIt)
+TEST(Position, SkipsToTheFirstChapterFromBeforeIt)
 {
     TestDesk desk(ListOf({Item(10)}, {Entry(0, 5 * Second)}));
     desk.Start(Second);
@@ -143,7 +143,7 @@ TEST(Position, SkipsFromBeforeTheFirstChapterToIt)
     EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), 5 * Second);
 }
 
-TEST(Position, SkipsBackToTheStartOfTheChapterOnceItHasPlayedThreeSeconds)
+TEST(Position, SkipsBackToTheStartOfTheChapterAfterThreeSeconds)
 {
     TestDesk desk(FourChapters());
     desk.Start(8 * Second);
@@ -153,7 +153,7 @@ TEST(Position, SkipsBackToTheStartOfTheChapterOnceItHasPlayedThreeSeconds)
     EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), 5 * Second);
 }
 
-TEST(Position, SkipsBackToTheChapterBeforeWithinThreeSeconds)
+TEST(Position, SkipsBackToThePreviousChapterWithinThreeSeconds)
 {
     TestDesk desk(FourChapters());
     desk.Start(8 * Second - Ticks(1));
@@ -173,7 +173,7 @@ TEST(Position, SkipsBackToTheStartOfTheFirstChapterAtAnyTime)
     EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), Second);
 }
 
-TEST(Position, RefusesChaptersThatAreNotThere)
+TEST(Position, RefusesChaptersThatDoNotExist)
 {
     TestDesk desk(FourChapters());
     desk.Start(16 * Second);

@@ -18,7 +18,7 @@ bd::PlayMode Mode(bd::PlayDirectionDef direction, bd::PlaySpeedDef speed)
     return bd::PlayMode(direction, speed);
 }
 
-/** An item that can do everything and ends in a still, and another one. */
+/** An item that supports every operation and ends in a still, and another one. */
 PlayList Everything()
 {
     return ListOf(
@@ -26,7 +26,7 @@ PlayList Everything()
         {Entry(0, Ticks(0)), Entry(0, 5 * Second), Entry(1, Ticks(0)), Entry(1, 5 * Second)});
 }
 
-/** Brings a navigator over Everything() into a status. */
+/** Brings a navigator that plays Everything() to a status. */
 void Bring(TestDesk& desk, Status status)
 {
     if (status == Status::Stopped) {
@@ -73,7 +73,7 @@ struct StatusRule {
 
 typedef std::pair<const char*, Operation> NamedOperation;
 
-/** Operations on what is on the screen that no mask can forbid. */
+/** Operations that need a picture and that no mask can forbid. */
 const NamedOperation Unmaskable[] = {
     {"Suspend", [](TestDesk& d) { return d.navigator.Suspend(); }},
     {"SetPointA", [](TestDesk& d) { return d.navigator.SetPointA(); }},
@@ -161,7 +161,7 @@ std::vector<StatusRule> StatusRules()
     return rules;
 }
 
-TEST(Refusals, SayWhichStatusAnOperationNeeds)
+TEST(Refusals, NameTheRequiredStatus)
 {
     for (const StatusRule& rule : StatusRules()) {
         for (const auto& [status, name] : AllStatuses) {
@@ -183,7 +183,7 @@ TEST(Refusals, SayWhichStatusAnOperationNeeds)
     }
 }
 
-TEST(Refusals, SayThatNoMenuIsOpen)
+TEST(Refusals, NameTheClosedMenu)
 {
     const Operation operations[] = {
         [](TestDesk& d) { return d.navigator.ClosePopUpMenu(); },
@@ -206,7 +206,7 @@ TEST(Refusals, SayThatNoMenuIsOpen)
     }
 }
 
-/** Operations that a disc can forbid, where nothing else stands in their way. */
+/** An operation that a disc can forbid, and a preparation after which nothing else refuses it. */
 struct MaskRule {
     bd::UserOperationMaskDef operation;
     const char* name;
@@ -289,7 +289,8 @@ std::vector<MaskRule> MaskRules()
     };
 }
 
-/** Everything() played into its second chapter, forbidden by item 0, by the play list, or not. */
+/** Plays Everything() to its second chapter, with operations forbidden by item 0 or the play list.
+ */
 std::unique_ptr<TestDesk> DeskForbidding(std::uint64_t byPlayList, std::uint64_t byItem)
 {
     PlayList playList = Everything();
@@ -300,7 +301,7 @@ std::unique_ptr<TestDesk> DeskForbidding(std::uint64_t byPlayList, std::uint64_t
     return desk;
 }
 
-TEST(Refusals, SayWhoForbidsAnOperation)
+TEST(Refusals, NameThePlayListOrItemThatForbidsAnOperation)
 {
     for (const MaskRule& rule : MaskRules()) {
         SCOPED_TRACE(rule.name);
@@ -326,13 +327,13 @@ TEST(Refusals, SayWhoForbidsAnOperation)
     }
 }
 
-TEST(Refusals, ComeFromTheBitOfTheOperationAndNoOther)
+TEST(Refusals, DependOnlyOnTheBitOfTheOperation)
 {
     for (const MaskRule& rule : MaskRules()) {
         SCOPED_TRACE(rule.name);
         std::uint64_t others = ~MaskOf({rule.operation});
         if (rule.operation != bd::UserOperationPopupOn) {
-            others &= ~MaskOf({bd::UserOperationPopupOn}); // which the preparation needs
+            others &= ~MaskOf({bd::UserOperationPopupOn}); // needed by the preparation
         }
         const auto desk = DeskForbidding(others, others);
         rule.prepare(*desk);
@@ -343,7 +344,7 @@ TEST(Refusals, ComeFromTheBitOfTheOperationAndNoOther)
     }
 }
 
-TEST(Refusals, NameTheMaskBeforeAnythingElseThatIsWrong)
+TEST(Refusals, NameTheMaskBeforeOtherReasons)
 {
     const auto desk = DeskForbidding(~std::uint64_t{0}, 0);
 
@@ -353,7 +354,7 @@ TEST(Refusals, NameTheMaskBeforeAnythingElseThatIsWrong)
     EXPECT_EQ(desk->navigator.ClosePopUpMenu().Reason(), "PopupOff is forbidden by play list 7");
 }
 
-TEST(Refusals, NameTheItemInPlayback)
+TEST(Refusals, NameTheActiveItem)
 {
     TestDesk desk(ListOf({Item(1), Forbidding(Item(1), {bd::UserOperationStop})}));
     desk.Start(Second);
@@ -361,7 +362,7 @@ TEST(Refusals, NameTheItemInPlayback)
     EXPECT_EQ(desk.navigator.Stop().Reason(), "Stop is forbidden by play item 1");
 }
 
-TEST(Refusals, DoNotComeFromTheMaskOfAPlaybackThatIsOver)
+TEST(Refusals, IgnoreTheMaskOnceNothingPlays)
 {
     for (const Status status : {Status::Stopped, Status::Standby, Status::Finished}) {
         PlayList playList = Everything();
@@ -372,7 +373,7 @@ TEST(Refusals, DoNotComeFromTheMaskOfAPlaybackThatIsOver)
     }
 }
 
-TEST(Refusals, DoNotMeetWhatNoMaskCanForbid)
+TEST(Refusals, ExcludeOperationsThatNoMaskCanForbid)
 {
     std::vector<NamedOperation> operations(std::begin(Unmaskable), std::end(Unmaskable));
     operations.emplace_back("normal speed",
@@ -385,7 +386,7 @@ TEST(Refusals, DoNotMeetWhatNoMaskCanForbid)
     }
 }
 
-TEST(Refusals, ContinueAndStepAreNotAmongThem)
+TEST(Refusals, ExcludeContinueAndStep)
 {
     PlayList playList = ListOf({Item(10), Item(10)});
     playList.playItems.back().uoMask = ~std::uint64_t{0};

@@ -11,18 +11,12 @@ namespace deskplayer
 namespace
 {
 
-/** Numbers of bd::TriggerType, as the listener writes them down. */
-static_assert(bd::TRIGGER_NONE == 4 && bd::TRIGGER_A == 5 && bd::TRIGGER_B == 6 &&
-                  bd::TRIGGER_AB_NONE == 7 && bd::TRIGGER_CHP == 8 && bd::TRIGGER_TITLE == 9 &&
-                  bd::TRIGGER_NOTIFY_FROM_CURPOS == 13,
-              "the numbers in the expected texts");
-
 bd::PlayMode BackwardMode()
 {
     return bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedNormal);
 }
 
-/** Sets A here and B @p later: playback is at A again. */
+/** Sets A here and B @p later, which takes playback back to A. */
 void SetPoints(TestDesk& desk, Ticks later)
 {
     desk.Do(desk.navigator.SetPointA());
@@ -57,7 +51,7 @@ TEST(Repeat, GoesFromBBackToA)
                            "11+22505 CurrentTimePosition(450005)\n");
 }
 
-TEST(Repeat, GoesFromBBackToAInAnItemBefore)
+TEST(Repeat, GoesFromBBackToAInAnEarlierItem)
 {
     TestDesk desk(ListOf({Item(2), Item(2)}));
     desk.Start(Second + Ticks(10));
@@ -112,7 +106,7 @@ TEST(Repeat, StartsOverWithANewA)
     EXPECT_FALSE(desk.navigator.IsRepeating());
 }
 
-TEST(Repeat, GoesOnBehindBOnceTheRepeatHasEnded)
+TEST(Repeat, ContinuesPastBOnceTheRepeatHasEnded)
 {
     TestDesk desk(ListOf({Item(100)}));
     desk.Start(Second);
@@ -127,7 +121,7 @@ TEST(Repeat, GoesOnBehindBOnceTheRepeatHasEnded)
     EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), 3 * Second);
 }
 
-TEST(Repeat, IsNoRepeatBehindB)
+TEST(Repeat, DoesNotRepeatPastB)
 {
     TestDesk desk(ListOf({Item(10)}));
     desk.Start(Second);
@@ -176,7 +170,7 @@ TEST(Repeat, RepeatsTheLastChapterAtTheEndOfThePlayList)
                                            "2 MarkInfo(7, 1, 45000)\n");
 }
 
-TEST(Repeat, RepeatsTheChapterThatTheViewerGoesTo)
+TEST(Repeat, RepeatsTheChapterThatTheViewerSelects)
 {
     TestDesk desk(
         ListOf({Item(10)}, {Entry(0, Ticks(0)), Entry(0, 3 * Second), Entry(0, 5 * Second)}));
@@ -247,7 +241,7 @@ TEST(Repeat, RepeatsThePlayList)
     EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), Second);
 }
 
-TEST(Repeat, OfAPlayListWithoutLengthEnds)
+TEST(Repeat, EndsOnAPlayListWithoutLength)
 {
     TestDesk desk(ListOf({WithEndlessStill(Item(0)), Item(0)}));
     desk.Start();
@@ -278,7 +272,7 @@ TEST(Repeat, EndsTheRepeatOfAChapterOrThePlayList)
     }
 }
 
-TEST(Repeat, IsOneKindAtATime)
+TEST(Repeat, HasOnlyOneKindAtATime)
 {
     TestDesk desk(ListOf({Item(10)}, {Entry(0, Ticks(0))}));
     desk.Start();
@@ -303,7 +297,7 @@ TEST(Repeat, RemembersTheTriggerThatWasSetLast)
     EXPECT_EQ(desk.navigator.Context().GetTrigger().triggerType, bd::TRIGGER_NOTIFY_FROM_CURPOS);
     desk.Do(desk.navigator.SetPointB());
     EXPECT_EQ(desk.navigator.Context().GetTrigger().triggerType, bd::TRIGGER_NOTIFY_FROM_CURPOS)
-        << "that one failed";
+        << "B could not be set";
     desk.Do(desk.navigator.SetPointA());
     EXPECT_EQ(desk.navigator.Context().GetTrigger().triggerType, bd::TRIGGER_A);
 }
@@ -321,7 +315,7 @@ TEST(Trigger, IsReachedAtItsTime)
                            "1+100 TriggerTimeReached(TRIGGER_NOTIFY_FROM_CURPOS, 45100)\n");
 }
 
-TEST(Trigger, IsReachedBackwardToo)
+TEST(Trigger, IsReachedBackwardAsWell)
 {
     TestDesk desk(ListOf({Item(10)}));
     desk.Start(2 * Second);
@@ -333,7 +327,7 @@ TEST(Trigger, IsReachedBackwardToo)
     EXPECT_EQ(desk.Take(), "2+44900 TriggerTimeReached(TRIGGER_NOTIFY_FROM_CURPOS, 45100)\n");
 }
 
-TEST(Trigger, StaysAndIsReachedAgain)
+TEST(Trigger, RemainsSetAndIsReachedAgain)
 {
     TestDesk desk(ListOf({Item(10)}));
     desk.Start();
@@ -347,7 +341,7 @@ TEST(Trigger, StaysAndIsReachedAgain)
     EXPECT_EQ(desk.Take(), "0+300 TriggerTimeReached(TRIGGER_NOTIFY_FROM_CURPOS, 100)\n");
 }
 
-TEST(Trigger, IsANotificationDuringARepeatToo)
+TEST(Trigger, IsANotificationDuringARepeatAsWell)
 {
     TestDesk desk(ListOf({Item(10)}));
     desk.Start();
@@ -359,13 +353,13 @@ TEST(Trigger, IsANotificationDuringARepeatToo)
     EXPECT_EQ(desk.Take(), "0+100 TriggerTimeReached(TRIGGER_NOTIFY_FROM_CURPOS, 100)\n");
 }
 
-TEST(Trigger, IsReachedBesideTheRepeatThatGoesBackThere)
+TEST(Trigger, IsReachedAtTheEndOfARepeat)
 {
     TestDesk desk(ListOf({Item(10)}, {Entry(0, Ticks(0)), Entry(0, 2 * Second)}));
     const struct {
         std::function<void()> repeat;
         Ticks end;
-        std::string heard;
+        std::string received;
     } repeats[] = {{[&desk] { SetPoints(desk, Second / 2); }, Second / 2,
                     "TriggerTimeReached(TRIGGER_B, 22500)\n"},
                    {[&desk] { desk.Do(desk.navigator.RepeatChapter()); }, 2 * Second,
@@ -373,7 +367,7 @@ TEST(Trigger, IsReachedBesideTheRepeatThatGoesBackThere)
                    {[&desk] { desk.Do(desk.navigator.RepeatTitle()); }, 10 * Second,
                     "TriggerTimeReached(TRIGGER_TITLE, 450000)\n"}};
     for (const auto& repeat : repeats) {
-        SCOPED_TRACE(repeat.heard);
+        SCOPED_TRACE(repeat.received);
         desk.Start();
         repeat.repeat();
         desk.Do(desk.navigator.SetTrigger(repeat.end));
@@ -381,14 +375,14 @@ TEST(Trigger, IsReachedBesideTheRepeatThatGoesBackThere)
         desk.navigator.Advance(repeat.end);
 
         std::string reached;
-        std::istringstream heard(desk.Take());
-        for (std::string line; std::getline(heard, line);) {
+        std::istringstream received(desk.Take());
+        for (std::string line; std::getline(received, line);) {
             if (line.find("TriggerTimeReached") != std::string::npos) {
                 reached += line.substr(line.find(' ') + 1) + "\n";
             }
         }
         EXPECT_EQ(reached, "TriggerTimeReached(TRIGGER_NOTIFY_FROM_CURPOS, " +
-                               std::to_string(repeat.end.count()) + ")\n" + repeat.heard);
+                               std::to_string(repeat.end.count()) + ")\n" + repeat.received);
         desk.Do(desk.navigator.Stop());
     }
 }
@@ -406,7 +400,7 @@ TEST(Trigger, IsReachedAtTheEndOfThePlayList)
               "1 Finished(EndOfMedia)\n");
 }
 
-TEST(Trigger, IsRefusedBehindTheEndOfThePlayList)
+TEST(Trigger, IsRefusedPastTheEndOfThePlayList)
 {
     TestDesk desk(ListOf({Item(10), Item(10)}));
     desk.Start();
@@ -419,7 +413,7 @@ TEST(Trigger, IsRefusedBehindTheEndOfThePlayList)
     EXPECT_EQ(desk.Snapshot(), before);
 }
 
-TEST(Trigger, LeavesOtherTriggersAlone)
+TEST(Trigger, DoesNotAffectOtherTriggers)
 {
     TestDesk desk(ListOf({Item(10)}));
     desk.Start();

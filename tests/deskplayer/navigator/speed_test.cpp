@@ -36,7 +36,7 @@ TEST(PlaySpeed, HasARatioForEveryStep)
     }
 }
 
-TEST(PlaySpeed, IsNormalForWhatIsNoStep)
+TEST(PlaySpeed, IsNormalForAnUnknownStep)
 {
     for (const int step : {-1, 18, 1000000}) {
         const SpeedRatio ratio = RatioOf(static_cast<bd::PlaySpeedDef>(step));
@@ -58,7 +58,7 @@ TEST(Speed, TakesEffectAtOnceWhilePlaying)
                            "1+22500 CurrentTimePosition(135000)\n");
 }
 
-TEST(Speed, IsNotToldAgainWhenItIsTheSame)
+TEST(Speed, IsNotAnnouncedAgainIfUnchanged)
 {
     TestDesk desk(ListOf({Item(100)}));
     desk.Start();
@@ -86,7 +86,7 @@ TEST(Speed, TakesEffectWithContinueWhilePaused)
     EXPECT_EQ(desk.navigator.Context().GetCurrentPlayMode(), Forward(bd::PlaySpeedSlow1));
 }
 
-/** Every speed gets as far in so many short times as in a long one, and exactly as far as it says.
+/** At every speed, many short advances move as far as one long one, and exactly as far as expected.
  */
 TEST(Speed, DoesNotDrift)
 {
@@ -114,7 +114,7 @@ TEST(Speed, DoesNotDrift)
     }
 }
 
-TEST(Speed, ReachesTheNextChangeWhenTimeToNextChangeSaysSo)
+TEST(Speed, ReachesTheNextChangeAfterTimeToNextChange)
 {
     for (const bd::PlaySpeedDef speed :
          {bd::PlaySpeedSlow5, bd::PlaySpeedSlow2, bd::PlaySpeedNormal, bd::PlaySpeedFast1,
@@ -138,7 +138,7 @@ TEST(Speed, ReachesTheNextChangeWhenTimeToNextChangeSaysSo)
     }
 }
 
-TEST(Speed, OfAPlaybackThatWasStoppedLeavesNothingToTheNext)
+TEST(Speed, IsResetWhenPlaybackStops)
 {
     TestDesk desk(ListOf({Item(10)}));
     desk.Start();
@@ -153,7 +153,7 @@ TEST(Speed, OfAPlaybackThatWasStoppedLeavesNothingToTheNext)
     EXPECT_EQ(desk.navigator.Context().GetCurrentTimePosition(), 100);
 }
 
-TEST(Speed, IsKeptIntoTheNextItem)
+TEST(Speed, IsKeptInTheNextItem)
 {
     TestDesk desk(ListOf({Item(2), Item(2)}));
     desk.Start();
@@ -166,7 +166,7 @@ TEST(Speed, IsKeptIntoTheNextItem)
               "2 Finished(EndOfMedia)\n");
 }
 
-TEST(Backward, PassesItemsChaptersAndMarksTheOtherWayRound)
+TEST(Backward, PassesItemsChaptersAndMarksInReverseOrder)
 {
     TestDesk desk(ListOf({Item(2), Item(2)}, {Entry(0, Ticks(0)), Entry(0, Second),
                                               Link(1, Ticks(100)), Entry(1, Second)}));
@@ -216,7 +216,7 @@ TEST(Backward, TurnsAroundAtOnceAtTheStart)
                            "1 CurrentTimePosition(45000)\n");
 }
 
-TEST(Backward, EntersAnItemOfOneTickBeforeItTurnsAround)
+TEST(Backward, EntersAnItemOfOneTickBeforeTurningAround)
 {
     TestDesk desk(
         ListOf({ItemOfTicks(Ticks(1)), Item(10)}, {Entry(0, Ticks(0)), Entry(1, Ticks(0))}));
@@ -250,7 +250,7 @@ TEST(Backward, HasNoStills)
               "2 PlayMode(PlayDirectionForward, PlaySpeedNormal)\n");
 }
 
-TEST(Backward, TellsTheStreamsOfTheItemItGetsTo)
+TEST(Backward, AnnouncesTheStreamsOfTheItemItEnters)
 {
     PlayItem withAudio = Item(1);
     withAudio.streams.primaryAudio = {StreamOf(CodingAc3, 0x1100)};

@@ -9,7 +9,7 @@ namespace deskplayer
 namespace
 {
 
-/** A resume point in which no two numbers are alike. */
+/** A resume point in which all numbers differ. */
 ResumePoint UnusualPoint()
 {
     ResumePoint point;
@@ -34,7 +34,7 @@ ResumePoint UnusualPoint()
     return point;
 }
 
-/** A block with the FNV-1a checksum of its bytes at its end. */
+/** A block with the FNV-1a checksum of its bytes appended. */
 std::vector<bd::UInt8> WithChecksum(std::vector<bd::UInt8> block)
 {
     std::uint32_t sum = 2166136261U;
@@ -47,7 +47,7 @@ std::vector<bd::UInt8> WithChecksum(std::vector<bd::UInt8> block)
     return block;
 }
 
-TEST(ResumeData, GivesBackWhatWasPutIn)
+TEST(ResumeData, IsDecodedAsEncoded)
 {
     const ResumePoint point = UnusualPoint();
 
@@ -74,7 +74,7 @@ TEST(ResumeData, GivesBackWhatWasPutIn)
     EXPECT_EQ(read->selection.pipPgPicked, point.selection.pipPgPicked);
 }
 
-TEST(ResumeData, TellsTheFlagsApart)
+TEST(ResumeData, DistinguishesTheFlags)
 {
     bool StreamSelection::*const flags[] = {
         &StreamSelection::pgShown, &StreamSelection::secondaryVideoShown,
@@ -92,10 +92,10 @@ TEST(ResumeData, TellsTheFlagsApart)
     }
 }
 
-TEST(ResumeData, IsTheSameOnEveryMachine)
+TEST(ResumeData, HasTheSameBytesOnEveryMachine)
 {
     const std::vector<bd::UInt8> expected = {
-        'B', 'D',  'R',  '1',                     // what it is
+        'B', 'D',  'R',  '1',                     // magic number
         0,   0x01, 0x86, 0x9F,                    // play list
         1,                                        // playing
         9,   10,                                  // play item
@@ -103,12 +103,12 @@ TEST(ResumeData, IsTheSameOnEveryMachine)
         0,   0,    0,    1,    0, 0,  0,    17,   // play mode
         0,   11,   0,    12,   0, 13, 0x14, 0x15, // video, audio, menu, subtitles
         0,   16,   0,    17,   0, 18, // secondary video and audio, picture-in-picture subtitles
-        19,  20,   0,    1,    0, 1}; // angle, style, what is shown
+        19,  20,   0,    1,    0, 1}; // angle, style, display flags
 
     EXPECT_EQ(MakeResumeData(UnusualPoint()), WithChecksum(expected));
 }
 
-TEST(ResumeData, IsRefusedWhenItIsABlockOfAnotherKind)
+TEST(ResumeData, IsRefusedIfItIsAnotherKindOfBlock)
 {
     std::vector<bd::UInt8> block = MakeResumeData(UnusualPoint());
     block.resize(block.size() - 4);
@@ -119,7 +119,7 @@ TEST(ResumeData, IsRefusedWhenItIsABlockOfAnotherKind)
     EXPECT_FALSE(ReadResumeData(WithChecksum(block)));
 }
 
-TEST(ResumeData, IsRefusedWhenABitOfItIsDamaged)
+TEST(ResumeData, IsRefusedIfABitIsDamaged)
 {
     const std::vector<bd::UInt8> block = MakeResumeData(UnusualPoint());
     for (std::size_t bit = 0; bit < 8 * block.size(); ++bit) {
@@ -156,16 +156,16 @@ TEST(ResumeDataKeeper, KeepsACopyOfTheLastBlock)
     EXPECT_TRUE(keeper.ResumeData().empty());
 }
 
-TEST(Standby, GivesOutTheResumeDataAndForgetsIt)
+TEST(Standby, PassesOnTheResumeDataAndDiscardsIt)
 {
     TestDesk desk(ListOf({Item(10)}));
     desk.Start(4 * Second);
 
     EXPECT_TRUE(desk.navigator.GoToStandby().IsDone());
 
-    const std::string heard = desk.Take();
-    EXPECT_EQ(heard.rfind("4 SystemSuspended(bytes 66 68 82 49 ", 0), 0) << heard;
-    EXPECT_EQ(std::count(heard.begin(), heard.end(), '\n'), 1);
+    const std::string received = desk.Take();
+    EXPECT_EQ(received.rfind("4 SystemSuspended(bytes 66 68 82 49 ", 0), 0) << received;
+    EXPECT_EQ(std::count(received.begin(), received.end(), '\n'), 1);
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Standby);
     EXPECT_EQ(desk.navigator.Context().GetSystemResumeData().size, 0);
     const std::optional<ResumePoint> point = ReadResumeData(desk.desk.ResumeData());
@@ -175,7 +175,7 @@ TEST(Standby, GivesOutTheResumeDataAndForgetsIt)
     EXPECT_TRUE(point->playing);
 }
 
-TEST(Standby, LastsAsLongAsItLasts)
+TEST(Standby, LastsUntilWakeUp)
 {
     TestDesk desk(ListOf({Item(10)}));
     desk.Start(4 * Second);
@@ -203,7 +203,7 @@ TEST(Standby, ClosesTheMenuAndEndsAStill)
               0);
 }
 
-TEST(Standby, IsLeftWithPositionStreamsAndPlayMode)
+TEST(Standby, IsLeftWithThePreviousPositionStreamsAndPlayMode)
 {
     PlayList playList = ListOf({Item(2), RichItem(10)}, {Entry(0, Ticks(0)), Entry(1, Ticks(0))});
     TestDesk desk(playList);
@@ -251,7 +251,7 @@ TEST(Standby, IsLeftWithPositionStreamsAndPlayMode)
     EXPECT_EQ(restarted.Snapshot(), before) << "in another navigator over the same play list";
 }
 
-TEST(Standby, IsLeftPausedWhenItWasEnteredSo)
+TEST(Standby, IsLeftPausedIfEnteredPaused)
 {
     TestDesk desk(ListOf({Item(10)}));
     desk.Start(4 * Second);
@@ -265,7 +265,7 @@ TEST(Standby, IsLeftPausedWhenItWasEnteredSo)
     EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), 4 * Second);
 }
 
-TEST(Standby, IsLeftIntoTheStillAtTheEndAgain)
+TEST(Standby, IsLeftIntoTheSameStill)
 {
     TestDesk desk(ListOf({WithTimedStill(Item(1), 5)}));
     desk.Start(2 * Second);
@@ -279,7 +279,7 @@ TEST(Standby, IsLeftIntoTheStillAtTheEndAgain)
                                            "7 Finished(EndOfMedia)\n");
 }
 
-TEST(Standby, IsLeftWhereItWasEnteredInEveryItem)
+TEST(Standby, IsLeftAtThePositionWhereItWasEnteredInEveryItem)
 {
     const PlayList playList = ListOf(
         {Item(2), Item(0), WithTimedStill(Item(2), 5), WithTimedStill(Item(0), 5), RichItem(2)},
@@ -289,7 +289,7 @@ TEST(Standby, IsLeftWhereItWasEnteredInEveryItem)
         TestDesk desk(playList);
         desk.Start(time * Second + Ticks(22500));
         const std::string before = desk.Snapshot();
-        const std::size_t size = // a still is shown anew, and takes its time again
+        const std::size_t size = // a still starts again with its full time
             desk.navigator.CurrentStatus() == Status::Still ? before.find(" at ") : before.size();
         desk.Do(desk.navigator.GoToStandby());
 
@@ -300,7 +300,7 @@ TEST(Standby, IsLeftWhereItWasEnteredInEveryItem)
     }
 }
 
-TEST(Standby, TellsThePlayModeThatWasAskedForWhilePaused)
+TEST(Standby, AnnouncesThePlayModeRequestedWhilePaused)
 {
     TestDesk desk(ListOf({Item(10)}));
     desk.Start(Second);
@@ -326,7 +326,7 @@ TEST(Standby, EndsARepeat)
     EXPECT_FALSE(desk.navigator.IsRepeating());
 }
 
-TEST(Standby, EndsInAStopWhenTheResumeDataIsNoGood)
+TEST(Standby, StopsPlaybackIfTheResumeDataIsInvalid)
 {
     ResumePoint ofAnotherPlayList;
     ofAnotherPlayList.playList = 8;

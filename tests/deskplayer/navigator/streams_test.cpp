@@ -18,11 +18,11 @@ bd::PlayMode Fast()
     return bd::PlayMode(bd::PlayDirectionForward, bd::PlaySpeedFast1);
 }
 
-/** Operations that select one of two. */
+/** Operations that select one of two streams. */
 struct Selection {
     Select select;
     const char* what;
-    const char* heard; ///< when the second was selected
+    const char* received; ///< when the second was selected
 };
 
 const Selection Selections[] = {
@@ -45,7 +45,7 @@ const Selection Selections[] = {
      "1 PipPgTextStInfo(2, false)\n"},
 };
 
-TEST(Streams, AreSelectedAndToldOnce)
+TEST(Streams, AreSelectedAndAnnouncedOnce)
 {
     for (const Selection& selection : Selections) {
         SCOPED_TRACE(selection.what);
@@ -54,7 +54,7 @@ TEST(Streams, AreSelectedAndToldOnce)
         const std::string before = desk.Snapshot();
 
         EXPECT_TRUE((desk.navigator.*selection.select)(2).IsDone());
-        EXPECT_EQ(desk.Take(), selection.heard);
+        EXPECT_EQ(desk.Take(), selection.received);
         EXPECT_NE(desk.Snapshot(), before);
 
         EXPECT_TRUE((desk.navigator.*selection.select)(2).IsDone());
@@ -65,7 +65,7 @@ TEST(Streams, AreSelectedAndToldOnce)
     }
 }
 
-TEST(Streams, ThatAreNotThereAreRefused)
+TEST(Streams, ThatDoNotExistAreRefused)
 {
     for (const Selection& selection : Selections) {
         SCOPED_TRACE(selection.what);
@@ -83,7 +83,7 @@ TEST(Streams, ThatAreNotThereAreRefused)
     }
 }
 
-TEST(Streams, CannotBeSelectedWhereThereAreNone)
+TEST(Streams, CannotBeSelectedIfThereAreNone)
 {
     for (const Selection& selection : Selections) {
         SCOPED_TRACE(selection.what);
@@ -98,7 +98,7 @@ TEST(Streams, CannotBeSelectedWhereThereAreNone)
     }
 }
 
-TEST(Streams, AreTheLastWhereTheChosenOneIsMissingAndTheChoiceStays)
+TEST(Streams, FallBackToTheLastAndKeepTheSelection)
 {
     PlayItem poor = RichItem(1);
     poor.streams.primaryAudio.pop_back();
@@ -115,14 +115,15 @@ TEST(Streams, AreTheLastWhereTheChosenOneIsMissingAndTheChoiceStays)
     desk.navigator.Advance(Second);
     EXPECT_NE(desk.Take().find("2 AudioInfo(0)\n"), std::string::npos);
     desk.navigator.Advance(Second);
-    const std::string heard = desk.Take();
-    EXPECT_NE(heard.find("3 AudioInfo(2)\n"), std::string::npos);
-    EXPECT_NE(heard.find("3 AudioInfoChanged(true, (AudioFormatPcm, AudioSampleRateUnknown, "
-                         "AudioBitsPerSamplingTypeInvalid, AudioChannelTypeUnknown, 4353, 0))\n"),
-              std::string::npos);
+    const std::string received = desk.Take();
+    EXPECT_NE(received.find("3 AudioInfo(2)\n"), std::string::npos);
+    EXPECT_NE(
+        received.find("3 AudioInfoChanged(true, (AudioFormatPcm, AudioSampleRateUnknown, "
+                      "AudioBitsPerSamplingTypeInvalid, AudioChannelTypeUnknown, 4353, 0))\n"),
+        std::string::npos);
 }
 
-TEST(Streams, TellTheirAudioAgainOnlyWhenItIsDifferent)
+TEST(Streams, AnnounceAudioAttributesOnlyWhenTheyDiffer)
 {
     PlayItem other = RichItem(1);
     other.streams.primaryAudio.front().attributes.sampleRate = 1;
@@ -184,7 +185,7 @@ TEST(Streams, HiddenSubtitlesAreNotAvailable)
     EXPECT_EQ(desk.Take(), "1 PresentationGraphicsInfo(2, false)\n");
 }
 
-TEST(Streams, OfTextHaveFourStyles)
+TEST(Streams, OfTextSubtitlesHaveFourStyles)
 {
     TestDesk desk(ListOf({RichItem(10)}));
     desk.Start(Second);
@@ -202,7 +203,7 @@ TEST(Streams, OfTextHaveFourStyles)
     EXPECT_EQ(desk.navigator.Context().GetCurrentTextSubtitleStyleNumber(), 4);
 }
 
-TEST(Streams, WithoutTextHaveNoStyles)
+TEST(Streams, WithoutTextSubtitlesHaveNoStyles)
 {
     PlayItem item = RichItem(10);
     item.streams.pg = {StreamOf(CodingGraphics)};
@@ -225,7 +226,7 @@ TEST(Streams, WithoutTextHaveNoStyles)
               "20 TextSubtitleStylesAvailable(0)\n");
 }
 
-TEST(Streams, ZoomIsTold)
+TEST(Streams, AreZoomed)
 {
     TestDesk desk(ListOf({Item(10)}));
     desk.Start(Second);
@@ -252,7 +253,7 @@ constexpr const char* Available = "0 PictureInPictureAvailable()\n"
 constexpr const char* Unavailable = "0 PictureInPictureUnavailable()\n"
                                     "0 SecondaryAudioUnavailable()\n";
 
-TEST(SecondaryStreams, AreAvailableWithTheItemOnTheirOwnAndBehindItsStreamsInStep)
+TEST(SecondaryStreams, AreAnnouncedWithTheItemIfAsyncAndAfterItsStreamsIfSync)
 {
     for (const bool inStep : {true, false}) {
         SCOPED_TRACE(inStep);
@@ -282,7 +283,7 @@ TEST(SecondaryStreams, AreAvailableWithTheItemOnTheirOwnAndBehindItsStreamsInSte
     }
 }
 
-TEST(SecondaryStreams, AreAvailableAtNormalSpeedOnly)
+TEST(SecondaryStreams, AreAvailableOnlyAtNormalSpeed)
 {
     for (const bd::SubPathType type : {bd::SubPathOutOfMuxSynchPipPresentationPath,
                                        bd::SubPathOutOfMuxASynchPipPresentationPath}) {
@@ -299,7 +300,7 @@ TEST(SecondaryStreams, AreAvailableAtNormalSpeedOnly)
     }
 }
 
-TEST(SecondaryStreams, AreUnavailableOnceInTheItemThatLacksThem)
+TEST(SecondaryStreams, AreAnnouncedUnavailableOnceInAnItemWithoutThem)
 {
     for (const bd::SubPathType type : {bd::SubPathOutOfMuxSynchPipPresentationPath,
                                        bd::SubPathOutOfMuxASynchPipPresentationPath}) {
@@ -320,7 +321,7 @@ TEST(SecondaryStreams, AreUnavailableOnceInTheItemThatLacksThem)
     }
 }
 
-TEST(SecondaryStreams, OfASubPathThatIsNotThereAreInStep)
+TEST(SecondaryStreams, OfAMissingSubPathAreSync)
 {
     PlayItem item = Item(10);
     item.streams.secondaryVideo = {StreamOfSubPath(0x1B, 3)};

@@ -2,7 +2,7 @@
 
 #include <gtest/gtest.h>
 
-#include "rooms.h"
+#include "parts.h"
 
 namespace deskplayer
 {
@@ -10,8 +10,8 @@ namespace deskplayer
 namespace
 {
 
-struct TransportRooms : EventRooms {
-    using EventRooms::EventRooms;
+struct TransportParts : EventParts {
+    using EventParts::EventParts;
 
     VirtualClock clock;
     PopUpMenu menu{playhead, state, sender};
@@ -19,84 +19,84 @@ struct TransportRooms : EventRooms {
     Transport transport{clock, state, playhead, menu, announcer, sender};
 };
 
-TEST(Transport, PlaysWithoutAskingForPermission)
+TEST(Transport, PlaysWithoutCheckingPermission)
 {
-    TransportRooms rooms(ListOf({Forbidding(Item(2), {bd::UserOperationTimeSearch})}));
-    rooms.transport.Start();
-    rooms.Take();
+    TransportParts parts(ListOf({Forbidding(Item(2), {bd::UserOperationTimeSearch})}));
+    parts.transport.Start();
+    parts.Take();
 
-    rooms.transport.JumpTo(Second);
+    parts.transport.JumpTo(Second);
 
-    EXPECT_EQ(rooms.Take(), "A.JumpOccurred()\n"
+    EXPECT_EQ(parts.Take(), "A.JumpOccurred()\n"
                             "A.CurrentTimePosition(45000)\n");
 }
 
-TEST(Transport, ReturnsTheTimeThatIsLeftWhenPlaybackEnds)
+TEST(Transport, ReturnsTheTimeLeftWhenPlaybackEnds)
 {
-    TransportRooms rooms(ListOf({Item(2)}));
-    rooms.transport.Start();
+    TransportParts parts(ListOf({Item(2)}));
+    parts.transport.Start();
 
-    EXPECT_EQ(rooms.transport.Advance(5 * Second), 3 * Second);
+    EXPECT_EQ(parts.transport.Advance(5 * Second), 3 * Second);
 
-    EXPECT_EQ(rooms.clock.Now(), 2 * Second);
-    EXPECT_EQ(rooms.state.status, Status::Finished);
+    EXPECT_EQ(parts.clock.Now(), 2 * Second);
+    EXPECT_EQ(parts.state.status, Status::Finished);
 }
 
 TEST(Transport, ClosesTheMenuBeforeItBecomesUnavailable)
 {
-    TransportRooms rooms(ListOf({RichItem(2), Item(2)}));
-    rooms.transport.Start();
-    rooms.menu.Open();
-    rooms.Take();
+    TransportParts parts(ListOf({RichItem(2), Item(2)}));
+    parts.transport.Start();
+    parts.menu.Open();
+    parts.Take();
 
-    rooms.transport.Advance(2 * Second);
+    parts.transport.Advance(2 * Second);
 
-    const std::string heard = rooms.Take();
-    EXPECT_EQ(heard.substr(heard.find("A.InteractiveGraphicsInvisible")),
+    const std::string received = parts.Take();
+    EXPECT_EQ(received.substr(received.find("A.InteractiveGraphicsInvisible")),
               "A.InteractiveGraphicsInvisible()\n"
               "A.InteractiveGraphicsInactive()\n"
               "A.PopUpMenuUnavailable()\n");
-    EXPECT_FALSE(rooms.menu.IsOpen());
+    EXPECT_FALSE(parts.menu.IsOpen());
 }
 
-TEST(Transport, KeepsTheMenuOpenWhereTheNextItemHasOne)
+TEST(Transport, KeepsTheMenuOpenIfTheNextItemHasOne)
 {
-    TransportRooms rooms(ListOf({RichItem(2), RichItem(2)}));
-    rooms.transport.Start();
-    rooms.menu.Open();
+    TransportParts parts(ListOf({RichItem(2), RichItem(2)}));
+    parts.transport.Start();
+    parts.menu.Open();
 
-    rooms.transport.Advance(3 * Second);
+    parts.transport.Advance(3 * Second);
 
-    EXPECT_TRUE(rooms.menu.IsOpen());
+    EXPECT_TRUE(parts.menu.IsOpen());
 }
 
-TEST(Transport, WaitsForAnOperationUnlessItPlaysOrATimedStillLasts)
+TEST(Transport, WaitsForAnOperationUnlessPlayingOrInATimedStill)
 {
-    TransportRooms rooms(ListOf({WithTimedStill(Item(1), 5)}));
-    EXPECT_EQ(rooms.transport.TimeToNextChange(), std::nullopt);
+    TransportParts parts(ListOf({WithTimedStill(Item(1), 5)}));
+    EXPECT_EQ(parts.transport.TimeToNextChange(), std::nullopt);
 
-    rooms.transport.Start();
-    EXPECT_EQ(rooms.transport.TimeToNextChange(), Second);
+    parts.transport.Start();
+    EXPECT_EQ(parts.transport.TimeToNextChange(), Second);
 
-    rooms.transport.Advance(3 * Second);
-    EXPECT_EQ(rooms.transport.TimeToNextChange(), 3 * Second);
+    parts.transport.Advance(3 * Second);
+    EXPECT_EQ(parts.transport.TimeToNextChange(), 3 * Second);
 
-    rooms.state.status = Status::Paused;
-    EXPECT_EQ(rooms.transport.TimeToNextChange(), std::nullopt);
+    parts.state.status = Status::Paused;
+    EXPECT_EQ(parts.transport.TimeToNextChange(), std::nullopt);
 }
 
 TEST(Transport, KeepsTheSelectionWhenItStartsAgain)
 {
-    TransportRooms rooms(ListOf({RichItem(2)}));
-    rooms.transport.Start();
-    rooms.state.selection.audio = 2;
-    rooms.state.pointA = Second;
-    rooms.transport.Stop();
+    TransportParts parts(ListOf({RichItem(2)}));
+    parts.transport.Start();
+    parts.state.selection.audio = 2;
+    parts.state.pointA = Second;
+    parts.transport.Stop();
 
-    rooms.transport.Start();
+    parts.transport.Start();
 
-    EXPECT_EQ(rooms.state.selection.audio, 2);
-    EXPECT_EQ(rooms.state.pointA, std::nullopt);
+    EXPECT_EQ(parts.state.selection.audio, 2);
+    EXPECT_EQ(parts.state.pointA, std::nullopt);
 }
 
 } // namespace

@@ -11,7 +11,7 @@ namespace deskplayer
 namespace
 {
 
-TEST(Callbacks, StandInTheOrderOfTheirDeclaration)
+TEST(Callbacks, AreInOrderOfDeclaration)
 {
     CollectingListener listener;
     CallEveryCallback(listener);
@@ -22,7 +22,7 @@ TEST(Callbacks, StandInTheOrderOfTheirDeclaration)
     }
 }
 
-TEST(Callbacks, KnowTheInterfaceThatDeclaresThem)
+TEST(Callbacks, NameTheInterfaceThatDeclaresThem)
 {
     const auto count = [](ListenerInterface interface) {
         return std::count_if(

@@ -1,4 +1,4 @@
-// What docs/outputs.md shows is what is written.
+// The examples and tables of docs/outputs.md match the actual output.
 
 #include <gtest/gtest.h>
 
@@ -71,7 +71,7 @@ std::string KindOf(const bd::ZoomRectangleDef& /*value*/)
     return "rectangle";
 }
 
-TEST(Documentation, ShowsTrueExamples)
+TEST(Documentation, ShowsTheActualOutput)
 {
     const std::string documentation = Documentation();
     for (const OutputFormat format :

@@ -1,6 +1,6 @@
 /**
  * @file
- * A session in which everything happens once.
+ * Calls every callback once.
  */
 #ifndef TESTS_DESKPLAYER_OUTPUT_EVERYCALLBACK_H
 #define TESTS_DESKPLAYER_OUTPUT_EVERYCALLBACK_H
@@ -13,10 +13,10 @@
 namespace deskplayer
 {
 
-/** Calls every callback once, in the order of declaration, with arguments that differ. */
+/** Calls every callback once, in order of declaration, with distinct arguments. */
 void CallEveryCallback(bdmv::INavigatorListener& listener);
 
-/** Keeps the callbacks. */
+/** Records the callbacks. */
 class CollectingListener : public CallbackListener
 {
 public:

@@ -18,7 +18,7 @@ using nlohmann::json;
 class JsonLines : public testing::Test
 {
 protected:
-    /** What has been written, line by line. */
+    /** The output, line by line. */
     std::vector<json> Lines() const
     {
         std::vector<json> lines;
@@ -37,7 +37,7 @@ protected:
     bdmv::INavigatorListener& listener = output;
 };
 
-TEST_F(JsonLines, WritesAnObjectALineWithMembersInAFixedOrder)
+TEST_F(JsonLines, WritesAnObjectPerLineWithMembersInAFixedOrder)
 {
     clock.Advance(Ticks(45000 * 27 + 22500));
 

@@ -56,7 +56,7 @@ TEST(OutputFilter, KeepsCallbacksByName)
     EXPECT_TRUE(filter.Passes(CallbackId::AudioInfo));
 }
 
-TEST(OutputFilter, KeepsWhatIsNamedTwiceOnce)
+TEST(OutputFilter, AcceptsANameTwice)
 {
     OutputFilter filter;
     filter.KeepCallbacks("PlayItem,PlayItem");
@@ -77,7 +77,7 @@ TEST(OutputFilter, NarrowsWithEveryOperation)
     EXPECT_EQ(CountPassing(filter), 0U);
 }
 
-TEST(OutputFilter, NamesAnUnknownInterfaceAndThoseThereAre)
+TEST(OutputFilter, NamesAnUnknownInterfaceAndAllInterfaces)
 {
     OutputFilter filter;
 
@@ -86,7 +86,7 @@ TEST(OutputFilter, NamesAnUnknownInterfaceAndThoseThereAre)
               "interactive");
 }
 
-TEST(OutputFilter, NamesAnUnknownCallbackAndThoseThereAre)
+TEST(OutputFilter, NamesAnUnknownCallbackAndAllCallbacks)
 {
     OutputFilter filter;
     const std::string message = MessageOf([&] { filter.KeepCallbacks("PlayItem,playitem"); });
@@ -102,11 +102,12 @@ TEST(OutputFilter, RefusesEmptyWords)
 {
     for (const char* list : {"", ",control", "control,", "control,,button"}) {
         OutputFilter filter;
-        EXPECT_EQ(MessageOf([&] { filter.KeepInterfaces(list); }).rfind("'' is no", 0), 0U) << list;
+        EXPECT_EQ(MessageOf([&] { filter.KeepInterfaces(list); }).rfind("'' is not a", 0), 0U)
+            << list;
     }
 }
 
-TEST(OutputFilter, StaysAsItIsWhenAWordIsWrong)
+TEST(OutputFilter, IsUnchangedIfAWordIsInvalid)
 {
     OutputFilter filter;
     EXPECT_THROW(filter.KeepCallbacks("Paused,?"), std::invalid_argument);
@@ -118,8 +119,8 @@ TEST(OutputFilter, MakesWordsInMessagesPrintable)
 {
     OutputFilter filter;
 
-    EXPECT_EQ(MessageOf([&] { filter.KeepInterfaces("\033[31m"); }).rfind("'\\x1B[31m' is no", 0),
-              0U);
+    EXPECT_EQ(
+        MessageOf([&] { filter.KeepInterfaces("\033[31m"); }).rfind("'\\x1B[31m' is not a", 0), 0U);
 }
 
 } // namespace

@@ -27,7 +27,7 @@ TEST(OutputFormat, IsParsedByItsName)
     EXPECT_EQ(ParseOutputFormat("trace"), OutputFormat::Trace);
 }
 
-TEST(OutputFormat, NamesAnUnknownNameAndThoseThereAre)
+TEST(OutputFormat, NamesAnUnknownFormatAndAllFormats)
 {
     try {
         ParseOutputFormat("xml");
@@ -37,7 +37,7 @@ TEST(OutputFormat, NamesAnUnknownNameAndThoseThereAre)
     }
 }
 
-TEST(OutputFormat, DecidesWhatIsMade)
+TEST(OutputFormat, DeterminesTheOutput)
 {
     OutputOptions options;
     EXPECT_EQ(Written(options).substr(0, 12), "00:00:00.000");
@@ -49,7 +49,7 @@ TEST(OutputFormat, DecidesWhatIsMade)
     EXPECT_EQ(Written(options).front(), '[');
 }
 
-TEST(OutputFormat, IsFollowedByTheOtherOptions)
+TEST(OutputFormat, IsCombinedWithTheOtherOptions)
 {
     OutputOptions options;
     options.coloured = true;

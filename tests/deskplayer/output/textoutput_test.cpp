@@ -142,7 +142,7 @@ TEST_F(ColouredTextOutput, DimsTheTimeAndTheNamesOfArguments)
                             " \033[2mnumber=\033[0m1\n");
 }
 
-TEST_F(ColouredTextOutput, TellsInterfacesApart)
+TEST_F(ColouredTextOutput, DistinguishesInterfacesByColour)
 {
     bdmv::IProgramData::RefPtr none;
 
@@ -158,7 +158,7 @@ TEST_F(ColouredTextOutput, TellsInterfacesApart)
     EXPECT_NE(text.find("\033[35mPopUpMenuAvailable\033[0m\n"), std::string::npos) << text;
 }
 
-/** A terminal that nobody looks at. */
+/** A pseudo-terminal whose output is not read. */
 class Terminal
 {
 public:
@@ -191,7 +191,7 @@ TEST(WantsColours, NotInAFile)
     close(file);
 }
 
-TEST(WantsColours, NotWhenNoColorIsSetToAnything)
+TEST(WantsColours, NotIfNoColorIsNotEmpty)
 {
     const Terminal terminal;
     ASSERT_NE(terminal.FileDescriptor(), -1);
@@ -200,7 +200,7 @@ TEST(WantsColours, NotWhenNoColorIsSetToAnything)
     EXPECT_FALSE(WantsColours(terminal.FileDescriptor(), "0"));
 }
 
-TEST(WantsColours, WhenNoColorIsEmpty)
+TEST(WantsColours, IfNoColorIsEmpty)
 {
     const Terminal terminal;
     ASSERT_NE(terminal.FileDescriptor(), -1);

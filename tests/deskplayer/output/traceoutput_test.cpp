@@ -30,13 +30,13 @@ struct TimedEvent {
 /** A trace as a viewer reads it. */
 struct ReadTrace {
     std::vector<TimedEvent> events;
-    std::map<int, std::string> tracks; ///< by their place
+    std::map<int, std::string> tracks; ///< by their sort index
 
-    /** Fails the test when a track is not named and placed before its first event. */
+    /** Fails the test if a track has no name and sort index before its first event. */
     explicit ReadTrace(const json& trace)
     {
         std::map<int, std::string> names;
-        std::map<int, int> places;
+        std::map<int, int> sortIndices;
         for (const json& event : trace) {
             const std::string phase = event.at("ph");
             const std::string name = event.value("name", "");
@@ -46,10 +46,11 @@ struct ReadTrace {
             if (name == "thread_name") {
                 EXPECT_TRUE(names.emplace(thread, arguments.at("name")).second) << event;
             } else if (name == "thread_sort_index") {
-                EXPECT_TRUE(places.emplace(thread, arguments.at("sort_index")).second) << event;
+                EXPECT_TRUE(sortIndices.emplace(thread, arguments.at("sort_index")).second)
+                    << event;
                 tracks[arguments.at("sort_index")] = names.at(thread);
             } else if (phase != "M") {
-                EXPECT_EQ(places.count(thread), 1U) << event;
+                EXPECT_EQ(sortIndices.count(thread), 1U) << event;
                 events.push_back({phase, names.at(thread), event.at("ts"), name, arguments});
             }
         }
@@ -78,7 +79,7 @@ public:
     }
 
     /**
-     * Ends the session and tells the slices of a track, with times in milliseconds:
+     * Ends the session and returns the slices of a track, with times in milliseconds:
      *
      *     "Playing 0-1000, Paused 1000-2000"
      */
@@ -102,7 +103,7 @@ private:
     std::optional<TraceOutput> m_Output;
 };
 
-/** Of a session in which everything happens three times, a second apart. */
+/** The trace of a session that calls every callback three times, a second apart. */
 std::vector<TimedEvent> EventsOfThreeRounds()
 {
     TracedSession session;
@@ -113,7 +114,7 @@ std::vector<TimedEvent> EventsOfThreeRounds()
     return ReadTrace(session.Trace()).events;
 }
 
-TEST(TraceOutput, IsValidWhenNothingHappened)
+TEST(TraceOutput, IsValidForAnEmptySession)
 {
     const json trace = TracedSession().Trace();
 
@@ -138,7 +139,7 @@ TEST(TraceOutput, HasAnInstantForEveryCallbackOnTheTrackOfItsInterface)
     EXPECT_EQ(instants, AllCallbacks.size());
 }
 
-TEST(TraceOutput, LimitsInstantsToTheirTrack)
+TEST(TraceOutput, RestrictsInstantsToTheirTrack)
 {
     TracedSession session;
     session->JumpOccurred();
@@ -157,7 +158,7 @@ TEST(TraceOutput, GivesTheArgumentsOfACallback)
     EXPECT_EQ(trace.events[1].arguments, json({{"number", 3}}));
 }
 
-TEST(TraceOutput, BeginsAndEndsInTurnOnEveryTrack)
+TEST(TraceOutput, AlternatesBeginAndEndOnEveryTrack)
 {
     std::map<std::string, int> open;
     for (const TimedEvent& event : EventsOfThreeRounds()) {
@@ -173,7 +174,7 @@ TEST(TraceOutput, BeginsAndEndsInTurnOnEveryTrack)
     }
 }
 
-TEST(TraceOutput, SaysTheSameWhereASliceBeginsAndWhereItEnds)
+TEST(TraceOutput, GivesBothEndsOfASliceTheSameMembers)
 {
     std::map<std::string, TimedEvent> open;
     for (const TimedEvent& event : EventsOfThreeRounds()) {
@@ -211,7 +212,7 @@ TEST(TraceOutput, NamesAndPlacesEveryTrack)
                       "picture-in-picture subtitles, menu, control, settings, button, interactive");
 }
 
-TEST(TraceOutput, HasOnlyTracksWithSomethingOnThem)
+TEST(TraceOutput, HasOnlyTracksWithEvents)
 {
     TracedSession session;
     session->JumpOccurred();
@@ -275,7 +276,7 @@ TEST(TraceOutput, ShowsSuspendedAndStandby)
               "Playing 4000-5000");
 }
 
-TEST(TraceOutput, DoesNotPlayWhenAStillEndsThatPlaybackHasLeft)
+TEST(TraceOutput, IgnoresTheEndOfAStillThatPlaybackHasLeft)
 {
     TracedSession session;
     session->StillOn();
@@ -287,7 +288,7 @@ TEST(TraceOutput, DoesNotPlayWhenAStillEndsThatPlaybackHasLeft)
     EXPECT_EQ(session.Slices("playback"), "Still 0-1000");
 }
 
-TEST(TraceOutput, EndsPlaybackWithEveryCallbackThatSaysSo)
+TEST(TraceOutput, EndsPlaybackWithEveryCallbackThatReportsItsEnd)
 {
     const std::map<std::string, std::function<void(TracedSession&)>> ends = {
         {"PlayFailed", [](TracedSession& session) { session->PlayFailed(); }},
@@ -308,7 +309,7 @@ TEST(TraceOutput, EndsPlaybackWithEveryCallbackThatSaysSo)
     }
 }
 
-TEST(TraceOutput, EndsWithPlaybackWhatIsInPlayback)
+TEST(TraceOutput, EndsTheSlicesOfPlaybackWithPlayback)
 {
     for (const char* track : {"playback", "play mode", "play list", "play item", "chapter"}) {
         TracedSession session;
@@ -361,7 +362,7 @@ TEST(TraceOutput, ShowsEveryStateByItsNumberOrName)
 TEST(TraceOutput, EndsTheSliceWhenNothingIsSelected)
 {
     typedef bdmv::INavigatorListener Listener;
-    const std::map<std::string, std::function<void(Listener&, bd::UInt8)>> tell = {
+    const std::map<std::string, std::function<void(Listener&, bd::UInt8)>> callbacks = {
         {"chapter", [](Listener& l, bd::UInt8 number) { l.ChapterNumber(number); }},
         {"video", [](Listener& l, bd::UInt8 number) { l.VideoInfo(number); }},
         {"audio", [](Listener& l, bd::UInt8 number) { l.AudioInfo(number); }},
@@ -374,10 +375,10 @@ TEST(TraceOutput, EndsTheSliceWhenNothingIsSelected)
         {"secondary audio", [](Listener& l, bd::UInt8 number) { l.SecondaryAudioInfo(number); }},
         {"picture-in-picture subtitles",
          [](Listener& l, bd::UInt8 number) { l.PipPgTextStInfo(number, true); }}};
-    for (const auto& [track, tellOf] : tell) {
+    for (const auto& [track, callBack] : callbacks) {
         TracedSession session;
         for (const bd::UInt8 number : std::vector<bd::UInt8>{0, 1, 0}) {
-            tellOf(*session.operator->(), number);
+            callBack(*session.operator->(), number);
             session.PassSecond();
         }
 
@@ -422,7 +423,7 @@ TEST(TraceOutput, ShowsTheMenuWhileItIsVisible)
     EXPECT_EQ(session.Slices("menu"), "Visible 0-1000");
 }
 
-TEST(TraceOutput, HidesInstantsButNoSlicesByTheFilter)
+TEST(TraceOutput, FiltersInstantsButNotSlices)
 {
     OutputFilter filter;
     filter.KeepCallbacks("Stepped");

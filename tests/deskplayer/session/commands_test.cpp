@@ -12,14 +12,15 @@ namespace deskplayer
 namespace
 {
 
-/** An item that can do everything, with chapters at 0 and 5 s, and one that ends in a still. */
+/** An item that supports every command, with chapters at 0 and 5 s, and one that ends in a still.
+ */
 PlayList TwoItems()
 {
     return ListOf({RichItem(10), WithEndlessStill(RichItem(10))},
                   {Entry(0, Ticks(0)), Entry(0, 5 * Second)});
 }
 
-/** Carries out a script of one line or several, all of them at once. */
+/** Carries out a script whose lines all have the same time. */
 Outcome Perform(TestDesk& desk, const std::string& script)
 {
     Outcome outcome = Outcome::Done();
@@ -29,12 +30,12 @@ Outcome Perform(TestDesk& desk, const std::string& script)
     return outcome;
 }
 
-/** What becomes of a command, a second after the preparation. */
+/** A command and its callbacks, a second after the preparation. */
 struct Example {
-    const char* pattern; ///< the command it stands for
+    const char* pattern; ///< the command that it is an example of
     const char* line;
     const char* preparation;
-    const char* heard;
+    const char* received;
 };
 
 const Example Examples[] = {
@@ -186,10 +187,10 @@ const Example Examples[] = {
     {"fail stream", "fail stream", "play", "1 Finished(DataStarvation)\n"},
 };
 
-/** Commands of which a listener hears more than an example wants to hold. */
+/** Commands with more callbacks than an example should list. */
 const char* const OtherCommands[] = {"standby", "wake"};
 
-TEST(Commands, DoWhatTheySay)
+TEST(Commands, DoWhatTheirHelpSays)
 {
     for (const Example& example : Examples) {
         SCOPED_TRACE(example.line);
@@ -201,11 +202,11 @@ TEST(Commands, DoWhatTheySay)
         const Outcome outcome = Perform(desk, example.line);
 
         EXPECT_TRUE(outcome.IsDone()) << outcome.Reason();
-        EXPECT_EQ(desk.Take(), example.heard);
+        EXPECT_EQ(desk.Take(), example.received);
     }
 }
 
-TEST(Commands, AreAllWrittenAsTheirExamples)
+TEST(Commands, AreAllCoveredByExamples)
 {
     std::set<std::string_view> patterns(std::begin(OtherCommands), std::end(OtherCommands));
     for (const Example& example : Examples) {
@@ -218,14 +219,14 @@ TEST(Commands, AreAllWrittenAsTheirExamples)
 
     std::set<std::string_view> all;
     for (const CommandSyntax& syntax : CommandSyntaxes()) {
-        EXPECT_TRUE(all.insert(syntax.pattern).second) << syntax.pattern << " is there twice";
+        EXPECT_TRUE(all.insert(syntax.pattern).second) << syntax.pattern << " occurs twice";
         EXPECT_FALSE(syntax.help.empty()) << syntax.pattern;
     }
     EXPECT_EQ(patterns, all);
     EXPECT_EQ(Commands().size(), CommandSyntaxes().size());
 }
 
-TEST(Commands, GoToStandbyAndWakeWithTheDataThatWereKept)
+TEST(Commands, GoToStandbyAndWakeUpWithTheStoredData)
 {
     TestDesk desk(TwoItems());
     desk.Do(Perform(desk, "play\nseek 12"));
@@ -238,12 +239,12 @@ TEST(Commands, GoToStandbyAndWakeWithTheDataThatWereKept)
     EXPECT_EQ(desk.Snapshot(), before);
 }
 
-TEST(Commands, PlayAtEveryStepOfSpeedAndNoOther)
+TEST(Commands, PlayAtEveryValidSpeedAndNoOther)
 {
     const struct {
         const char* words;
         bd::PlayDirectionDef direction;
-        int towards; ///< +1 fast, -1 slow
+        int sign; ///< +1 fast, -1 slow
         int steps;
         const char* refusal;
     } kinds[] = {
@@ -259,7 +260,7 @@ TEST(Commands, PlayAtEveryStepOfSpeedAndNoOther)
             desk.Do(Perform(desk, kind.words + std::to_string(step)));
             const bd::PlayMode& mode = desk.navigator.Context().GetCurrentPlayMode();
             EXPECT_EQ(mode.Direction(), kind.direction);
-            EXPECT_EQ(mode.Speed(), bd::PlaySpeedNormal + kind.towards * step);
+            EXPECT_EQ(mode.Speed(), bd::PlaySpeedNormal + kind.sign * step);
         }
         const std::string before = desk.Snapshot();
         for (const int step : {0, kind.steps + 1, 65535}) {
@@ -270,11 +271,11 @@ TEST(Commands, PlayAtEveryStepOfSpeedAndNoOther)
     }
 }
 
-TEST(Commands, GoRoundTheStreams)
+TEST(Commands, CycleThroughTheStreams)
 {
     const struct {
         const char* line;
-        const char* heard;
+        const char* received;
     } kinds[] = {{"audio next", "0 AudioInfo("},
                  {"subtitle next", "0 PresentationGraphicsInfo("},
                  {"angle next", "0 AngleInfo("}};
@@ -284,12 +285,12 @@ TEST(Commands, GoRoundTheStreams)
         desk.Start();
         for (const char number : {'2', '1', '2'}) {
             EXPECT_TRUE(Perform(desk, kind.line).IsDone());
-            EXPECT_EQ(desk.Take().rfind(std::string(kind.heard) + number, 0), 0);
+            EXPECT_EQ(desk.Take().rfind(std::string(kind.received) + number, 0), 0);
         }
     }
 }
 
-TEST(Commands, RefuseTheNextOfNoStreams)
+TEST(Commands, RefuseTheNextStreamIfThereIsNone)
 {
     TestDesk desk(ListOf({Item(10)}));
     desk.Start();
@@ -298,7 +299,7 @@ TEST(Commands, RefuseTheNextOfNoStreams)
               "no audio stream 1; there are no audio streams");
     EXPECT_EQ(Perform(desk, "subtitle next").Reason(),
               "no subtitle stream 1; there are no subtitle streams");
-    EXPECT_TRUE(Perform(desk, "angle next").IsDone()) << "there is always one";
+    EXPECT_TRUE(Perform(desk, "angle next").IsDone()) << "every play item has one";
     EXPECT_EQ(desk.Take(), "");
 }
 

@@ -22,13 +22,13 @@ namespace
 
 constexpr char ControlC = '\x03';
 
-/** An item of an hour, so that nothing ends by itself, with chapters every ten minutes. */
+/** An item of an hour, so that playback does not end, with chapters every ten minutes. */
 PlayList LongPlayList()
 {
     return ListOf({RichItem(3600), RichItem(10)}, {Entry(0, Ticks(0)), Entry(0, 600 * Second)});
 }
 
-/** A pipe that keys have been written to. */
+/** A pipe with keys to read. */
 class Keys
 {
 public:
@@ -47,7 +47,7 @@ public:
     Keys(const Keys&) = delete;
     Keys& operator=(const Keys&) = delete;
 
-    /** There will be no more. */
+    /** Ends the input. */
     void End()
     {
         if (m_Ends[1] >= 0) {
@@ -58,7 +58,7 @@ public:
 
     int Descriptor() const { return m_Ends[0]; }
 
-    /** How many were not read. */
+    /** The number of unread keys. */
     std::size_t Left() const
     {
         fcntl(m_Ends[0], F_SETFL, O_NONBLOCK);
@@ -71,10 +71,10 @@ private:
     int m_Ends[2] = {-1, -1};
 };
 
-/** Without the times, which are those of the wall clock. */
-std::string WithoutTimes(const std::string& heard)
+/** Callbacks without their times, which depend on the wall clock. */
+std::string WithoutTimes(const std::string& received)
 {
-    std::istringstream lines(heard);
+    std::istringstream lines(received);
     std::string callbacks;
     for (std::string line; std::getline(lines, line);) {
         callbacks += line.substr(line.find(' ') + 1) + "\n";
@@ -82,7 +82,7 @@ std::string WithoutTimes(const std::string& heard)
     return callbacks;
 }
 
-/** Presses keys one after the other. @return the refusals, one a line */
+/** Presses keys one after the other. @return the refusals, one per line */
 std::string Press(TestDesk& desk, const std::string& pressed)
 {
     std::string refusals;
@@ -93,8 +93,8 @@ std::string Press(TestDesk& desk, const std::string& pressed)
     return refusals;
 }
 
-/** What a listener hears of keys that are pressed after others, and the refusals. */
-std::string HeardOfKeys(TestDesk& desk, const std::string& before, const std::string& keys)
+/** The callbacks of keys that are pressed after others, and the refusals. */
+std::string CallbacksOfKeys(TestDesk& desk, const std::string& before, const std::string& keys)
 {
     Press(desk, before);
     desk.Take();
@@ -103,9 +103,9 @@ std::string HeardOfKeys(TestDesk& desk, const std::string& before, const std::st
 }
 
 struct KeyExample {
-    const char* before; ///< keys that prepare for it
+    const char* before; ///< keys pressed as preparation
     char key;
-    const char* heard;
+    const char* received;
 };
 
 TEST(Remote, PerformsTheActionOfEveryKey)
@@ -114,7 +114,7 @@ TEST(Remote, PerformsTheActionOfEveryKey)
         {"", ' ', "Paused()\n"},
         {" ", ' ', "Continued(PlayDirectionForward, PlaySpeedNormal)\n"},
         {"", 'x', "Stopped()\n"},
-        {" ", '.', nullptr}, // tells a position of the wall clock
+        {" ", '.', nullptr}, // reports a position that depends on the wall clock
         {"", 'f',
          "PlayMode(PlayDirectionForward, "
          "PlaySpeedFast1)\nPictureInPictureUnavailable()\nSecondaryAudioUnavailable()\n"},
@@ -140,16 +140,16 @@ TEST(Remote, PerformsTheActionOfEveryKey)
          "ButtonActivationBusy()\nExecuteButton(1, 2, program shared by 2)\n"
          "ButtonActivationDone()\nInteractiveGraphicsInvisible()\nInteractiveGraphicsInactive()\n"
          "JumpOccurred()\nMarkInfo(7, 1, 27000000)\nChapterNumber(2)\n"},
-        {"", 'z', nullptr}, // tells a position of the wall clock
+        {"", 'z', nullptr}, // reports a position that depends on the wall clock
         {"", 'Z', "not in standby, but playing\n"},
     };
     std::set<char> keys;
     for (const KeyExample& example : examples) {
         SCOPED_TRACE(example.key);
         keys.insert(example.key);
-        if (example.heard != nullptr) {
+        if (example.received != nullptr) {
             TestDesk desk(LongPlayList());
-            EXPECT_EQ(HeardOfKeys(desk, example.before, {example.key}), example.heard);
+            EXPECT_EQ(CallbacksOfKeys(desk, example.before, {example.key}), example.received);
         }
     }
     for (const RemoteKey& key : RemoteKeys()) {
@@ -162,38 +162,38 @@ TEST(Remote, StepsWhilePaused)
 {
     TestDesk desk(LongPlayList());
 
-    const std::string heard = HeardOfKeys(desk, " ", ".");
+    const std::string received = CallbacksOfKeys(desk, " ", ".");
 
-    EXPECT_EQ(heard.rfind("Stepped(", 0), 0) << heard;
+    EXPECT_EQ(received.rfind("Stepped(", 0), 0) << received;
 }
 
 TEST(Remote, PlaysAgainAfterAStop)
 {
     TestDesk desk(LongPlayList());
 
-    const std::string heard = HeardOfKeys(desk, "", "xx");
+    const std::string received = CallbacksOfKeys(desk, "", "xx");
 
-    EXPECT_EQ(heard.rfind("Stopped()\nPlayStarted()\n", 0), 0) << heard;
+    EXPECT_EQ(received.rfind("Stopped()\nPlayStarted()\n", 0), 0) << received;
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Playing);
 }
 
-TEST(Remote, GoesToStandbyAndComesBack)
+TEST(Remote, GoesToStandbyAndWakesUp)
 {
-    TestDesk asleep(LongPlayList());
-    HeardOfKeys(asleep, "", "z");
-    EXPECT_EQ(asleep.navigator.CurrentStatus(), Status::Standby);
+    TestDesk inStandby(LongPlayList());
+    CallbacksOfKeys(inStandby, "", "z");
+    EXPECT_EQ(inStandby.navigator.CurrentStatus(), Status::Standby);
 
-    TestDesk awake(LongPlayList());
-    HeardOfKeys(awake, "n", "zZ");
-    EXPECT_EQ(awake.navigator.CurrentStatus(), Status::Playing);
-    EXPECT_GE(Ticks(awake.navigator.Context().GetCurrentTimePosition()), 600 * Second);
+    TestDesk awakened(LongPlayList());
+    CallbacksOfKeys(awakened, "n", "zZ");
+    EXPECT_EQ(awakened.navigator.CurrentStatus(), Status::Playing);
+    EXPECT_GE(Ticks(awakened.navigator.Context().GetCurrentTimePosition()), 600 * Second);
 }
 
 TEST(Remote, PlaysNoFasterThanTheFastest)
 {
     TestDesk desk(LongPlayList());
 
-    HeardOfKeys(desk, " ", std::string(20, 'f'));
+    CallbacksOfKeys(desk, " ", std::string(20, 'f'));
     EXPECT_EQ(desk.navigator.Context().GetPlayMode(),
               bd::PlayMode(bd::PlayDirectionForward, bd::PlaySpeedFast12));
 }
@@ -202,7 +202,7 @@ TEST(Remote, PlaysFasterBackwardStepByStep)
 {
     TestDesk desk(LongPlayList());
 
-    HeardOfKeys(desk, " ", "frr");
+    CallbacksOfKeys(desk, " ", "frr");
     EXPECT_EQ(desk.navigator.Context().GetPlayMode(),
               bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedFast2));
 }
@@ -240,7 +240,7 @@ TEST(Remote, EndsWithQAndReadsNoFurther)
     EXPECT_EQ(keys.Left(), 3);
 }
 
-TEST(Remote, EndsWithTheInput)
+TEST(Remote, EndsAtTheEndOfTheInput)
 {
     TestDesk desk(LongPlayList());
     Keys keys(" ");
@@ -260,7 +260,7 @@ TEST(Remote, EndsWithoutAnInput)
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Playing);
 }
 
-TEST(Remote, EndsWithThePlayback)
+TEST(Remote, EndsAtTheEndOfPlayback)
 {
     TestDesk desk(ListOf({ItemOfTicks(Second / 10)}));
     Keys keys("");
@@ -271,7 +271,7 @@ TEST(Remote, EndsWithThePlayback)
     EXPECT_GE(desk.clock.Now(), Second / 10) << "on the wall clock";
 }
 
-TEST(Remote, IgnoresKeysThatMeanNothing)
+TEST(Remote, IgnoresUnknownKeys)
 {
     std::string others;
     for (int key = 0; key < 256; ++key) {
@@ -286,7 +286,7 @@ TEST(Remote, IgnoresKeysThatMeanNothing)
     }
     TestDesk desk(LongPlayList());
 
-    EXPECT_EQ(HeardOfKeys(desk, "", others), "");
+    EXPECT_EQ(CallbacksOfKeys(desk, "", others), "");
 }
 
 TEST(Remote, ExplainsEveryKey)
@@ -294,14 +294,14 @@ TEST(Remote, ExplainsEveryKey)
     const std::string help = RemoteHelp();
     std::set<char> keys = {'q'};
     for (const RemoteKey& key : RemoteKeys()) {
-        EXPECT_TRUE(keys.insert(key.key).second) << key.key << " is there twice";
+        EXPECT_TRUE(keys.insert(key.key).second) << key.key << " occurs twice";
         const std::string name = key.key == ' ' ? "space" : std::string(1, key.key);
         EXPECT_NE((" " + help).find(name + " " + key.help), std::string::npos) << key.help;
     }
     EXPECT_NE(help.find("q or Ctrl-C quit\n"), std::string::npos);
 }
 
-/** A terminal whose other end the test holds. */
+/** A pseudo-terminal controlled by the test. */
 class Terminal
 {
 public:
@@ -330,7 +330,7 @@ public:
         EXPECT_EQ(write(m_Test, keys.data(), keys.size()), static_cast<ssize_t>(keys.size()));
     }
 
-    /** What it shows. */
+    /** The output shown. */
     std::string Screen() const
     {
         fcntl(m_Test, F_SETFL, O_NONBLOCK);
@@ -362,7 +362,7 @@ private:
     std::function<void()> m_Action;
 };
 
-TEST(RemoteTerminal, GivesSingleKeysWithoutShowingThem)
+TEST(RemoteTerminal, DeliversSingleKeysWithoutEcho)
 {
     TestDesk desk(LongPlayList());
     const Terminal terminal;
@@ -379,12 +379,12 @@ TEST(RemoteTerminal, GivesSingleKeysWithoutShowingThem)
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Paused);
     EXPECT_EQ(meanwhile.c_lflag & (ICANON | ECHO), 0);
     EXPECT_EQ(terminal.Screen(), "");
-    EXPECT_NE(before.c_lflag & (ICANON | ECHO), 0) << "there was something to change";
+    EXPECT_NE(before.c_lflag & (ICANON | ECHO), 0) << "the original settings differ";
     EXPECT_TRUE(SameSettings(terminal.Settings(), before));
     desk.desk.Listeners().RemoveListener(&presser);
 }
 
-TEST(RemoteTerminal, TakesControlCForAKeyThatQuits)
+TEST(RemoteTerminal, TreatsControlCAsAKeyThatQuits)
 {
     TestDesk desk(LongPlayList());
     const Terminal terminal;
@@ -394,12 +394,12 @@ TEST(RemoteTerminal, TakesControlCForAKeyThatQuits)
 
     PlayByRemote(desk.desk, terminal.Descriptor(), {});
 
-    EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Playing) << "the key behind it was not read";
+    EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Playing) << "the key after it was not read";
     EXPECT_TRUE(SameSettings(terminal.Settings(), before));
     desk.desk.Listeners().RemoveListener(&presser);
 }
 
-TEST(RemoteTerminal, IsPutBackWhenASignalEndsTheProgram)
+TEST(RemoteTerminal, IsRestoredWhenASignalEndsTheProgram)
 {
     const Terminal terminal;
     const termios before = terminal.Settings();
@@ -416,7 +416,7 @@ TEST(RemoteTerminal, IsPutBackWhenASignalEndsTheProgram)
     }
 }
 
-TEST(RemoteTerminal, LeavesSignalsAsItFoundThem)
+TEST(RemoteTerminal, RestoresSignalActions)
 {
     struct sigaction ignore = {};
     ignore.sa_handler = SIG_IGN;
@@ -440,7 +440,7 @@ TEST(RemoteTerminal, LeavesSignalsAsItFoundThem)
     desk.desk.Listeners().RemoveListener(&presser);
 }
 
-TEST(RemoteTerminal, IsPutBackWhenPlaybackEnds)
+TEST(RemoteTerminal, IsRestoredWhenPlaybackEnds)
 {
     TestDesk desk(ListOf({ItemOfTicks(Ticks(100))}));
     const Terminal terminal;
@@ -452,7 +452,7 @@ TEST(RemoteTerminal, IsPutBackWhenPlaybackEnds)
     EXPECT_TRUE(SameSettings(terminal.Settings(), before));
 }
 
-TEST(RemoteTerminal, IsPutBackWhenAListenerThrows)
+TEST(RemoteTerminal, IsRestoredWhenAListenerThrows)
 {
     TestDesk desk(LongPlayList());
     const Terminal terminal;

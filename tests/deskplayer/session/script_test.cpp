@@ -53,7 +53,7 @@ std::vector<ScriptStep> Parse(std::string_view text)
     return ParseScript(text, "file", Syntaxes);
 }
 
-/** The only step of a script of one line. */
+/** The only step of a one-line script. */
 ScriptStep ParseLine(std::string_view line)
 {
     const std::vector<ScriptStep> steps = Parse(line);
@@ -61,7 +61,7 @@ ScriptStep ParseLine(std::string_view line)
     return steps.empty() ? ScriptStep() : steps.front();
 }
 
-/** What is said of @p text, without the name of the file. */
+/** The error for @p text, without the name of the file. */
 std::string ErrorOf(std::string_view text, const std::vector<CommandSyntax>& syntaxes = Syntaxes)
 {
     try {
@@ -83,7 +83,7 @@ Ticks TimeOf(const std::string& time)
     return Ticks(step.values.empty() ? 0 : step.values.front());
 }
 
-/** What is said of @p time, up to what was expected in its place. */
+/** The error for @p time, without the list of what is valid there. */
 std::string TimeErrorOf(const std::string& time)
 {
     const std::string error = ErrorOf("seek " + time);
@@ -107,7 +107,7 @@ TEST(ParseScript, ReadsNothingFromAnEmptyText)
     EXPECT_TRUE(Parse("").empty());
 }
 
-TEST(ParseScript, ReadsOneCommandALine)
+TEST(ParseScript, ReadsOneCommandPerLine)
 {
     const auto steps = Parse("chapter next\nplay\n");
     ASSERT_EQ(steps.size(), 2u);
@@ -115,7 +115,7 @@ TEST(ParseScript, ReadsOneCommandALine)
     EXPECT_EQ(steps[1].command, CommandPlay);
 }
 
-TEST(ParseScript, KnowsTheLineOfACommand)
+TEST(ParseScript, ReportsTheLineOfACommand)
 {
     const auto steps = Parse("\n# about\nplay\n\nplay");
     ASSERT_EQ(steps.size(), 2u);
@@ -123,17 +123,17 @@ TEST(ParseScript, KnowsTheLineOfACommand)
     EXPECT_EQ(steps[1].line, 5u);
 }
 
-TEST(ParseScript, PassesOverCommentsAndBlankLines)
+TEST(ParseScript, SkipsCommentsAndBlankLines)
 {
     EXPECT_TRUE(Parse("\n \t \n# play\n  #play\n#\n").empty());
 }
 
-TEST(ParseScript, EndsALineWhereItsCommentBegins)
+TEST(ParseScript, EndsALineAtItsComment)
 {
     EXPECT_EQ(ParseLine("chapter next# play").command, CommandNext);
 }
 
-TEST(ParseScript, TakesAnyNumberOfBlanksBetweenWords)
+TEST(ParseScript, AcceptsAnyNumberOfBlanksBetweenWords)
 {
     EXPECT_EQ(ParseLine(" \tchapter \t  next\t ").command, CommandNext);
 }
@@ -146,12 +146,12 @@ TEST(ParseScript, AcceptsCarriageReturnsAtLineEnds)
     EXPECT_EQ(steps[1].line, 3u);
 }
 
-TEST(ParseScript, AcceptsALastLineWithoutItsEnd)
+TEST(ParseScript, AcceptsALastLineWithoutALineEnding)
 {
     EXPECT_EQ(Parse("play\nplay").size(), 2u);
 }
 
-TEST(ParseScript, AcceptsOtherScriptsInComments)
+TEST(ParseScript, AcceptsNonAsciiTextInComments)
 {
     EXPECT_EQ(Parse("play # \xC3\xA4\xFF").size(), 1u);
 }
@@ -168,26 +168,26 @@ TEST(ParseScript, GivesTheValuesOfPlaceholdersInOrder)
     EXPECT_EQ(step.values, (Values{Second.count(), (2 * Second).count(), 3}));
 }
 
-TEST(ParseScript, LeavesTheTimeOfALineOutOfTheValues)
+TEST(ParseScript, ExcludesTheTimeOfALineFromTheValues)
 {
     EXPECT_EQ(ParseLine("at 5s chapter 7").values, Values{7});
     EXPECT_EQ(ParseLine("after 5s chapter 7").values, Values{7});
 }
 
-TEST(ParseScript, TellsPatternsApartThatBeginAlike)
+TEST(ParseScript, DistinguishesPatternsThatBeginAlike)
 {
     EXPECT_EQ(ParseLine("subtitle on").command, CommandSubtitleOn);
     EXPECT_EQ(ParseLine("subtitle 4").command, CommandSubtitle);
     EXPECT_EQ(ParseLine("subtitle style 4").command, CommandSubtitleStyle);
 }
 
-TEST(ParseScript, TellsAPatternFromOneThatGoesOn)
+TEST(ParseScript, DistinguishesAPatternFromALongerOne)
 {
     EXPECT_EQ(ParseLine("forward").command, CommandForward);
     EXPECT_EQ(ParseLine("forward fast 2").command, CommandForwardFast);
 }
 
-TEST(ParseScript, ChoosesTheFirstOfPatternsThatFit)
+TEST(ParseScript, ChoosesTheFirstMatchingPattern)
 {
     const auto steps = ParseScript("go 5\n", "file", {{"go TIME", ""}, {"go NUMBER", ""}});
     ASSERT_EQ(steps.size(), 1u);
@@ -212,12 +212,12 @@ TEST(ParseScript, CarriesOutALineAtTheTimeItNames)
     EXPECT_EQ(ParseLine("at 3s play").time, 3 * Second);
 }
 
-TEST(ParseScript, CarriesOutALineTogetherWithTheOneBefore)
+TEST(ParseScript, CarriesOutALineAtTheTimeOfThePreviousOne)
 {
     EXPECT_EQ(Parse("at 3s play\nplay\n")[1].time, 3 * Second);
 }
 
-TEST(ParseScript, CarriesOutALineAWhileAfterTheOneBefore)
+TEST(ParseScript, CarriesOutALineSomeTimeAfterThePreviousOne)
 {
     EXPECT_EQ(Parse("at 3s play\nafter 2s play\nafter 2s play\n")[2].time, 7 * Second);
 }
@@ -227,7 +227,7 @@ TEST(ParseScript, CountsFromTheStartBeforeTheFirstLine)
     EXPECT_EQ(ParseLine("after 2s play").time, 2 * Second);
 }
 
-TEST(ParseScript, AcceptsTheTimeOfTheLineBefore)
+TEST(ParseScript, AcceptsTheTimeOfThePreviousLine)
 {
     EXPECT_EQ(Parse("at 3s play\nat 3s play\n")[1].time, 3 * Second);
 }
@@ -263,7 +263,7 @@ TEST(ParseScript, ReadsUpToThreeDecimals)
     EXPECT_EQ(TimeOf("2.000ms"), 2 * Millisecond);
 }
 
-TEST(ParseScript, LetsTheGreatestUnitOfATimeGoBeyondTheNext)
+TEST(ParseScript, AcceptsAnyValueOfTheLargestUnitOfATime)
 {
     EXPECT_EQ(TimeOf("75:00"), 75 * 60 * Second);
     EXPECT_EQ(TimeOf("90"), 90 * Second);
@@ -278,12 +278,12 @@ TEST(ParseScript, ReadsTimesUpToTheLongestSession)
     EXPECT_EQ(Parse("at 999h play\nafter 1h play\n")[1].time, LongestSession);
 }
 
-TEST(ParseScriptRefuses, AWordThatIsNoCommand)
+TEST(ParseScriptRefuses, AnUnknownWord)
 {
     EXPECT_EQ(ErrorOf("chapter nxt"), "1:9: unexpected 'nxt'; expected next, previous or a NUMBER");
 }
 
-TEST(ParseScriptRefuses, ALineThatBeginsWrongAndNamesEveryBeginningOnce)
+TEST(ParseScriptRefuses, AnUnknownFirstWordAndNamesEveryFirstWordOnce)
 {
     EXPECT_EQ(ErrorOf("\n  chaptr next"), "2:3: unexpected 'chaptr'; expected at, after, "
                                           "play, chapter, seek, forward, subtitle or loop");
@@ -302,7 +302,7 @@ TEST(ParseScriptRefuses, ALineThatEndsTooEarly)
               "1:8: the line ends here; expected next, previous or a NUMBER");
 }
 
-TEST(ParseScriptRefuses, WordsBehindACommand)
+TEST(ParseScriptRefuses, WordsAfterACommand)
 {
     EXPECT_EQ(ErrorOf("play now please"), "1:6: unexpected 'now'; expected the end of the line");
 }
@@ -313,12 +313,12 @@ TEST(ParseScriptRefuses, AWordWhereALineCouldEndAsWell)
               "1:9: unexpected 'slowly'; expected the end of the line or fast");
 }
 
-TEST(ParseScriptRefuses, AWordThatFitsAnotherBeginning)
+TEST(ParseScriptRefuses, AWordThatFitsOnlyAnotherCommand)
 {
     EXPECT_EQ(ErrorOf("subtitle style on"), "1:16: unexpected 'on'; expected a NUMBER");
 }
 
-TEST(ParseScriptRefuses, WordsInOtherLetters)
+TEST(ParseScriptRefuses, WordsInTheWrongCase)
 {
     EXPECT_EQ(ErrorOf("chapter NEXT"),
               "1:9: unexpected 'NEXT'; expected next, previous or a NUMBER");
@@ -339,7 +339,7 @@ TEST(ParseScriptRefuses, AnythingWhenThereAreNoCommands)
     EXPECT_EQ(ErrorOf("play", {}), "1:1: unexpected 'play'");
 }
 
-TEST(ParseScriptRefuses, CountsColumnsInBytes)
+TEST(ParseScriptRefuses, WithTheColumnInBytes)
 {
     EXPECT_EQ(ErrorOf("\tplay \t now").substr(0, 5), "1:9: ");
     EXPECT_EQ(ErrorOf("chapter \xC3\xA4"),
@@ -354,13 +354,13 @@ TEST(ParseScriptRefuses, NumbersBeyondTheGreatest)
     EXPECT_EQ(ErrorOf("chapter 18446744073709551617"), "1:9: '18446744073709551617'" + expected);
 }
 
-TEST(ParseScriptRefuses, NumbersBeyondTheGreatestWhereWordsComeBehindThemInTheTable)
+TEST(ParseScriptRefuses, NumbersBeyondTheGreatestBeforeWordsInTheTable)
 {
     EXPECT_EQ(ErrorOf("subtitle 65536"),
               "1:10: '65536' is not between 0 and 65535; expected on, a NUMBER or style");
 }
 
-TEST(ParseScriptRefuses, NumbersWithAnythingBehindTheirDigits)
+TEST(ParseScriptRefuses, NumbersWithTrailingCharacters)
 {
     EXPECT_EQ(ErrorOf("subtitle style 1.5"),
               "1:16: '1.5' is not a whole number; expected a NUMBER");
@@ -412,7 +412,7 @@ TEST(ParseScriptRefuses, TimesBeyondTheLongestSession)
     }
 }
 
-TEST(ParseScriptRefuses, ASessionThatGetsTooLong)
+TEST(ParseScriptRefuses, ASessionThatBecomesTooLong)
 {
     EXPECT_EQ(ErrorOf("at 999h play\nafter 1:00:00.001 play\n"),
               "2:7: '1:00:00.001' after 999:00:00.000 is more than 1000 hours");
@@ -424,7 +424,7 @@ TEST(ParseScriptRefuses, ToGoBackInTime)
               "4:4: 00:01:29.999 is before line 3; expected at least 00:01:30.000");
 }
 
-TEST(ParseScriptRefuses, ALineWithoutTheTimeItBeginsWith)
+TEST(ParseScriptRefuses, ALineWithoutATimeAfterAtOrAfter)
 {
     EXPECT_EQ(ErrorOf("at"), "1:3: the line ends here; expected " + TimeHelp);
     EXPECT_EQ(ErrorOf("after play"), "1:7: unexpected 'play'; expected " + TimeHelp);
@@ -450,7 +450,7 @@ TEST(ParseScriptRefuses, ControlCharactersInComments)
     EXPECT_EQ(ErrorOf("play # \x1B[2J"), "1:8: '\\x1B' is a control character; expected text");
 }
 
-TEST(ParseScriptRefuses, CarriageReturnsThatEndNoLine)
+TEST(ParseScriptRefuses, CarriageReturnsWithinALine)
 {
     EXPECT_EQ(ErrorOf("play\rplay\n"), "1:5: '\\x0D' is a control character; expected text");
     EXPECT_EQ(ErrorOf("play\r\r\n"), "1:5: '\\x0D' is a control character; expected text");
@@ -478,7 +478,7 @@ TEST(ParseScriptRefuses, WithAnyFileNameOnOneLine)
     EXPECT_STREQ(ScriptError("a\n\x1B", 1, 2, "problem").what(), "a\\x0A\\x1B:1:2: problem");
 }
 
-/** The longest texts there can be, with as many lines or words as fit. */
+/** The longest possible texts, with as many lines or words as fit. */
 std::vector<std::string> LongestTexts()
 {
     std::vector<std::string> texts;
@@ -505,12 +505,12 @@ TEST(ParseScript, ReadsTheLongestTextsPromptly)
     }
 }
 
-TEST(ParseScript, GetsMemoryInProportionToTheText)
+TEST(ParseScript, UsesMemoryInProportionToTheText)
 {
     for (const std::string& text : LongestTexts()) {
-        const std::size_t before = BytesAskedFor();
+        const std::size_t before = AllocatedBytes();
         ParseOrRefuse(text);
-        EXPECT_LT(BytesAskedFor() - before, 200 * text.size()) << text.substr(0, 10);
+        EXPECT_LT(AllocatedBytes() - before, 200 * text.size()) << text.substr(0, 10);
     }
 }
 

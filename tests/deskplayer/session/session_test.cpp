@@ -12,28 +12,28 @@ namespace deskplayer
 namespace
 {
 
-/** Carries out a script and collects what the hooks are called with. */
+/** Carries out a script and records the calls of the hooks. */
 class Session : public testing::Test
 {
 protected:
-    /** @return what the listener heard, and the refusals where they happened */
+    /** @return the callbacks, with the refusals in between */
     std::string PlayScript(TestDesk& desk, const std::string& script)
     {
-        std::string heard;
+        std::string received;
         SessionHooks hooks = desk.Hooks();
         hooks.beforeTimePasses = [this, &desk, count = hooks.beforeTimePasses](Ticks time) {
             count(time);
             timesPassed.emplace_back(desk.clock.Now(), time);
         };
-        hooks.onRefused = [&heard, &desk](std::size_t line, const std::string& reason) {
-            heard += desk.TakeWithoutPositions();
-            heard += "line " + std::to_string(line) + ": " + reason + "\n";
+        hooks.onRefused = [&received, &desk](std::size_t line, const std::string& reason) {
+            received += desk.TakeWithoutPositions();
+            received += "line " + std::to_string(line) + ": " + reason + "\n";
         };
         PlaySession(ParseScript(script, "a.session", CommandSyntaxes()), desk.desk, hooks);
-        return heard + desk.TakeWithoutPositions();
+        return received + desk.TakeWithoutPositions();
     }
 
-    std::vector<std::pair<Ticks, Ticks>> timesPassed; ///< from when, how long
+    std::vector<std::pair<Ticks, Ticks>> timesPassed; ///< start and duration
 };
 
 const char* const StartOfItem =
@@ -59,7 +59,7 @@ TEST_F(Session, CarriesOutEachStepAtItsTimeAndPlaysToTheEnd)
                                          "67+44100 Finished(EndOfMedia)\n");
 }
 
-TEST_F(Session, ReportsWhatIsRefusedWithItsLineAndGoesOn)
+TEST_F(Session, ReportsRefusalsWithTheirLineAndContinues)
 {
     TestDesk desk(ListOf({Item(10)}));
 
@@ -71,7 +71,7 @@ TEST_F(Session, ReportsWhatIsRefusedWithItsLineAndGoesOn)
                                          "1 Paused()\n");
 }
 
-TEST_F(Session, NeedsNoHooks)
+TEST_F(Session, RunsWithoutHooks)
 {
     TestDesk desk(ListOf({Item(1)}));
 
@@ -81,7 +81,7 @@ TEST_F(Session, NeedsNoHooks)
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Finished);
 }
 
-TEST_F(Session, HasItsTimeGoOnWhenPlaybackHasEnded)
+TEST_F(Session, ContinuesItsTimeAfterPlaybackHasEnded)
 {
     TestDesk desk(ListOf({Item(1)}));
 
@@ -101,7 +101,7 @@ TEST_F(Session, DoesNothingWithoutSteps)
     EXPECT_EQ(desk.clock.Now(), Ticks(0));
 }
 
-TEST_F(Session, EndsWherePlaybackWouldStand)
+TEST_F(Session, EndsWherePlaybackWaits)
 {
     const std::pair<const char*, Status> ends[] = {{"pause", Status::Paused},
                                                    {"suspend", Status::Suspended},
@@ -117,7 +117,7 @@ TEST_F(Session, EndsWherePlaybackWouldStand)
     }
 }
 
-TEST_F(Session, EndsWherePlaybackWouldGoRoundForEver)
+TEST_F(Session, EndsWherePlaybackWouldRepeatForever)
 {
     for (const char* const repeat :
          {"repeat a\nafter 1s repeat b", "repeat chapter", "repeat title"}) {
@@ -130,7 +130,7 @@ TEST_F(Session, EndsWherePlaybackWouldGoRoundForEver)
     }
 }
 
-TEST_F(Session, GoesOnToTheEndWhenPlaybackHasLeftTheRepeat)
+TEST_F(Session, PlaysToTheEndOncePlaybackHasLeftTheRepeat)
 {
     TestDesk desk(ListOf({Item(10)}));
 
@@ -140,7 +140,7 @@ TEST_F(Session, GoesOnToTheEndWhenPlaybackHasLeftTheRepeat)
     EXPECT_EQ(desk.clock.Now(), 6 * Second);
 }
 
-TEST_F(Session, WaitsBeforeTimePassesChangeByChange)
+TEST_F(Session, CallsTheHookBeforeEveryChange)
 {
     TestDesk desk(ListOf({Item(2)}, {Link(0, Ticks(100))}));
 
@@ -156,7 +156,7 @@ TEST_F(Session, WaitsBeforeTimePassesChangeByChange)
     EXPECT_EQ(desk.clock.Now(), 17 * Second);
 }
 
-TEST_F(Session, HandsOnWhatAListenerThrows)
+TEST_F(Session, RethrowsTheExceptionOfAListener)
 {
     class Thrower : public bdmv::NavigatorListenerAdapter
     {
@@ -171,8 +171,8 @@ TEST_F(Session, HandsOnWhatAListenerThrows)
     desk.desk.Listeners().RemoveListener(&thrower);
 }
 
-/** What a listener hears of a play list without a viewer. */
-std::string HeardFromStartToEnd(TestDesk& desk)
+/** The callbacks of playing a play list from start to end. */
+std::string CallbacksFromStartToEnd(TestDesk& desk)
 {
     PlayFromStartToEnd(desk.desk, desk.Hooks());
     return desk.TakeWithoutPositions();
@@ -182,15 +182,16 @@ TEST(FromStartToEnd, PlaysAndFinishes)
 {
     TestDesk desk(ListOf({Item(10)}));
 
-    EXPECT_EQ(HeardFromStartToEnd(desk), std::string(StartOfItem) + "10 Finished(EndOfMedia)\n");
+    EXPECT_EQ(CallbacksFromStartToEnd(desk),
+              std::string(StartOfItem) + "10 Finished(EndOfMedia)\n");
 }
 
-TEST(FromStartToEnd, LeavesEndlessStillsAfterThreeSecondsAndTimedOnesToThemselves)
+TEST(FromStartToEnd, LeavesEndlessStillsAfterThreeSecondsAndTimedOnesAfterTheirTime)
 {
     TestDesk desk(ListOf({WithEndlessStill(Item(1)), WithTimedStill(Item(1), 10),
                           Forbidding(WithEndlessStill(Item(1)), {bd::UserOperationStillOff})}));
 
-    EXPECT_EQ(HeardFromStartToEnd(desk),
+    EXPECT_EQ(CallbacksFromStartToEnd(desk),
               std::string(StartOfItem) +
                   "1 StillOn()\n"
                   "4 StillOff()\n"
@@ -208,22 +209,22 @@ TEST(FromStartToEnd, FinishesWhenThereIsNothingToPlay)
 {
     TestDesk desk(ListOf({}));
 
-    EXPECT_EQ(HeardFromStartToEnd(desk), "0 PlayStarted()\n"
-                                         "0 Playlist(7)\n"
-                                         "0 Finished(EndOfMedia)\n");
+    EXPECT_EQ(CallbacksFromStartToEnd(desk), "0 PlayStarted()\n"
+                                             "0 Playlist(7)\n"
+                                             "0 Finished(EndOfMedia)\n");
 }
 
 TEST(FromStartToEnd, FinishesWhenNothingHasLength)
 {
     TestDesk desk(ListOf({Item(0), WithTimedStill(Item(0), 0), Item(0)}, {Entry(1, Ticks(0))}));
 
-    const std::string heard = HeardFromStartToEnd(desk);
+    const std::string received = CallbacksFromStartToEnd(desk);
 
     const std::string end = "0 Finished(EndOfMedia)\n";
-    EXPECT_EQ(heard.substr(heard.size() - end.size()), end) << heard;
+    EXPECT_EQ(received.substr(received.size() - end.size()), end) << received;
 }
 
-TEST(FromStartToEnd, WaitsBeforeTimePasses)
+TEST(FromStartToEnd, CallsTheHookBeforeTimePasses)
 {
     TestDesk desk(ListOf({WithEndlessStill(Item(2))}));
     Ticks waited(0);
@@ -240,17 +241,17 @@ TEST(FromStartToEnd, WaitsBeforeTimePasses)
     EXPECT_EQ(desk.clock.Now(), waited);
 }
 
-TEST(FromStartToEnd, TellsEverySecondOfTwoHours)
+TEST(FromStartToEnd, ReportsEverySecondOfTwoHours)
 {
     TestDesk desk(ListOf({Item(7200)}));
 
     PlayFromStartToEnd(desk.desk, desk.Hooks());
 
-    const std::string heard = desk.Take();
+    const std::string received = desk.Take();
     const std::string others = std::string(StartOfItem) + "7200 Finished(EndOfMedia)\n";
-    EXPECT_EQ(std::count(heard.begin(), heard.end(), '\n'),
+    EXPECT_EQ(std::count(received.begin(), received.end(), '\n'),
               7201 + std::count(others.begin(), others.end(), '\n'));
-    EXPECT_NE(heard.find("\n3601 CurrentTimePosition(162045000)\n"), std::string::npos);
+    EXPECT_NE(received.find("\n3601 CurrentTimePosition(162045000)\n"), std::string::npos);
 }
 
 } // namespace

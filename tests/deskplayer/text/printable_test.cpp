@@ -8,7 +8,7 @@ namespace deskplayer
 namespace
 {
 
-TEST(Printable, EscapesEverythingThatCouldDisturbALine)
+TEST(Printable, EscapesAllButPrintableAscii)
 {
     EXPECT_EQ(Printable(std::string("a~ \0\n\x1B\x7F\xE9\\", 9)),
               "a~ \\x00\\x0A\\x1B\\x7F\\xE9\\x5C");

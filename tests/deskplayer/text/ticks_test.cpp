@@ -17,7 +17,7 @@ TEST(Ticks, ConvertExactlyFromSecondsAndMilliseconds)
     static_assert(!std::is_convertible<std::chrono::microseconds, Ticks>::value,
                   "what has no whole number of ticks is converted explicitly");
     static_assert(!std::is_convertible<std::uint64_t, Ticks>::value,
-                  "a number without a unit is no time");
+                  "a number without a unit is not a time");
 }
 
 TEST(TimeText, ShowsHoursMinutesSecondsAndMilliseconds)

@@ -1,9 +1,9 @@
 /**
  * @file
- * The rooms of the navigator, for tests that need some of them and no navigator.
+ * Parts of the navigator, for tests that need no whole navigator.
  */
-#ifndef TESTS_DESKPLAYER_NAVIGATOR_ROOMS_H
-#define TESTS_DESKPLAYER_NAVIGATOR_ROOMS_H
+#ifndef TESTS_DESKPLAYER_NAVIGATOR_PARTS_H
+#define TESTS_DESKPLAYER_NAVIGATOR_PARTS_H
 
 #include <string>
 #include <utility>
@@ -17,9 +17,9 @@
 namespace deskplayer
 {
 
-/** A play list, number 7, its state, which the test writes, and what answers about them. */
-struct StateRooms {
-    explicit StateRooms(PlayList list) : playList(LayOut(7, std::move(list))) {}
+/** Play list number 7, its state, which tests set, and the classes that answer queries about it. */
+struct StateParts {
+    explicit StateParts(PlayList list) : playList(LayOut(7, std::move(list))) {}
 
     const LoadedPlayList playList;
     PlaybackState state;
@@ -27,14 +27,14 @@ struct StateRooms {
     PlaybackContext context{playhead, state};
 };
 
-/** The same with a listener that writes down the events. */
-struct EventRooms : StateRooms {
-    explicit EventRooms(PlayList list) : StateRooms(std::move(list))
+/** The same with a listener that records callbacks. */
+struct EventParts : StateParts {
+    explicit EventParts(PlayList list) : StateParts(std::move(list))
     {
         delivery.Listeners().AddListener(&listener);
     }
 
-    /** The callbacks since the last call, one a line. */
+    /** The callbacks since the last call, one per line. */
     std::string Take() { return journal.Take(); }
 
     bdmvtest::Journal journal;
