@@ -26,9 +26,9 @@ constexpr char ByReference[] = "a reference";
 constexpr char ByValue[] = "AudioInfoType by value";
 
 constexpr char OneList[] = "one list";
-constexpr char OwnLists[] = "lists of their own";
+constexpr char OwnLists[] = "separate lists";
 
-constexpr char Delivery[] = "its delivery alone, by hand";
+constexpr char Delivery[] = "delivery alone, by hand";
 constexpr char DispatchOff[] = "dispatch, line off";
 constexpr char DispatchNull[] = "dispatch, null sink";
 constexpr char DispatchQueue[] = "dispatch, queue";
