@@ -360,8 +360,8 @@ public:
 };
 
 /**
- * Playback reached the end of the media, or ran out of data. Any other reason is reported through
- * Assert() and sent as the end of the media.
+ * Playback reached the end of the media, or was starved of data. Any other reason is reported
+ * through Assert() and sent as the end of the media.
  */
 class FinishedEvent : public NavigatorEvent
 {
