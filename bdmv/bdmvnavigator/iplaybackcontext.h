@@ -18,8 +18,8 @@ namespace bdmv
  * The navigator's record of the playback in progress, as far as events read it.
  *
  * Events call these operations on the dispatching thread while they are dispatched, never while the
- * lock of a listener list is held; events have no lock. A context that another thread changes
- * meanwhile keeps each single query consistent; events do not expect several queries to be. Queries
+ * lock of a listener list is held; events take no other lock. A context that another thread changes
+ * meanwhile keeps each query consistent; events do not expect consistency across queries. Queries
  * are assumed to succeed.
  *
  * An operation with output parameters writes all of them. An output that it does not write keeps

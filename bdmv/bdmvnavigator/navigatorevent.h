@@ -18,8 +18,8 @@
  *
  * Lifetime. The context must outlive the event, which does not own it.
  *
- * Threads. An event starts no thread and has no lock. Between two callbacks of one event the lock
- * of the list is free, so listeners may see another thread's event there.
+ * Threads. An event starts no thread and has no lock. Between two callbacks of one event the list
+ * is unlocked, so listeners may receive another thread's event there.
  */
 #ifndef BDMVNAVIGATOR_NAVIGATOREVENT_H
 #define BDMVNAVIGATOR_NAVIGATOREVENT_H
