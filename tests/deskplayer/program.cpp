@@ -32,7 +32,7 @@ std::string Quoted(const std::string& word)
 }
 
 /** Longer than any run, even on a slow machine or in an emulator. */
-const char* const SecondsOfARun = "30";
+const char* const SecondsOfARun = "120";
 
 /** Exit status of coreutils' timeout after it has killed the program. */
 constexpr int TimedOut = 124;
