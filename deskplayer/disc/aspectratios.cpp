@@ -9,7 +9,7 @@ AspectRatio AspectRatios::Find(const PlayList& playList, std::size_t playItem, c
 {
     const std::optional<std::string> name = ClipOfStream(playList, playItem, stream);
     if (!name) {
-        return {std::nullopt, "its clip is not known"};
+        return {std::nullopt, "its clip is unknown"};
     }
     const Clip& clip = Read(*name);
     if (!clip.problem.empty()) {

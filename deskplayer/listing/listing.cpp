@@ -165,7 +165,7 @@ Lines StreamLines(const StreamTable& streams, const AspectText& aspectText)
     AddLanguages(lines, "menus: ", streams.ig);
     AddStreams(lines, "secondary video: ", streams.secondaryVideo, aspectText);
     AddStreams(lines, "secondary audio: ", streams.secondaryAudio, aspectText);
-    AddLanguages(lines, "secondary subtitles: ", streams.pipPg);
+    AddLanguages(lines, "picture-in-picture subtitles: ", streams.pipPg);
     return lines;
 }
 
@@ -189,7 +189,7 @@ Lines StreamLines(const PlayList& playList, AspectRatios& aspectRatios)
     const StreamTable& shown = playList.playItems[longest].streams;
     Lines lines = StreamLines(shown, [&](const Stream& stream) {
         const std::optional<std::uint8_t> code = aspectRatios.Find(playList, longest, stream).code;
-        return code ? ", " + AspectRatioName(*code) : ", aspect ratio not known";
+        return code ? ", " + AspectRatioName(*code) : ", aspect ratio unknown";
     });
 
     // Aspect ratios are ignored: comparing them would require reading the clips of all play items.

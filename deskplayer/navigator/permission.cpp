@@ -63,8 +63,9 @@ Outcome Permission::CheckStatus(std::initializer_list<Status> statuses) const
         return Outcome::Done();
     }
     std::string expected;
-    for (const Status status : statuses) {
-        expected += (expected.empty() ? "" : " or ") + std::string(StatusName(status));
+    for (const Status& status : statuses) {
+        const char* const separator = &status + 1 == statuses.end() ? " or " : ", ";
+        expected += (expected.empty() ? "" : separator) + std::string(StatusName(status));
     }
     return Outcome::Refused("not " + expected + ", but " + StatusName(m_rState.status));
 }

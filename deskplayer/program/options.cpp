@@ -36,7 +36,8 @@ public:
 void AddOptions(CLI::App& app, Options& options)
 {
     app.formatter(std::make_shared<HelpFormatter>());
-    app.set_version_flag("--version", "bdmv-deskplayer " BDMVNAVIGATOR_VERSION_TEXT);
+    app.set_version_flag("--version", "bdmv-deskplayer " BDMVNAVIGATOR_VERSION_TEXT,
+                         "Print the version and exit");
     app.add_flag_callback(
         "--commands",
         [] {
@@ -50,21 +51,21 @@ void AddOptions(CLI::App& app, Options& options)
         app.add_option("--playlist", options.playList, "Play list to play; the longest by default")
             ->check(CLI::Range(0, 99999).description(""))
             ->type_name("N");
-    auto* const list = app.add_flag("--list", options.list, "Print a table of the play lists");
+    auto* const list =
+        app.add_flag("--list", options.list, "Print the titles and a table of the play lists");
     auto* const describe =
         app.add_option("--describe", options.describe, "Print the full contents of a play list")
             ->check(CLI::Range(0, 99999).description(""))
             ->type_name("N")
             ->excludes(list);
-    auto* const session =
-        app.add_option("--session", options.session,
-                       "Session file to carry out; by default, play from start to end")
-            ->type_name("FILE");
+    auto* const session = app.add_option("--session", options.session,
+                                         "Session file to run; by default, play from start to end")
+                              ->type_name("FILE");
     auto* const realTime =
         app.add_flag("--realtime", options.realTime, "Play in real time instead of at once");
-    auto* const remote = app.add_flag("--remote", options.remote,
-                                      "Play in real time, with single keys as a remote control")
-                             ->excludes(session);
+    auto* const remote =
+        app.add_flag("--remote", options.remote, "Play in real time, controlled by single keys")
+            ->excludes(session);
     for (CLI::Option* const playing : {playList, session, realTime, remote}) {
         playing->excludes(list)->excludes(describe);
     }
@@ -74,10 +75,11 @@ void AddOptions(CLI::App& app, Options& options)
         ->type_name("FORMAT");
     app.add_option("--output", options.output, "File to write; standard output by default")
         ->type_name("FILE");
-    app.add_option("--listen", options.listen,
-                   "Listener interfaces to write: control, settings, button, interactive")
+    app.add_option(
+           "--listen", options.listen,
+           "Write only callbacks of these interfaces: control, settings, button, interactive")
         ->type_name("NAME,...");
-    app.add_option("--only", options.only, "Callbacks to write: PlayItem, AudioInfo, ...")
+    app.add_option("--only", options.only, "Write only these callbacks, such as PlayItem,AudioInfo")
         ->type_name("NAME,...");
     app.add_option("--log", options.log,
                    "Log lines to write to standard error, such as BdmvNavigator=Event for those "
@@ -91,8 +93,8 @@ void AddOptions(CLI::App& app, Options& options)
         "  bdmv-deskplayer disc --session evening.session\n"
         "  bdmv-deskplayer disc --only PlayItem,ChapterNumber --format json\n"
         "  bdmv-deskplayer disc --remote\n\n"
-        "Exit status: 0 success, 1 the output could not be written, 2 wrong usage or a session\n"
-        "that cannot be read, 3 the disc cannot be read.");
+        "Exit status: 0 success, 1 the output could not be written, 2 incorrect usage or a\n"
+        "session that cannot be read, 3 the disc cannot be read.");
 }
 
 } // namespace deskplayer

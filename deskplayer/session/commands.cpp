@@ -24,7 +24,7 @@ bd::PlayMode ModeOf(bd::PlayDirectionDef direction, std::int64_t steps)
 Outcome PlayFast(Desk& desk, bd::PlayDirectionDef direction, std::uint64_t steps)
 {
     if (steps == 0 || steps > FastSteps) {
-        return Outcome::Refused("fast play has steps 1 to " + std::to_string(FastSteps));
+        return Outcome::Refused("fast speeds are numbered 1 to " + std::to_string(FastSteps));
     }
     return desk.Navigator().SetPlayMode(ModeOf(direction, static_cast<std::int64_t>(steps)));
 }
@@ -32,7 +32,7 @@ Outcome PlayFast(Desk& desk, bd::PlayDirectionDef direction, std::uint64_t steps
 Outcome PlaySlowly(Desk& desk, bd::PlayDirectionDef direction, std::uint64_t steps)
 {
     if (steps == 0 || steps > SlowSteps) {
-        return Outcome::Refused("slow motion has steps 1 to " + std::to_string(SlowSteps));
+        return Outcome::Refused("slow speeds are numbered 1 to " + std::to_string(SlowSteps));
     }
     return desk.Navigator().SetPlayMode(ModeOf(direction, -static_cast<std::int64_t>(steps)));
 }
@@ -73,17 +73,17 @@ const std::vector<Command>& Commands()
          [](Desk& d, Values) {
              return d.Navigator().SetPlayMode(ModeOf(bd::PlayDirectionForward, 0));
          }},
-        {{"forward fast NUMBER", "play fast, steps 1 to 12"},
+        {{"forward fast NUMBER", "play fast, at speed 1 to 12"},
          [](Desk& d, Values v) { return PlayFast(d, bd::PlayDirectionForward, v[0]); }},
-        {{"forward slow NUMBER", "play in slow motion, steps 1 to 5"},
+        {{"forward slow NUMBER", "play in slow motion, at speed 1 to 5"},
          [](Desk& d, Values v) { return PlaySlowly(d, bd::PlayDirectionForward, v[0]); }},
         {{"backward", "play backward at normal speed"},
          [](Desk& d, Values) {
              return d.Navigator().SetPlayMode(ModeOf(bd::PlayDirectionBackward, 0));
          }},
-        {{"backward fast NUMBER", "play backward fast, steps 1 to 12"},
+        {{"backward fast NUMBER", "play backward fast, at speed 1 to 12"},
          [](Desk& d, Values v) { return PlayFast(d, bd::PlayDirectionBackward, v[0]); }},
-        {{"backward slow NUMBER", "play backward in slow motion, steps 1 to 5"},
+        {{"backward slow NUMBER", "play backward in slow motion, at speed 1 to 5"},
          [](Desk& d, Values v) { return PlaySlowly(d, bd::PlayDirectionBackward, v[0]); }},
         {{"still off", "leave a still"}, [](Desk& d, Values) { return d.Navigator().EndStill(); }},
         {{"suspend", "suspend playback, as a title does when it calls a menu"},
@@ -104,7 +104,7 @@ const std::vector<Command>& Commands()
         // Repeat and triggers
         {{"repeat a", "set the start of an A-B repeat"},
          [](Desk& d, Values) { return d.Navigator().SetPointA(); }},
-        {{"repeat b", "set its end, and repeat from A to B"},
+        {{"repeat b", "set the end of an A-B repeat, and repeat from A to B"},
          [](Desk& d, Values) { return d.Navigator().SetPointB(); }},
         {{"repeat ab off", "end the A-B repeat"},
          [](Desk& d, Values) { return d.Navigator().EndABRepeat(); }},
@@ -154,7 +154,7 @@ const std::vector<Command>& Commands()
          [](Desk& d, Values v) { return d.Navigator().SelectSecondaryAudio(v[0]); }},
         {{"pip subtitle on", "use the subtitles of the picture-in-picture"},
          [](Desk& d, Values) { return d.Navigator().PickPipSubtitle(true); }},
-        {{"pip subtitle off", "use the subtitles of the main video"},
+        {{"pip subtitle off", "use the subtitles of the primary video"},
          [](Desk& d, Values) { return d.Navigator().PickPipSubtitle(false); }},
         {{"pip subtitle NUMBER", "select a subtitle stream of the picture-in-picture"},
          [](Desk& d, Values v) { return d.Navigator().SelectPipSubtitle(v[0]); }},

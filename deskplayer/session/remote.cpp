@@ -151,11 +151,11 @@ const std::vector<RemoteKey>& RemoteKeys()
         {'a', "next audio", [](Desk& d) { return PerformCommand(d, "audio next"); }},
         {'s', "next subtitle", [](Desk& d) { return PerformCommand(d, "subtitle next"); }},
         {'g', "next angle", [](Desk& d) { return PerformCommand(d, "angle next"); }},
-        {'m', "menu", [](Desk& d) { return PerformCommand(d, "menu on"); }},
+        {'m', "open menu", [](Desk& d) { return PerformCommand(d, "menu on"); }},
         {'c', "close menu", [](Desk& d) { return PerformCommand(d, "menu off"); }},
         {'k', "button above", [](Desk& d) { return PerformCommand(d, "button previous"); }},
         {'j', "button below", [](Desk& d) { return PerformCommand(d, "button next"); }},
-        {'e', "enter", [](Desk& d) { return PerformCommand(d, "button activate"); }},
+        {'e', "activate button", [](Desk& d) { return PerformCommand(d, "button activate"); }},
         {'z', "standby", [](Desk& d) { return PerformCommand(d, "standby"); }},
         {'Z', "wake up", [](Desk& d) { return PerformCommand(d, "wake"); }},
     };

@@ -326,7 +326,7 @@ Ticks TimeOf(const Line& line, Timing timing, std::string_view word, const Scrip
     const Ticks time(Read(TimePlaceholder, word).value);
     if (timing == TimingAt) {
         if (time < previous.time) {
-            line.Fail(word.data(), TimeText(time) + " is before line " +
+            line.Fail(word.data(), TimeText(time) + " is earlier than line " +
                                        std::to_string(previous.line) + "; expected at least " +
                                        TimeText(previous.time));
         }
@@ -373,7 +373,7 @@ std::vector<ScriptStep> ParseScript(std::string_view text, const std::string& fi
 {
     if (text.size() > LongestScript) {
         throw ScriptError(fileName, 1, 1,
-                          "the script has " + std::to_string(text.size()) +
+                          "the session has " + std::to_string(text.size()) +
                               " bytes; expected at most " + std::to_string(LongestScript));
     }
     const std::vector<Form> forms = FormsOf(syntaxes);

@@ -38,7 +38,7 @@ TEST(Codes, HaveNames)
     EXPECT_EQ(AudioPresentationName(3), "stereo");
     EXPECT_EQ(SampleRateName(5), "192 kHz");
     EXPECT_EQ(CharacterCodeName(1), "UTF-8");
-    EXPECT_EQ(SubPathTypeName(7), "picture in picture of the same clip");
+    EXPECT_EQ(SubPathTypeName(7), "picture-in-picture of the same clip");
 }
 
 TEST(Codes, AreNamedByNumberIfReserved)

@@ -181,7 +181,7 @@ protected:
 
     AspectRatio Find() { return AspectRatios(MakeDisc()).Find(m_PlayList, 0, Video()); }
 
-    void ExpectNotKnown(const std::string& reason, bool damaged)
+    void ExpectUnknown(const std::string& reason, bool damaged)
     {
         const AspectRatio ratio = Find();
         EXPECT_EQ(ratio.code, std::nullopt);
@@ -210,27 +210,27 @@ TEST_F(AspectRatioLookup, ComesFromTheClipThatTheSubPathNames)
 TEST_F(AspectRatioLookup, IsUnknownWithoutClipInformation)
 {
     fs::remove(PathOf("CLIPINF/00000.clpi"));
-    ExpectNotKnown("00000.clpi: No such file or directory", false);
+    ExpectUnknown("00000.clpi: No such file or directory", false);
 }
 
 TEST_F(AspectRatioLookup, IsUnknownIfTheClipHasNoSuchStream)
 {
     Video().pid = 1;
-    ExpectNotKnown("not in the clip information", false);
+    ExpectUnknown("not in the clip information", false);
     Video().pid = 0xFFFF;
-    ExpectNotKnown("not in the clip information", false);
+    ExpectUnknown("not in the clip information", false);
 }
 
 TEST_F(AspectRatioLookup, IsUnknownIfNoClipIsNamed)
 {
     Video().entryType = EntryTypeSubPath;
-    ExpectNotKnown("its clip is not known", false);
+    ExpectUnknown("its clip is unknown", false);
 }
 
 TEST_F(AspectRatioLookup, IsUnknownIfTheClipInformationIsDamaged)
 {
     fs::resize_file(PathOf("CLIPINF/00000.clpi"), 50);
-    ExpectNotKnown("BDMV/CLIPINF/00000.clpi: offset ", true);
+    ExpectUnknown("BDMV/CLIPINF/00000.clpi: offset ", true);
 }
 
 TEST_F(AspectRatioLookup, IsReadOncePerClip)

@@ -341,7 +341,7 @@ TEST(ParsePlayList, ReadsTheKindsOfStreamsInFileOrder)
     add(1, {});       // primary video
     add(2, {});       // primary audio
     add(3, {});       // PG
-    add(7, {});       // PG of picture in picture
+    add(7, {});       // PG of picture-in-picture
     add(4, {});       // IG
     add(5, Zeros(2)); // secondary audio
     add(6, Zeros(4)); // secondary video

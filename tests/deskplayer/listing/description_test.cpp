@@ -253,7 +253,7 @@ TEST(DescribePlayList, ExplainsTheValues)
     flags: random access flag no
     user operations: mask 0000000000000000 (forbids nothing)
     angles: count 1, different audios no, seamless change yes
-  sub path 0: type 6 (picture in picture of another clip, not in step), repeat yes
+  sub path 0: type 6 (asynchronous picture-in-picture of another clip), repeat yes
     sub play item 0: clip 00002, codec M2TS, STC sequence 4, connection condition 5 (seamless)
       time: IN 2000 (00:00:00.044), OUT 2020 (00:00:00.044), duration 20 (00:00:00.000)
       starts: play item 0, at 1000 (00:00:00.022)

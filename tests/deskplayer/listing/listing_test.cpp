@@ -175,7 +175,7 @@ std::string VideoLine(const std::string& label, const json& stream)
         line += ", " + DynamicRangeName(stream.at("dynamic_range")) + " dynamic range";
     }
     return line + ", " +
-           (stream.at("aspect").is_null() ? "aspect ratio not known"
+           (stream.at("aspect").is_null() ? "aspect ratio unknown"
                                           : AspectRatioName(stream.at("aspect")));
 }
 
@@ -219,7 +219,7 @@ Lines ExpectedStreams(const json& streams)
     for (const json& stream : streams.at("secondary_audio")) {
         lines.push_back(AudioLine("secondary audio", stream));
     }
-    AddLanguageLine(lines, "secondary subtitles", streams.at("pip_pg"));
+    AddLanguageLine(lines, "picture-in-picture subtitles", streams.at("pip_pg"));
     return lines;
 }
 
@@ -346,14 +346,14 @@ TEST(ListPlayLists, ShowsStreamsOfEveryKind)
     const Lines rows = RowsOf(playList.Make());
 
     const Lines expected = {
-        "video: H.264 video, 1080p, 23.976 Hz, aspect ratio not known",
-        "enhancement video: H.264 video, 2160p, 23.976 Hz, aspect ratio not known",
+        "video: H.264 video, 1080p, 23.976 Hz, aspect ratio unknown",
+        "enhancement video: H.264 video, 2160p, 23.976 Hz, aspect ratio unknown",
         "audio: English: AC-3 audio, stereo, 48 kHz",
         "subtitles: French",
         "menus: Spanish",
-        "secondary video: H.264 video, 480p, 23.976 Hz, aspect ratio not known",
+        "secondary video: H.264 video, 480p, 23.976 Hz, aspect ratio unknown",
         "secondary audio: Italian: AC-3 audio, stereo, 48 kHz",
-        "secondary subtitles: German",
+        "picture-in-picture subtitles: German",
     };
     ASSERT_EQ(rows.size(), expected.size());
     for (std::size_t line = 0; line < rows.size(); ++line) {
@@ -395,8 +395,7 @@ TEST(ListPlayLists, ReportsAnUnknownAspectRatio)
 {
     const Bytes video = Join({StreamEntry(0x1011), StreamAttributesBytes(0x1B, {0x61, 0, 0, 0})});
     const Lines rows = RowsOf(WithStreams({1, 0, 0, 0, 0, 0, 0, 0}, video).Make());
-    EXPECT_EQ(rows.at(0).substr(47),
-              "video: H.264 video, 1080p, 23.976 Hz, aspect ratio not known");
+    EXPECT_EQ(rows.at(0).substr(47), "video: H.264 video, 1080p, 23.976 Hz, aspect ratio unknown");
 }
 
 TEST(ListPlayLists, LooksUpAnAspectRatioInTheClipOfThePlayItem)

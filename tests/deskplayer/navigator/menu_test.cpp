@@ -261,7 +261,7 @@ TEST(Menu, RefusesOperationsWhilePlaybackIsSuspended)
     desk.Start();
     desk.Do(desk.navigator.OpenPopUpMenu());
     desk.Do(desk.navigator.Suspend());
-    const std::string suspended = "not playing or paused or in a still, but suspended";
+    const std::string suspended = "not playing, paused or in a still, but suspended";
 
     EXPECT_EQ(desk.navigator.ClosePopUpMenu().Reason(), suspended);
     EXPECT_EQ(desk.navigator.SelectPreviousButton().Reason(), suspended);

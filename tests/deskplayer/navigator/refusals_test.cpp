@@ -154,7 +154,7 @@ std::vector<StatusRule> StatusRules()
         rules.push_back({named.first,
                          named.second,
                          {Status::Playing, Status::Paused, Status::Still},
-                         "playing or paused or in a still"});
+                         "playing, paused or in a still"});
     };
     std::for_each(std::begin(maskable), std::end(maskable), add);
     std::for_each(std::begin(Unmaskable), std::end(Unmaskable), add);

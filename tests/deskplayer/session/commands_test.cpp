@@ -248,10 +248,10 @@ TEST(Commands, PlayAtEveryValidSpeedAndNoOther)
         int steps;
         const char* refusal;
     } kinds[] = {
-        {"forward fast ", bd::PlayDirectionForward, 1, 12, "fast play has steps 1 to 12"},
-        {"forward slow ", bd::PlayDirectionForward, -1, 5, "slow motion has steps 1 to 5"},
-        {"backward fast ", bd::PlayDirectionBackward, 1, 12, "fast play has steps 1 to 12"},
-        {"backward slow ", bd::PlayDirectionBackward, -1, 5, "slow motion has steps 1 to 5"}};
+        {"forward fast ", bd::PlayDirectionForward, 1, 12, "fast speeds are numbered 1 to 12"},
+        {"forward slow ", bd::PlayDirectionForward, -1, 5, "slow speeds are numbered 1 to 5"},
+        {"backward fast ", bd::PlayDirectionBackward, 1, 12, "fast speeds are numbered 1 to 12"},
+        {"backward slow ", bd::PlayDirectionBackward, -1, 5, "slow speeds are numbered 1 to 5"}};
     for (const auto& kind : kinds) {
         SCOPED_TRACE(kind.words);
         TestDesk desk(TwoItems());

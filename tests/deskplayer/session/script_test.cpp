@@ -421,7 +421,7 @@ TEST(ParseScriptRefuses, ASessionThatBecomesTooLong)
 TEST(ParseScriptRefuses, ToGoBackInTime)
 {
     EXPECT_EQ(ErrorOf("at 1.5m play\n\nplay\nat 1:29.999 play\n"),
-              "4:4: 00:01:29.999 is before line 3; expected at least 00:01:30.000");
+              "4:4: 00:01:29.999 is earlier than line 3; expected at least 00:01:30.000");
 }
 
 TEST(ParseScriptRefuses, ALineWithoutATimeAfterAtOrAfter)
@@ -470,7 +470,7 @@ TEST(ParseScriptRefuses, ATextThatIsTooLong)
     std::string text(LongestScript, '\n');
     EXPECT_TRUE(Parse(text).empty());
     text += '\n';
-    EXPECT_EQ(ErrorOf(text), "1:1: the script has 1048577 bytes; expected at most 1048576");
+    EXPECT_EQ(ErrorOf(text), "1:1: the session has 1048577 bytes; expected at most 1048576");
 }
 
 TEST(ParseScriptRefuses, WithAnyFileNameOnOneLine)

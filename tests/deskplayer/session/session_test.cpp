@@ -88,7 +88,7 @@ TEST_F(Session, ContinuesItsTimeAfterPlaybackHasEnded)
     EXPECT_EQ(PlayScript(desk, "play\nat 1:00:00 fail play\nplay\nafter 3 stop\n"),
               std::string(StartOfItem) + "1 Finished(EndOfMedia)\n"
                                          "3600 PlayFailed()\n"
-                                         "line 4: not playing or paused or in a still, but "
+                                         "line 4: not playing, paused or in a still, but "
                                          "finished\n");
     EXPECT_EQ(desk.clock.Now(), 3603 * Second);
 }
