@@ -27,7 +27,7 @@ struct StcSequence {
 
 struct AtcSequence {
     std::uint32_t firstPacket = 0;
-    std::uint8_t firstStcSequence = 0; ///< number within the clip of the first STC sequence
+    std::uint8_t firstStcSequence = 0; ///< number of its first STC sequence in the clip
     std::vector<StcSequence> stcSequences;
 };
 

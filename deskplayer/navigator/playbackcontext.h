@@ -1,6 +1,6 @@
 /**
  * @file
- * The playback context over a play list of a disc.
+ * The playback context of a play list on a disc.
  */
 #ifndef DESKPLAYER_NAVIGATOR_PLAYBACKCONTEXT_H
 #define DESKPLAYER_NAVIGATOR_PLAYBACKCONTEXT_H

@@ -242,7 +242,7 @@ void TraceOutput::EndPlayback()
     }
 }
 
-/** Gives both ends the same members, because some viewers match them by name and arguments. */
+/** Gives begin and end the same members, because some viewers match them by name and arguments. */
 void TraceOutput::AppendSlice(Track track, const char* phase, const Slice& slice)
 {
     AppendEvent(track, phase, {{"name", slice.name}, {"args", ArgumentsJson(slice.callback)}});

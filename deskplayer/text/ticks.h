@@ -12,7 +12,7 @@
 namespace deskplayer
 {
 
-/** Frequency of the clock in which the files of a disc give times, in hertz. */
+/** Ticks per second of the times on a disc. */
 constexpr std::uint32_t TicksPerSecond = 45000;
 
 /**
