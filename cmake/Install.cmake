@@ -1,5 +1,5 @@
-# The installed package: find_package(bdmvnavigator) gives bdmvnavigator::bdmvnavigator and, where
-# the port was built and its own dependency is found, bdmvnavigator::kevro.
+# The installed package: find_package(bdmvnavigator) provides bdmvnavigator::bdmvnavigator and, if the
+# port was built and its dependency is found, bdmvnavigator::kevro.
 include(CMakePackageConfigHelpers)
 
 set(package_dir ${CMAKE_INSTALL_LIBDIR}/cmake/bdmvnavigator)
@@ -33,7 +33,7 @@ endif()
 configure_package_config_file(cmake/bdmvnavigator-config.cmake.in
   ${PROJECT_BINARY_DIR}/bdmvnavigator-config.cmake
   INSTALL_DESTINATION ${package_dir})
-# Before version 1 a minor version may change what clients see.
+# Before version 1 a minor version may change the interface.
 if(PROJECT_VERSION_MAJOR EQUAL 0)
   set(compatibility SameMinorVersion)
 else()

@@ -1,8 +1,8 @@
-# How every target of this project is compiled.
+# The compiler options of every target of this project.
 #
 # bdmvnavigator_target_options(TARGET [CXX_STANDARD N])
 #
-# N is 17 unless given: only the library itself is held to C++11, because player toolchains lag.
+# N defaults to 17: only the library itself is limited to C++11, because player toolchains lag.
 function(bdmvnavigator_target_options target)
   cmake_parse_arguments(arg "" "CXX_STANDARD" "" ${ARGN})
   if(NOT arg_CXX_STANDARD)
@@ -18,14 +18,15 @@ function(bdmvnavigator_target_options target)
     -Wall -Wextra -Wpedantic -Wconversion -Wshadow -Wformat=2
     $<$<COMPILE_LANGUAGE:CXX>:-Wnon-virtual-dtor>
     $<$<COMPILE_LANGUAGE:CXX>:-Woverloaded-virtual>
-    # Assertions name their file; it must not depend on where somebody checked out or built.
+    # Assertions name their file; the name must not depend on the source or build directory.
     -fmacro-prefix-map=${PROJECT_SOURCE_DIR}/=)
   if(BDMVNAVIGATOR_WARNINGS_AS_ERRORS)
     target_compile_options(${target} PRIVATE -Werror)
   endif()
 endfunction()
 
-# bdmvnavigator_sources_of(TARGET VARIABLE): where its sources are, to compile them in another way.
+# bdmvnavigator_sources_of(TARGET VARIABLE): the paths of its sources, to compile them with other
+# options.
 function(bdmvnavigator_sources_of target variable)
   get_target_property(sources ${target} SOURCES)
   get_target_property(folder ${target} SOURCE_DIR)

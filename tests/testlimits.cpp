@@ -1,6 +1,6 @@
-// Limits of every test program, so that what never ends fails and names its test: processor time,
-// because a loop that goes on for ever need not call anything that a test could count, and the size
-// of files, because such a loop may write. Programs that a test starts inherit the latter.
+// Limits of every test program, so that a test which never ends fails and is named: CPU time,
+// because an endless loop need not call anything that a test could count, and the size of files,
+// because such a loop may write. Programs that a test starts inherit the latter.
 
 #include <fcntl.h>
 #include <gtest/gtest.h>
@@ -16,10 +16,10 @@
 namespace
 {
 
-/** Of one test, with all its threads but without the programs that it starts. */
+/** CPU time of one test, with all its threads. The longest test takes less than a tenth of it. */
 constexpr int Seconds = BDMVNAVIGATOR_SECONDS_OF_A_TEST;
 
-/** In bytes. Many times what a test writes, little for the disk. */
+/** In bytes. Many times what a test writes, but little for the disk. */
 constexpr rlim_t LargestFile = rlim_t{64} << 20;
 
 /** Signal handlers may not compose text, and a test may have redirected standard error. */
@@ -40,13 +40,13 @@ void EndTest()
 
 extern "C" void OnTimeUsedUp(int)
 {
-    Write("\nended: used up the processor time of a test, so it may never end: ");
+    Write("\nended: used up the CPU time of a test, so it may never end: ");
     EndTest();
 }
 
 extern "C" void OnFileTooLarge(int)
 {
-    Write("\nended: wrote more into a file than a test may: ");
+    Write("\nended: exceeded the file size of a test: ");
     EndTest();
 }
 

@@ -37,7 +37,7 @@ namespace bdmv
  * Exceptions. An exception thrown by a callback leaves INavigatorEvent::Dispatch(): later listeners
  * miss this callback, and all listeners miss the rest of the event.
  *
- * Lifetime. The object behind a reference argument lives for the duration of the call. Copy what is
+ * Lifetime. The object of a reference argument lives for the duration of the call. Copy what is
  * needed later.
  *
  * The order of the bases is part of the binary interface.

@@ -18,8 +18,8 @@ namespace bdmv
  * The navigator's record of the playback in progress, as far as events read it.
  *
  * Events call these operations on the dispatching thread while they are dispatched, never while the
- * lock of a listener list is held; events have no lock. A context that another thread changes
- * meanwhile keeps each single query consistent; events do not expect several queries to be. Queries
+ * lock of a listener list is held; events take no other lock. A context that another thread changes
+ * meanwhile keeps each query consistent; events do not expect consistency across queries. Queries
  * are assumed to succeed.
  *
  * An operation with output parameters writes all of them. An output that it does not write keeps
@@ -91,17 +91,17 @@ public:
      */
     virtual bd::PlayListMarkIdDef GetCurrentPLMarkId(bd::TimePosition& time) = 0;
 
-    /** The current primary video stream and how many there are. */
+    /** The current primary video stream, and the number of primary video streams. */
     virtual void GetVideoInfo(bd::StreamNumberDef* number, bd::UInt8* count) = 0;
 
     /** Video format and aspect ratio of the primary video. */
     virtual void GetVideoAttributes(bd::VideoFormatType& format,
                                     bd::VideoAspectRatioType& aspectRatio) = 0;
 
-    /** The current primary audio stream and how many there are. */
+    /** The current primary audio stream, and the number of primary audio streams. */
     virtual void GetAudioInfo(bd::StreamNumberDef* number, bd::UInt8* count) = 0;
 
-    /** The current interactive graphics stream and how many there are. */
+    /** The current interactive graphics stream, and the number of them. */
     virtual void GetIgInfo(bd::StreamNumberDef* number, bd::UInt8* count) = 0;
 
     /**
@@ -114,21 +114,21 @@ public:
      */
     virtual ErrCode rGetPgTextStInfo(bd::StreamNumberDef* number, bd::UInt8* count) = 0;
 
-    /** The current presentation graphics or text subtitle stream and how many there are. */
+    /** The current presentation graphics or text subtitle stream, and the number of them. */
     virtual void GetPgTextStInfo(bd::StreamNumberDef* number, bd::UInt8* count) = 0;
 
-    /** The current secondary video stream, how many there are, and whether it plays asynchronously.
+    /** The current secondary video stream, the number of them, and whether it plays asynchronously.
      */
     virtual void GetSecondaryVideoInfo(bd::StreamNumberDef* number, bd::UInt8* count,
                                        bool* async) = 0;
 
-    /** The current secondary audio stream and how many there are. */
+    /** The current secondary audio stream, and the number of them. */
     virtual void GetSecondaryAudioInfo(bd::StreamNumberDef* number, bd::UInt8* count) = 0;
 
-    /** The current picture-in-picture subtitle stream and how many there are. */
+    /** The current picture-in-picture subtitle stream, and the number of them. */
     virtual void GetPipPgTextStInfo(bd::StreamNumberDef* number, bd::UInt8* count) = 0;
 
-    /** The current angle and how many there are. */
+    /** The current angle, and the number of angles. */
     virtual void GetAngleInfo(bd::AngleNumberDef* number, bd::UInt8* count) = 0;
 
     /** Whether presentation graphics and text subtitles are shown. */

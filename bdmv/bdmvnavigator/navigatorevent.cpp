@@ -16,7 +16,7 @@ constexpr bd::LogTag Notification = {bd::CompIdBdmvNavigator, KEVRO_Log_LevelEve
 /** The notification that repeats many times a second during playback. */
 constexpr bd::LogTag HighFrequencyNotification = {bd::CompIdBdmvNavigator, KEVRO_Log_LevelEvent, 1};
 
-/** The line that helps to find out why a trigger was reported as it was. */
+/** The line that helps to explain which trigger was reported. */
 constexpr bd::LogTag Diagnostic = {bd::CompIdBdmvNavigator, KEVRO_Log_LevelWarning, 0};
 
 /** Identifies the report of an unknown finish reason in the field; independent of the real line. */
@@ -39,7 +39,7 @@ const char* TrueOrFalse(bool value)
     return value ? "TRUE" : "FALSE";
 }
 
-/** The selected stream and the number of its kind; 0 where the context does not write it. */
+/** The selected stream and the number of streams; 0 where the context does not write them. */
 struct StreamInfo {
     bd::StreamNumberDef number = 0;
     bd::UInt8 count = 0;

@@ -18,8 +18,8 @@
  *
  * Lifetime. The context must outlive the event, which does not own it.
  *
- * Threads. An event starts no thread and has no lock. Between two callbacks of one event the lock
- * of the list is free, so listeners may see another thread's event there.
+ * Threads. An event starts no thread and has no lock. Between two callbacks of one event the list
+ * is unlocked, so listeners may receive another thread's event there.
  */
 #ifndef BDMVNAVIGATOR_NAVIGATOREVENT_H
 #define BDMVNAVIGATOR_NAVIGATOREVENT_H
@@ -360,8 +360,8 @@ public:
 };
 
 /**
- * Playback reached the end of the media, or ran out of data. Any other reason is reported through
- * Assert() and sent as the end of the media.
+ * Playback reached the end of the media, or was starved of data. Any other reason is reported
+ * through Assert() and sent as the end of the media.
  */
 class FinishedEvent : public NavigatorEvent
 {

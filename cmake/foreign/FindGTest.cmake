@@ -1,4 +1,4 @@
-# GoogleTest from the sources that Debian packages.
+# GoogleTest, built from Debian's package of its sources.
 include(FindPackageHandleStandardArgs)
 find_path(GTest_SOURCES googletest/src/gtest-all.cc
   PATHS /usr/src/googletest NO_DEFAULT_PATH NO_CMAKE_FIND_ROOT_PATH)

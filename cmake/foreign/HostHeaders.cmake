@@ -1,8 +1,8 @@
-# Libraries that need no more than their headers: those of the building machine serve any target.
+# Header-only libraries: those of the build machine work for any target.
 include(FindPackageHandleStandardArgs)
 
-# bdmvnavigator_find_host_headers(PACKAGE TARGET FOLDERS...): an imported TARGET that sees these
-# FOLDERS of /usr/include and nothing else there, where the headers of the wrong C library are.
+# bdmvnavigator_find_host_headers(PACKAGE TARGET FOLDERS...): an imported TARGET that sees only these
+# FOLDERS of /usr/include, because the rest includes the headers of the wrong C library.
 macro(bdmvnavigator_find_host_headers package target)
   set(${package}_HEADERS TRUE)
   foreach(folder ${ARGN})

@@ -156,7 +156,7 @@ public:
     }
 
     /**
-     * Formats and writes one line, without asking the switch; see BD_LOG() for that.
+     * Formats and writes one line, without checking the switch; see BD_LOG() for that.
      *
      * @param format a printf format without a line end, then its arguments
      */

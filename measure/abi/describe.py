@@ -5,7 +5,7 @@
 
 OBJECT holds the debug information of all public types, CLASSES is the compiler's list of classes
 with their alignment, ARCHIVE is the library and NM the tool that lists its symbols. Every line
-begins with what it is about, and nothing depends on where a declaration stands.
+begins with its subject, and the output does not depend on the position of declarations.
 """
 
 import itertools
@@ -17,8 +17,8 @@ from elftools.elf.elffile import ELFFile
 
 NAMESPACES = ("bd", "bdmv", "bdstreaming")
 PLATFORM = re.compile(r"(KEVRO_\w+|Assert|g_u1Bduopmask)$")
-# The kinds of symbols that the library alone brings. Weak functions, which are inline ones and
-# instances of templates, come and go with the optimisation, and whoever calls them has his own.
+# The kinds of symbols that only the library defines. Weak functions (inline functions and instances
+# of templates) depend on the optimisation, and every caller has its own copy.
 EXPORTED = "BDRTV"
 KINDS = {
     "DW_TAG_class_type": "class",
@@ -30,7 +30,7 @@ KINDS = {
 
 
 def attribute(die, name, default=None):
-    """The value of an attribute, texts decoded."""
+    """The value of an attribute; texts are decoded."""
     if name not in die.attributes:
         return default
     value = die.attributes[name].value
@@ -38,13 +38,13 @@ def attribute(die, name, default=None):
 
 
 def type_of(die):
-    """What a declaration is of; None for void."""
+    """The type of a declaration; None for void."""
     return die.get_DIE_from_attribute("DW_AT_type") if "DW_AT_type" in die.attributes else None
 
 
 def qualified_name(die):
-    """A name as written in a program. Of the standard library's templates only their own name:
-    their arguments are its own business."""
+    """A name as written in a program; a template of the standard library without its arguments,
+    which are internal to that library."""
     names = []
     while die is not None and die.tag != "DW_TAG_compile_unit":
         names.insert(0, attribute(die, "DW_AT_name", "(unnamed)"))
@@ -55,7 +55,7 @@ def qualified_name(die):
 
 
 def type_name(die):
-    """The name of a type, built from what it points to where it does."""
+    """The name of a type, which for a pointer or reference includes the type it refers to."""
     if die is None:
         return "void"
     if die.tag == "DW_TAG_const_type":
@@ -88,7 +88,7 @@ def parameters(function):
 
 
 def is_const(function):
-    """Whether a member function is: its object is."""
+    """Whether a member function is const: its object is."""
     for child in function.iter_children():
         if child.tag == "DW_TAG_formal_parameter" and "DW_AT_artificial" in child.attributes:
             pointer = type_of(child)
@@ -99,10 +99,10 @@ def is_const(function):
 
 
 def slot_of(function):
-    """The number of a virtual function in the table, an expression of one constant."""
+    """The slot of a virtual function in the table, an expression with one constant."""
     operation, *bytes_of_number = function.attributes["DW_AT_vtable_elem_location"].value
     assert operation == 0x10, "DW_OP_constu"
-    return sum((byte & 0x7F) << (7 * place) for place, byte in enumerate(bytes_of_number))
+    return sum((byte & 0x7F) << (7 * index) for index, byte in enumerate(bytes_of_number))
 
 
 def slot_text(function):
@@ -133,7 +133,7 @@ def describe_class(die, subject, alignments):
         elif "DW_AT_virtuality" in child.attributes:
             destructor = attribute(child, "DW_AT_name")
     if destructor:
-        # Debug information leaves its two slots out; they are the ones that nothing else has.
+        # Debug information omits the destructor's two slots; they are the slots that are left.
         taken = {slot for slot, _ in slots}
         free = itertools.filterfalse(taken.__contains__, itertools.count())
         slots.append((next(free), f"{destructor}(), which destroys"))
@@ -187,13 +187,13 @@ def public_types(die, public=False):
 
 
 def read_alignments(path):
-    """Class by class, from the compiler's dump."""
+    """The alignment of each class, from the compiler's dump."""
     with open(path, encoding="utf-8") as dump:
         return dict(re.findall(r"^Class (.+)\n   size=\d+ align=(\d+)$", dump.read(), re.MULTILINE))
 
 
 def read_symbols(nm, archive, kinds, *options):
-    """The names of the given kinds, in their order."""
+    """The names of the given kinds, sorted."""
     output = subprocess.run(
         [nm, "--extern-only", *options, archive], check=True, capture_output=True, text=True
     ).stdout

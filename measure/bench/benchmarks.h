@@ -28,7 +28,7 @@ constexpr char ByValue[] = "AudioInfoType by value";
 constexpr char OneList[] = "one list";
 constexpr char OwnLists[] = "separate lists";
 
-constexpr char Delivery[] = "its delivery alone, by hand";
+constexpr char Delivery[] = "delivery alone, by hand";
 constexpr char DispatchOff[] = "dispatch, line off";
 constexpr char DispatchNull[] = "dispatch, null sink";
 constexpr char DispatchQueue[] = "dispatch, queue";

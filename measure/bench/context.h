@@ -1,6 +1,6 @@
 /**
  * @file
- * A playback context that answers at once.
+ * A playback context that answers immediately.
  */
 #ifndef BENCH_CONTEXT_H
 #define BENCH_CONTEXT_H
@@ -11,12 +11,12 @@
 namespace bench
 {
 
-/** Answers what the measured events ask, and nothing to the other queries. */
+/** Answers the queries of the measured events, and ignores all others. */
 class Context final : public bdmv::IPlaybackContext
 {
 public:
-    // What is asked. The bodies stand in a source of their own, so that no caller sees through
-    // them.
+    // The queries of the measured events. They are defined in a separate source, so that no caller
+    // can inline them.
     bd::PlayListIdDef GetPlayListId() override;
     bd::PlayItemIdDef GetPlayItemId() override;
     bd::TimePosition GetCurrentTimePosition() override;

@@ -19,8 +19,8 @@ namespace bench
 /**
  * Registers three callbacks to each number of listeners.
  *
- * The subjects are made here, before anything runs: the heap is still in one piece, so that what
- * they allocate lies in order.
+ * The subjects are created here, before any benchmark runs, while the heap is not fragmented, so
+ * that their allocations are contiguous.
  */
 template <typename Subject> void RegisterDelivery(const std::string& name)
 {

@@ -1,5 +1,5 @@
-// Delivery by the library, by hand, and by what else a user might take. The peers call the
-// listeners as their users would: without a virtual call, by the concrete class.
+// Delivery by the library, by hand, and by the alternatives that a user might choose. Those call
+// the listeners as their users would: without a virtual call, through the concrete class.
 
 #include <mutex>
 
@@ -67,7 +67,7 @@ private:
     sigc::signal<void(bool, bd::AudioInfoType)> m_AudioInfoChanged;
 };
 
-/** What a user adds to a subject that is for one thread only. */
+/** Adds the mutex that a user needs around a subject that is not thread-safe. */
 template <typename Subject> class Locked
 {
 public:

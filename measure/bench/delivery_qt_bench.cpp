@@ -1,5 +1,5 @@
-// Delivery by Qt's signals. They may be emitted on any thread; the receivers are then called on
-// that thread.
+// Delivery by Qt's signals. They may be emitted on any thread; the receivers are called on that
+// thread.
 
 #include <QObject>
 

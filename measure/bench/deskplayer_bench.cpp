@@ -1,9 +1,9 @@
-// How fast the desk player sends events through a session on the virtual clock: from the navigator
-// through the queue to the delivering thread and every listener, and back.
+// The rate at which the desk player sends events through a session on the virtual clock: from the
+// navigator through the queue to the delivering thread and every listener, and back.
 //
 // The sessions play from start to end with a chapter every five minutes, log lines off. The ratios
-// say how the cost of a session grows with its length and with the number of listeners; the times
-// of different runs are not to be compared.
+// show how the cost of a session grows with its length and with the number of listeners; do not
+// compare the times of different runs.
 
 #include <benchmark/benchmark.h>
 
@@ -42,7 +42,7 @@ deskplayer::LoadedPlayList PlayListOf(std::uint32_t minutes)
     return deskplayer::LayOut(1, list);
 }
 
-/** Counts the callbacks that come every second, nearly all there are. */
+/** Counts the position callbacks, one every second, which are nearly all callbacks. */
 class CountingListener : public bdmv::NavigatorListenerAdapter
 {
 public:
@@ -87,7 +87,7 @@ void PrintTable(const bench::Report& report)
 {
     std::printf("\nSessions of the desk player, relative to 2 h, 1 listener\n"
                 "  %10s%12s%12s%12s%9s\n",
-                "minutes", "listeners", "ms", "events/s", "relative");
+                "minutes", "listeners", "ms", "events/s", "ratio");
     const double twoHours = report[TwoHours.Row()].wall;
     for (const Session& session : Sessions) {
         const bench::Row row = report[session.Row()];

@@ -1,4 +1,4 @@
-// Whole events to one listener, where what an event adds to its delivery weighs most.
+// Whole events to one listener, where the overhead over the delivery is largest.
 
 #include <chrono>
 #include <memory>
@@ -54,7 +54,7 @@ template <typename Event> void Dispatch(benchmark::State& state)
         benchmark::DoNotOptimize(event);
         event->Dispatch(stage.listeners);
     }
-    // Not an average: one allocation in a million dispatches is one too many.
+    // The total, not an average: one allocation in a million dispatches is one too many.
     state.counters[AllocationsCounter] = static_cast<double>(bdmvtest::CountAllocations() - before);
 }
 
@@ -67,7 +67,7 @@ auto WithLog(void (*function)(benchmark::State&), std::chrono::microseconds sink
     };
 }
 
-/** Registers the rows of an event; @p deliver is its work without a log line, by hand. */
+/** Registers the rows of an event; @p deliver does its work by hand, without a log line. */
 template <typename Event>
 void RegisterEvent(const std::string& name, void (*deliver)(bdmv::IPlaybackContext&, List&))
 {

@@ -1,6 +1,6 @@
 /**
  * @file
- * What every benchmark calls, and with what.
+ * The listeners that every benchmark calls, and the arguments.
  */
 #ifndef BENCH_LISTENER_H
 #define BENCH_LISTENER_H
@@ -13,8 +13,8 @@ namespace bench
 {
 
 /**
- * Counts its callbacks, the least that a listener can do. The bodies stand in a source of their
- * own, so that no caller sees through them.
+ * Counts its callbacks, the least that a listener can do. They are defined in a separate source, so
+ * that no caller can inline them.
  */
 class CountingListener final : public bdmv::NavigatorListenerAdapter
 {
@@ -29,10 +29,10 @@ private:
     std::uint64_t m_Count = 0;
 };
 
-/** The listeners of all rows of one thread: 1024 side by side, so that all rows find them alike. */
+/** The listeners of all single-threaded rows: 1024 in one array, the same for every row. */
 CountingListener* Listeners();
 
-// Values that no compiler knows.
+// Values that the compiler cannot know.
 extern const bd::TimePosition& Position;
 extern const bd::AudioInfoType& AudioInfo;
 

@@ -1,4 +1,4 @@
-// One log line: the longest of the three measured events, and what a user would write instead.
+// One log line: the longest of the three measured events, and the alternatives of a user.
 
 #include <chrono>
 #include <cstdarg>

@@ -1,6 +1,6 @@
 /**
  * @file
- * Switches the log of the port for a row.
+ * Configures the log of the port for a row.
  */
 #ifndef BENCH_LOGGING_H
 #define BENCH_LOGGING_H
@@ -25,10 +25,10 @@ constexpr std::size_t QueueLines = 100;
 /** A sink that drops its lines at once. */
 constexpr std::chrono::microseconds Null{0};
 
-/** One that takes as long as a terminal or a flash: the thread of a queue is never done then. */
+/** A sink as slow as a terminal or flash memory, so the queue's thread is always busy. */
 constexpr std::chrono::microseconds Slow{100};
 
-/** Drops lines, each after some time. */
+/** Drops each line after a delay. */
 class DroppingSink final : public spdlog::sinks::base_sink<std::mutex>
 {
 public:
@@ -48,7 +48,7 @@ private:
     std::chrono::microseconds m_Time;
 };
 
-/** As long as it lives, all lines are on and go into a sink that drops them. */
+/** While it lives, all lines are on and go to a sink that drops them. */
 class LoggingOn
 {
 public:

@@ -1,4 +1,4 @@
-// Delivery, events, threads and log lines in one run, so that their times may be compared.
+// Delivery, events, threads and log lines in one run, so that their times are comparable.
 
 #include "benchmarks.h"
 #include "kevro_linux.h"

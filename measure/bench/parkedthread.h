@@ -1,6 +1,6 @@
 /**
  * @file
- * Makes a process one with several threads.
+ * Makes a process multi-threaded.
  */
 #ifndef BENCH_PARKEDTHREAD_H
 #define BENCH_PARKEDTHREAD_H
@@ -13,8 +13,8 @@ namespace bench
 {
 
 /**
- * A thread that does nothing. A process that never had a second thread locks several times cheaper,
- * and no player is such a process.
+ * A thread that does nothing. In a process that never had a second thread a lock costs several
+ * times less, but every player has several threads.
  */
 class ParkedThread
 {

@@ -1,6 +1,6 @@
 /**
  * @file
- * Runs the benchmarks of a program and collects what they measured.
+ * Runs the benchmarks of a program and collects their results.
  */
 #ifndef BENCH_REPORT_H
 #define BENCH_REPORT_H
@@ -15,12 +15,12 @@ namespace bench
 {
 
 /**
- * The medians of a row over its repetitions, for one iteration and in the unit of the row. Not a
- * number for what was not measured.
+ * The medians of a row over its repetitions, for one iteration and in the unit of the row; NaN if
+ * not measured.
  */
 struct Row {
-    double cpu;  ///< of the processor for the calling thread
-    double wall; ///< passed; with several threads, divided by their number
+    double cpu;  ///< CPU time of the calling thread
+    double wall; ///< elapsed time; with several threads, divided by their number
     std::map<std::string, double> counters;
 
     double Counter(const std::string& name) const;
@@ -44,14 +44,14 @@ private:
 };
 
 /**
- * Runs everything registered: 15 repetitions of each row, those of all rows in random order.
+ * Runs all registered benchmarks: 15 repetitions of each row, in random order over all rows.
  *
- * @param argc, argv arguments of Google Benchmark, which overrule these defaults
+ * @param argc, argv arguments of Google Benchmark, which override these defaults
  * @return false, and a message on standard error, when an argument is unknown
  */
 bool RunBenchmarks(Report& report, int argc, char** argv);
 
-/** Prints a number that may be none. */
+/** Prints a number, or "-" for NaN. */
 void PrintNumber(int width, int decimals, double value);
 
 } // namespace bench

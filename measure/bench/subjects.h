@@ -1,6 +1,6 @@
 /**
  * @file
- * What delivers: the floor that no delivery under a lock can pass, and the library.
+ * The floor, which no delivery under a lock can beat, and the library.
  *
  * A subject has Add() and, for each shape of callback, an operation that calls it on every listener
  * added.

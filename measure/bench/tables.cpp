@@ -16,13 +16,13 @@ namespace
 
 constexpr const char* Events[] = {"PlayStartedEvent", "CurrentTimePositionEvent", "PlayItemEvent"};
 
-/** A limit, and what was measured against it. */
+/** A limit, and the values judged by it. */
 class Goal
 {
 public:
     Goal(const char* text, double limit) : m_Text(text), m_Limit(limit) {}
 
-    /** Takes a value; one that was not measured is not a number and does not count. */
+    /** Judges a value; NaN, which means not measured, is ignored. */
     void Judge(const std::string& where, double value)
     {
         if (std::isnan(value)) {
@@ -59,7 +59,7 @@ private:
     std::vector<std::string> m_Missed;
 };
 
-/** A time, and how many times another it is. */
+/** Prints a time, and its ratio to another. */
 void PrintTime(double time, double other)
 {
     PrintNumber(11, 1, time);
@@ -69,8 +69,7 @@ void PrintTime(double time, double other)
 void PrintDelivery(const Report& report, Goal& goal)
 {
     for (const char* const callback : {NoArguments, ByReference, ByValue}) {
-        std::printf("\nDelivery with %s: ns, and relative to the floor\n  %-28s", callback,
-                    "listeners");
+        std::printf("\nDelivery with %s: ns, × floor\n  %-28s", callback, "listeners");
         for (const int count : ListenerCounts) {
             std::printf("%11d%7s", count, "");
         }
@@ -96,9 +95,7 @@ void PrintEvents(const Report& report, Goal& allocations, Goal& lineOff)
 {
     const double logSwitch = report[LogRow(LogSwitch)].cpu;
     std::printf(
-        "\nEvents to one listener: ns, and relative to the delivery alone plus one call of the "
-        "switch\n  %-38s",
-        "");
+        "\nEvents to one listener: ns, × delivery alone plus one call of the switch\n  %-38s", "");
     for (const char* const event : Events) {
         std::printf("%25s", event);
     }
@@ -123,10 +120,8 @@ void PrintEvents(const Report& report, Goal& allocations, Goal& lineOff)
 
 void PrintThreads(const Report& report)
 {
-    std::printf(
-        "\nThreads that fire at eight listeners each: elapsed ns of one delivery in its thread, "
-        "relative to the floor,\nhow much of the time a thread ran, and how much it waited for a "
-        "processor\n");
+    std::printf("\nThreads that each fire at eight listeners: elapsed ns per delivery, × floor,\n"
+                "share of time a thread ran, share of time it waited for a processor\n");
     for (const char* const lists : {OneList, OwnLists}) {
         for (const int threads : ThreadCounts) {
             for (const char* const subject : {FloorName, LibraryName}) {
@@ -145,8 +140,7 @@ void PrintThreads(const Report& report)
 
 void PrintLog(const Report& report, Goal& queued)
 {
-    std::printf(
-        "\nA log line: processor ns of the caller, relative to vsnprintf alone, elapsed ns\n");
+    std::printf("\nA log line: the caller's CPU ns, × vsnprintf alone, elapsed ns\n");
     const double formatting = report[LogRow(LogVsnprintf)].cpu;
     for (const char* const what : {LogSwitch, LogOff, LogVsnprintf, LogNull, LogQueue, LogQueueNull,
                                    LogSpdlog, LogSpdlogQueue, LogSpdlogQueueNull}) {
@@ -165,11 +159,10 @@ void PrintLog(const Report& report, Goal& queued)
 
 void PrintTables(const Report& report)
 {
-    Goal delivery("delivery, relative to the floor", 1.10);
+    Goal delivery("delivery, × floor", 1.10);
     Goal allocations("allocations between Dispatch() and its return", 0);
-    Goal lineOff("an event with its line off, relative to its delivery plus one call of the switch",
-                 1.15);
-    Goal queued("a queued line, relative to vsnprintf alone", 1.5);
+    Goal lineOff("an event with its line off, × delivery alone plus one call of the switch", 1.15);
+    Goal queued("a line into the queue, × vsnprintf alone", 1.5);
 
     PrintDelivery(report, delivery);
     PrintEvents(report, allocations, lineOff);

@@ -1,6 +1,6 @@
 /**
  * @file
- * What was measured, as tables with ratios and goals.
+ * The results, as tables with ratios and goals.
  */
 #ifndef BENCH_TABLES_H
 #define BENCH_TABLES_H

@@ -1,4 +1,4 @@
-// Several threads that fire at once, each at eight listeners.
+// Several threads that fire concurrently, each at eight listeners.
 
 #include <array>
 #include <chrono>
@@ -20,9 +20,9 @@ namespace
 constexpr std::size_t ListenersEach = 8;
 constexpr std::size_t MostThreads = 4;
 
-/** A subject with its listeners, apart from others in the processors' caches. */
-template <typename Subject> struct alignas(128) Party {
-    Party()
+/** A subject with its listeners, on cache lines that no other subject shares. */
+template <typename Subject> struct alignas(128) SubjectWithListeners {
+    SubjectWithListeners()
     {
         for (CountingListener& listener : listeners) {
             subject.Add(listener);
@@ -33,7 +33,7 @@ template <typename Subject> struct alignas(128) Party {
     Subject subject;
 };
 
-/** How long the calling thread has been ready to run while no processor took it, in seconds. */
+/** The time the calling thread has been ready to run but not running, in seconds. */
 double SecondsWaited()
 {
     std::ifstream file("/proc/thread-self/schedstat");
@@ -45,13 +45,13 @@ double SecondsWaited()
 
 template <typename Subject> void RegisterThreads(const std::string& name)
 {
-    using Parties = std::array<Party<Subject>, MostThreads>;
-    const auto parties = std::make_shared<Parties>();
+    using Subjects = std::array<SubjectWithListeners<Subject>, MostThreads>;
+    const auto subjects = std::make_shared<Subjects>();
     for (const int threads : ThreadCounts) {
         for (const bool own : {false, true}) {
-            const auto fire = [parties, own](benchmark::State& state) {
+            const auto fire = [subjects, own](benchmark::State& state) {
                 Subject& subject =
-                    (*parties)[own ? static_cast<std::size_t>(state.thread_index()) : 0].subject;
+                    (*subjects)[own ? static_cast<std::size_t>(state.thread_index()) : 0].subject;
                 const double waited = SecondsWaited();
                 const auto begun = std::chrono::steady_clock::now();
                 for (auto _ : state) {

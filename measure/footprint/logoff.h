@@ -1,5 +1,5 @@
-// Included ahead of a source, a log switch that is off for good: what it takes then is what it
-// takes without its log lines.
+// A log switch that is always off. Included before a source, it removes the source's log lines, so
+// that the size without them can be measured.
 #include "kevro/kevro_log.h"
 
 __attribute__((always_inline)) inline KEVRO_Bool KEVRO_Log_IsEnabled(KEVRO_UInt32, KEVRO_Int32,

@@ -3,7 +3,7 @@
 
     report.py BUILD
 
-BUILD is a build directory. Fails, after printing, when an event takes more than it may.
+BUILD is a build directory. After printing, fails if an event exceeds the limit.
 """
 
 import pathlib
@@ -13,7 +13,7 @@ import sys
 
 from elftools.elf.elffile import ELFFile
 
-LIMIT = 200  # bytes of text per event on average, without strings
+LIMIT = 200  # bytes of text per event on average, without strings and type names
 EVENT = re.compile(r"_ZN4bdmv\d+(\w+Event)(8DispatchE|D[02]Ev)")
 TABLE = re.compile(r"_ZT[VI]N4bdmv\d+(\w+Event)E$")
 TYPE_NAME = re.compile(r"_ZTSN4bdmv\d+(\w+Event)E$")
@@ -61,10 +61,10 @@ def by_event(pattern, symbols):
 
 
 def object_sizes(build, pattern):
-    """Text, data and bss of object files together, as the tool `size` counts them."""
+    """The total text, data and bss of object files, as counted by the tool `size`."""
     paths = [str(path) for path in pathlib.Path(build).glob(pattern)]
     if not paths:
-        sys.exit(f"there is no {pattern} in {build}")
+        sys.exit(f"no {pattern} in {build}")
     lines = subprocess.run(
         ["arm-linux-gnueabihf-size", *paths], check=True, capture_output=True, text=True
     ).stdout.splitlines()[1:]
@@ -87,9 +87,9 @@ def print_program(builds, count):
         ("text", "text"),
         ("- code of the events", "events"),
         ("- code that fires callbacks", "firing"),
-        ("- code of locks, reference-counted pointers, log, mask and helpers", "rest"),
-        ("- exception tables", "unwinding"),
-        ("- texts of log lines and assertions", "texts"),
+        ("- code of locks, shared pointers, the log, the mask and helpers", "rest"),
+        ("- tables for exceptions", "unwinding"),
+        ("- strings of log lines and assertions", "texts"),
         ("- type names", "names"),
         ("data: virtual tables and type information", "data"),
         ("bss", "bss"),
@@ -100,7 +100,7 @@ def print_program(builds, count):
     print_heading("the library in a program", ("with log lines", "without"))
     for title, attribute in (
         ("text", "text"),
-        ("text without strings", "beyond_strings"),
+        ("text without strings and type names", "beyond_strings"),
         ("data", "data"),
     ):
         print_row(title, [round(getattr(build, attribute) / count) for build in builds])
@@ -120,7 +120,7 @@ def print_objects(directory):
 
 
 def print_events(full, quiet):
-    print("\nPer event, in bytes; code includes the destructors:\n")
+    print("\nPer event, in bytes; the code includes the destructors:\n")
     print_heading("event", ("code", "without log lines", "name", "tables"))
     for name in sorted(full.code_of):
         sizes = (full.code_of, quiet.code_of, full.name_of, full.tables_of)
@@ -136,7 +136,7 @@ def main():
     print_objects(directory)
     print_events(full, quiet)
     if full.beyond_strings > LIMIT * count:
-        sys.exit(f"an event takes more than {LIMIT} bytes of text without strings")
+        sys.exit(f"an event has more than {LIMIT} bytes of text without strings and type names")
 
 
 main()

@@ -1,5 +1,5 @@
-// Counts instructions: runs each piece of work a thousand times while callgrind collects, and has
-// it write the count under the name of the work. scripts/instructions reads them.
+// Counts instructions: runs each piece of work a thousand times while callgrind collects, then
+// makes it write the count under the name of the work. scripts/instructions reads the counts.
 
 #include <cstdio>
 #include <utility>
@@ -61,7 +61,7 @@ template <typename Event> void CountEvent(const char* name)
 int main()
 {
     if (RUNNING_ON_VALGRIND == 0) {
-        std::fputs("instructions: to be run by callgrind, see scripts/instructions\n", stderr);
+        std::fputs("instructions: run this under callgrind, see scripts/instructions\n", stderr);
         return 2;
     }
     const bench::ParkedThread parked;

@@ -48,7 +48,7 @@ extern "C" {
  * threads are applied one after the other.
  *
  * @param text        null is refused
- * @param message     receives why the text was refused: the word, its position and what was
+ * @param message     receives the reason of a refusal: the word, its position and what was
  *                    expected there; empty on success. Cut to fit; may be null.
  * @param messageSize bytes at @p message
  * @return whether the text is in force
@@ -62,7 +62,7 @@ bool KEVRO_Log_Configure(const char* text, char* message, size_t messageSize);
  * - `stderr`: standard error.
  * - `file:PATH[,size=BYTES][,files=N]`: a file, to which lines are appended. A line that would make
  *   it larger than BYTES (default 1048576) starts a new file; the newest N (default 3) old files
- * are kept, numbered from 1 before the extension. Missing directories are created. PATH must not
+ *   are kept, numbered from 1 before the extension. Missing directories are created. PATH must not
  *   contain a comma.
  * - `syslog[:IDENT]`: the system's logger, facility user, under the name IDENT or, without it, the
  *   program's.

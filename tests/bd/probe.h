@@ -1,6 +1,6 @@
 /**
  * @file
- * A listener interface with a method of every kind, and a listener that records its calls.
+ * A listener interface with every kind of method, and a listener that records its calls.
  */
 #ifndef TESTS_BD_PROBE_H
 #define TESTS_BD_PROBE_H
@@ -63,7 +63,7 @@ public:
     /** Called after a call has been recorded. */
     std::function<void()> onCall;
 
-    /** Added by the methods with one parameter to what they were given, if they can change it. */
+    /** The methods with one parameter add it to their argument, if they can change that. */
     int increment = 0;
 
     /** What the references of the last call refer to. */

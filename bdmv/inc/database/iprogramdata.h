@@ -28,7 +28,7 @@ public:
 
     /**
      * @param commandId index of the command
-     * @return the command; owned by the program, valid as long as it
+     * @return the command; owned by the program, valid during its lifetime
      */
     virtual const INavigationCommandData*
     GetNavigationCommandData(CommandIdDef commandId) const = 0;

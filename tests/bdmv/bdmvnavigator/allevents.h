@@ -21,9 +21,9 @@ struct EventClass {
 /**
  * Creates an event of a class, and makes the compiler check what all event classes share.
  *
- * @tparam Frozen the constructor's parameters after the context
+ * @tparam Stored the constructor's parameters after the context
  */
-template <typename Event, typename... Frozen>
+template <typename Event, typename... Stored>
 std::unique_ptr<bdmv::INavigatorEvent> Make(bdmv::IPlaybackContext& context)
 {
     static_assert(std::is_base_of<bdmv::NavigatorEvent, Event>::value, "");
@@ -34,13 +34,13 @@ std::unique_ptr<bdmv::INavigatorEvent> Make(bdmv::IPlaybackContext& context)
     static_assert(!std::is_copy_assignable<Event>::value, "");
     static_assert(!std::is_default_constructible<Event>::value, "");
     static_assert(std::is_constructible<Event, bdmv::IPlaybackContext&>::value ==
-                      (sizeof...(Frozen) == 0),
+                      (sizeof...(Stored) == 0),
                   "takes the context and every value that it stores");
-    static_assert(!std::is_constructible<Event, bdmv::IPlaybackContext&, Frozen..., int>::value,
+    static_assert(!std::is_constructible<Event, bdmv::IPlaybackContext&, Stored..., int>::value,
                   "takes no more than that");
-    static_assert(sizeof...(Frozen) != 0 || sizeof(Event) == sizeof(bdmv::NavigatorEvent),
+    static_assert(sizeof...(Stored) != 0 || sizeof(Event) == sizeof(bdmv::NavigatorEvent),
                   "has no other members than the values it stores");
-    return std::make_unique<Event>(context, Frozen()...);
+    return std::make_unique<Event>(context, Stored()...);
 }
 
 /** Every event, in the order of declaration. */

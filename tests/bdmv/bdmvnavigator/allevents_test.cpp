@@ -14,7 +14,7 @@ static_assert(std::is_abstract<bdmv::NavigatorEvent>::value, "");
 static_assert(std::has_virtual_destructor<bdmv::INavigatorEvent>::value, "");
 static_assert(std::has_virtual_destructor<bdmv::NavigatorEvent>::value, "");
 static_assert(sizeof(bdmv::INavigatorEvent) == sizeof(void*), "");
-static_assert(sizeof(bdmv::NavigatorEvent) == 2 * sizeof(void*), "only the context");
+static_assert(sizeof(bdmv::NavigatorEvent) == 2 * sizeof(void*), "has only the context");
 static_assert(std::is_constructible<bdmv::TriggerSetEvent, bdmv::IPlaybackContext&, bd::TriggerType,
                                     bool>::value,
               "");

@@ -131,7 +131,7 @@ Operation Op(const char* name, Signature Interface::*function)
  * Callers expect the operations after the two slots of the destructor, in this order, and the
  * object has them there.
  *
- * @param object  implements the interface, and writes what is called into the journal
+ * @param object  implements the interface, and records its calls in the journal
  * @param journal has entries such as "name.Operation(arguments)"
  */
 template <typename Interface>

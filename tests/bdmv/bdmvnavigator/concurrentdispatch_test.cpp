@@ -36,13 +36,13 @@ private:
 };
 
 /** Counts the calls it receives while it is in no list. */
-class VisitingListener : public bdmv::NavigatorListenerAdapter
+class TemporaryListener : public bdmv::NavigatorListenerAdapter
 {
 public:
-    void Paused() override { callsWhileAbsent += isListed ? 0 : 1; }
+    void Paused() override { callsWhileUnlisted += isListed ? 0 : 1; }
 
     bool isListed = false; ///< changed while the listener is in no list
-    int callsWhileAbsent = 0;
+    int callsWhileUnlisted = 0;
 };
 
 TEST(ConcurrentDispatch, DeliversEveryEventOnceWhileListenersAreAddedAndRemoved)
@@ -51,7 +51,7 @@ TEST(ConcurrentDispatch, DeliversEveryEventOnceWhileListenersAreAddedAndRemoved)
     Context context;
     Listeners listeners;
     CountingListener permanent;
-    VisitingListener visitors[2];
+    TemporaryListener temporaries[2];
     listeners.AddListener(&permanent);
 
     std::atomic<int> dispatching{2};
@@ -63,20 +63,20 @@ TEST(ConcurrentDispatch, DeliversEveryEventOnceWhileListenersAreAddedAndRemoved)
         }
         --dispatching;
     };
-    const auto addAndRemove = [&](VisitingListener& visitor) {
+    const auto addAndRemove = [&](TemporaryListener& temporary) {
         while (dispatching != 0) {
-            visitor.isListed = true;
-            EXPECT_TRUE(listeners.AddListener(&visitor));
-            EXPECT_TRUE(listeners.ListenerExists(&visitor));
-            EXPECT_TRUE(listeners.RemoveListener(&visitor));
-            visitor.isListed = false;
+            temporary.isListed = true;
+            EXPECT_TRUE(listeners.AddListener(&temporary));
+            EXPECT_TRUE(listeners.ListenerExists(&temporary));
+            EXPECT_TRUE(listeners.RemoveListener(&temporary));
+            temporary.isListed = false;
         }
     };
     std::vector<std::thread> threads;
     threads.emplace_back(dispatchAll);
     threads.emplace_back(dispatchAll);
-    threads.emplace_back(addAndRemove, std::ref(visitors[0]));
-    threads.emplace_back(addAndRemove, std::ref(visitors[1]));
+    threads.emplace_back(addAndRemove, std::ref(temporaries[0]));
+    threads.emplace_back(addAndRemove, std::ref(temporaries[1]));
     for (std::thread& thread : threads) {
         thread.join();
     }
@@ -84,7 +84,7 @@ TEST(ConcurrentDispatch, DeliversEveryEventOnceWhileListenersAreAddedAndRemoved)
     EXPECT_EQ(permanent.pauses, 2 * rounds);
     EXPECT_EQ(permanent.positions, 2 * rounds);
     EXPECT_EQ(permanent.overlaps, 0);
-    EXPECT_EQ(visitors[0].callsWhileAbsent + visitors[1].callsWhileAbsent, 0);
+    EXPECT_EQ(temporaries[0].callsWhileUnlisted + temporaries[1].callsWhileUnlisted, 0);
 }
 
 } // namespace

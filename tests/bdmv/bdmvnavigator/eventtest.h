@@ -115,10 +115,10 @@ inline void PrintTo(const Scenario& scenario, std::ostream* stream)
 }
 
 /** Creates an event of a class, with the values that it stores at construction. */
-template <typename Event, typename... Frozen>
-std::function<bdmv::INavigatorEvent*(bdmv::IPlaybackContext&)> New(Frozen... frozen)
+template <typename Event, typename... Stored>
+std::function<bdmv::INavigatorEvent*(bdmv::IPlaybackContext&)> New(Stored... stored)
 {
-    return [=](bdmv::IPlaybackContext& context) { return new Event(context, frozen...); };
+    return [=](bdmv::IPlaybackContext& context) { return new Event(context, stored...); };
 }
 
 /** An event without queries: a line and a callback without arguments. */

@@ -96,8 +96,7 @@ public:
         }
     }
 
-    /** Starts reading; the lines written to the pipe are available once both write ends are closed.
-     */
+    /** Starts reading; the lines written are available once both write ends are closed. */
     std::future<std::vector<std::string>> StartReading()
     {
         return std::async(std::launch::async,
