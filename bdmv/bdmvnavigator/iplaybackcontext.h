@@ -22,7 +22,7 @@ namespace bdmv
  * meanwhile keeps each query consistent; events do not expect consistency across queries. Queries
  * are assumed to succeed.
  *
- * An operation with output parameters writes all of them. An output that it does not write keeps
+ * An operation with output parameters should write all of them. An output that it leaves out keeps
  * its earlier value: the event's preset (0, false, empty, or no information, unless the operation
  * says otherwise) or, in the GetPgTextStInfo() call of PresentationGraphicsInfoEvent, the value
  * that rGetPgTextStInfo() wrote.
