@@ -144,7 +144,7 @@ public:
     virtual bool GetPipPgTextStSelect() = 0;
 
     /**
-     * The user-operation mask now in force.
+     * The user operation mask now in force.
      *
      * @param[in,out] mask preset to nothing forbidden
      */

@@ -17,7 +17,7 @@
 namespace deskplayer
 {
 
-/** A part of the clip with a continuous time line. Times are in ticks of 45 kHz. */
+/** A part of the clip with a continuous time line. Times are in 45 kHz ticks. */
 struct StcSequence {
     std::uint16_t pcrPid = 0; ///< PID of the clock reference
     std::uint32_t firstPacket = 0;

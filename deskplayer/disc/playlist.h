@@ -2,7 +2,7 @@
  * @file
  * PLAYLIST/nnnnn.mpls: the sequence of play items, each a part of a clip, and their streams.
  *
- * Times are in ticks of 45 kHz. IN, OUT and mark times are positions on the time line of the clip;
+ * Times are in 45 kHz ticks. IN, OUT and mark times are positions on the time line of the clip;
  * disc/timeline.h maps them to the time line of the play list.
  */
 #ifndef DESKPLAYER_DISC_PLAYLIST_H

@@ -44,7 +44,7 @@ constexpr std::uint64_t GreatestNumber = 65535;
  *
  *     "chapter next"    "chapter NUMBER"    "seek TIME"
  *
- * NUMBER is a decimal number from 0 to 65535, TIME a time as above, given in ticks of 45 kHz. The
+ * NUMBER is a decimal number from 0 to 65535, TIME a time as above, given in 45 kHz ticks. The
  * first word is neither "at" nor "after".
  *
  * Patterns may share their first words, and one may be a prefix of another. If several match a

@@ -16,8 +16,8 @@ namespace deskplayer
 constexpr std::uint32_t TicksPerSecond = 45000;
 
 /**
- * A duration, or a position as its distance from the start of a play list or session, in ticks of
- * 45 kHz. Whole seconds and milliseconds convert implicitly.
+ * A duration, or a position as its distance from the start of a play list or session, in
+ * 45 kHz ticks. Whole seconds and milliseconds convert implicitly.
  */
 using Ticks = std::chrono::duration<std::uint64_t, std::ratio<1, TicksPerSecond>>;
 

@@ -70,7 +70,7 @@ def attempt(change, build, scratch):
         begin = time.monotonic()
         result = run(test, scratch)
         if result != "passed":
-            return {"result": "detected" if result == "failed" else result, "by": test["name"]}
+            return {"result": "noticed" if result == "failed" else result, "by": test["name"]}
         seconds[test["name"]] = time.monotonic() - begin
     return {"result": "survived", "seconds": seconds}
 

@@ -1,5 +1,5 @@
 #!/usr/bin/env python3
-"""Breaks the code one change at a time and reports what no test detects.
+"""Breaks the code one change at a time and reports what no test notices.
 
     scripts/mutate                   every change of the events, a sample of everything else
     scripts/mutate AREA...           only these areas: {areas}
@@ -13,7 +13,7 @@ A change drops a statement or swaps it with the next one, inverts a condition, o
 a literal, an argument, an enumerator, a constant or the function that is called. The changed file is
 built, and the tests of its area that depend on it are run until one fails. A change that does not
 compile is not counted. One that fails no test survives: it is reported, and the exit status is 1, unless
-measure/mutation/explained.txt says why no test can detect it. A test that exceeds its time detects
+measure/mutation/explained.txt says why no test can notice it. A test that exceeds its time notices
 the change too, but is reported: broken code should fail its tests, not hang them.
 """
 
@@ -164,7 +164,7 @@ def choose(areas, options):
 
 
 def explained():
-    """The changes that no test can detect, as "FILE: what"."""
+    """The changes that no test can notice, as "FILE: what"."""
     return {line for line in EXPLAINED.read_text().splitlines() if line and line[0] != "#"}
 
 
@@ -200,10 +200,10 @@ def try_change(area, change, seconds):
 
 
 def report(counts):
-    detected = f"{counts['detected'] + counts['timed out']} changes detected"
+    noticed = f"{counts['noticed'] + counts['timed out']} changes noticed"
     if counts["timed out"]:
-        detected += f" ({counts['timed out']} by a test that timed out)"
-    return (f"{detected}, {counts['survived']} survived, {counts['explained']} undetectable, "
+        noticed += f" ({counts['timed out']} by a test that timed out)"
+    return (f"{noticed}, {counts['survived']} survived, {counts['explained']} cannot be noticed, "
             f"{counts['unbuildable']} did not compile")
 
 
@@ -241,7 +241,7 @@ def main():
             if outcome == "survived" and f"{change.file}: {change.what}" in known:
                 outcome = "explained"
             counts = totals.setdefault(area.name, dict.fromkeys(
-                ("unbuildable", "detected", "timed out", "survived", "explained"), 0))
+                ("unbuildable", "noticed", "timed out", "survived", "explained"), 0))
             counts[outcome] += 1
             if outcome in ("survived", "timed out"):
                 by = f" ({result['by']})" if "by" in result else ""

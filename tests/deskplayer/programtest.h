@@ -60,7 +60,7 @@ protected:
     /** Overwrites bytes of the play list. */
     void Patch(std::streamoff offset, const std::string& bytes) const;
 
-    /** Replaces the film with the trailer, shortened or extended to @p ticks of 45 kHz. */
+    /** Replaces the film with the trailer, shortened or extended to @p 45 kHz ticks. */
     void MakeShort(std::uint32_t ticks) const;
 
     /** Expects a message of one line, no output, and exit status 3. */
