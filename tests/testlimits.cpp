@@ -19,7 +19,7 @@ namespace
 /** CPU time of one test, with all its threads. The longest test takes less than a tenth of it. */
 constexpr int Seconds = BDMVNAVIGATOR_SECONDS_OF_A_TEST;
 
-/** In bytes. Many times what a test writes, but little for the disk. */
+/** In bytes. Many times what a test writes, but small for a disk. */
 constexpr rlim_t LargestFile = rlim_t{64} << 20;
 
 /** Signal handlers may not compose text, and a test may have redirected standard error. */

@@ -11,7 +11,7 @@
  * navigatorListeners.RemoveListener(&userInterface); // no callback runs after this
  * @endcode
  *
- * A client that wants a few callbacks derives from NavigatorListenerAdapter instead.
+ * A client that needs only a few callbacks derives from NavigatorListenerAdapter instead.
  */
 #ifndef BDMVNAVIGATOR_INAVIGATORLISTENER_H
 #define BDMVNAVIGATOR_INAVIGATORLISTENER_H

@@ -22,10 +22,10 @@ namespace bdmv
  * meanwhile keeps each query consistent; events do not expect consistency across queries. Queries
  * are assumed to succeed.
  *
- * An operation with output parameters writes all of them. An output that it does not write keeps
- * its earlier value: the event's preset (0, false, empty, or no information, unless the operation
- * says otherwise) or, in the GetPgTextStInfo() call of PresentationGraphicsInfoEvent, the value
- * that rGetPgTextStInfo() wrote.
+ * An operation with output parameters should write all of them. An output that it leaves unset
+ * keeps its earlier value: the event's preset (0, false, empty, or no information, unless the
+ * operation says otherwise) or, in the GetPgTextStInfo() call of PresentationGraphicsInfoEvent, the
+ * value that rGetPgTextStInfo() wrote.
  *
  * The order of the operations is part of the binary interface.
  */
@@ -144,7 +144,7 @@ public:
     virtual bool GetPipPgTextStSelect() = 0;
 
     /**
-     * The user-operation mask now in force.
+     * The user operation mask now in force.
      *
      * @param[in,out] mask preset to nothing forbidden
      */

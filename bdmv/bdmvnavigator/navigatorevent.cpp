@@ -77,8 +77,8 @@ struct AsyncFlags {
 /**
  * The trigger that listeners receive when a time of kind @p type was reached.
  *
- * A B point without an A-B repeat while a chapter or title repeats is a notification. A time of no
- * valid kind is attributed to the B point first, then to the chapter or title repeat, and last to
+ * Point B without an A-B repeat, while a chapter or title repeats, is a notification. A time of no
+ * valid kind is attributed to point B first, then to the chapter or title repeat, and last to
  * the trigger that is set.
  */
 bd::TriggerType CorrectByRepeatStates(IPlaybackContext& context, bd::TriggerType type)

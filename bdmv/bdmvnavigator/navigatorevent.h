@@ -11,15 +11,15 @@
  * event->Dispatch(listeners);
  * @endcode
  *
- * Dispatching an event does three things, in the order that the event states: it queries the
- * playback context, it writes a log line that begins with "Sending", and it fires a callback on
+ * Dispatching an event does three things, in most events in this order: it queries the playback
+ * context, it writes a log line that begins with "Sending", and it fires a callback on
  * every listener. The values are those at the time of dispatch; values fixed at construction are
  * constructor arguments.
  *
  * Lifetime. The context must outlive the event, which does not own it.
  *
- * Threads. An event starts no thread and has no lock. Between two callbacks of one event the list
- * is unlocked, so listeners may receive another thread's event there.
+ * Threads. An event starts no thread and has no lock. The list is unlocked between two callbacks
+ * of one event, so listeners may receive another thread's event in between.
  */
 #ifndef BDMVNAVIGATOR_NAVIGATOREVENT_H
 #define BDMVNAVIGATOR_NAVIGATOREVENT_H
@@ -226,7 +226,7 @@ public:
     void Dispatch(Listeners& listeners) override;
 };
 
-/** The primary audio stream is selected. */
+/** A primary audio stream is selected. */
 class AudioInfoEvent : public NavigatorEvent
 {
 public:
@@ -235,7 +235,7 @@ public:
     void Dispatch(Listeners& listeners) override;
 };
 
-/** The primary video stream is selected. */
+/** A primary video stream is selected. */
 class VideoInfoEvent : public NavigatorEvent
 {
 public:
@@ -244,7 +244,7 @@ public:
     void Dispatch(Listeners& listeners) override;
 };
 
-/** The interactive graphics stream is selected. */
+/** An interactive graphics stream is selected. */
 class InteractiveGraphicsInfoEvent : public NavigatorEvent
 {
 public:
@@ -254,7 +254,7 @@ public:
 };
 
 /**
- * The presentation graphics or text subtitle stream is selected. Neither logged nor sent when the
+ * A presentation graphics or text subtitle stream is selected. Neither logged nor sent when the
  * context does not allow the query.
  */
 class PresentationGraphicsInfoEvent : public NavigatorEvent
@@ -265,7 +265,7 @@ public:
     void Dispatch(Listeners& listeners) override;
 };
 
-/** The secondary audio stream is selected; then, whether it is output. */
+/** A secondary audio stream is selected. Reports the stream, then whether it is output. */
 class SecondaryAudioInfoEvent : public NavigatorEvent
 {
 public:
@@ -274,7 +274,7 @@ public:
     void Dispatch(Listeners& listeners) override;
 };
 
-/** The secondary video stream is selected; then, whether it is shown. */
+/** A secondary video stream is selected. Reports the stream, then whether it is shown. */
 class SecondaryVideoInfoEvent : public NavigatorEvent
 {
 public:
@@ -284,7 +284,7 @@ public:
 };
 
 /**
- * The subtitle stream of the picture-in-picture window is selected. It is available while subtitles
+ * A subtitle stream is selected for the picture-in-picture window. It is available while subtitles
  * are shown, the window offers more of them than the primary picture, and the selected one is among
  * them.
  */
@@ -296,7 +296,7 @@ public:
     void Dispatch(Listeners& listeners) override;
 };
 
-/** The angle is selected. */
+/** An angle is selected. */
 class AngleInfoEvent : public NavigatorEvent
 {
 public:
@@ -341,7 +341,7 @@ public:
     void Dispatch(Listeners& listeners) override;
 };
 
-/** The text subtitle user style is selected. */
+/** A text subtitle user style is selected. */
 class TextSubtitleStyleInfoEvent : public NavigatorEvent
 {
 public:
@@ -417,7 +417,7 @@ public:
 };
 
 /**
- * The system goes into standby: passes the resume data to the listeners, then makes the context
+ * The system goes into standby. Passes the resume data to the listeners, then makes the context
  * discard it.
  */
 class SystemSuspendedEvent : public NavigatorEvent

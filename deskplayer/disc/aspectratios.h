@@ -35,7 +35,7 @@ struct AspectRatio {
 class AspectRatios
 {
 public:
-    /** @param disc must outlive it */
+    /** @param disc must outlive this object */
     explicit AspectRatios(const Disc& disc) : m_rDisc(disc) {}
 
     /**

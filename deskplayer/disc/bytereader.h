@@ -59,18 +59,18 @@ public:
     /** Skips @p size bytes. */
     void Skip(std::size_t size, const char* field);
 
-    /** Reads a length of one byte and returns a reader of the bytes it counts. */
+    /** Reads a one-byte length and returns a reader of that many bytes. */
     ByteReader TakePart8(PartName name);
 
-    /** Reads a length of two bytes and returns a reader of the bytes it counts. */
+    /** Reads a two-byte length and returns a reader of that many bytes. */
     ByteReader TakePart16(PartName name);
 
-    /** Reads a length of four bytes and returns a reader of the bytes it counts. */
+    /** Reads a four-byte length and returns a reader of that many bytes. */
     ByteReader TakePart32(PartName name);
 
     /**
-     * Reads an address and returns a reader of the part there: a length of four bytes and the bytes
-     * it counts. This reader continues after the address.
+     * Reads an address. At the address, reads a four-byte length and returns a reader of that many
+     * bytes. This reader continues after the address.
      *
      * @param lowest the lowest valid address
      */
@@ -80,17 +80,17 @@ public:
     std::optional<ByteReader> OptionalPartAtAddress(std::size_t lowest, PartName name);
 
     /**
-     * Reads a number of entries from one byte. Checks that as many can follow, so it is safe to
-     * reserve memory for them.
+     * Reads a one-byte number of entries. Checks that the bytes left have room for them, so it is
+     * safe to reserve memory for them.
      *
      * @param smallestEntry minimum size of an entry, in bytes
      */
     std::uint8_t Count8(std::size_t smallestEntry, const char* field);
 
-    /** The same for a number of two bytes. */
+    /** The same for a two-byte number. */
     std::uint16_t Count16(std::size_t smallestEntry, const char* field);
 
-    /** From the start of the file. */
+    /** In bytes from the start of the file. */
     std::size_t Offset() const { return m_Offset; }
 
     std::size_t BytesLeft() const { return m_End - m_Offset; }

@@ -17,7 +17,7 @@
 namespace deskplayer
 {
 
-/** A part of the clip with a continuous time line. Times are in ticks of 45 kHz. */
+/** A part of the clip with a continuous time line. Times are in 45 kHz ticks. */
 struct StcSequence {
     std::uint16_t pcrPid = 0; ///< PID of the clock reference
     std::uint32_t firstPacket = 0;
@@ -27,7 +27,7 @@ struct StcSequence {
 
 struct AtcSequence {
     std::uint32_t firstPacket = 0;
-    std::uint8_t firstStcSequence = 0; ///< number within the clip of the first STC sequence
+    std::uint8_t firstStcSequence = 0; ///< number of its first STC sequence in the clip
     std::vector<StcSequence> stcSequences;
 };
 

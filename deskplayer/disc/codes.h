@@ -22,7 +22,7 @@ enum StreamKind {
     StreamKindTextSubtitle
 };
 
-/** The only coding type with more attributes than its kind. */
+/** The only coding type with attributes that others of its kind lack. */
 constexpr std::uint8_t CodingTypeH265 = 0x24;
 
 /** The kind of a stream with @p codingType; StreamKindUnknown for reserved ones. */

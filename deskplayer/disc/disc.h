@@ -27,12 +27,12 @@ namespace deskplayer
 {
 
 /**
- * Maximum size of a play list file, in bytes; real ones are a tenth of that. The values of a
- * malicious one take almost forty times the memory of its bytes.
+ * Maximum size of a play list file, in bytes; real ones are a tenth of that. The values read from a
+ * malicious one take almost forty times its size in memory.
  */
 constexpr std::uintmax_t LargestPlayListFile = std::uintmax_t{1024} * 1024;
 
-/** Maximum size of any other file, whose values expand less. */
+/** Maximum size in bytes of any other file, whose values take less memory. */
 constexpr std::uintmax_t LargestFile = std::uintmax_t{4} * 1024 * 1024;
 
 /** The longest play list of a disc, most likely the main movie. */
@@ -46,7 +46,7 @@ struct LongestPlayList {
  * Reads the files of one disc. Nothing is cached; only the path of the folder is stored.
  *
  * All operations throw FileError if a file is missing, is not a regular file, is larger than
- * LargestPlayListFile or LargestFile or cannot be read, and FormatError if its contents are
+ * LargestPlayListFile or LargestFile, or cannot be read, and FormatError if its contents are
  * malformed; both are DiscErrors. The copies in BDMV/BACKUP are not used, so that damage to a disc
  * is reported.
  */

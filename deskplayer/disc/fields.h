@@ -38,7 +38,7 @@ void ReadDynamicRange(ByteReader& reader, StreamAttributes& attributes);
  */
 void ReadAttributesOtherThanVideo(ByteReader& reader, StreamAttributes& attributes);
 
-/** Bit number @p bit of @p field, counted from the most significant one, which is bit 0. */
+/** Bit number @p bit of @p field; the most significant bit is number 0. */
 template <typename Field> constexpr bool Bit(Field field, unsigned bit)
 {
     return (field >> (8 * sizeof(Field) - 1 - bit) & 1) != 0;

@@ -41,7 +41,7 @@ struct Index {
  * Reads index.bdmv. Content provider data and extension data are skipped.
  *
  * @param fileName for messages
- * @throw FormatError wrong type or version, an address outside the file or in its header, a
+ * @throw FormatError wrong type or version, an address outside the file or in its header, or a
  *        structure that is longer than the enclosing one or shorter than its own content. Reserved
  *        codes and anything after the known content of a structure are not errors.
  */

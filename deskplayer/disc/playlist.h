@@ -2,7 +2,7 @@
  * @file
  * PLAYLIST/nnnnn.mpls: the sequence of play items, each a part of a clip, and their streams.
  *
- * Times are in ticks of 45 kHz. IN, OUT and mark times are positions on the time line of the clip;
+ * Times are in 45 kHz ticks. IN, OUT and mark times are positions on the time line of the clip;
  * disc/timeline.h maps them to the time line of the play list.
  */
 #ifndef DESKPLAYER_DISC_PLAYLIST_H
@@ -43,8 +43,8 @@ struct ClipReference {
 
 constexpr std::uint8_t EntryTypePlayItem = 1;         ///< in the clip of the play item
 constexpr std::uint8_t EntryTypeSubPath = 2;          ///< in another clip, named by a sub path
-constexpr std::uint8_t EntryTypePlayItemSubPath3 = 3; ///< in the clip of the play item, but part
-constexpr std::uint8_t EntryTypePlayItemSubPath4 = 4; ///< of a sub path
+constexpr std::uint8_t EntryTypePlayItemSubPath3 = 3; ///< in the play item's clip, for a sub path
+constexpr std::uint8_t EntryTypePlayItemSubPath4 = 4; ///< the same
 
 /** A stream of a play item: its source, its attributes, and the streams it can be combined with. */
 struct Stream {
@@ -126,8 +126,8 @@ struct Mark {
 
 /** A block of the extension data. Its bytes are not read, so it may lie outside the file. */
 struct ExtensionBlock {
-    std::uint16_t kind = 0;    ///< first half
-    std::uint16_t subKind = 0; ///< second half
+    std::uint16_t kind = 0;    ///< first half of the block kind
+    std::uint16_t subKind = 0; ///< second half of the block kind
     std::uint32_t offset = 0;  ///< from the start of the extension data
     std::uint32_t size = 0;
 };

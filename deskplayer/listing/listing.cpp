@@ -137,7 +137,7 @@ void AddStreams(Lines& lines, const std::string& label, const std::vector<Stream
     }
 }
 
-/** Adds the languages of streams, which can be many: as many as fit on each line. */
+/** Adds the languages of streams, as many as fit on each line. */
 void AddLanguages(Lines& lines, const std::string& label, const std::vector<Stream>& streams)
 {
     std::string line = label;

@@ -21,10 +21,11 @@ namespace deskplayer
 /**
  * A queue of events, and the thread that dispatches and deletes them in order.
  *
- * Call Post() and Settle() from the navigator's thread. Between the two the delivering thread reads
- * the playback context, so the navigator must not change it. Earlier writes of the navigator are
- * visible to the listeners, and writes of the listeners are visible to the navigator afterwards.
- * This makes a session exactly repeatable although events report values at dispatch.
+ * Call Post() and Settle() from the navigator's thread. From Post() until Settle() returns, the
+ * delivering thread reads the playback context, so the navigator must not change it. Earlier writes
+ * of the navigator are visible to the listeners, and writes of the listeners are visible to the
+ * navigator afterwards. This makes a session exactly repeatable although events report values at
+ * dispatch.
  */
 class EventDelivery
 {
@@ -60,7 +61,7 @@ private:
     std::mutex m_Mutex; ///< guards the members below
     std::condition_variable m_Changed;
     std::deque<std::unique_ptr<bdmv::INavigatorEvent>> m_Queue;
-    std::uint64_t m_Undelivered = 0; ///< queued, and the one being dispatched
+    std::uint64_t m_Undelivered = 0; ///< events queued or being dispatched
     std::exception_ptr m_Failure;    ///< the first since the last Settle()
     bool m_Ending = false;
     std::thread m_Thread; ///< last, so that it starts after everything it uses is constructed

@@ -13,7 +13,7 @@
 namespace deskplayer
 {
 
-/** Makes events over a playback context. Belongs to the navigator's thread. */
+/** Creates events that query one playback context. Use it on the navigator's thread. */
 class EventSender
 {
 public:

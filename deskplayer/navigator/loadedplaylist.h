@@ -19,7 +19,7 @@
 namespace deskplayer
 {
 
-/** The longest play list that is played. No disc has one as long. */
+/** Maximum duration of a play list that is played; no real disc reaches it. */
 constexpr Ticks LongestDuration = std::chrono::hours(100);
 
 /** A play list, its time line, and the aspect ratios from its clips. */
@@ -34,7 +34,7 @@ struct LoadedPlayList {
     /** The chapters in order of their start; at the same position, in order of play item. */
     std::vector<Chapter> chaptersByStart;
 
-    /** The code of the first primary video stream of every play item. */
+    /** The aspect ratio code of the first primary video stream of every play item. */
     std::vector<std::optional<std::uint8_t>> aspectRatios;
 };
 

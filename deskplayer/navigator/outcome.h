@@ -24,7 +24,7 @@ public:
     /**
      * Refused because no stream, chapter or button has this number.
      *
-     * @param what  what is numbered, from 1, in the singular: "button"
+     * @param what  the noun for what is numbered, in the singular: "button"
      * @param count the highest number; 0 if there are none
      */
     static Outcome NoSuch(const std::string& what, std::uint64_t number, std::uint64_t count)

@@ -1,6 +1,6 @@
 /**
  * @file
- * The playback context over a play list of a disc.
+ * The playback context of a play list on a disc.
  */
 #ifndef DESKPLAYER_NAVIGATOR_PLAYBACKCONTEXT_H
 #define DESKPLAYER_NAVIGATOR_PLAYBACKCONTEXT_H
@@ -20,7 +20,7 @@ namespace deskplayer
 /**
  * Answers every query from the play list and the state of playback.
  *
- * Positions are in ticks of 45 kHz on the time line of the play list. Play items and marks are
+ * Positions are in 45 kHz ticks on the time line of the play list. Play items and marks are
  * numbered as in the play list, from 0, and chapters from 1.
  *
  * The navigator's thread changes the state only while no event is queued or being dispatched; the

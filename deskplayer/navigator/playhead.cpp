@@ -150,7 +150,7 @@ Ticks Playhead::NextStopBackward() const
             stop = std::max(stop, *candidate);
         }
     };
-    // An item or a chapter is left with the last position before its start.
+    // Backward playback leaves an item or a chapter at the last position before its start.
     const auto considerLeaving = [&consider](Ticks start) {
         if (start > Ticks(0)) {
             consider(start - Ticks(1));

@@ -71,7 +71,7 @@ public:
     /** Whether a repeat lies ahead, so that playback never reaches its end. */
     bool IsRepeating() const;
 
-    /** The distance to the next stop in the direction of play: a position with something to do. */
+    /** The distance in the direction of play to the next stop, a position where events are due. */
     Ticks DistanceToNextStop() const;
 
     /** The session time until the next stop at the current speed. */
@@ -80,8 +80,8 @@ public:
     // Movement.
 
     /**
-     * Moves as far as playback gets in this session time, at most to the next stop. A remainder of
-     * less than one tick of the play list is carried over to the next call.
+     * Moves as far as playback advances in this session time, at most to the next stop. A remainder
+     * of less than one tick of the play list is carried over to the next call.
      *
      * @return the distance
      */

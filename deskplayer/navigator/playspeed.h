@@ -12,7 +12,7 @@
 namespace deskplayer
 {
 
-/** Ticks of the play list that are played while ticks of the session pass. */
+/** Playback advances by `played` ticks of the play list in `passed` ticks of the session. */
 struct SpeedRatio {
     std::uint64_t played;
     std::uint64_t passed;

@@ -33,7 +33,7 @@ public:
 
     bool IsOpen() const { return m_Open; }
 
-    /** Opens the menu and selects the button of the current chapter, or 1 before the first. */
+    /** Opens the menu and selects the button of the current chapter; button 1 before the first. */
     void Open();
 
     /** Closes the menu if it is open. */
@@ -46,7 +46,7 @@ public:
     void Select(bd::ButtonId button) { m_SelectedButton = button; }
 
     /**
-     * Hands the program of the selected button to the listeners and closes the menu.
+     * Passes the program of the selected button to the listeners and closes the menu.
      *
      * @return the chapter that the program plays from its start
      */

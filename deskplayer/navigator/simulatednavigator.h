@@ -30,8 +30,8 @@ namespace deskplayer
  * User operations return an Outcome. One that the current mask forbids, or that is not possible at
  * that moment, is refused: it sends no event and changes nothing.
  *
- * Every event has been delivered, with the values at that moment, when an operation returns. Call
- * all operations from one thread. They rethrow exceptions of listeners.
+ * Every event is delivered with the values of the moment when it is sent, before the operation
+ * returns. Call all operations from one thread. They rethrow exceptions of listeners.
  *
  * Positions are on the time line of the play list. Play items are played in sequence, whatever the
  * playback type of the play list.

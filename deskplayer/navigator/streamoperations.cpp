@@ -187,7 +187,7 @@ Outcome SimulatedNavigator::SelectAndActivateButton(std::uint64_t number)
     });
 }
 
-/** Hands the button's program to the listeners, then carries it out. */
+/** Passes the button's program to the listeners, then carries it out. */
 void SimulatedNavigator::ActivateSelectedButton()
 {
     m_Transport.JumpTo(m_Menu.ExecuteSelectedButton().start);

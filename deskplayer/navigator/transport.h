@@ -70,8 +70,8 @@ public:
     void ChangePlayMode(bd::PlayMode mode);
 
     /**
-     * Moves by one picture and announces the marks and positions passed. A repeat ends the step at
-     * its start.
+     * Moves by one picture and announces the marks and positions passed. A step that reaches the
+     * end of a repeat ends at the start of the repeat.
      */
     void Step();
 

@@ -13,7 +13,7 @@ namespace deskplayer
 {
 
 /**
- * An object with a member for every argument, in order. Positions are in ticks of 45 kHz, or null;
+ * An object with a member for every argument, in order. Positions are in 45 kHz ticks, or null;
  * rectangles are objects.
  */
 nlohmann::ordered_json ArgumentsJson(const Callback& callback);

@@ -16,7 +16,7 @@
 namespace deskplayer
 {
 
-/** A position on the time line of the play list, in ticks of 45 kHz; or bd::TimePositionNone. */
+/** A position on the time line of the play list, in 45 kHz ticks; or bd::TimePositionNone. */
 struct Position {
     bd::TimePosition ticks;
 };

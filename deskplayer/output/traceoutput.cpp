@@ -66,7 +66,7 @@ ordered_json Metadata(const char* name, std::size_t thread, const char* member, 
             {"args", {{member, value}}}};
 }
 
-/** Whole microseconds, which are precise enough to distinguish ticks of 45 kHz. */
+/** Whole microseconds, which are precise enough to distinguish 45 kHz ticks. */
 std::uint64_t Microseconds(Ticks time)
 {
     return (time.count() * 200 + 4) / 9;
@@ -242,7 +242,7 @@ void TraceOutput::EndPlayback()
     }
 }
 
-/** Gives both ends the same members, because some viewers match them by name and arguments. */
+/** Gives begin and end the same members, because some viewers match them by name and arguments. */
 void TraceOutput::AppendSlice(Track track, const char* phase, const Slice& slice)
 {
     AppendEvent(track, phase, {{"name", slice.name}, {"args", ArgumentsJson(slice.callback)}});

@@ -19,15 +19,15 @@ namespace deskplayer
 {
 
 /**
- * Writes a trace in the JSON array form of the trace-event format: lasting states as slices, one
- * track each, and every callback that passes the filter as an instant on the track of its
- * interface.
+ * Writes a trace in the JSON array form of the trace-event format: states as slices, with a track
+ * for each kind of state, and every callback that passes the filter as an instant on the track of
+ * its interface.
  *
  * The filter does not apply to slices: a state whose end is hidden would seem to last.
  *
  * A slice lasts from the callback that begins it until the next one on its track; those of playback
- * itself end with playback. Open slices end when the output is destroyed, which completes the
- * trace. Memory does not grow with the length of the session.
+ * itself also end when playback ends. Open slices end when the output is destroyed, which completes
+ * the trace. Memory does not grow with the length of the session.
  */
 class TraceOutput : public Output
 {
@@ -48,7 +48,7 @@ private:
 
     struct TrackState {
         std::string name;
-        bool named = false;         ///< whether the trace names it: only before its first event
+        bool named = false;         ///< whether the trace has named it
         std::optional<Slice> slice; ///< the open one
     };
 

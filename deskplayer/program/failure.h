@@ -1,6 +1,6 @@
 /**
  * @file
- * How the program reports what it could not do.
+ * Exit statuses, errors and messages of the program.
  */
 #ifndef DESKPLAYER_PROGRAM_FAILURE_H
 #define DESKPLAYER_PROGRAM_FAILURE_H

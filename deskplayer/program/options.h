@@ -14,7 +14,7 @@
 namespace deskplayer
 {
 
-/** What the command line asks for. */
+/** The values given on the command line. */
 struct Options {
     std::string disc;
     std::optional<std::uint32_t> playList;

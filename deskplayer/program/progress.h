@@ -23,7 +23,7 @@ namespace deskplayer
 class Progress
 {
 public:
-    /** @param options whether output goes to the same terminal, which rules out showing progress */
+    /** @param options if they send output to the same terminal, progress is not shown */
     Progress(const VirtualClock& clock, const Options& options)
         : m_rClock(clock), m_Possible(isatty(STDERR_FILENO) != 0 &&
                                       (isatty(STDOUT_FILENO) == 0 || !options.output.empty()))

@@ -30,7 +30,7 @@ public:
     File(const File&) = delete;
     File& operator=(const File&) = delete;
 
-    /** Waits for input, the end or an error. @return false if a silent pipe made it time out */
+    /** Waits for input, the end or an error. @return false if it timed out */
     bool WaitForInput() const
     {
         constexpr int timeout = 500; // milliseconds

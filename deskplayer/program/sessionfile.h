@@ -16,8 +16,8 @@ namespace deskplayer
 /**
  * The steps of a session file.
  *
- * @throw UsageError the file cannot be read, is too long, or is a pipe that stays silent
- * @throw ScriptError it is not a session
+ * @throw UsageError the file cannot be read, is too long, or is a pipe without input
+ * @throw ScriptError the session is malformed
  */
 std::vector<ScriptStep> ReadSessionFile(const std::string& fileName);
 

@@ -13,7 +13,7 @@
  *
  * Times are hours, minutes, seconds and a fraction, of which all but the seconds may be omitted
  * ("1:02:03.5", "02:03", "3.25"), or numbers with a unit ("2s", "500ms", "1.5m", "1h"). They have
- * up to three decimals and are whole milliseconds.
+ * up to three decimals and must be whole milliseconds.
  */
 #ifndef DESKPLAYER_SESSION_SCRIPT_H
 #define DESKPLAYER_SESSION_SCRIPT_H
@@ -44,7 +44,7 @@ constexpr std::uint64_t GreatestNumber = 65535;
  *
  *     "chapter next"    "chapter NUMBER"    "seek TIME"
  *
- * NUMBER is a decimal number from 0 to 65535, TIME a time as above, given in ticks of 45 kHz. The
+ * NUMBER is a decimal number from 0 to 65535, TIME a time as above, given in 45 kHz ticks. The
  * first word is neither "at" nor "after".
  *
  * Patterns may share their first words, and one may be a prefix of another. If several match a
@@ -91,7 +91,7 @@ public:
  * @param text     the whole script
  * @param fileName for messages
  * @param syntaxes all commands; their patterns are used only during the call
- * @throw ScriptError for the first malformed line, with everything that is valid there
+ * @throw ScriptError for the first malformed line; the message lists what is valid there
  */
 std::vector<ScriptStep> ParseScript(std::string_view text, const std::string& fileName,
                                     const std::vector<CommandSyntax>& syntaxes);

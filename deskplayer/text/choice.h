@@ -14,10 +14,10 @@ namespace deskplayer
 {
 
 /**
- * Finds a word that a user wrote among the choices.
+ * Finds the choice that equals a user's word.
  *
  * @param word    must equal one of @p choices exactly
- * @param kind    what a choice is, with its article, for the message: "an output format"
+ * @param kind    the noun for a choice, with its article, for the message: "an output format"
  * @param choices at least two
  * @return index into @p choices
  * @throw std::invalid_argument "'xml' is not an output format; expected text, json or trace"

@@ -21,7 +21,7 @@ struct CodeName {
 /**
  * The entry of a table whose member `code` equals @p code; null if there is none.
  *
- * @param table an array, which the returned pointer refers to
+ * @param table an array; the returned pointer points into it
  */
 template <typename Table, typename Code> auto FindCode(const Table& table, const Code& code)
 {

@@ -12,12 +12,12 @@
 namespace deskplayer
 {
 
-/** Frequency of the clock in which the files of a disc give times, in hertz. */
+/** Ticks per second of the times on a disc. */
 constexpr std::uint32_t TicksPerSecond = 45000;
 
 /**
- * A duration, or a position as its distance from the start of a play list or session, in ticks of
- * 45 kHz. Whole seconds and milliseconds convert implicitly.
+ * A duration, or a position as its distance from the start of a play list or session, in
+ * 45 kHz ticks. Whole seconds and milliseconds convert implicitly.
  */
 using Ticks = std::chrono::duration<std::uint64_t, std::ratio<1, TicksPerSecond>>;
 

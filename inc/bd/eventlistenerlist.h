@@ -18,8 +18,8 @@
  * Re-entrancy. The lock is not recursive. A callback that adds, removes, looks up or fires on the
  * list that is calling it gets std::system_error with
  * std::errc::resource_deadlock_would_occur; the list and its lock stay valid. Post such work to the
- * thread that delivers events and do it there after the delivery. To silence a listener at
- * once, make it ignore further callbacks until it has been removed.
+ * thread that delivers events and do it there after the delivery. To silence a listener at once,
+ * make it ignore further callbacks until it has been removed.
  *
  * Threads. Every operation may be called from any thread. Callbacks run on the thread that fires,
  * one after another, front to back. A thread that fires or registers meanwhile waits for the whole
@@ -222,8 +222,8 @@ private:
 
 /**
  * The type of a firing function's value argument. It follows from the method's parameter, not from
- * the argument passed: for a reference parameter it is that reference, for a value a const
- * reference, so the value is not copied before it reaches the invoker.
+ * the argument passed: for a reference parameter it is that reference, for a value parameter
+ * a const reference, so that the value is not copied before it reaches the invoker.
  */
 template <typename P> struct FiredValue {
     typedef const P& Type;

@@ -1,6 +1,6 @@
 /**
  * @file
- * Diagnostic log lines: who writes them, at which level, and the writer itself.
+ * Diagnostic log lines: the components that write them, their levels, and the writer.
  *
  * @code
  * constexpr bd::LogTag Diagnostic = {bd::CompIdBdmvNavigator, KEVRO_Log_LevelWarning, 0};

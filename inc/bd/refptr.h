@@ -77,7 +77,7 @@ public:
      * Releases the current object, then shares that of @p other. Changes nothing when both share
      * the same object already. @p other may lie within the released object.
      */
-    // NOLINTNEXTLINE(bugprone-unhandled-self-assignment): equal counters cover it
+    // NOLINTNEXTLINE(bugprone-unhandled-self-assignment): comparing counters handles it
     RefPtr& operator=(const RefPtr& other)
     {
         if (m_Counter != other.m_Counter) {

@@ -233,7 +233,7 @@ enum AudioChannelType : KEVRO_Int32 {
 };
 
 /**
- * User operations, numbered as the bit positions of the disc's 64-bit user-operation mask, counted
+ * User operations, numbered as the bit positions of the disc's 64-bit user operation mask, counted
  * from its most significant bit. Numbers not listed are not assigned.
  */
 enum UserOperationMaskDef : KEVRO_Int32 {

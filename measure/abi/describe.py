@@ -1,9 +1,9 @@
 #!/usr/bin/env python3
-"""Prints the binary interface of the library, one fact a line, for scripts/abi.
+"""Prints the binary interface of the library, one fact per line, for scripts/abi.
 
     describe.py NM OBJECT CLASSES ARCHIVE
 
-OBJECT holds the debug information of all public types, CLASSES is the compiler's list of classes
+OBJECT contains the debug information of all public types, CLASSES is the compiler's list of classes
 with their alignment, ARCHIVE is the library and NM the tool that lists its symbols. Every line
 begins with its subject, and the output does not depend on the position of declarations.
 """

@@ -17,7 +17,7 @@ namespace bench
 {
 
 /**
- * Registers three callbacks to each number of listeners.
+ * Registers the delivery of three callbacks to each number of listeners.
  *
  * The subjects are created here, before any benchmark runs, while the heap is not fragmented, so
  * that their allocations are contiguous.

@@ -1,4 +1,4 @@
-// One log line: the longest of the three measured events, and the alternatives of a user.
+// One log line, the longest of the three measured events', and what a user might choose instead.
 
 #include <chrono>
 #include <cstdarg>

@@ -13,8 +13,8 @@ namespace bench
 {
 
 /**
- * A thread that does nothing. In a process that never had a second thread a lock costs several
- * times less, but every player has several threads.
+ * A thread that does nothing. In a process that has never had a second thread, locking takes about
+ * a third of the time, but every player has several threads.
  */
 class ParkedThread
 {

@@ -35,8 +35,7 @@ public:
 
     Row operator[](const std::string& name) const;
 
-    /** The largest value that a counter had in any repetition; not a number if it was not counted.
-     */
+    /** The largest value that a counter had in any repetition; NaN if it was not counted. */
     double Largest(const std::string& name, const std::string& counter) const;
 
 private:

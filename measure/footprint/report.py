@@ -3,7 +3,7 @@
 
     report.py BUILD
 
-BUILD is a build directory. After printing, fails if an event exceeds the limit.
+BUILD is a build directory. After printing, fails if the average event exceeds the limit.
 """
 
 import pathlib
@@ -136,7 +136,7 @@ def main():
     print_objects(directory)
     print_events(full, quiet)
     if full.beyond_strings > LIMIT * count:
-        sys.exit(f"an event has more than {LIMIT} bytes of text without strings and type names")
+        sys.exit(f"an average event has more than {LIMIT} bytes of text without strings and type names")
 
 
 main()

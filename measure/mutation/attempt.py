@@ -1,5 +1,5 @@
 #!/usr/bin/env python3
-"""Tries one change and prints what became of it; mutate.py runs it in namespaces of its own.
+"""Tries one change and prints the outcome; mutate.py runs it in separate namespaces.
 
     attempt.py ROOT BUILD SCRATCH <CHANGE
 
@@ -17,12 +17,12 @@ import sys
 import time
 
 FILE_BYTES = 16 << 20  # of each file that a test writes
-SCRATCH_BYTES = 1 << 30  # of all files, with what the build makes
+SCRATCH_BYTES = 1 << 30  # of all files, build results included
 MEMORY_BYTES = 4 << 30  # of address space
 
 
 def mount_overlay(root, scratch):
-    """What is written below ROOT from now on goes to memory."""
+    """Redirects all later writes below ROOT to memory."""
     subprocess.run(["mount", "-t", "tmpfs", "-o", f"size={SCRATCH_BYTES}", "tmpfs", scratch],
                    check=True)
     for name in ("upper", "work", "temporary"):
@@ -58,7 +58,7 @@ def run(test, scratch):
 
 
 def attempt(change, build, scratch):
-    """Returns what became of the change, and of which test."""
+    """Returns the outcome of the change and, if a test failed or timed out, its name."""
     if change["file"]:
         pathlib.Path(change["file"]).write_text(change["text"])
     if change["file"].endswith(".cpp") and not builds(build, [change["file"] + "^"]):

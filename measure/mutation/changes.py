@@ -1,6 +1,6 @@
-"""Finds the changes that may be made to a C++ file, in the tree that libclang makes of it.
+"""Finds the changes that may be made to a C++ file, in libclang's syntax tree of it.
 
-A statement is dropped, or trades places with the next one; a condition is inverted; an operator, a
+A statement is dropped, or swapped with the next one; a condition is inverted; an operator, a
 literal, an argument, an enumerator or a constant is replaced; another function of the same signature
 is called.
 """
@@ -51,7 +51,7 @@ class Change:
 
 
 def file_offset(location):
-    """Where a location is in the file: for an argument of a macro, where it is written."""
+    """The offset of a location in the file: for an argument of a macro, where it is written."""
     function = cindex.conf.lib.clang_getFileLocation
     function.argtypes = [cindex.SourceLocation, ctypes.POINTER(ctypes.c_void_p),
                          *3 * [ctypes.POINTER(ctypes.c_uint)]]
@@ -122,7 +122,7 @@ class Finder:
         return self.source[begin:end].decode()
 
     def range_of(self, cursor):
-        """The bytes of a cursor; None for one that a macro makes."""
+        """The bytes of a cursor; None for one in a macro's expansion."""
         begin, end = file_offset(cursor.extent.start), file_offset(cursor.extent.end)
         return (begin, end) if begin < end and begin not in self.macros else None
 
@@ -133,7 +133,7 @@ class Finder:
     # Declarations
 
     def collect_constants(self, cursor):
-        """Constants of one structure at namespace scope, by its name: each may stand for another."""
+        """Constants of one structure at namespace scope, by its name: each may replace another."""
         if cursor.kind == CursorKind.NAMESPACE:
             for child in cursor.get_children():
                 self.collect_constants(child)
@@ -188,7 +188,7 @@ class Finder:
                 self.visit(child)
 
     def is_block(self, statement):
-        """Whether a statement has others within. What a macro makes of it does not count."""
+        """Whether a statement contains others, apart from those in a macro's expansion."""
         return statement.kind in BLOCKS and statement.extent.start.offset not in self.macros
 
     def statement_range(self, statement):
@@ -261,12 +261,12 @@ class Finder:
                 continue
             kind = argument.type.get_canonical().kind
             if kind in (TypeKind.MEMBERPOINTER, TypeKind.FUNCTIONPROTO):
-                continue  # another function takes its place instead
+                continue  # replaced by another function instead
             if kind == TypeKind.RECORD and \
                     cursor.type.get_canonical() == argument.type.get_canonical():
                 continue  # a copy
             if argument.type.spelling == "std::memory_order":
-                continue  # a test sees no other order on most processors
+                continue  # most processors do not reorder in a way that a test can detect
             place = self.range_of(argument)
             if place and not self.is_literal(*place):
                 text = self.text(*place)

@@ -36,13 +36,13 @@ HERE = pathlib.Path(__file__).resolve().parent
 ROOT = HERE.parent.parent
 BUILD = ROOT / "build/mutation"
 EXPLAINED = HERE / "explained.txt"
-LEAST_SECONDS = 20  # that a test may take, however quick it is without a change
-SLOWER = 10  # times as long as without a change
+LEAST_SECONDS = 20  # minimum time limit of a test
+SLOWER = 10  # time limit of a test, as a multiple of its time without a change
 
 
 @dataclasses.dataclass(frozen=True)
 class Area:
-    """Sources, the folders with the tests whose subject they are, and how many changes to try."""
+    """Sources, the folders of their tests, and how many changes to try."""
     name: str
     sources: tuple
     tests: tuple
@@ -63,7 +63,7 @@ def output_of(*command):
     return subprocess.run(command, check=True, capture_output=True, text=True).stdout
 
 
-# What depends on what: read from the build
+# Dependencies, read from the build
 
 def ninja(*arguments):
     return output_of("ninja", "-C", str(BUILD), *arguments).splitlines()
@@ -71,7 +71,7 @@ def ninja(*arguments):
 
 @functools.lru_cache(None)
 def inputs_of(targets):
-    """Everything that the targets are made of: sources and what is made of them."""
+    """All inputs of the targets: sources and intermediate files."""
     return {os.path.normpath(BUILD / line) for line in ninja("-t", "inputs", *targets)}
 
 
@@ -122,7 +122,7 @@ def compile_commands():
 
 
 def options_of(area, file):
-    """What libclang has to know; a header is read with the options of all sources of its area."""
+    """The options for libclang; a header is read with those of all sources of its area."""
     sources = [str(ROOT / file)] if file.endswith(".cpp") else \
         sorted(str(path) for pattern in area.sources for path in ROOT.glob(pattern))
     kept = {}
@@ -164,14 +164,14 @@ def choose(areas, options):
 
 
 def explained():
-    """The changes that nothing can notice, as "FILE: what"."""
+    """The changes that no test can notice, as "FILE: what"."""
     return {line for line in EXPLAINED.read_text().splitlines() if line and line[0] != "#"}
 
 
-# Trying them
+# Attempts
 
 def attempt(file, text, tests):
-    """Runs attempt.py where neither the sources nor other attempts see what it does."""
+    """Runs attempt.py isolated from the sources and from other attempts."""
     with tempfile.TemporaryDirectory() as scratch:
         command = ["unshare", "--mount", "--pid", "--fork", "--kill-child", "--mount-proc"]
         if os.geteuid() != 0:
@@ -186,7 +186,7 @@ def attempt(file, text, tests):
 
 
 def seconds_without_change(area):
-    """How long each test of an area takes. All have to pass."""
+    """How long each test of an area takes. All must pass."""
     result = attempt("", "", [dict(test, seconds=600) for test in tests_of(area)])
     if result["result"] != "survived":
         sys.exit(f"mutate: {result.get('by', area.name)} fails without a change")
@@ -221,7 +221,7 @@ def main():
     options = parser.parse_args()
     for name in options.areas:
         if name not in names:
-            parser.error(f"no area '{name}'; there are {', '.join(names)}")
+            parser.error(f"unknown area '{name}'; expected {', '.join(names)}")
     areas = [area for area in AREAS if not options.areas or area.name in options.areas]
 
     chosen = choose(areas, options)

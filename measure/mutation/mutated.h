@@ -27,7 +27,7 @@ constexpr const char* Mutated(const char*)
     return "MUTATED";
 }
 
-/** Null, which notices at once whoever uses it; another address for what is null. */
+/** Null, so that any use crashes at once; for a null pointer, another address. */
 template <typename T> T* Mutated(T* pointer)
 {
     return pointer == nullptr ? reinterpret_cast<T*>(alignof(void*)) : nullptr;

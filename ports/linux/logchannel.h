@@ -53,7 +53,7 @@ private:
     std::mutex m_Mutex;         ///< never held while a line is written
     std::unique_ptr<Output> m_Current;
     std::unique_ptr<Output> m_Previous; ///< null, or the output that an exchange is draining
-    KEVRO_UInt64 m_LostBefore = 0;      ///< by earlier outputs
+    KEVRO_UInt64 m_LostBefore = 0;      ///< lines lost by earlier outputs
     std::atomic<bool> m_Finishing{false};
 };
 

@@ -23,9 +23,9 @@ namespace kevro
 /**
  * Takes lines and passes them to a destination, directly or through spdlog's bounded queue.
  *
- * Between the queue and the destination it is itself a spdlog sink: there it composes the line, so
- * that a writer only copies its text, counts the lines, keeps exceptions from spdlog, and writes a
- * line that reports lost ones.
+ * It is itself the spdlog sink between the queue and the destination. There it counts lines, keeps
+ * exceptions from spdlog, and reports lost lines. It also composes lines there, so that a writer
+ * only copies the text.
  *
  * Shares its owner's mutex, so choosing an output and writing to it take one lock. All operations
  * may be called from several threads at once.
@@ -43,7 +43,7 @@ public:
     Output(std::mutex& mutex, std::unique_ptr<spdlog::sinks::sink> destination,
            std::size_t queueLines);
 
-    /** Drain() first. No thread may write any more, and the mutex must be free. */
+    /** Call Drain() first. No thread may write any more, and the mutex must be free. */
     ~Output() override = default;
 
     Output(const Output&) = delete;
@@ -76,12 +76,12 @@ private:
 
     const std::unique_ptr<spdlog::sinks::sink> m_Destination;
     std::mutex m_WriteMutex;         ///< held while the destination writes a line
-    KEVRO_UInt64 m_ReportedLost = 0; ///< under m_WriteMutex
+    KEVRO_UInt64 m_ReportedLost = 0; ///< guarded by m_WriteMutex
 
     std::mutex& m_rMutex; ///< never held while a line is written
     std::condition_variable m_Progress;
     KEVRO_UInt64 m_Accepted = 0; ///< lines queued, being written or done
-    KEVRO_UInt64 m_Done = 0;     ///< lines written or lost; with a queue the last one's number
+    KEVRO_UInt64 m_Done = 0;     ///< lines written or lost; with a queue, the number of the last
     KEVRO_UInt64 m_Refused = 0;  ///< lines lost, but not by the queue
 
     std::shared_ptr<spdlog::async_logger>

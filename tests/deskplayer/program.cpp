@@ -106,8 +106,8 @@ ProgramResult RunDeskPlayerOnTerminal(const std::vector<std::string>& arguments)
     return ResultOf(status, output, "");
 }
 
-ProgramResult RunDeskPlayerInLittleMemory(const std::vector<std::string>& arguments,
-                                          unsigned long kibibytes)
+ProgramResult RunDeskPlayerWithLimitedMemory(const std::vector<std::string>& arguments,
+                                             unsigned long kibibytes)
 {
     return Run("ulimit -S -v " + std::to_string(kibibytes) + " && ", arguments, "");
 }

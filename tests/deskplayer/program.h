@@ -18,16 +18,16 @@ struct ProgramResult {
 /**
  * Runs the desk player with these arguments and empty input, and waits until it ends.
  *
- * @param output file for its standard output; by default, the result has it
+ * @param output file for its standard output; by default, it is returned in the result
  */
 ProgramResult RunDeskPlayer(const std::vector<std::string>& arguments,
                             const std::string& output = {});
 
-/** The same with a terminal for input and all output; the result has the screen's contents. */
+/** The same with a terminal for input and all output; the result contains the screen's text. */
 ProgramResult RunDeskPlayerOnTerminal(const std::vector<std::string>& arguments);
 
 /** The same with a limited address space. */
-ProgramResult RunDeskPlayerInLittleMemory(const std::vector<std::string>& arguments,
-                                          unsigned long kibibytes);
+ProgramResult RunDeskPlayerWithLimitedMemory(const std::vector<std::string>& arguments,
+                                             unsigned long kibibytes);
 
 #endif

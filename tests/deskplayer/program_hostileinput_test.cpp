@@ -53,7 +53,7 @@ protected:
     {
         SCOPED_TRACE(testing::PrintToString(arguments));
         const double before = SecondsOfChildren();
-        const ProgramResult result = RunDeskPlayerInLittleMemory(arguments, 64 * 1024);
+        const ProgramResult result = RunDeskPlayerWithLimitedMemory(arguments, 64 * 1024);
         EXPECT_LT(SecondsOfChildren() - before, 1);
         EXPECT_EQ(result.status, status);
         EXPECT_EQ(result.output, "");
@@ -116,7 +116,7 @@ TEST_F(HostileInput, MayBeThePlayListThatTakesTheMostMemory)
          {std::vector<std::string>{"--list"}, {"--describe", "1"}, {}}) {
         std::vector<std::string> arguments = {disc};
         arguments.insert(arguments.end(), option.begin(), option.end());
-        const ProgramResult result = RunDeskPlayerInLittleMemory(arguments, 64 * 1024);
+        const ProgramResult result = RunDeskPlayerWithLimitedMemory(arguments, 64 * 1024);
         EXPECT_EQ(result.status, 0);
         EXPECT_EQ(result.errors, "");
     }
@@ -141,7 +141,7 @@ TEST_F(HostileInput, MayReferToALargeClipInEveryPlayItem)
 
     const double before = SecondsOfChildren();
     const ProgramResult result =
-        RunDeskPlayerInLittleMemory({disc, "--only", "Finished"}, 64 * 1024);
+        RunDeskPlayerWithLimitedMemory({disc, "--only", "Finished"}, 64 * 1024);
     EXPECT_LT(SecondsOfChildren() - before, 1);
     EXPECT_EQ(result.status, 0);
     EXPECT_EQ(result.errors, "");

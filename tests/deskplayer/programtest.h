@@ -35,7 +35,7 @@ std::string ReadContents(const fs::path& path);
 /** Expects a message of one line, no output, and exit status 2. */
 void ExpectUsageError(const std::vector<std::string>& arguments, const std::string& message);
 
-/** Sets a file's size without writing data; it may exceed the limit of what a test may write. */
+/** Sets a file's size without writing data, so it may exceed what a test may write. */
 void ResizeSparsely(const fs::path& file, std::uintmax_t size);
 
 /** A folder for the files of a test. */
@@ -45,7 +45,7 @@ protected:
     ScratchFolder();
     ~ScratchFolder() override;
 
-    /** @return its path */
+    /** @return the path of the file */
     std::string WriteFile(const std::string& name, const std::string& content) const;
 
     const fs::path folder;
@@ -60,7 +60,7 @@ protected:
     /** Overwrites bytes of the play list. */
     void Patch(std::streamoff offset, const std::string& bytes) const;
 
-    /** Replaces the film by the trailer, shortened or extended to @p ticks of 45 kHz. */
+    /** Replaces the film with the trailer, shortened or extended to @p 45 kHz ticks. */
     void MakeShort(std::uint32_t ticks) const;
 
     /** Expects a message of one line, no output, and exit status 3. */

@@ -66,7 +66,7 @@ PlayList ListOf(std::vector<PlayItem> items, std::vector<Mark> marks = {});
 /**
  * A navigator with play list number 7, and a listener that records callbacks.
  *
- * Throws if playback does not end, after many times the callbacks of the longest test.
+ * Throws if playback does not end, after more callbacks and advances than any test needs.
  */
 class TestDesk
 {

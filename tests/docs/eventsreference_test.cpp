@@ -11,7 +11,7 @@
 #include <set>
 
 #include "docs/declarations.h"
-#include "docs/happenings.h"
+#include "docs/effects.h"
 #include "support/describe.h"
 
 namespace
@@ -325,7 +325,7 @@ TEST_F(EventsDocument, HasOnlyValidLinks)
     }
 }
 
-TEST_F(EventsDocument, DecidesAboutEveryTriggerAsItsTableSays)
+TEST_F(EventsDocument, DecidesEveryTriggerByItsTable)
 {
     const EventSection& section = reference.SectionOf("TriggerReachedEvent");
     const auto fits = [](const std::string& cell, int value) {
@@ -363,7 +363,7 @@ TEST_F(EventsDocument, DecidesAboutEveryTriggerAsItsTableSays)
                 ASSERT_NE(row, section.table.end());
                 used.insert(*row);
 
-                const Happening callback = WhatHappens(ClassOf(section.event), situation).back();
+                const Effect callback = EffectsOf(ClassOf(section.event), situation).back();
 
                 EXPECT_EQ(AsNumber(callback.values.at(0)),
                           std::to_string(toNumber(row->at(3), context)));
@@ -388,11 +388,11 @@ protected:
     {
         for (const Situation& situation : AllSituations()) {
             SCOPED_TRACE(situation.name);
-            const std::vector<Happening> happenings = WhatHappens(eventClass, situation);
+            const std::vector<Effect> effects = EffectsOf(eventClass, situation);
             const std::vector<std::size_t> made = StepsMade(section, situation);
-            ASSERT_LE(happenings.size(), made.size());
-            for (std::size_t i = 0; i < happenings.size(); ++i) {
-                action(section.steps[made[i]], happenings, i);
+            ASSERT_LE(effects.size(), made.size());
+            for (std::size_t i = 0; i < effects.size(); ++i) {
+                action(section.steps[made[i]], effects, i);
             }
         }
     }
@@ -401,27 +401,26 @@ protected:
      * The value of a name at a point of a dispatch: that of the next callback with such an
      * argument, or else of the last query with such a variable.
      */
-    std::string ValueOf(const std::string& name, const std::vector<Happening>& happenings,
-                        std::size_t at)
+    std::string ValueOf(const std::string& name, const std::vector<Effect>& effects, std::size_t at)
     {
         const std::map<std::string, std::string> callbacks = DeclaredCallbacks();
-        for (std::size_t i = at; i < happenings.size(); ++i) {
-            if (happenings[i].action == "callback") {
+        for (std::size_t i = at; i < effects.size(); ++i) {
+            if (effects[i].action == "callback") {
                 const std::vector<std::string> names =
-                    ParameterNames(callbacks.at(happenings[i].subject));
+                    ParameterNames(callbacks.at(effects[i].subject));
                 const auto found = std::find(names.begin(), names.end(), name);
                 if (found != names.end()) {
-                    return happenings[i].values.at(static_cast<std::size_t>(found - names.begin()));
+                    return effects[i].values.at(static_cast<std::size_t>(found - names.begin()));
                 }
             }
         }
         for (std::size_t i = at; i-- > 0;) {
             for (const Step& step : section.steps) {
-                if (step.action == "query" && step.Subject() == happenings[i].subject) {
+                if (step.action == "query" && step.Subject() == effects[i].subject) {
                     const std::vector<Variable> variables = step.Variables();
                     for (std::size_t j = 0; j < variables.size(); ++j) {
                         if (variables[j].first == name) {
-                            return happenings[i].answers.at(j);
+                            return effects[i].answers.at(j);
                         }
                     }
                 }
@@ -436,7 +435,7 @@ TEST_P(EventsDocumentSection, BeginsWithWhatHasHappened)
     EXPECT_TRUE(std::regex_search(section.firstSentence, std::regex("^[A-Z]"))) << "no sentence";
 }
 
-TEST_P(EventsDocumentSection, StatesWhatHappensInEverySituation)
+TEST_P(EventsDocumentSection, StatesItsEffectsInEverySituation)
 {
     for (const Situation& situation : AllSituations()) {
         SCOPED_TRACE(situation.name);
@@ -447,12 +446,12 @@ TEST_P(EventsDocumentSection, StatesWhatHappensInEverySituation)
                 expected.push_back(step.action + " " + step.Subject());
             }
         }
-        std::vector<std::string> happened;
-        for (const Happening& happening : WhatHappens(eventClass, situation)) {
-            happened.push_back(happening.action + " " + happening.subject);
+        std::vector<std::string> actual;
+        for (const Effect& effect : EffectsOf(eventClass, situation)) {
+            actual.push_back(effect.action + " " + effect.subject);
         }
 
-        EXPECT_EQ(expected, happened);
+        EXPECT_EQ(expected, actual);
     }
 }
 
@@ -503,31 +502,30 @@ TEST_P(EventsDocumentSection, ExplainsEveryConversion)
         }
     }
 
-    ForEachStepMade(
-        [this](const Step& step, const std::vector<Happening>& happenings, std::size_t i) {
-            if (IsLog(step)) {
-                const std::vector<Shown> explained = ExplainedValues(step);
-                ASSERT_EQ(explained.size(), happenings[i].values.size());
-                for (std::size_t j = 0; j < explained.size(); ++j) {
-                    if (!explained[j].name.empty()) {
-                        EXPECT_EQ(AsNumber(happenings[i].values[j]),
-                                  AsNumber(ValueOf(explained[j].name, happenings, i)))
-                            << explained[j].name;
-                    }
+    ForEachStepMade([this](const Step& step, const std::vector<Effect>& effects, std::size_t i) {
+        if (IsLog(step)) {
+            const std::vector<Shown> explained = ExplainedValues(step);
+            ASSERT_EQ(explained.size(), effects[i].values.size());
+            for (std::size_t j = 0; j < explained.size(); ++j) {
+                if (!explained[j].name.empty()) {
+                    EXPECT_EQ(AsNumber(effects[i].values[j]),
+                              AsNumber(ValueOf(explained[j].name, effects, i)))
+                        << explained[j].name;
                 }
             }
-        });
+        }
+    });
 }
 
 TEST_P(EventsDocumentSection, StatesThePresetsOfVariables)
 {
-    ForEachStepMade([](const Step& step, const std::vector<Happening>& happenings, std::size_t i) {
+    ForEachStepMade([](const Step& step, const std::vector<Effect>& effects, std::size_t i) {
         if (step.action == "query") {
             const std::vector<Variable> variables = step.Variables();
-            ASSERT_EQ(variables.size(), happenings[i].values.size()) << step.code;
+            ASSERT_EQ(variables.size(), effects[i].values.size()) << step.code;
             for (std::size_t j = 0; j < variables.size(); ++j) {
                 if (!variables[j].second.empty()) {
-                    EXPECT_EQ(happenings[i].values[j], DescribePreset(variables[j].second))
+                    EXPECT_EQ(effects[i].values[j], DescribePreset(variables[j].second))
                         << step.code;
                 }
             }

@@ -1,6 +1,6 @@
 // Which file includes which: the library needs only itself, the standard libraries of C and C++ and
 // the operating system's threads, every folder uses only the folders below it, and no files or
-// folders include each other in a circle.
+// folders include each other in a cycle.
 
 #include <gtest/gtest.h>
 
@@ -45,7 +45,7 @@ struct Include {
     }
 };
 
-/** Every #include of the headers and sources below the folders, which must hold some. */
+/** Every #include of the headers and sources below the folders, which must contain some. */
 std::vector<Include> IncludesBelow(const std::vector<std::string>& folders)
 {
     static const std::regex directive("^\\s*#\\s*include\\s*([\"<][^\">]+[\">])");
@@ -97,7 +97,7 @@ const std::set<std::string> SystemHeaders = {
 
 } // namespace
 
-TEST(Includes, OfTheLibraryAreItsOwnTheStandardsOrTheThreads)
+TEST(Includes, OfTheLibraryAreItsOwnStandardOrForThreads)
 {
     for (const Include& include : IncludesBelow({"inc", "bdmv", "prv_inc", "bd"})) {
         const bool known = include.IsQuoted()
@@ -167,7 +167,7 @@ Graph IncludeGraph(std::string (*nodeOf)(const std::string& file))
     return graph;
 }
 
-/** Removes nodes that include none of the remaining ones: those left are on a circle or lead to it.
+/** Removes nodes that include none of the remaining ones: those left are on a cycle or lead to one.
  */
 Graph WithoutEnds(Graph graph)
 {
@@ -219,12 +219,12 @@ TEST(Includes, LeadOnlyToFoldersBelow)
     }
 }
 
-TEST(Includes, OfFilesFormNoCircle)
+TEST(Includes, OfFilesFormNoCycle)
 {
     EXPECT_EQ(NamesIn(WithoutEnds(IncludeGraph(FileItself))), "");
 }
 
-TEST(Includes, OfFoldersFormNoCircle)
+TEST(Includes, OfFoldersFormNoCycle)
 {
     EXPECT_EQ(NamesIn(WithoutEnds(IncludeGraph(FolderOf))), "");
 }

@@ -53,35 +53,35 @@ public:
     virtual void PlayMode(bd::PlayDirectionDef direction, bd::PlaySpeedDef speed) = 0;
 
     /**
-     * The primary audio stream is selected. Sent by AudioInfoEvent.
+     * A primary audio stream is selected. Sent by AudioInfoEvent.
      *
      * @param number its stream number
      */
     virtual void AudioInfo(bd::StreamNumberDef number) = 0;
 
     /**
-     * The primary video stream is selected. Sent by VideoInfoEvent.
+     * A primary video stream is selected. Sent by VideoInfoEvent.
      *
      * @param number its stream number
      */
     virtual void VideoInfo(bd::StreamNumberDef number) = 0;
 
     /**
-     * The angle is selected. Sent by AngleInfoEvent.
+     * An angle is selected. Sent by AngleInfoEvent.
      *
      * @param number the angle number
      */
     virtual void AngleInfo(bd::AngleNumberDef number) = 0;
 
     /**
-     * The interactive graphics stream is selected. Sent by InteractiveGraphicsInfoEvent.
+     * An interactive graphics stream is selected. Sent by InteractiveGraphicsInfoEvent.
      *
      * @param number its stream number
      */
     virtual void InteractiveGraphicsInfo(bd::StreamNumberDef number) = 0;
 
     /**
-     * The presentation graphics or text subtitle stream is selected. Sent by
+     * A presentation graphics or text subtitle stream is selected. Sent by
      * PresentationGraphicsInfoEvent.
      *
      * @param number    its stream number
@@ -91,21 +91,21 @@ public:
     virtual void PresentationGraphicsInfo(bd::StreamNumberDef number, bool available) = 0;
 
     /**
-     * The secondary audio stream is selected. Sent by SecondaryAudioInfoEvent.
+     * A secondary audio stream is selected. Sent by SecondaryAudioInfoEvent.
      *
      * @param number its stream number
      */
     virtual void SecondaryAudioInfo(bd::StreamNumberDef number) = 0;
 
     /**
-     * The secondary video stream is selected. Sent by SecondaryVideoInfoEvent.
+     * A secondary video stream is selected. Sent by SecondaryVideoInfoEvent.
      *
      * @param number its stream number
      */
     virtual void SecondaryVideoInfo(bd::StreamNumberDef number) = 0;
 
     /**
-     * The subtitle stream of the picture-in-picture window is selected. Sent by
+     * A subtitle stream is selected for the picture-in-picture window. Sent by
      * PipPgTextStInfoEvent.
      *
      * @param number    its stream number
@@ -122,7 +122,7 @@ public:
     virtual void AudioInfoChanged(bool isPrimary, bd::AudioInfoType info) = 0;
 
     /**
-     * The text subtitle user style is selected. Sent by TextSubtitleStyleInfoEvent.
+     * A text subtitle user style is selected. Sent by TextSubtitleStyleInfoEvent.
      *
      * @param styleNumber its number
      */

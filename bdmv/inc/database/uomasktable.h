@@ -1,6 +1,6 @@
 /**
  * @file
- * The user-operation mask.
+ * The user operation mask.
  *
  * A disc forbids user operations through 64-bit masks in its play lists, play items and menu pages:
  * a set bit forbids one operation. bd::UserOperationMaskDef numbers the operations by the position

@@ -26,7 +26,7 @@
 #include "support/scriptableplaybackcontext.h"
 
 #if defined(__clang__)
-// A virtual function is called as the plain function that it is to the processor.
+// In machine code a virtual function is a plain function, and it is called as one.
 #define CALLS_TABLE_ENTRY __attribute__((no_sanitize("function")))
 #else
 #define CALLS_TABLE_ENTRY

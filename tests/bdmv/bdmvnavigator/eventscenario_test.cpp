@@ -83,7 +83,7 @@ const Reentry reentries[] = {
 
 } // namespace
 
-TEST_P(EventScenario, HappensInThisOrder)
+TEST_P(EventScenario, HappensInTheStatedOrder)
 {
     DispatchScenario(listeners);
 

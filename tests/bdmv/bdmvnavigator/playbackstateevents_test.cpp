@@ -96,7 +96,7 @@ class PlaybackStateEvents : public EventTest
 {
 };
 
-TEST_F(PlaybackStateEvents, SteppedWritesThisJournal)
+TEST_F(PlaybackStateEvents, SteppedWritesTheWholeJournal)
 {
     context.currentTimePosition = 900000;
     context.playMode = bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedNormal);
@@ -157,7 +157,7 @@ TEST_F(PlaybackStateEvents, AListenerThatChangesTheContextDoesNotChangeWhatTheOt
                   Fired("Stepped(0, PlayDirectionForward)"));
 }
 
-TEST_F(PlaybackStateEvents, AnAssertionThatDoesNotReturnEndsFinished)
+TEST_F(PlaybackStateEvents, AnAssertionThatDoesNotReturnEndsTheFinishedEvent)
 {
     struct Abandoned {
     };

@@ -105,7 +105,7 @@ TEST(ProgramData, NamesItsPointerTypeAndItsIndexType)
     EXPECT_TRUE((std::is_same_v<bdmv::IProgramData::CommandIdDef, bd::UInt16>));
 }
 
-TEST(PlayListMark, IsDestroyedWithWhatImplementsIt)
+TEST(PlayListMark, IsDestroyedWithItsImplementation)
 {
     struct Mark : bdmv::IPlayListMark {
         explicit Mark(bool& isDestroyed) : destroyed(isDestroyed) {}

@@ -18,12 +18,12 @@ struct Reached {
     TriggerType abRepeat;
     TriggerType chpTitleRepeat;
     TriggerType set;
-    Asked asked; ///< after the type by time
+    Asked asked; ///< further queries, after GetTriggerTypeByTime()
     TriggerType reported;
 };
 
 const Reached reachedTriggers[] = {
-    // A B point.
+    // Point B.
     {"BWithoutABWithChapter", TRIGGER_B, TRIGGER_AB_NONE, TRIGGER_CHP, TRIGGER_A, States,
      TRIGGER_NOTIFY_FROM_CURPOS},
     {"BWithoutABWithTitle", TRIGGER_B, TRIGGER_AB_NONE, TRIGGER_TITLE, TRIGGER_A, States,

@@ -25,7 +25,7 @@ Bytes Zeros(std::size_t count);
 Bytes Join(std::initializer_list<Bytes> pieces);
 Bytes Repeat(std::size_t count, const Bytes& piece);
 
-/** @p body after its length of one, two or four bytes. */
+/** @p body, preceded by its length in one, two or four bytes. */
 Bytes Part8(const Bytes& body);
 Bytes Part16(const Bytes& body);
 Bytes Part32(const Bytes& body);
@@ -39,7 +39,7 @@ Bytes StreamEntry(unsigned pid);
 /** Stream attributes: coding type and the four bytes after it. */
 Bytes StreamAttributesBytes(unsigned codingType, const Bytes& details);
 
-/** An audio stream without language, entry and attributes. */
+/** The entry and attributes of an audio stream without a language. */
 Bytes AudioStream(unsigned pid);
 
 /** A stream table. @p counts are the eight counts in file order. */
@@ -102,7 +102,7 @@ struct PlayListBytes {
 /** A play list of one play item. */
 PlayListBytes WithItem(const PlayItemBytes& item);
 
-/** A play list of one play item with the streams of @p streamTable. */
+/** A play list of one play item with a stream table as StreamTableBytes() makes it. */
 PlayListBytes WithStreams(const Bytes& counts, const Bytes& streams);
 
 /**

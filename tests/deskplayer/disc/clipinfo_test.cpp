@@ -219,7 +219,7 @@ TEST(ClipDuration, IsTheSumOverAllStcSequencesInSixtyFourBits)
     EXPECT_EQ(Duration(clipInfo), Ticks(2u * 0xFFFFFFFFull + 2u));
 }
 
-TEST(AspectRatiosOf, AreSortedByPidOverTheVideoStreamsOfAllPrograms)
+TEST(AspectRatiosOf, AreThoseOfTheVideoStreamsOfAllProgramsSortedByPid)
 {
     const auto video = [](unsigned pid, unsigned ratio) {
         return Join({U16(pid), Part8({0x1B, 0x61, static_cast<std::uint8_t>(ratio << 4)})});

@@ -135,7 +135,7 @@ std::size_t MemoryForPlayList(const Bytes& bytes)
     return AllocatedBytes() - before;
 }
 
-TEST(DamagedFiles, DoNotGetMemoryForMissingContent)
+TEST(DamagedFiles, AllocateNoMemoryForMissingContent)
 {
     PlayListBytes items = WithItem(PlayItemBytes());
     items.itemCount = 0xFFFF;
@@ -152,7 +152,7 @@ TEST(DamagedFiles, DoNotGetMemoryForMissingContent)
     EXPECT_LT(MemoryForPlayList(WithStreams(Repeat(8, {0xFF}), AudioStream(1)).Make()), 4000u);
 }
 
-TEST(DamagedFiles, GetAtMostMemoryInProportionToTheirSize)
+TEST(DamagedFiles, AllocateMemoryAtMostInProportionToTheirSize)
 {
     const Bytes dense = DensePlayList().Make();
     ASSERT_GT(dense.size(), LargestPlayListFile * 9 / 10);

@@ -89,7 +89,7 @@ TEST(DescribePlayList, ShowsEveryValueOfEveryPlayList)
     EXPECT_GE(playLists, 23u);
 }
 
-/** It is unknown whether a stream of a reserved entry type belongs to a sub path. */
+/** Descriptions omit the sub path of a stream with a reserved entry type. */
 void RemoveSubPathsOfReservedEntryTypes(json& playList)
 {
     for (json& item : playList.at("items")) {
@@ -306,7 +306,7 @@ TEST(DescribePlayList, IsSafeToPrintForAnyTextOnADisc)
     EXPECT_NE(text.find("language a\\x0A\\x9B\n"), std::string::npos) << text;
 }
 
-/** Describes a play list with one stream of the disc "pip", and finds its aspect ratio. */
+/** Describes a play list with one stream of the disc "pip". @return its aspect ratio */
 std::string AspectOfVideo(const ScratchDisc& scratch, unsigned pid, const std::string& clip)
 {
     PlayItemBytes item;

@@ -103,7 +103,7 @@ public:
         return text == "yes";
     }
 
-    /** Converts numbers from 1 to numbers from 0. */
+    /** Converts numbers counted from 1 to numbers counted from 0. */
     json Numbers(const std::string& name) const
     {
         json numbers = json::array();

@@ -13,8 +13,8 @@ namespace deskplayer
 {
 
 /**
- * The values in a description, in the form of a play list in a disc's expected.json, and its
- * chapters. Text in parentheses is skipped.
+ * The values in a description, in the form that a disc's expected.json uses for a play list, and
+ * the chapters. Text in parentheses is skipped.
  *
  * @throw std::runtime_error a line or a value is malformed
  */

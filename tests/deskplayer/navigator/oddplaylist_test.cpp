@@ -175,10 +175,10 @@ TEST(OddPlayList, HandlesTheMaximumNumberOfStreams)
 /**
  * A random play list: short items, some without length, some with stills, and marks anywhere.
  */
-PlayList DrawPlayList(std::mt19937& lot)
+PlayList RandomPlayList(std::mt19937& generator)
 {
-    const auto draw = [&lot](std::uint32_t below) {
-        return static_cast<std::uint32_t>(lot() % below);
+    const auto draw = [&generator](std::uint32_t below) {
+        return static_cast<std::uint32_t>(generator() % below);
     };
     PlayList playList;
     for (std::uint32_t item = draw(5); item-- > 0;) {
@@ -196,30 +196,30 @@ PlayList DrawPlayList(std::mt19937& lot)
     return playList;
 }
 
-/** Carries out a random operation, which may be refused. */
-void PerformAny(TestDesk& desk, std::mt19937& lot)
+/** Carries out a random command, which may be refused. */
+void PerformRandomCommand(TestDesk& desk, std::mt19937& generator)
 {
-    const Command& command = Commands()[lot() % Commands().size()];
+    const Command& command = Commands()[generator() % Commands().size()];
     std::vector<std::uint64_t> values;
     for (int i = 0; i < 4; ++i) {
-        values.push_back(lot() % 8 == 0 ? lot() : lot() % 12);
+        values.push_back(generator() % 8 == 0 ? generator() : generator() % 12);
     }
     command.perform(desk.desk, values);
 }
 
-TEST(OddPlayList, StaysInOrderUnderAnyOperations)
+TEST(OddPlayList, StaysConsistentUnderAnyOperations)
 {
     for (unsigned seed = 0; seed < 300; ++seed) {
         SCOPED_TRACE(seed);
-        std::mt19937 lot(seed);
-        const PlayList playList = DrawPlayList(lot);
+        std::mt19937 generator(seed);
+        const PlayList playList = RandomPlayList(generator);
         const LoadedPlayList loaded = LayOut(7, playList);
         TestDesk desk(playList);
         desk.navigator.Play();
         for (int operation = 0; operation < 60; ++operation) {
-            PerformAny(desk, lot);
+            PerformRandomCommand(desk, generator);
             const Ticks before = desk.clock.Now();
-            const Ticks passes(lot() % (2 * Second).count());
+            const Ticks passes(generator() % (2 * Second).count());
 
             const Ticks left = desk.navigator.Advance(passes);
 

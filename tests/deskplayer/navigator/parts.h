@@ -1,6 +1,6 @@
 /**
  * @file
- * Parts of the navigator, for tests that need no whole navigator.
+ * Parts of the navigator, for tests that do not need all of it.
  */
 #ifndef TESTS_DESKPLAYER_NAVIGATOR_PARTS_H
 #define TESTS_DESKPLAYER_NAVIGATOR_PARTS_H

@@ -103,7 +103,7 @@ TEST_F(PlaybackContextQueries, ReportsTheRepeatStates)
     EXPECT_EQ(context.GetCurrentChpTitleRepeatState(), bd::TRIGGER_TITLE);
 }
 
-TEST_F(PlaybackContextQueries, KnowsTheTriggerAtATime)
+TEST_F(PlaybackContextQueries, ReportsTheTriggerAtATime)
 {
     EXPECT_EQ(context.GetTriggerTypeByTime(0), bd::TRIGGER_INVALID);
     state.pointA = Ticks(5);

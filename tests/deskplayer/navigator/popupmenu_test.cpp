@@ -69,7 +69,7 @@ TEST_F(MenuOfThreeChapters, PassesOnTheProgramAndReturnsTheChapter)
     EXPECT_EQ(parts.state.position, Ticks(0)) << "the caller performs the jump";
 }
 
-TEST(Menu, SelectsTheFirstButtonBeforeTheFirstChapter)
+TEST(PopUpMenu, SelectsTheFirstButtonBeforeTheFirstChapter)
 {
     EventParts parts(ListOf({RichItem(10)}, {Entry(0, 5 * Second)}));
     PopUpMenu menu(parts.playhead, parts.state, parts.sender);

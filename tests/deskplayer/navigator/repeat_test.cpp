@@ -16,7 +16,7 @@ bd::PlayMode BackwardMode()
     return bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedNormal);
 }
 
-/** Sets A here and B @p later, which takes playback back to A. */
+/** Sets A here and B @p later, which returns playback to A. */
 void SetPoints(TestDesk& desk, Ticks later)
 {
     desk.Do(desk.navigator.SetPointA());
@@ -272,7 +272,7 @@ TEST(Repeat, EndsTheRepeatOfAChapterOrThePlayList)
     }
 }
 
-TEST(Repeat, HasOnlyOneKindAtATime)
+TEST(Repeat, AllowsOnlyOneKindAtATime)
 {
     TestDesk desk(ListOf({Item(10)}, {Entry(0, Ticks(0))}));
     desk.Start();

@@ -203,7 +203,7 @@ TEST(Standby, ClosesTheMenuAndEndsAStill)
               0);
 }
 
-TEST(Standby, IsLeftWithThePreviousPositionStreamsAndPlayMode)
+TEST(Standby, RestoresPositionStreamsAndPlayMode)
 {
     PlayList playList = ListOf({Item(2), RichItem(10)}, {Entry(0, Ticks(0)), Entry(1, Ticks(0))});
     TestDesk desk(playList);
@@ -248,10 +248,10 @@ TEST(Standby, IsLeftWithThePreviousPositionStreamsAndPlayMode)
     restarted.Start();
     restarted.Do(restarted.navigator.GoToStandby());
     restarted.Do(restarted.navigator.WakeUp(desk.desk.ResumeData()));
-    EXPECT_EQ(restarted.Snapshot(), before) << "in another navigator over the same play list";
+    EXPECT_EQ(restarted.Snapshot(), before) << "in another navigator with the same play list";
 }
 
-TEST(Standby, IsLeftPausedIfEnteredPaused)
+TEST(Standby, RestoresAPause)
 {
     TestDesk desk(ListOf({Item(10)}));
     desk.Start(4 * Second);
@@ -265,7 +265,7 @@ TEST(Standby, IsLeftPausedIfEnteredPaused)
     EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), 4 * Second);
 }
 
-TEST(Standby, IsLeftIntoTheSameStill)
+TEST(Standby, RestoresAStill)
 {
     TestDesk desk(ListOf({WithTimedStill(Item(1), 5)}));
     desk.Start(2 * Second);
@@ -279,7 +279,7 @@ TEST(Standby, IsLeftIntoTheSameStill)
                                            "7 Finished(EndOfMedia)\n");
 }
 
-TEST(Standby, IsLeftAtThePositionWhereItWasEnteredInEveryItem)
+TEST(Standby, RestoresThePositionInEveryItem)
 {
     const PlayList playList = ListOf(
         {Item(2), Item(0), WithTimedStill(Item(2), 5), WithTimedStill(Item(0), 5), RichItem(2)},

@@ -226,7 +226,7 @@ TEST(Streams, WithoutTextSubtitlesHaveNoStyles)
               "20 TextSubtitleStylesAvailable(0)\n");
 }
 
-TEST(Streams, AreZoomed)
+TEST(Zoom, IsAnnouncedWithItsParameters)
 {
     TestDesk desk(ListOf({Item(10)}));
     desk.Start(Second);

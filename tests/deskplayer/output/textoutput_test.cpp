@@ -191,7 +191,7 @@ TEST(WantsColours, NotInAFile)
     close(file);
 }
 
-TEST(WantsColours, NotIfNoColorIsNotEmpty)
+TEST(WantsColours, NotIfNoColorHasAValue)
 {
     const Terminal terminal;
     ASSERT_NE(terminal.FileDescriptor(), -1);

@@ -351,7 +351,7 @@ bool SameSettings(const termios& left, const termios& right)
            std::memcmp(left.c_cc, right.c_cc, sizeof left.c_cc) == 0;
 }
 
-/** Does something as soon as playback has started. */
+/** Performs an action once playback has started. */
 class AtStart : public bdmv::NavigatorListenerAdapter
 {
 public:

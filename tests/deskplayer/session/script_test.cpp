@@ -195,7 +195,7 @@ TEST(ParseScript, ChoosesTheFirstMatchingPattern)
     EXPECT_EQ(steps[0].values, Values{(5 * Second).count()});
 }
 
-TEST(ParseScript, ReadsNumbersUpToTheGreatest)
+TEST(ParseScript, ReadsNumbersUpToTheMaximum)
 {
     EXPECT_EQ(ParseLine("chapter 0").values, Values{0});
     EXPECT_EQ(ParseLine("chapter 007").values, Values{7});
@@ -346,7 +346,7 @@ TEST(ParseScriptRefuses, WithTheColumnInBytes)
               "1:9: unexpected '\\xC3\\xA4'; expected next, previous or a NUMBER");
 }
 
-TEST(ParseScriptRefuses, NumbersBeyondTheGreatest)
+TEST(ParseScriptRefuses, NumbersAboveTheMaximum)
 {
     const std::string expected = " is not between 0 and 65535; expected next, previous or a NUMBER";
     EXPECT_EQ(ErrorOf("chapter 65536"), "1:9: '65536'" + expected);
@@ -354,7 +354,7 @@ TEST(ParseScriptRefuses, NumbersBeyondTheGreatest)
     EXPECT_EQ(ErrorOf("chapter 18446744073709551617"), "1:9: '18446744073709551617'" + expected);
 }
 
-TEST(ParseScriptRefuses, NumbersBeyondTheGreatestBeforeWordsInTheTable)
+TEST(ParseScriptRefuses, NumbersAboveTheMaximumBeforeWordsInTheTable)
 {
     EXPECT_EQ(ErrorOf("subtitle 65536"),
               "1:10: '65536' is not between 0 and 65535; expected on, a NUMBER or style");

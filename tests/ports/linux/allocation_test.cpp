@@ -24,18 +24,18 @@ std::size_t AllocationsOfALine(const std::string& text)
     return bdmvtest::CountAllocations() - before;
 }
 
-TEST_F(LogAllocation, IsNoneForALineOfTwoHundredBytes)
+TEST_F(LogAllocation, DoesNotOccurForALineOfTwoHundredBytes)
 {
     EXPECT_EQ(AllocationsOfALine(std::string(200, 'x')), 0U);
 }
 
-TEST_F(LogAllocation, IsNoneForAQueuedLineOfTwoHundredBytes)
+TEST_F(LogAllocation, DoesNotOccurForAQueuedLineOfTwoHundredBytes)
 {
     porttesting::ConfigureSink("file:" + m_LogFile + ",queue=2");
     EXPECT_EQ(AllocationsOfALine(std::string(200, 'x')), 0U);
 }
 
-TEST_F(LogAllocation, IsNoneWhenTheQueueDropsLines)
+TEST_F(LogAllocation, DoesNotOccurWhenTheQueueDropsLines)
 {
     porttesting::ConfigureSink("file:" + m_LogFile + ",queue=1");
     const std::string text(200, 'x');
@@ -46,7 +46,7 @@ TEST_F(LogAllocation, IsNoneWhenTheQueueDropsLines)
     EXPECT_EQ(bdmvtest::CountAllocations() - before, 0U);
 }
 
-TEST_F(LogAllocation, IsNoneToCheckTheSwitch)
+TEST_F(LogAllocation, DoesNotOccurWhenTheSwitchIsChecked)
 {
     const std::size_t before = bdmvtest::CountAllocations();
     KEVRO_Log_IsEnabled(bd::CompIdBdmvNavigator, KEVRO_Log_LevelEvent, 0);

@@ -34,7 +34,7 @@ TEST(Environment, ConfiguresTheSwitch)
     EXPECT_EQ(RunHelper({"enabled", "57", "3", "0"}, environment).output, "0\n");
 }
 
-TEST(Environment, SwitchesEverythingOffByAnEmptyText)
+TEST(Environment, SwitchesEverythingOffForAnEmptyText)
 {
     const Outcome outcome = RunHelper({"enabled", "57", "13", "0"}, {"KEVRO_LOG="});
     EXPECT_EQ(outcome.output, "0\n");

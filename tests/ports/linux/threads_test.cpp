@@ -106,7 +106,7 @@ TEST(Threads, CountEveryLineThatIsNotWritten)
               static_cast<KEVRO_UInt64>(WriterCount * LinesPerWriter - written));
 }
 
-TEST(Threads, NeverSeeALineOffThatOldAndNewConfigurationHaveOn)
+TEST(Threads, NeverFindALineOffThatBothConfigurationsSwitchOn)
 {
     ASSERT_TRUE(KEVRO_Log_Configure("BdmvNavigator=Event|Info", nullptr, 0));
     std::atomic<bool> stop{false};

@@ -2,8 +2,8 @@
  * @file
  * The actual effects of the events, in enough situations to see all of them.
  */
-#ifndef DOCS_HAPPENINGS_H
-#define DOCS_HAPPENINGS_H
+#ifndef DOCS_EFFECTS_H
+#define DOCS_EFFECTS_H
 
 #include <functional>
 #include <string>
@@ -15,7 +15,7 @@
 typedef bdmvtest::ScriptablePlaybackContext Context;
 
 /** One action of an event, in the words of the reference. */
-struct Happening {
+struct Effect {
     std::string action;               ///< query, log, callback and the like
     std::string subject;              ///< the operation, the format, the callback
     std::vector<std::string> values;  ///< a query's variables before it, the values in a line, or
@@ -40,7 +40,7 @@ Situation TriggerSituation(bd::TriggerType kind, bd::TriggerType abState,
 void Arrange(Context& context, const Situation& situation);
 
 /** Dispatches an event of the class to one listener, with the log on. */
-std::vector<Happening> WhatHappens(const EventClass& event, const Situation& situation);
+std::vector<Effect> EffectsOf(const EventClass& event, const Situation& situation);
 
 /** The printf conversions of a format, in order. */
 std::vector<std::string> Conversions(const std::string& format);

@@ -1,4 +1,4 @@
-#include "docs/happenings.h"
+#include "docs/effects.h"
 
 #include <cctype>
 #include <sstream>
@@ -70,7 +70,7 @@ std::string LogAction(const std::string& tag)
 }
 
 /** Reads "Name(value, value)", and " -> value, value" after it. */
-Happening ParseCall(const std::string& action, const std::string& call)
+Effect ParseCall(const std::string& action, const std::string& call)
 {
     const std::size_t open = call.find('(');
     const std::size_t arrow = call.rfind(") -> ");
@@ -80,10 +80,10 @@ Happening ParseCall(const std::string& action, const std::string& call)
             SplitValues(answers)};
 }
 
-/** Turns the entries of a journal into happenings. */
-std::vector<Happening> ParseJournal(const std::string& journal)
+/** Turns the entries of a journal into effects. */
+std::vector<Effect> ParseJournal(const std::string& journal)
 {
-    std::vector<Happening> happenings;
+    std::vector<Effect> effects;
     std::string format;
     std::istringstream entries(journal);
     for (std::string entry; std::getline(entries, entry);) {
@@ -91,24 +91,24 @@ std::vector<Happening> ParseJournal(const std::string& journal)
         if (StartsWith(entry, "context.")) {
             if (entry.find('(') != std::string::npos) {
                 const bool answers = entry.find(" -> ") != std::string::npos;
-                happenings.push_back(ParseCall(answers ? "query" : "call", entry.substr(8)));
+                effects.push_back(ParseCall(answers ? "query" : "call", entry.substr(8)));
             }
         } else if (StartsWith(entry, "format: ")) {
             format = entry.substr(colon + 2);
         } else if (StartsWith(entry, "log ")) {
-            happenings.push_back({LogAction(entry.substr(4, colon - 4)),
-                                  format,
-                                  ShownValues(format, entry.substr(colon + 2)),
-                                  {}});
+            effects.push_back({LogAction(entry.substr(4, colon - 4)),
+                               format,
+                               ShownValues(format, entry.substr(colon + 2)),
+                               {}});
         } else if (StartsWith(entry, "A.")) {
-            happenings.push_back(ParseCall("callback", entry.substr(2)));
+            effects.push_back(ParseCall("callback", entry.substr(2)));
         } else if (StartsWith(entry, "assert: ")) {
-            happenings.push_back({"assert", entry.substr(colon + 2), {}, {}});
+            effects.push_back({"assert", entry.substr(colon + 2), {}, {}});
         } else if (!StartsWith(entry, "log? ")) {
             throw std::runtime_error("cannot read " + entry);
         }
     }
-    return happenings;
+    return effects;
 }
 
 } // namespace
@@ -213,7 +213,7 @@ void Arrange(Context& context, const Situation& situation)
     situation.arrange(context);
 }
 
-std::vector<Happening> WhatHappens(const EventClass& event, const Situation& situation)
+std::vector<Effect> EffectsOf(const EventClass& event, const Situation& situation)
 {
     bdmvtest::Journal journal;
     bdmvtest::FakePlatform platform(&journal);
