@@ -369,7 +369,7 @@ TEST(Refusals, IgnoreTheMaskOnceNothingPlays)
         playList.applicationInfo.uoMask = MaskOf({bd::UserOperationTimeSearch});
         TestDesk desk(playList);
         Bring(desk, status);
-        EXPECT_EQ(desk.navigator.SearchTime(Ticks(0)).Reason().rfind("not playing ", 0), 0);
+        EXPECT_EQ(desk.navigator.SearchTime(Ticks(0)).Reason().rfind("not playing, ", 0), 0);
     }
 }
 
