@@ -142,17 +142,21 @@ Outcome SimulatedNavigator::SearchChapter(std::uint64_t number)
 
 Outcome SimulatedNavigator::SkipToNextChapter()
 {
-    return JumpToChapter(bd::UserOperationSkipToNextPoint, m_Context.GetCurrentChapter() + 1U);
+    const std::uint64_t number = m_Context.GetCurrentChapter();
+    const Chapter* const next = m_Playhead.ChapterAfter(number);
+    return JumpToChapter(bd::UserOperationSkipToNextPoint,
+                         next == nullptr ? number + 1U : next->number);
 }
 
 Outcome SimulatedNavigator::SkipToPreviousChapter()
 {
     const std::uint64_t number = m_Context.GetCurrentChapter();
     const Chapter* const chapter = m_Playhead.FindChapter(number);
-    const bool justStarted =
-        chapter != nullptr && number > 1 && m_State.position - chapter->start < SkipBackWindow;
+    const Chapter* const previous = m_Playhead.ChapterBefore(number);
+    const bool justStarted = chapter != nullptr && previous != nullptr &&
+                             m_State.position - chapter->start < SkipBackWindow;
     return JumpToChapter(bd::UserOperationSkipBackToPreviousPoint,
-                         justStarted ? number - 1 : number);
+                         justStarted ? previous->number : number);
 }
 
 Outcome SimulatedNavigator::JumpToChapter(bd::UserOperationMaskDef operation, std::uint64_t number)
@@ -161,7 +165,11 @@ Outcome SimulatedNavigator::JumpToChapter(bd::UserOperationMaskDef operation, st
     const Chapter* const chapter = m_Playhead.FindChapter(number);
     Outcome outcome = m_Permission.CheckActive();
     if (outcome.IsDone() && chapter == nullptr) {
-        outcome = Outcome::NoSuch("chapter", number, chapters.empty() ? 0 : chapters.back().number);
+        const std::uint64_t last = chapters.empty() ? 0 : chapters.back().number;
+        outcome = number != 0 && number < last
+                      ? Outcome::Refused("the mark of chapter " + std::to_string(number) +
+                                         " is outside its play item")
+                      : Outcome::NoSuch("chapter", number, last);
     }
     const Ticks start = chapter == nullptr ? Ticks(0) : chapter->start;
     return Operate(operation, outcome, [this, start] { m_Transport.JumpTo(start); });

@@ -173,6 +173,49 @@ TEST(Position, SkipsBackToTheStartOfTheFirstChapterAtAnyTime)
     EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), Second);
 }
 
+/** An item of ten seconds with chapters 3 and 5; the marks of the others are after its end. */
+PlayList ChaptersThreeAndFive()
+{
+    return ListOf({Item(10)}, {Entry(0, 11 * Second), Entry(0, 11 * Second), Entry(0, 2 * Second),
+                               Entry(0, 11 * Second), Entry(0, 6 * Second), Entry(0, 11 * Second)});
+}
+
+TEST(Position, SkipsForwardOverChaptersWithoutAPosition)
+{
+    TestDesk desk(ChaptersThreeAndFive());
+    desk.Start(Second);
+
+    EXPECT_TRUE(desk.navigator.SkipToNextChapter().IsDone());
+    EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), 2 * Second);
+    EXPECT_TRUE(desk.navigator.SkipToNextChapter().IsDone());
+    EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), 6 * Second);
+    EXPECT_EQ(desk.navigator.SkipToNextChapter().Reason(),
+              "no chapter 6; chapters are numbered 1 to 5");
+}
+
+TEST(Position, SkipsBackOverChaptersWithoutAPosition)
+{
+    TestDesk desk(ChaptersThreeAndFive());
+    desk.Start(7 * Second);
+
+    EXPECT_TRUE(desk.navigator.SkipToPreviousChapter().IsDone());
+    EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), 2 * Second);
+    desk.navigator.Advance(Second);
+    EXPECT_TRUE(desk.navigator.SkipToPreviousChapter().IsDone());
+    EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), 2 * Second);
+}
+
+TEST(Position, RefusesAChapterWithoutAPosition)
+{
+    TestDesk desk(ChaptersThreeAndFive());
+    desk.Start(Second);
+
+    EXPECT_EQ(desk.navigator.SearchChapter(4).Reason(),
+              "the mark of chapter 4 is outside its play item");
+    EXPECT_EQ(desk.navigator.SearchChapter(0).Reason(),
+              "no chapter 0; chapters are numbered 1 to 5");
+}
+
 TEST(Position, RefusesChaptersThatDoNotExist)
 {
     TestDesk desk(FourChapters());
