@@ -241,7 +241,10 @@ Outcome SimulatedNavigator::RepeatTitle()
 
 Outcome SimulatedNavigator::EndChapterTitleRepeat()
 {
-    return SetChapterTitleRepeat(bd::TRIGGER_NONE);
+    return Operate(m_Permission.CheckActive(), [this] {
+        m_State.chapterTitleRepeat = bd::TRIGGER_NONE;
+        SetTriggerType(bd::TRIGGER_NONE, true);
+    });
 }
 
 Outcome SimulatedNavigator::SetTrigger(Ticks position)

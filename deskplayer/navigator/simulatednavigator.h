@@ -110,6 +110,8 @@ public:
     Outcome EndABRepeat();
     Outcome RepeatChapter();
     Outcome RepeatTitle();
+
+    /** Leaves an A-B repeat as it is. */
     Outcome EndChapterTitleRepeat();
 
     /** Notifies listeners when playback reaches @p position, which may be the end. */
