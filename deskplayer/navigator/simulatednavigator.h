@@ -192,7 +192,9 @@ private:
     Outcome SelectStream(bd::UserOperationMaskDef operation, std::uint64_t number,
                          std::size_t count, const char* what, Number& selected);
     template <typename Event>
-    Outcome Switch(bd::UserOperationMaskDef operation, bool& shown, bool value);
+    Outcome Switch(bd::UserOperationMaskDef operation, const Outcome& possible, bool& shown,
+                   bool value);
+    Outcome CheckShowing(bool shown, const std::vector<Stream>& streams, const char* what) const;
     Outcome JumpToChapter(bd::UserOperationMaskDef operation, std::uint64_t number);
     void SetTriggerType(bd::TriggerType type, bool result);
     Outcome SetChapterTitleRepeat(bd::TriggerType repeat);

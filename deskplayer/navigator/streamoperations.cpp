@@ -1,6 +1,8 @@
 // The operations of the navigator on streams, the picture and the menu.
 
+#include <string>
 #include <utility>
+#include <vector>
 
 #include "bdmvnavigator/navigatorevent.h"
 #include "navigator/simulatednavigator.h"
@@ -26,12 +28,24 @@ Outcome SimulatedNavigator::SelectStream(bd::UserOperationMaskDef operation, std
 }
 
 template <typename Event>
-Outcome SimulatedNavigator::Switch(bd::UserOperationMaskDef operation, bool& shown, bool value)
+Outcome SimulatedNavigator::Switch(bd::UserOperationMaskDef operation, const Outcome& possible,
+                                   bool& shown, bool value)
 {
-    return Operate(operation, m_Permission.CheckActive(), [&, value] {
+    return Operate(operation, possible, [&, value] {
         shown = value;
         m_Sender.Send<Event>();
     });
+}
+
+/** Streams can be hidden at any time, but shown only if there are any. */
+Outcome SimulatedNavigator::CheckShowing(bool shown, const std::vector<Stream>& streams,
+                                         const char* what) const
+{
+    Outcome outcome = m_Permission.CheckActive();
+    if (outcome.IsDone() && shown && streams.empty()) {
+        outcome = Outcome::Refused(std::string("the play item has no ") + what);
+    }
+    return outcome;
 }
 
 Outcome SimulatedNavigator::SelectAudio(std::uint64_t number)
@@ -51,6 +65,7 @@ Outcome SimulatedNavigator::SelectSubtitle(std::uint64_t number)
 Outcome SimulatedNavigator::ShowSubtitles(bool shown)
 {
     return Switch<bdmv::PresentationGraphicsDisplayEvent>(bd::UserOperationPGTextSTEnableDisable,
+                                                          m_Permission.CheckActive(),
                                                           m_State.selection.pgShown, shown);
 }
 
@@ -82,8 +97,11 @@ Outcome SimulatedNavigator::SelectSecondaryVideo(std::uint64_t number)
 
 Outcome SimulatedNavigator::ShowSecondaryVideo(bool shown)
 {
+    const Outcome possible =
+        CheckShowing(shown, m_Playhead.CurrentStreams().secondaryVideo, "secondary video");
     return Switch<bdmv::SecondaryVideoDisplayEvent>(bd::UserOperationSecondaryVideoEnableDisable,
-                                                    m_State.selection.secondaryVideoShown, shown);
+                                                    possible, m_State.selection.secondaryVideoShown,
+                                                    shown);
 }
 
 Outcome SimulatedNavigator::SelectSecondaryAudio(std::uint64_t number)
@@ -95,8 +113,11 @@ Outcome SimulatedNavigator::SelectSecondaryAudio(std::uint64_t number)
 
 Outcome SimulatedNavigator::ShowSecondaryAudio(bool shown)
 {
+    const Outcome possible =
+        CheckShowing(shown, m_Playhead.CurrentStreams().secondaryAudio, "secondary audio");
     return Switch<bdmv::SecondaryAudioDisplayEvent>(bd::UserOperationSecondaryAudioEnableDisable,
-                                                    m_State.selection.secondaryAudioShown, shown);
+                                                    possible, m_State.selection.secondaryAudioShown,
+                                                    shown);
 }
 
 Outcome SimulatedNavigator::SelectPipSubtitle(std::uint64_t number)
@@ -109,6 +130,7 @@ Outcome SimulatedNavigator::SelectPipSubtitle(std::uint64_t number)
 Outcome SimulatedNavigator::PickPipSubtitle(bool pick)
 {
     return Switch<bdmv::PipPgTextSelectEvent>(bd::UserOperationPiPPGTextSTStreamNumberChange,
+                                              m_Permission.CheckActive(),
                                               m_State.selection.pipPgPicked, pick);
 }
 

@@ -174,6 +174,26 @@ TEST(Streams, AreShownAndHidden)
     }
 }
 
+TEST(Streams, ThatAnItemLacksCanBeHiddenButNotShown)
+{
+    TestDesk desk(ListOf({RichItem(10), Item(10)}));
+    desk.Start(Second);
+    desk.Do(desk.navigator.ShowSecondaryVideo(true));
+    desk.Do(desk.navigator.ShowSecondaryAudio(true));
+    desk.Do(desk.navigator.SearchTime(11 * Second));
+
+    EXPECT_EQ(desk.navigator.ShowSecondaryVideo(true).Reason(),
+              "the play item has no secondary video");
+    EXPECT_EQ(desk.navigator.ShowSecondaryAudio(true).Reason(),
+              "the play item has no secondary audio");
+    EXPECT_EQ(desk.Take(), "");
+
+    EXPECT_TRUE(desk.navigator.ShowSecondaryVideo(false).IsDone());
+    EXPECT_TRUE(desk.navigator.ShowSecondaryAudio(false).IsDone());
+    EXPECT_EQ(desk.Take(), "1 SecondaryVideoDisplay(0, false)\n"
+                           "1 SecondaryAudioDisplay(0, false)\n");
+}
+
 TEST(Streams, HiddenSubtitlesAreNotAvailable)
 {
     TestDesk desk(ListOf({RichItem(10)}));
