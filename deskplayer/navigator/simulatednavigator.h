@@ -24,6 +24,9 @@
 namespace deskplayer
 {
 
+/** The picture in the coordinates of zoom rectangles, whatever the format of the video. */
+constexpr bd::ZoomRectangleDef WholePicture = {0, 0, 1920, 1080};
+
 /**
  * Plays a play list on a virtual clock and sends the events that a navigator would.
  *
@@ -133,6 +136,7 @@ public:
 
     // The picture.
 
+    /** Both rectangles must lie within WholePicture and have an area. */
     Outcome Zoom(const bd::ZOOM_PARAM_Def& zoom);
 
     // The menu. Its buttons, numbered from 1, each play a chapter from its start.

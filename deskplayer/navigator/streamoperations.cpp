@@ -1,5 +1,6 @@
 // The operations of the navigator on streams, the picture and the menu.
 
+#include <cstdint>
 #include <string>
 #include <utility>
 #include <vector>
@@ -9,6 +10,28 @@
 
 namespace deskplayer
 {
+
+namespace
+{
+
+/** An empty text if a rectangle has an area and lies within the picture, otherwise why not. */
+std::string ProblemOf(const bd::ZoomRectangleDef& rectangle)
+{
+    if (rectangle.Width == 0 || rectangle.Height == 0) {
+        return "a rectangle of " + std::to_string(rectangle.Width) + "x" +
+               std::to_string(rectangle.Height) + " has no area";
+    }
+    const std::uint32_t right = std::uint32_t{rectangle.X} + rectangle.Width;
+    const std::uint32_t bottom = std::uint32_t{rectangle.Y} + rectangle.Height;
+    if (right > WholePicture.Width || bottom > WholePicture.Height) {
+        return "the rectangle extends to " + std::to_string(right) + "," + std::to_string(bottom) +
+               ", but the picture is " + std::to_string(WholePicture.Width) + "x" +
+               std::to_string(WholePicture.Height);
+    }
+    return "";
+}
+
+} // namespace
 
 // ---------------------------------------------------------------------------------------------
 // Streams
@@ -136,7 +159,14 @@ Outcome SimulatedNavigator::PickPipSubtitle(bool pick)
 
 Outcome SimulatedNavigator::Zoom(const bd::ZOOM_PARAM_Def& zoom)
 {
-    return Operate(m_Permission.CheckActive(), [this, &zoom] {
+    Outcome outcome = m_Permission.CheckActive();
+    for (const bd::ZoomRectangleDef& rectangle : {zoom.rClipRectangle, zoom.rDestRectangle}) {
+        const std::string problem = ProblemOf(rectangle);
+        if (outcome.IsDone() && !problem.empty()) {
+            outcome = Outcome::Refused(problem);
+        }
+    }
+    return Operate(outcome, [this, &zoom] {
         m_State.zoom = zoom;
         m_Sender.Send<bdmv::ZoomModeSetEvent>();
     });

@@ -256,6 +256,38 @@ TEST(Streams, AreZoomed)
     EXPECT_EQ(desk.Take(), "1 ZoomModeSet(((1, 2, 3, 4), (5, 6, 7, 8), 9))\n");
 }
 
+TEST(Streams, AreZoomedToTheBordersOfThePicture)
+{
+    TestDesk desk(ListOf({Item(10)}));
+    desk.Start(Second);
+
+    EXPECT_TRUE(desk.navigator.Zoom({WholePicture, WholePicture, 0}).IsDone());
+    EXPECT_TRUE(desk.navigator.Zoom({{1919, 1079, 1, 1}, WholePicture, 0}).IsDone());
+}
+
+TEST(Streams, AreNotZoomedToRectanglesOutsideThePicture)
+{
+    TestDesk desk(ListOf({Item(10)}));
+    desk.Start(Second);
+    const std::string before = desk.Snapshot();
+    const struct {
+        bd::ZoomRectangleDef rectangle;
+        const char* reason;
+    } cases[] = {{{0, 0, 0, 0}, "a rectangle of 0x0 has no area"},
+                 {{0, 0, 1, 0}, "a rectangle of 1x0 has no area"},
+                 {{0, 0, 0, 1}, "a rectangle of 0x1 has no area"},
+                 {{1919, 0, 2, 1}, "the rectangle extends to 1921,1, but the picture is 1920x1080"},
+                 {{0, 1080, 1, 1}, "the rectangle extends to 1,1081, but the picture is 1920x1080"},
+                 {{65535, 65535, 65535, 65535},
+                  "the rectangle extends to 131070,131070, but the picture is 1920x1080"}};
+    for (const auto& wrong : cases) {
+        EXPECT_EQ(desk.navigator.Zoom({wrong.rectangle, WholePicture, 0}).Reason(), wrong.reason);
+        EXPECT_EQ(desk.navigator.Zoom({WholePicture, wrong.rectangle, 0}).Reason(), wrong.reason);
+    }
+    EXPECT_EQ(desk.Take(), "");
+    EXPECT_EQ(desk.Snapshot(), before);
+}
+
 /** A play item whose secondary streams come from a sub path of @p type. */
 PlayList WithSecondaryStreamsOf(bd::SubPathType type)
 {
