@@ -130,6 +130,8 @@ Outcome SimulatedNavigator::SearchTime(Ticks position)
     Outcome outcome = m_Permission.CheckActive();
     if (outcome.IsDone() && position >= duration) {
         outcome = Outcome::Refused("the play list ends at " + TimeText(duration));
+    } else if (outcome.IsDone()) {
+        outcome = CheckRandomAccess(position);
     }
     return Operate(bd::UserOperationTimeSearch, outcome,
                    [this, position] { m_Transport.JumpTo(position); });
@@ -170,9 +172,21 @@ Outcome SimulatedNavigator::JumpToChapter(bd::UserOperationMaskDef operation, st
                       ? Outcome::Refused("the mark of chapter " + std::to_string(number) +
                                          " is outside its play item")
                       : Outcome::NoSuch("chapter", number, last);
+    } else if (outcome.IsDone()) {
+        outcome = CheckRandomAccess(chapter->start);
     }
     const Ticks start = chapter == nullptr ? Ticks(0) : chapter->start;
     return Operate(operation, outcome, [this, start] { m_Transport.JumpTo(start); });
+}
+
+/** A flag does not restrict jumps within its play item: playback has entered it already. */
+Outcome SimulatedNavigator::CheckRandomAccess(Ticks position) const
+{
+    const std::size_t item = m_Playhead.ItemAt(position);
+    return item != m_State.item && m_PlayList.playList.playItems[item].randomAccessFlag
+               ? Outcome::Refused("play item " + std::to_string(item) +
+                                  " does not permit random access")
+               : Outcome::Done();
 }
 
 // ---------------------------------------------------------------------------------------------

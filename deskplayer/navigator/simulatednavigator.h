@@ -97,6 +97,9 @@ public:
 
     // Position.
 
+    // A jump into another play item whose random access flag is set is refused. Buttons, repeats
+    // and the return from standby are not the viewer's jumps and ignore the flag.
+
     Outcome SearchTime(Ticks position);
     Outcome SearchChapter(std::uint64_t number);
     Outcome SkipToNextChapter();
@@ -200,6 +203,7 @@ private:
                    bool value);
     Outcome CheckShowing(bool shown, const std::vector<Stream>& streams, const char* what) const;
     Outcome JumpToChapter(bd::UserOperationMaskDef operation, std::uint64_t number);
+    Outcome CheckRandomAccess(Ticks position) const;
     void SetTriggerType(bd::TriggerType type, bool result);
     Outcome SetChapterTitleRepeat(bd::TriggerType repeat);
     Outcome CheckMenu() const;
