@@ -24,6 +24,7 @@
 #include "output/textoutput.h"
 #include "program/failure.h"
 #include "program/options.h"
+#include "program/playbacktype.h"
 #include "program/progress.h"
 #include "program/sessionfile.h"
 #include "program/target.h"
@@ -119,6 +120,7 @@ int Run(const Options& options)
         DescribePlayList(target.Open(), disc, *options.describe, playList);
     } else {
         LoadedPlayList playList = Load(disc, options);
+        ReportPlaybackType(playList);
         const std::vector<ScriptStep> steps =
             options.session.empty() ? std::vector<ScriptStep>() : ReadSessionFile(options.session);
         Play(std::move(playList), steps, options, outputOptions, target.Open());
