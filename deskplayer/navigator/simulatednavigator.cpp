@@ -69,7 +69,9 @@ Outcome SimulatedNavigator::Step()
 {
     Outcome outcome = m_Permission.CheckStatus({Status::Paused});
     if (outcome.IsDone() && !m_Transport.CanStep()) {
-        outcome = Outcome::Refused("the play item has no further picture in this direction");
+        outcome = Outcome::Refused(m_State.playMode.Direction() == bd::PlayDirectionForward
+                                       ? "no further picture before a still or the end"
+                                       : "this is the first picture");
     }
     return Operate(outcome, [this] { m_Transport.Step(); });
 }

@@ -77,8 +77,9 @@ public:
     Outcome Continue();
 
     /**
-     * Shows the next picture in the direction of play; only while paused. Listeners are notified of
-     * the marks and positions passed, and then of the step.
+     * Shows the next picture in the direction of play, which may be in another play item; only
+     * while paused. Refused where a still, or the end or start of the play list, comes first.
+     * Listeners are notified of everything passed, and then of the step.
      */
     Outcome Step();
 

@@ -70,12 +70,12 @@ public:
     void ChangePlayMode(bd::PlayMode mode);
 
     /**
-     * Moves by one picture and announces the marks and positions passed. A repeat ends the step at
-     * its start.
+     * Moves to the next picture, which may be in another play item, and announces everything passed
+     * as playback does. A repeat ends the step at its start. Only if CanStep().
      */
     void Step();
 
-    /** Whether the play item has another picture in the direction of the step. */
+    /** Whether there is another picture in the direction of the step, and no still before it. */
     bool CanStep() const;
 
     /** Moves to a position and announces everything that differs there. */
@@ -95,6 +95,9 @@ private:
     void ReachTrigger(bd::TriggerType type);
     void ReachEnd();
     void ReachEndOfItem();
+    Ticks NextPicture() const;
+    bool RepeatsAt(Ticks position) const;
+    bool CanLeaveItem() const;
 
     VirtualClock& m_rClock;
     PlaybackState& m_rState;
