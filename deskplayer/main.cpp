@@ -52,8 +52,8 @@ OutputOptions OutputOptionsOf(const Options& options)
     } catch (const std::invalid_argument& error) {
         throw UsageError(error.what());
     }
-    output.coloured =
-        options.output.empty() && WantsColours(STDOUT_FILENO, std::getenv("NO_COLOR"));
+    output.coloured = options.output.empty() &&
+                      WantsColours(STDOUT_FILENO, std::getenv("NO_COLOR"), std::getenv("TERM"));
     return output;
 }
 

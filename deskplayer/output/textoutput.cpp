@@ -107,10 +107,11 @@ void TextOutput::Paint(std::string_view text, const char* colour)
     }
 }
 
-bool WantsColours(int fileDescriptor, const char* noColor)
+bool WantsColours(int fileDescriptor, const char* noColor, const char* terminal)
 {
     const bool forbidden = noColor != nullptr && *noColor != '\0';
-    return !forbidden && isatty(fileDescriptor) == 1;
+    const bool isDumb = terminal != nullptr && std::string_view(terminal) == "dumb";
+    return !forbidden && !isDumb && isatty(fileDescriptor) == 1;
 }
 
 } // namespace deskplayer

@@ -114,8 +114,16 @@ bool TakeCharacter(std::string_view& text, char character)
     return found;
 }
 
+bool IsNegative(std::string_view word)
+{
+    return TakeCharacter(word, '-') && TakeNumber(word);
+}
+
 Meaning ReadNumber(std::string_view word)
 {
+    if (IsNegative(word)) {
+        return {0, "is negative"};
+    }
     const auto number = TakeNumber(word);
     if (!number) {
         return {0, Unexpected};
@@ -167,6 +175,9 @@ Meaning ReadTime(std::string_view word)
 {
     constexpr Meaning notATime{0, "is not a time"};
 
+    if (IsNegative(word)) {
+        return {0, "is negative"};
+    }
     const auto first = TakeNumber(word);
     if (!first) {
         return {0, Unexpected};
@@ -375,6 +386,10 @@ std::vector<ScriptStep> ParseScript(std::string_view text, const std::string& fi
         throw ScriptError(fileName, 1, 1,
                           "the script has " + std::to_string(text.size()) +
                               " bytes; expected at most " + std::to_string(LongestScript));
+    }
+    constexpr std::string_view byteOrderMark = "\xEF\xBB\xBF";
+    if (text.substr(0, byteOrderMark.size()) == byteOrderMark) {
+        text.remove_prefix(byteOrderMark.size());
     }
     const std::vector<Form> forms = FormsOf(syntaxes);
     Forms allForms;

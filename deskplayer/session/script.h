@@ -85,8 +85,9 @@ public:
 /**
  * Reads a script.
  *
- * Lines end in LF or CR LF, which the last line may lack. Comments may contain any bytes except
- * control characters. Time and memory are linear in the length of the text.
+ * A byte order mark at the start is ignored. Lines end in LF or CR LF, which the last line may
+ * lack. Comments may contain any bytes except control characters. Time and memory are linear in the
+ * length of the text.
  *
  * @param text     the whole script
  * @param fileName for messages

@@ -107,6 +107,21 @@ TEST(ParseScript, ReadsNothingFromAnEmptyText)
     EXPECT_TRUE(Parse("").empty());
 }
 
+TEST(ParseScript, IgnoresAByteOrderMarkAtTheStart)
+{
+    EXPECT_EQ(ParseLine("\xEF\xBB\xBFplay").command, CommandPlay);
+    EXPECT_EQ(ErrorOf("\xEF\xBB\xBFplay now"),
+              "1:6: unexpected 'now'; expected the end of the line");
+    EXPECT_EQ(ErrorOf("play\n\xEF\xBB\xBFplay").substr(0, 4), "2:1:");
+}
+
+TEST(ParseScript, NamesNegativeTimesAndNumbers)
+{
+    EXPECT_EQ(ErrorOf("after -1s play"), "1:7: '-1s' is negative; expected " + TimeHelp);
+    EXPECT_EQ(ErrorOf("chapter -1"), "1:9: '-1' is negative; expected next, previous or a NUMBER");
+    EXPECT_EQ(ErrorOf("chapter -x"), "1:9: unexpected '-x'; expected next, previous or a NUMBER");
+}
+
 TEST(ParseScript, ReadsOneCommandPerLine)
 {
     const auto steps = Parse("chapter next\nplay\n");
@@ -370,7 +385,7 @@ TEST(ParseScriptRefuses, NumbersWithTrailingCharacters)
 
 TEST(ParseScriptRefuses, NumbersWithASign)
 {
-    EXPECT_EQ(ErrorOf("subtitle style -1"), "1:16: unexpected '-1'; expected a NUMBER");
+    EXPECT_EQ(ErrorOf("subtitle style -1"), "1:16: '-1' is negative; expected a NUMBER");
     EXPECT_EQ(ErrorOf("subtitle style +1"), "1:16: unexpected '+1'; expected a NUMBER");
 }
 
@@ -385,7 +400,7 @@ TEST(ParseScriptRefuses, MalformedTimes)
 
 TEST(ParseScriptRefuses, WordsInPlaceOfATime)
 {
-    for (const std::string time : {"soon", "-1", "+1", ".5", ":30", "s"}) {
+    for (const std::string time : {"soon", "-", "+1", ".5", ":30", "s"}) {
         EXPECT_EQ(TimeErrorOf(time), "1:6: unexpected '" + time + "'");
     }
 }
