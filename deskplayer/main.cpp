@@ -26,11 +26,11 @@
 #include "program/options.h"
 #include "program/playbacktype.h"
 #include "program/progress.h"
+#include "program/sessionchecks.h"
 #include "program/sessionfile.h"
 #include "program/target.h"
 #include "session/remote.h"
 #include "session/session.h"
-#include "text/timetext.h"
 
 namespace deskplayer
 {
@@ -69,8 +69,9 @@ LoadedPlayList Load(const Disc& disc, const Options& options)
     return LoadPlayList(disc, longest.number, std::move(longest.playList));
 }
 
-void Play(LoadedPlayList playList, const std::vector<ScriptStep>& steps, const Options& options,
-          const OutputOptions& outputOptions, std::ostream& stream)
+/** @return the exit status */
+int Play(LoadedPlayList playList, const std::vector<ScriptStep>& steps, const Options& options,
+         const OutputOptions& outputOptions, std::ostream& stream)
 {
     Desk desk(std::move(playList));
     const std::unique_ptr<Output> output = MakeOutput(outputOptions, stream, desk.Clock());
@@ -79,7 +80,7 @@ void Play(LoadedPlayList playList, const std::vector<ScriptStep>& steps, const O
     if (options.remote) {
         std::cerr << RemoteHelp();
         PlayByRemote(desk, STDIN_FILENO, PrintMessage);
-        return;
+        return ExitOk;
     }
 
     Progress progress(desk.Clock(), options);
@@ -94,15 +95,14 @@ void Play(LoadedPlayList playList, const std::vector<ScriptStep>& steps, const O
                 std::chrono::duration_cast<std::chrono::nanoseconds>(desk.Clock().Now() + time));
         }
     };
-    hooks.onRefused = [&options, &desk](std::size_t line, const std::string& reason) {
-        PrintMessage(options.session + ":" + std::to_string(line) + ": refused at " +
-                     TimeText(desk.Clock().Now()) + ": " + reason);
-    };
+    SessionChecks checks(options, desk);
+    checks.AddTo(hooks);
     if (options.session.empty()) {
         PlayFromStartToEnd(desk, hooks);
     } else {
         PlaySession(steps, desk, hooks);
     }
+    return checks.HaveFailed() ? ExitSession : ExitOk;
 }
 
 /** @return the exit status */
@@ -123,7 +123,7 @@ int Run(const Options& options)
         ReportPlaybackType(playList);
         const std::vector<ScriptStep> steps =
             options.session.empty() ? std::vector<ScriptStep>() : ReadSessionFile(options.session);
-        Play(std::move(playList), steps, options, outputOptions, target.Open());
+        status = Play(std::move(playList), steps, options, outputOptions, target.Open());
     }
     target.Finish();
     return status;

@@ -60,12 +60,15 @@ void AddOptions(CLI::App& app, Options& options)
         app.add_option("--session", options.session,
                        "Session file to carry out; by default, play from start to end")
             ->type_name("FILE");
+    auto* const strict = app.add_flag("--strict", options.strict,
+                                      "Exit with status 4 if a command of the session was refused")
+                             ->needs(session);
     auto* const realTime =
         app.add_flag("--realtime", options.realTime, "Play in real time instead of at once");
     auto* const remote = app.add_flag("--remote", options.remote,
                                       "Play in real time, with single keys as a remote control")
                              ->excludes(session);
-    for (CLI::Option* const playing : {playList, session, realTime, remote}) {
+    for (CLI::Option* const playing : {playList, session, strict, realTime, remote}) {
         playing->excludes(list)->excludes(describe);
     }
 
@@ -92,7 +95,8 @@ void AddOptions(CLI::App& app, Options& options)
         "  bdmv-deskplayer disc --only PlayItem,ChapterNumber --format json\n"
         "  bdmv-deskplayer disc --remote\n\n"
         "Exit status: 0 success, 1 the output could not be written, 2 wrong usage or a session\n"
-        "that cannot be read, 3 the disc cannot be read.");
+        "that cannot be read, 3 the disc cannot be read, 4 the session failed: with --strict, a\n"
+        "command was refused.");
 }
 
 } // namespace deskplayer

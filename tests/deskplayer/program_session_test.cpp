@@ -47,6 +47,27 @@ TEST_F(DeskPlayerSession, WithTheEveningSessionPlaysToTheEnd)
               "08:03:35.000  Finished                    reason=EndOfMedia");
 }
 
+TEST_F(DeskPlayerSession, FailsWithStrictIfACommandWasRefused)
+{
+    const std::string refused = WriteFile("a.session", "play\npause\nplay\nafter 1s stop\n");
+    const std::string accepted = WriteFile("b.session", "play\npause\nafter 1s stop\n");
+
+    const ProgramResult strict =
+        RunDeskPlayer({SampleDisc, "--strict", "--session", refused, "--only", "Stopped"});
+    const ProgramResult lenient =
+        RunDeskPlayer({SampleDisc, "--session", refused, "--only", "Stopped"});
+
+    EXPECT_EQ(strict.status, 4);
+    EXPECT_EQ(lenient.status, 0);
+    EXPECT_EQ(strict.output, "00:00:01.000  Stopped\n") << "the session continues";
+    EXPECT_EQ(strict.output, lenient.output);
+    EXPECT_EQ(strict.errors, "bdmv-deskplayer: " + refused +
+                                 ":3: refused at 00:00:00.000: not stopped or finished, but "
+                                 "paused\n");
+    EXPECT_EQ(strict.errors, lenient.errors);
+    EXPECT_EQ(RunDeskPlayer({SampleDisc, "--strict", "--session", accepted}).status, 0);
+}
+
 TEST_F(DeskPlayerSession, AlwaysHasTheSameOutput)
 {
     for (const char* const format : {"text", "json", "trace"}) {

@@ -16,7 +16,8 @@ TEST(DeskPlayerUsage, IsDescribedByHelp)
     EXPECT_EQ(help.errors, "");
     for (const char* const option :
          {"--help", "--version", "--commands", "--playlist", "--list", "--describe", "--session",
-          "--realtime", "--remote", "--format", "--output", "--listen", "--only", "--log"}) {
+          "--strict", "--realtime", "--remote", "--format", "--output", "--listen", "--only",
+          "--log"}) {
         EXPECT_NE(help.output.find(option), std::string::npos) << option;
     }
 
@@ -45,6 +46,8 @@ TEST(DeskPlayerUsage, IsRefusedWithStatus2WhenInvalid)
         {SampleDisc, "--describe", "100000"},
         {SampleDisc, "--no-such-option"},
         {SampleDisc, "--session"},
+        {SampleDisc, "--strict"},
+        {SampleDisc, "--strict", "--remote"},
         {SampleDisc, "--log", "NoSuchComponent=Event"}};
     for (const std::vector<std::string>& arguments : wrong) {
         const ProgramResult result = RunDeskPlayer(arguments);

@@ -35,7 +35,8 @@ TEST(FindChoice, ListsAllChoicesIfNoneIsSimilar)
 {
     for (const std::string word : {"", "P", "xml", "Stopped"}) {
         EXPECT_EQ(ErrorOf(word),
-                  "'" + word + "' is not a callback; expected PlayItem, PlayMode, Paused or UOMask");
+                  "'" + word +
+                      "' is not a callback; expected PlayItem, PlayMode, Paused or UOMask");
     }
     EXPECT_EQ(ErrorOf(std::string(1000000, 'P')).find("did you mean"), std::string::npos);
 }
