@@ -168,7 +168,7 @@ TEST_F(HostileInput, MayBeASessionOfOneLineOrWord)
     const std::string line = WriteFile("line.session", words);
     ExpectRefusedSession(line, line + ":1:1: unexpected 'a'");
     const std::string word = WriteFile("word.session", std::string(deskplayer::LongestScript, 'a'));
-    ExpectRefusedSession(word, word + ":1:1: 'aaa");
+    ExpectRefusedSession(word, word + ":1:1: unexpected 'aaa");
     const std::string late =
         WriteFile("late.session", std::string(deskplayer::LongestScript - 1, '\n') + "x");
     ExpectRefusedSession(late, late + ":1048576:1: unexpected 'x'");
