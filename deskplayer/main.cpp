@@ -95,7 +95,7 @@ int Play(LoadedPlayList playList, const std::vector<ScriptStep>& steps, const Op
                 std::chrono::duration_cast<std::chrono::nanoseconds>(desk.Clock().Now() + time));
         }
     };
-    SessionChecks checks(options, desk);
+    SessionChecks checks(options, steps, desk);
     checks.AddTo(hooks);
     if (options.session.empty()) {
         PlayFromStartToEnd(desk, hooks);

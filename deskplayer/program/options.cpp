@@ -16,7 +16,7 @@ namespace
 void PrintCommands()
 {
     for (const CommandSyntax& syntax : CommandSyntaxes()) {
-        std::cout << std::left << std::setw(36) << syntax.pattern << syntax.help << '\n';
+        std::cout << std::left << std::setw(38) << syntax.pattern << syntax.help << '\n';
     }
 }
 
@@ -95,8 +95,8 @@ void AddOptions(CLI::App& app, Options& options)
         "  bdmv-deskplayer disc --only PlayItem,ChapterNumber --format json\n"
         "  bdmv-deskplayer disc --remote\n\n"
         "Exit status: 0 success, 1 the output could not be written, 2 wrong usage or a session\n"
-        "that cannot be read, 3 the disc cannot be read, 4 the session failed: with --strict, a\n"
-        "command was refused.");
+        "that cannot be read, 3 the disc cannot be read, 4 the session failed: an expectation\n"
+        "was not met or, with --strict, a command was refused.");
 }
 
 } // namespace deskplayer

@@ -7,7 +7,9 @@
 
 #include <cstddef>
 #include <string>
+#include <vector>
 
+#include "output/callbackrecorder.h"
 #include "program/options.h"
 #include "session/session.h"
 
@@ -18,9 +20,14 @@ namespace deskplayer
 class SessionChecks
 {
 public:
-    /** @param options and @p desk must outlive the checks */
-    SessionChecks(const Options& options, Desk& desk) : m_rOptions(options), m_rDesk(desk) {}
+    /**
+     * Registers a listener at the desk if the session has expectations.
+     *
+     * @param options and @p desk must outlive the checks
+     */
+    SessionChecks(const Options& options, const std::vector<ScriptStep>& steps, Desk& desk);
 
+    ~SessionChecks() { m_rDesk.Listeners().RemoveListener(&m_Recorder); }
     SessionChecks(const SessionChecks&) = delete;
     SessionChecks& operator=(const SessionChecks&) = delete;
 
@@ -30,10 +37,13 @@ public:
     bool HaveFailed() const { return m_Failed; }
 
 private:
+    void CheckExpectation(const ScriptStep& step);
+    void Report(std::size_t line, const std::string& message) const;
     void ReportRefusal(std::size_t line, const std::string& reason);
 
     const Options& m_rOptions;
     Desk& m_rDesk;
+    CallbackRecorder m_Recorder;
     bool m_Failed = false;
 };
 

@@ -217,9 +217,17 @@ const std::vector<CommandSyntax>& CommandSyntaxes()
         std::vector<CommandSyntax> all;
         std::transform(Commands().begin(), Commands().end(), std::back_inserter(all),
                        [](const Command& command) { return command.syntax; });
+        all.push_back({"expect nothing", "fail if there were callbacks since the last command"});
+        all.push_back({"expect CALLBACK [ARGUMENT=VALUE ...]",
+                       "fail unless there was such a callback since the last command"});
         return all;
     }();
     return syntaxes;
+}
+
+bool IsExpectation(const ScriptStep& step)
+{
+    return step.command >= Commands().size();
 }
 
 } // namespace deskplayer

@@ -68,6 +68,50 @@ TEST_F(DeskPlayerSession, FailsWithStrictIfACommandWasRefused)
     EXPECT_EQ(RunDeskPlayer({SampleDisc, "--strict", "--session", accepted}).status, 0);
 }
 
+TEST_F(DeskPlayerSession, FailsIfAnExpectationIsNotMet)
+{
+    const std::string session =
+        WriteFile("a.session", "expect nothing\n"
+                               "play\n"
+                               "after 2.5s expect PlayStarted\n"
+                               "expect PlayItem playItemId=0\n"
+                               "expect CurrentTimePosition position=00:00:02.000\n"
+                               "subtitle off\n"
+                               "expect PresentationGraphicsDisplay shown=true\n"
+                               "pause\n"
+                               "expect nothing\n"
+                               "expect Paused\n"
+                               "pause\n"
+                               "expect Paused\n"
+                               "expect nothing\n"
+                               "after 1s stop\n"
+                               "expect Stopped\n");
+
+    const ProgramResult result =
+        RunDeskPlayer({SampleDisc, "--playlist", "1", "--session", session, "--only", "Stopped"});
+
+    EXPECT_EQ(result.status, 4);
+    EXPECT_EQ(result.output, "00:00:03.500  Stopped\n") << "the session continues";
+    const std::vector<std::string> lines = LinesOf(result.errors);
+    const std::string start = "bdmv-deskplayer: " + session;
+    ASSERT_EQ(lines.size(), 4U) << result.errors;
+    EXPECT_EQ(lines[0], start + ":7: expected PresentationGraphicsDisplay shown=true by "
+                                "00:00:02.500; since the last command: "
+                                "PresentationGraphicsDisplay shown=false");
+    EXPECT_EQ(lines[1], start + ":9: expected nothing by 00:00:02.500; since the last command: "
+                                "Paused");
+    EXPECT_EQ(lines[3], start + ":12: expected Paused by 00:00:02.500; since the last command: "
+                                "nothing");
+}
+
+TEST_F(DeskPlayerSession, RefusesAnExpectationOfAnUnknownCallback)
+{
+    const std::string session = WriteFile("a.session", "play\nexpect playstarted\n");
+
+    ExpectUsageError({SampleDisc, "--session", session},
+                     session + ":2:8: 'playstarted' is not a callback; did you mean PlayStarted?");
+}
+
 TEST_F(DeskPlayerSession, AlwaysHasTheSameOutput)
 {
     for (const char* const format : {"text", "json", "trace"}) {

@@ -30,9 +30,10 @@ TEST(DeskPlayerUsage, IsDescribedByHelp)
     const ProgramResult commands = RunDeskPlayer({"--commands"});
     EXPECT_EQ(commands.status, 0);
     EXPECT_EQ(LinesOf(commands.output).front(),
-              "play                                start at the beginning of the play list");
-    EXPECT_EQ(LinesOf(commands.output).back(),
-              "fail stream                         make the stream run out of data");
+              "play                                  start at the beginning of the play list");
+    EXPECT_EQ(LinesOf(commands.output).back(), "expect CALLBACK [ARGUMENT=VALUE ...]  fail unless "
+                                               "there was such a callback since the last "
+                                               "command");
 }
 
 TEST(DeskPlayerUsage, IsRefusedWithStatus2WhenInvalid)
