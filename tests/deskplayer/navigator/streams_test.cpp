@@ -1,6 +1,7 @@
 #include <gtest/gtest.h>
 
 #include <functional>
+#include <utility>
 
 #include "../testdesk.h"
 
@@ -371,6 +372,25 @@ TEST(SecondaryStreams, AreAnnouncedUnavailableOnceInAnItemWithoutThem)
                   "10 SecondaryAudioInfo(0)\n"
                   "10 SecondaryAudioDisplay(0, false)\n");
     }
+}
+
+TEST(SecondaryStreams, ThatAreAsyncAreAnnouncedInANewItemAtAnySpeed)
+{
+    PlayList playList = WithSecondaryStreamsOf(bd::SubPathOutOfMuxASynchPipPresentationPath);
+    std::swap(playList.playItems[0], playList.playItems[1]);
+    TestDesk desk(playList);
+    desk.Start();
+    desk.navigator.SetPlayMode(Fast());
+    desk.Take();
+
+    desk.navigator.SearchTime(15 * Second);
+
+    const std::string received = desk.Take();
+    EXPECT_NE(received.find(Available), std::string::npos) << received;
+    EXPECT_EQ(received.find("Unavailable"), std::string::npos) << received;
+    desk.navigator.SetPlayMode(bd::PlayMode());
+    EXPECT_EQ(desk.Take(),
+              std::string("0 PlayMode(PlayDirectionForward, PlaySpeedNormal)\n") + Available);
 }
 
 TEST(SecondaryStreams, OfAMissingSubPathAreSync)
