@@ -24,12 +24,13 @@
 #include "output/textoutput.h"
 #include "program/failure.h"
 #include "program/options.h"
+#include "program/playbacktype.h"
 #include "program/progress.h"
+#include "program/sessionchecks.h"
 #include "program/sessionfile.h"
 #include "program/target.h"
 #include "session/remote.h"
 #include "session/session.h"
-#include "text/timetext.h"
 
 namespace deskplayer
 {
@@ -51,8 +52,8 @@ OutputOptions OutputOptionsOf(const Options& options)
     } catch (const std::invalid_argument& error) {
         throw UsageError(error.what());
     }
-    output.coloured =
-        options.output.empty() && WantsColours(STDOUT_FILENO, std::getenv("NO_COLOR"));
+    output.coloured = options.output.empty() &&
+                      WantsColours(STDOUT_FILENO, std::getenv("NO_COLOR"), std::getenv("TERM"));
     return output;
 }
 
@@ -68,8 +69,9 @@ LoadedPlayList Load(const Disc& disc, const Options& options)
     return LoadPlayList(disc, longest.number, std::move(longest.playList));
 }
 
-void Play(LoadedPlayList playList, const std::vector<ScriptStep>& steps, const Options& options,
-          const OutputOptions& outputOptions, std::ostream& stream)
+/** @return the exit status */
+int Play(LoadedPlayList playList, const std::vector<ScriptStep>& steps, const Options& options,
+         const OutputOptions& outputOptions, std::ostream& stream)
 {
     Desk desk(std::move(playList));
     const std::unique_ptr<Output> output = MakeOutput(outputOptions, stream, desk.Clock());
@@ -78,7 +80,7 @@ void Play(LoadedPlayList playList, const std::vector<ScriptStep>& steps, const O
     if (options.remote) {
         std::cerr << RemoteHelp();
         PlayByRemote(desk, STDIN_FILENO, PrintMessage);
-        return;
+        return ExitOk;
     }
 
     Progress progress(desk.Clock(), options);
@@ -93,15 +95,14 @@ void Play(LoadedPlayList playList, const std::vector<ScriptStep>& steps, const O
                 std::chrono::duration_cast<std::chrono::nanoseconds>(desk.Clock().Now() + time));
         }
     };
-    hooks.onRefused = [&options, &desk](std::size_t line, const std::string& reason) {
-        PrintMessage(options.session + ":" + std::to_string(line) + ": refused at " +
-                     TimeText(desk.Clock().Now()) + ": " + reason);
-    };
+    SessionChecks checks(options, steps, desk);
+    checks.AddTo(hooks);
     if (options.session.empty()) {
         PlayFromStartToEnd(desk, hooks);
     } else {
         PlaySession(steps, desk, hooks);
     }
+    return checks.HaveFailed() ? ExitSession : ExitOk;
 }
 
 /** @return the exit status */
@@ -119,9 +120,10 @@ int Run(const Options& options)
         DescribePlayList(target.Open(), disc, *options.describe, playList);
     } else {
         LoadedPlayList playList = Load(disc, options);
+        ReportPlaybackType(playList);
         const std::vector<ScriptStep> steps =
             options.session.empty() ? std::vector<ScriptStep>() : ReadSessionFile(options.session);
-        Play(std::move(playList), steps, options, outputOptions, target.Open());
+        status = Play(std::move(playList), steps, options, outputOptions, target.Open());
     }
     target.Finish();
     return status;

@@ -78,9 +78,9 @@ struct PlayItem {
     ClipReference clip; ///< of angle 1
     std::uint8_t connectionCondition = 0;
     std::uint32_t inTime = 0;
-    std::uint32_t outTime = 0; ///< not before inTime; applies to all angles, like inTime
-    std::uint64_t uoMask = 0;  ///< as in the file; in addition to the one of the play list
-    bool randomAccessFlag = false;
+    std::uint32_t outTime = 0;     ///< not before inTime; applies to all angles, like inTime
+    std::uint64_t uoMask = 0;      ///< as in the file; in addition to the one of the play list
+    bool randomAccessFlag = false; ///< jumping into the play item is not permitted
     std::uint8_t stillMode = 0;
     std::uint16_t stillTime = 0; ///< seconds; 0 unless the still mode is StillModeTimed
     bool multiAngle = false;     ///< an angle table exists

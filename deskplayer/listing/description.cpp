@@ -32,8 +32,8 @@ using Fields = std::vector<Field>;
 
 const CodeName g_PlaybackTypes[] = {
     {PlaybackTypeInSequence, "in sequence"},
-    {PlaybackTypeRandom, "random"},
-    {PlaybackTypeShuffle, "shuffle"},
+    {PlaybackTypeRandom, "random; played in sequence"},
+    {PlaybackTypeShuffle, "shuffle; played in sequence"},
 };
 
 const CodeName g_ConnectionConditions[] = {

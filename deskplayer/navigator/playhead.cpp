@@ -60,6 +60,22 @@ const Chapter* Playhead::FindChapter(std::uint64_t number) const
     return found == chapters.end() ? nullptr : &*found;
 }
 
+const Chapter* Playhead::ChapterAfter(std::uint64_t number) const
+{
+    const std::vector<Chapter>& chapters = m_rPlayList.timeLine.chapters; // in order of number
+    const auto found = std::find_if(chapters.begin(), chapters.end(),
+                                    [number](const Chapter& c) { return c.number > number; });
+    return found == chapters.end() ? nullptr : &*found;
+}
+
+const Chapter* Playhead::ChapterBefore(std::uint64_t number) const
+{
+    const std::vector<Chapter>& chapters = m_rPlayList.timeLine.chapters;
+    const auto found = std::find_if(chapters.rbegin(), chapters.rend(),
+                                    [number](const Chapter& c) { return c.number < number; });
+    return found == chapters.rend() ? nullptr : &*found;
+}
+
 std::size_t Playhead::ItemAt(Ticks position) const
 {
     const std::vector<Ticks>& starts = m_rPlayList.timeLine.itemStarts;

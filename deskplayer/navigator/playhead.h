@@ -51,6 +51,15 @@ public:
     /** The chapter with this number, from 1; null if there is none. */
     const Chapter* FindChapter(std::uint64_t number) const;
 
+    /**
+     * The first chapter with a greater number; null if there is none. Chapters without a position,
+     * whose marks are outside their play items, are passed over here and in ChapterBefore().
+     */
+    const Chapter* ChapterAfter(std::uint64_t number) const;
+
+    /** The last chapter with a smaller number; null if there is none. */
+    const Chapter* ChapterBefore(std::uint64_t number) const;
+
     /** The play item at a position: the later one where two meet. */
     std::size_t ItemAt(Ticks position) const;
 

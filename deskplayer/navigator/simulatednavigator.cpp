@@ -69,7 +69,9 @@ Outcome SimulatedNavigator::Step()
 {
     Outcome outcome = m_Permission.CheckStatus({Status::Paused});
     if (outcome.IsDone() && !m_Transport.CanStep()) {
-        outcome = Outcome::Refused("the play item has no further picture in this direction");
+        outcome = Outcome::Refused(m_State.playMode.Direction() == bd::PlayDirectionForward
+                                       ? "no further picture before a still or the end"
+                                       : "this is the first picture");
     }
     return Operate(outcome, [this] { m_Transport.Step(); });
 }
@@ -130,6 +132,8 @@ Outcome SimulatedNavigator::SearchTime(Ticks position)
     Outcome outcome = m_Permission.CheckActive();
     if (outcome.IsDone() && position >= duration) {
         outcome = Outcome::Refused("the play list ends at " + TimeText(duration));
+    } else if (outcome.IsDone()) {
+        outcome = CheckRandomAccess(position);
     }
     return Operate(bd::UserOperationTimeSearch, outcome,
                    [this, position] { m_Transport.JumpTo(position); });
@@ -142,17 +146,21 @@ Outcome SimulatedNavigator::SearchChapter(std::uint64_t number)
 
 Outcome SimulatedNavigator::SkipToNextChapter()
 {
-    return JumpToChapter(bd::UserOperationSkipToNextPoint, m_Context.GetCurrentChapter() + 1U);
+    const std::uint64_t number = m_Context.GetCurrentChapter();
+    const Chapter* const next = m_Playhead.ChapterAfter(number);
+    return JumpToChapter(bd::UserOperationSkipToNextPoint,
+                         next == nullptr ? number + 1U : next->number);
 }
 
 Outcome SimulatedNavigator::SkipToPreviousChapter()
 {
     const std::uint64_t number = m_Context.GetCurrentChapter();
     const Chapter* const chapter = m_Playhead.FindChapter(number);
-    const bool justStarted =
-        chapter != nullptr && number > 1 && m_State.position - chapter->start < SkipBackWindow;
+    const Chapter* const previous = m_Playhead.ChapterBefore(number);
+    const bool justStarted = chapter != nullptr && previous != nullptr &&
+                             m_State.position - chapter->start < SkipBackWindow;
     return JumpToChapter(bd::UserOperationSkipBackToPreviousPoint,
-                         justStarted ? number - 1 : number);
+                         justStarted ? previous->number : number);
 }
 
 Outcome SimulatedNavigator::JumpToChapter(bd::UserOperationMaskDef operation, std::uint64_t number)
@@ -161,10 +169,26 @@ Outcome SimulatedNavigator::JumpToChapter(bd::UserOperationMaskDef operation, st
     const Chapter* const chapter = m_Playhead.FindChapter(number);
     Outcome outcome = m_Permission.CheckActive();
     if (outcome.IsDone() && chapter == nullptr) {
-        outcome = Outcome::NoSuch("chapter", number, chapters.empty() ? 0 : chapters.back().number);
+        const std::uint64_t last = chapters.empty() ? 0 : chapters.back().number;
+        outcome = number != 0 && number < last
+                      ? Outcome::Refused("the mark of chapter " + std::to_string(number) +
+                                         " is outside its play item")
+                      : Outcome::NoSuch("chapter", number, last);
+    } else if (outcome.IsDone()) {
+        outcome = CheckRandomAccess(chapter->start);
     }
     const Ticks start = chapter == nullptr ? Ticks(0) : chapter->start;
     return Operate(operation, outcome, [this, start] { m_Transport.JumpTo(start); });
+}
+
+/** A flag does not restrict jumps within its play item: playback has entered it already. */
+Outcome SimulatedNavigator::CheckRandomAccess(Ticks position) const
+{
+    const std::size_t item = m_Playhead.ItemAt(position);
+    return item != m_State.item && m_PlayList.playList.playItems[item].randomAccessFlag
+               ? Outcome::Refused("play item " + std::to_string(item) +
+                                  " does not permit random access")
+               : Outcome::Done();
 }
 
 // ---------------------------------------------------------------------------------------------
@@ -233,7 +257,10 @@ Outcome SimulatedNavigator::RepeatTitle()
 
 Outcome SimulatedNavigator::EndChapterTitleRepeat()
 {
-    return SetChapterTitleRepeat(bd::TRIGGER_NONE);
+    return Operate(m_Permission.CheckActive(), [this] {
+        m_State.chapterTitleRepeat = bd::TRIGGER_NONE;
+        SetTriggerType(bd::TRIGGER_NONE, true);
+    });
 }
 
 Outcome SimulatedNavigator::SetTrigger(Ticks position)

@@ -24,6 +24,9 @@
 namespace deskplayer
 {
 
+/** The picture in the coordinates of zoom rectangles, whatever the format of the video. */
+constexpr bd::ZoomRectangleDef WholePicture = {0, 0, 1920, 1080};
+
 /**
  * Plays a play list on a virtual clock and sends the events that a navigator would.
  *
@@ -74,8 +77,9 @@ public:
     Outcome Continue();
 
     /**
-     * Shows the next picture in the direction of play; only while paused. Listeners are notified of
-     * the marks and positions passed, and then of the step.
+     * Shows the next picture in the direction of play, which may be in another play item; only
+     * while paused. Refused where a still, or the end or start of the play list, comes first.
+     * Listeners are notified of everything passed, and then of the step.
      */
     Outcome Step();
 
@@ -94,6 +98,9 @@ public:
 
     // Position.
 
+    // A jump into another play item whose random access flag is set is refused. Buttons, repeats
+    // and the return from standby are not the viewer's jumps and ignore the flag.
+
     Outcome SearchTime(Ticks position);
     Outcome SearchChapter(std::uint64_t number);
     Outcome SkipToNextChapter();
@@ -110,6 +117,8 @@ public:
     Outcome EndABRepeat();
     Outcome RepeatChapter();
     Outcome RepeatTitle();
+
+    /** Leaves an A-B repeat as it is. */
     Outcome EndChapterTitleRepeat();
 
     /** Notifies listeners when playback reaches @p position, which may be the end. */
@@ -131,6 +140,7 @@ public:
 
     // The picture.
 
+    /** Both rectangles must lie within WholePicture and have an area. */
     Outcome Zoom(const bd::ZOOM_PARAM_Def& zoom);
 
     // The menu. Its buttons, numbered from 1, each play a chapter from its start.
@@ -190,8 +200,11 @@ private:
     Outcome SelectStream(bd::UserOperationMaskDef operation, std::uint64_t number,
                          std::size_t count, const char* what, Number& selected);
     template <typename Event>
-    Outcome Switch(bd::UserOperationMaskDef operation, bool& shown, bool value);
+    Outcome Switch(bd::UserOperationMaskDef operation, const Outcome& possible, bool& shown,
+                   bool value);
+    Outcome CheckShowing(bool shown, const std::vector<Stream>& streams, const char* what) const;
     Outcome JumpToChapter(bd::UserOperationMaskDef operation, std::uint64_t number);
+    Outcome CheckRandomAccess(Ticks position) const;
     void SetTriggerType(bd::TriggerType type, bool result);
     Outcome SetChapterTitleRepeat(bd::TriggerType repeat);
     Outcome CheckMenu() const;

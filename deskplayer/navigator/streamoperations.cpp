@@ -1,12 +1,37 @@
 // The operations of the navigator on streams, the picture and the menu.
 
+#include <cstdint>
+#include <string>
 #include <utility>
+#include <vector>
 
 #include "bdmvnavigator/navigatorevent.h"
 #include "navigator/simulatednavigator.h"
 
 namespace deskplayer
 {
+
+namespace
+{
+
+/** An empty text if a rectangle has an area and lies within the picture, otherwise why not. */
+std::string ProblemOf(const bd::ZoomRectangleDef& rectangle)
+{
+    if (rectangle.Width == 0 || rectangle.Height == 0) {
+        return "a rectangle of " + std::to_string(rectangle.Width) + "x" +
+               std::to_string(rectangle.Height) + " has no area";
+    }
+    const std::uint32_t right = std::uint32_t{rectangle.X} + rectangle.Width;
+    const std::uint32_t bottom = std::uint32_t{rectangle.Y} + rectangle.Height;
+    if (right > WholePicture.Width || bottom > WholePicture.Height) {
+        return "the rectangle extends to " + std::to_string(right) + "," + std::to_string(bottom) +
+               ", but the picture is " + std::to_string(WholePicture.Width) + "x" +
+               std::to_string(WholePicture.Height);
+    }
+    return "";
+}
+
+} // namespace
 
 // ---------------------------------------------------------------------------------------------
 // Streams
@@ -26,12 +51,24 @@ Outcome SimulatedNavigator::SelectStream(bd::UserOperationMaskDef operation, std
 }
 
 template <typename Event>
-Outcome SimulatedNavigator::Switch(bd::UserOperationMaskDef operation, bool& shown, bool value)
+Outcome SimulatedNavigator::Switch(bd::UserOperationMaskDef operation, const Outcome& possible,
+                                   bool& shown, bool value)
 {
-    return Operate(operation, m_Permission.CheckActive(), [&, value] {
+    return Operate(operation, possible, [&, value] {
         shown = value;
         m_Sender.Send<Event>();
     });
+}
+
+/** Streams can be hidden at any time, but shown only if there are any. */
+Outcome SimulatedNavigator::CheckShowing(bool shown, const std::vector<Stream>& streams,
+                                         const char* what) const
+{
+    Outcome outcome = m_Permission.CheckActive();
+    if (outcome.IsDone() && shown && streams.empty()) {
+        outcome = Outcome::Refused(std::string("the play item has no ") + what);
+    }
+    return outcome;
 }
 
 Outcome SimulatedNavigator::SelectAudio(std::uint64_t number)
@@ -51,6 +88,7 @@ Outcome SimulatedNavigator::SelectSubtitle(std::uint64_t number)
 Outcome SimulatedNavigator::ShowSubtitles(bool shown)
 {
     return Switch<bdmv::PresentationGraphicsDisplayEvent>(bd::UserOperationPGTextSTEnableDisable,
+                                                          m_Permission.CheckActive(),
                                                           m_State.selection.pgShown, shown);
 }
 
@@ -82,8 +120,11 @@ Outcome SimulatedNavigator::SelectSecondaryVideo(std::uint64_t number)
 
 Outcome SimulatedNavigator::ShowSecondaryVideo(bool shown)
 {
+    const Outcome possible =
+        CheckShowing(shown, m_Playhead.CurrentStreams().secondaryVideo, "secondary video");
     return Switch<bdmv::SecondaryVideoDisplayEvent>(bd::UserOperationSecondaryVideoEnableDisable,
-                                                    m_State.selection.secondaryVideoShown, shown);
+                                                    possible, m_State.selection.secondaryVideoShown,
+                                                    shown);
 }
 
 Outcome SimulatedNavigator::SelectSecondaryAudio(std::uint64_t number)
@@ -95,8 +136,11 @@ Outcome SimulatedNavigator::SelectSecondaryAudio(std::uint64_t number)
 
 Outcome SimulatedNavigator::ShowSecondaryAudio(bool shown)
 {
+    const Outcome possible =
+        CheckShowing(shown, m_Playhead.CurrentStreams().secondaryAudio, "secondary audio");
     return Switch<bdmv::SecondaryAudioDisplayEvent>(bd::UserOperationSecondaryAudioEnableDisable,
-                                                    m_State.selection.secondaryAudioShown, shown);
+                                                    possible, m_State.selection.secondaryAudioShown,
+                                                    shown);
 }
 
 Outcome SimulatedNavigator::SelectPipSubtitle(std::uint64_t number)
@@ -109,12 +153,20 @@ Outcome SimulatedNavigator::SelectPipSubtitle(std::uint64_t number)
 Outcome SimulatedNavigator::PickPipSubtitle(bool pick)
 {
     return Switch<bdmv::PipPgTextSelectEvent>(bd::UserOperationPiPPGTextSTStreamNumberChange,
+                                              m_Permission.CheckActive(),
                                               m_State.selection.pipPgPicked, pick);
 }
 
 Outcome SimulatedNavigator::Zoom(const bd::ZOOM_PARAM_Def& zoom)
 {
-    return Operate(m_Permission.CheckActive(), [this, &zoom] {
+    Outcome outcome = m_Permission.CheckActive();
+    for (const bd::ZoomRectangleDef& rectangle : {zoom.rClipRectangle, zoom.rDestRectangle}) {
+        const std::string problem = ProblemOf(rectangle);
+        if (outcome.IsDone() && !problem.empty()) {
+            outcome = Outcome::Refused(problem);
+        }
+    }
+    return Operate(outcome, [this, &zoom] {
         m_State.zoom = zoom;
         m_Sender.Send<bdmv::ZoomModeSetEvent>();
     });

@@ -98,16 +98,11 @@ void Transport::ReachPosition()
 void Transport::ReachForward()
 {
     const Ticks position = m_rState.position;
-    if (position == m_rState.pointB) {
-        RepeatFrom(*m_rState.pointA);
+    if (RepeatsAt(position)) {
+        RepeatFrom(position == m_rState.pointB
+                       ? *m_rState.pointA
+                       : m_rPlayhead.FindChapter(m_rAnnouncer.AnnouncedChapter())->start);
         return;
-    }
-    if (m_rState.chapterTitleRepeat == bd::TRIGGER_CHP) {
-        const Chapter* const chapter = m_rPlayhead.FindChapter(m_rAnnouncer.AnnouncedChapter());
-        if (chapter != nullptr && chapter->start < chapter->end && position == chapter->end) {
-            RepeatFrom(chapter->start);
-            return;
-        }
     }
     AnnounceMarks(m_rState.item);
     m_rAnnouncer.AnnounceChapter();
@@ -285,27 +280,83 @@ void Transport::ChangePlayMode(bd::PlayMode mode)
     }
 }
 
+/** The position of the next picture; the end of the play item, or the position, without one. */
+Ticks Transport::NextPicture() const
+{
+    const std::vector<PlayItem>& items = m_rPlayhead.LoadedList().playList.playItems;
+    const Ticks position = m_rState.position;
+    const Ticks duration = PictureDuration(m_rPlayhead.CurrentStreams().primaryVideo);
+    if (m_rPlayhead.IsForward()) {
+        return std::min(position + duration, m_rPlayhead.EndOfItem(m_rState.item));
+    }
+    const Ticks start = m_rPlayhead.StartOfItem(m_rState.item);
+    if (position >= start + duration) {
+        return position - duration;
+    }
+    if (start == Ticks(0)) {
+        return position;
+    }
+    const std::size_t before = m_rPlayhead.ItemAt(start - Ticks(1));
+    const Ticks last = PictureDuration(items[before].streams.primaryVideo);
+    return std::max(m_rPlayhead.StartOfItem(before), start - std::min(start, last));
+}
+
+/** Whether playback that reaches @p position, forward, jumps back to the start of a repeat. */
+bool Transport::RepeatsAt(Ticks position) const
+{
+    if (position == m_rState.pointB) {
+        return true;
+    }
+    if (m_rState.chapterTitleRepeat != bd::TRIGGER_CHP) {
+        return false;
+    }
+    const Chapter* const chapter = m_rPlayhead.FindChapter(m_rAnnouncer.AnnouncedChapter());
+    return chapter != nullptr && chapter->start < chapter->end && position == chapter->end;
+}
+
+/** Whether a picture follows the active play item without a still in between. */
+bool Transport::CanLeaveItem() const
+{
+    const std::vector<PlayItem>& items = m_rPlayhead.LoadedList().playList.playItems;
+    for (std::size_t item = m_rState.item; item < items.size(); ++item) {
+        const bool hasPicture = m_rPlayhead.StartOfItem(item) < m_rPlayhead.EndOfItem(item);
+        if (item != m_rState.item && hasPicture) {
+            return true;
+        }
+        if (items[item].stillMode != StillModeNone) {
+            return false;
+        }
+    }
+    return m_rState.chapterTitleRepeat == bd::TRIGGER_TITLE &&
+           m_rPlayhead.LoadedList().timeLine.duration > Ticks(0);
+}
+
 bool Transport::CanStep() const
 {
-    const Ticks duration = PictureDuration(m_rPlayhead.CurrentStreams().primaryVideo);
-    return m_rPlayhead.IsForward()
-               ? m_rState.position + duration < m_rPlayhead.EndOfItem(m_rState.item)
-               : m_rState.position >= m_rPlayhead.StartOfItem(m_rState.item) + duration;
+    if (!m_rPlayhead.IsForward()) {
+        return m_rState.position != NextPicture();
+    }
+    const Ticks end = m_rPlayhead.EndOfItem(m_rState.item);
+    return NextPicture() < end || (m_rState.position < end && RepeatsAt(end)) || CanLeaveItem();
 }
 
 void Transport::Step()
 {
     m_rPlayhead.DropRemainder();
-    Ticks left = PictureDuration(m_rPlayhead.CurrentStreams().primaryVideo);
-    while (left > Ticks(0)) {
-        const Ticks distance = std::min(left, m_rPlayhead.DistanceToNextStop());
-        left -= distance;
-        m_rPlayhead.Move(distance);
+    const bool isForward = m_rPlayhead.IsForward();
+    const Ticks target = NextPicture();
+    bool repeats = false;
+    while (m_rState.position != target && !repeats) {
+        const Ticks left = isForward ? target - m_rState.position : m_rState.position - target;
+        m_rPlayhead.Move(std::min(left, m_rPlayhead.DistanceToNextStop()));
         const Ticks reached = m_rState.position;
         ReachPosition();
-        if (m_rState.position != reached) {
-            break;
-        }
+        repeats = m_rState.position != reached;
+    }
+    // Play items without length have no picture.
+    while (isForward && !repeats && m_rState.status == Status::Paused &&
+           m_rState.position == m_rPlayhead.EndOfItem(m_rState.item)) {
+        ReachEndOfItem();
     }
     m_rSender.Send<bdmv::SteppedEvent>();
 }

@@ -70,12 +70,13 @@ public:
     void ChangePlayMode(bd::PlayMode mode);
 
     /**
-     * Moves by one picture and announces the marks and positions passed. A step that reaches the
-     * end of a repeat ends at the start of the repeat.
+     * Moves to the next picture, which may be in another play item, and announces everything passed
+     * as playback does. A step that reaches the end of a repeat ends at the start of the repeat.
+     * Only if CanStep().
      */
     void Step();
 
-    /** Whether the play item has another picture in the direction of the step. */
+    /** Whether there is another picture in the direction of the step, and no still before it. */
     bool CanStep() const;
 
     /** Moves to a position and announces everything that differs there. */
@@ -95,6 +96,9 @@ private:
     void ReachTrigger(bd::TriggerType type);
     void ReachEnd();
     void ReachEndOfItem();
+    Ticks NextPicture() const;
+    bool RepeatsAt(Ticks position) const;
+    bool CanLeaveItem() const;
 
     VirtualClock& m_rClock;
     PlaybackState& m_rState;

@@ -21,8 +21,8 @@ public:
      * Keeps only the callbacks of some interfaces.
      *
      * @param interfaces InterfaceNames separated by commas: "control,settings"
-     * @throw std::invalid_argument names the unknown word and all valid ones; the filter is
-     *        unchanged
+     * @throw std::invalid_argument names the unknown word and a similar one or all valid ones; the
+     *        filter is unchanged
      */
     void KeepInterfaces(std::string_view interfaces);
 

@@ -26,7 +26,7 @@ inline constexpr std::array<std::string_view, 3> OutputFormatNames{"text", "json
 
 /**
  * @param name one of OutputFormatNames
- * @throw std::invalid_argument names the unknown word and all valid ones
+ * @throw std::invalid_argument names the unknown word and a similar one or all valid ones
  */
 OutputFormat ParseOutputFormat(std::string_view name);
 

@@ -2,7 +2,7 @@
 
 #include <unistd.h>
 
-#include "bd/constants.h"
+#include "output/argumentstext.h"
 #include "text/timetext.h"
 
 namespace deskplayer
@@ -37,41 +37,6 @@ const char* ColourOf(ListenerInterface interface)
     return Reset;
 }
 
-std::string ValueText(bool value)
-{
-    return value ? "true" : "false";
-}
-
-std::string ValueText(std::uint64_t value)
-{
-    return std::to_string(value);
-}
-
-std::string ValueText(Position position)
-{
-    return position.ticks == bd::TimePositionNone ? "none" : TimeText(Ticks(position.ticks));
-}
-
-std::string ValueText(const std::string& value)
-{
-    return value;
-}
-
-std::string ValueText(const std::vector<std::string>& names)
-{
-    std::string text;
-    for (const std::string& name : names) {
-        text += (text.empty() ? "" : ",") + name;
-    }
-    return text.empty() ? "nothing" : text;
-}
-
-std::string ValueText(const bd::ZoomRectangleDef& rectangle)
-{
-    return std::to_string(rectangle.Width) + "x" + std::to_string(rectangle.Height) + "+" +
-           std::to_string(rectangle.X) + "+" + std::to_string(rectangle.Y);
-}
-
 } // namespace
 
 TextOutput::TextOutput(std::ostream& stream, const VirtualClock& clock, const OutputFilter& filter,
@@ -93,7 +58,7 @@ void TextOutput::Write(const Callback& callback)
     for (const Argument& argument : callback.arguments) {
         Stream() << ' ';
         Paint(std::string(argument.name) + "=", Dim);
-        Stream() << std::visit([](const auto& value) { return ValueText(value); }, argument.value);
+        Stream() << TextOf(argument.value);
     }
     Stream() << '\n';
 }
@@ -107,10 +72,11 @@ void TextOutput::Paint(std::string_view text, const char* colour)
     }
 }
 
-bool WantsColours(int fileDescriptor, const char* noColor)
+bool WantsColours(int fileDescriptor, const char* noColor, const char* terminal)
 {
     const bool forbidden = noColor != nullptr && *noColor != '\0';
-    return !forbidden && isatty(fileDescriptor) == 1;
+    const bool isDumb = terminal != nullptr && std::string_view(terminal) == "dumb";
+    return !forbidden && !isDumb && isatty(fileDescriptor) == 1;
 }
 
 } // namespace deskplayer

@@ -37,14 +37,16 @@ private:
 };
 
 /**
- * Whether a user wants colours on an open file: it is a terminal, and the environment does not
- * turn colours off.
+ * Whether a user wants colours on an open file: it is a terminal that has them, and the environment
+ * does not turn colours off.
  *
  * @param fileDescriptor of the file
  * @param noColor        value of the environment variable NO_COLOR, which turns colours off unless
  *                       it is empty; null if it is not set
+ * @param terminal       value of the environment variable TERM; null if it is not set. A terminal
+ *                       named "dumb" has no colours.
  */
-bool WantsColours(int fileDescriptor, const char* noColor);
+bool WantsColours(int fileDescriptor, const char* noColor, const char* terminal);
 
 } // namespace deskplayer
 

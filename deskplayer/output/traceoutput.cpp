@@ -55,6 +55,8 @@ constexpr std::array<std::string_view, 18> TrackNames{"playback",
 
 constexpr int Process = 1;
 
+constexpr const char* Playing = "Playing";
+
 /** A metadata event, which describes the process or one of its threads; the tracks are threads. */
 template <typename Value>
 ordered_json Metadata(const char* name, std::size_t thread, const char* member, const Value& value)
@@ -106,8 +108,7 @@ void TraceOutput::Follow(const Callback& callback)
     switch (callback.id) {
     case CallbackId::PlayStarted:
     case CallbackId::Continued:
-    case CallbackId::Resumed:
-        Begin(Track::Playback, "Playing", callback);
+        Begin(Track::Playback, Playing, callback);
         break;
     case CallbackId::Paused:
         Begin(Track::Playback, "Paused", callback);
@@ -117,18 +118,23 @@ void TraceOutput::Follow(const Callback& callback)
         break;
     case CallbackId::StillOff:
         if (StateOf(Track::Playback).slice && StateOf(Track::Playback).slice->name == "Still") {
-            Begin(Track::Playback, "Playing", callback);
+            Begin(Track::Playback, Playing, callback);
         }
         break;
     case CallbackId::Suspended:
+        m_BeforeSuspension = StateOf(Track::Playback).slice ? StateOf(Track::Playback).slice->name
+                                                            : std::string(Playing);
         Begin(Track::Playback, "Suspended", callback);
+        break;
+    case CallbackId::Resumed:
+        Begin(Track::Playback, m_BeforeSuspension, callback);
         break;
     case CallbackId::SystemSuspended:
         Begin(Track::Playback, "Standby", callback);
         break;
     case CallbackId::SystemResumed:
         if (ValueOf<bool>("playing", callback)) {
-            Begin(Track::Playback, "Playing", callback);
+            Begin(Track::Playback, Playing, callback);
         } else {
             EndPlayback();
         }

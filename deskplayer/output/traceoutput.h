@@ -65,8 +65,9 @@ private:
     void Append(const nlohmann::ordered_json& event);
     TrackState& StateOf(Track track) { return m_Tracks[static_cast<std::size_t>(track)]; }
 
-    std::vector<TrackState> m_Tracks; ///< indexed by Track
-    const char* m_Separator = "[\n";  ///< before the next event
+    std::vector<TrackState> m_Tracks;           ///< indexed by Track
+    std::string m_BeforeSuspension = "Playing"; ///< the slice of playback that Resumed() begins
+    const char* m_Separator = "[\n";            ///< before the next event
 };
 
 } // namespace deskplayer

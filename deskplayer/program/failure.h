@@ -17,6 +17,7 @@ constexpr int ExitOk = 0;
 constexpr int ExitOutput = 1;
 constexpr int ExitUsage = 2;
 constexpr int ExitDisc = 3;
+constexpr int ExitSession = 4;
 
 /** The command line or the session is invalid. */
 class UsageError : public std::runtime_error

@@ -16,7 +16,7 @@ namespace
 void PrintCommands()
 {
     for (const CommandSyntax& syntax : CommandSyntaxes()) {
-        std::cout << std::left << std::setw(36) << syntax.pattern << syntax.help << '\n';
+        std::cout << std::left << std::setw(38) << syntax.pattern << syntax.help << '\n';
     }
 }
 
@@ -61,12 +61,15 @@ void AddOptions(CLI::App& app, Options& options)
     auto* const session = app.add_option("--session", options.session,
                                          "Session file to run; by default, play from start to end")
                               ->type_name("FILE");
+    auto* const strict = app.add_flag("--strict", options.strict,
+                                      "Exit with status 4 if a command of the session was refused")
+                             ->needs(session);
     auto* const realTime =
         app.add_flag("--realtime", options.realTime, "Play in real time instead of at once");
     auto* const remote =
         app.add_flag("--remote", options.remote, "Play in real time, controlled by single keys")
             ->excludes(session);
-    for (CLI::Option* const playing : {playList, session, realTime, remote}) {
+    for (CLI::Option* const playing : {playList, session, strict, realTime, remote}) {
         playing->excludes(list)->excludes(describe);
     }
 
@@ -94,7 +97,8 @@ void AddOptions(CLI::App& app, Options& options)
         "  bdmv-deskplayer disc --only PlayItem,ChapterNumber --format json\n"
         "  bdmv-deskplayer disc --remote\n\n"
         "Exit status: 0 success, 1 the output could not be written, 2 incorrect usage or a\n"
-        "session that cannot be read, 3 the disc cannot be read.");
+        "session that cannot be read, 3 the disc cannot be read, 4 the session failed: an\n"
+        "expectation was not met or, with --strict, a command was refused.");
 }
 
 } // namespace deskplayer

@@ -21,6 +21,7 @@ struct Options {
     bool list = false;
     std::optional<std::uint32_t> describe;
     std::string session;
+    bool strict = false;
     bool realTime = false;
     bool remote = false;
     std::string format = "text";

@@ -7,6 +7,7 @@
 #include <array>
 #include <cstddef>
 
+#include "output/callbacks.h"
 #include "program/failure.h"
 #include "session/commands.h"
 
@@ -73,7 +74,11 @@ std::string ReadSession(const std::string& fileName)
 
 std::vector<ScriptStep> ReadSessionFile(const std::string& fileName)
 {
-    return ParseScript(ReadSession(fileName), fileName, CommandSyntaxes());
+    std::vector<std::string_view> callbacks;
+    for (const CallbackInfo& info : AllCallbacks) {
+        callbacks.push_back(info.name);
+    }
+    return ParseScript(ReadSession(fileName), fileName, CommandSyntaxes(), callbacks);
 }
 
 } // namespace deskplayer

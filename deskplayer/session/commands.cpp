@@ -53,8 +53,6 @@ std::uint64_t NextOf(Desk& desk, void (PlaybackContext::*get)(Number*, bd::UInt8
     return number < count ? number + 1U : 1U;
 }
 
-constexpr bd::ZoomRectangleDef WholePicture = {0, 0, 1920, 1080};
-
 } // namespace
 
 const std::vector<Command>& Commands()
@@ -165,7 +163,7 @@ const std::vector<Command>& Commands()
              return d.Navigator().Zoom({WholePicture, WholePicture, 0});
          }},
         {{"zoom NUMBER NUMBER NUMBER NUMBER",
-          "enlarge a part of the picture: left, top, width, height in pixels"},
+          "enlarge a part of the picture of 1920 x 1080: left, top, width, height"},
          [](Desk& d, Values v) {
              return d.Navigator().Zoom({RectangleOf(v, 0), WholePicture, 0});
          }},
@@ -219,9 +217,17 @@ const std::vector<CommandSyntax>& CommandSyntaxes()
         std::vector<CommandSyntax> all;
         std::transform(Commands().begin(), Commands().end(), std::back_inserter(all),
                        [](const Command& command) { return command.syntax; });
+        all.push_back({"expect nothing", "fail if there were callbacks since the last command"});
+        all.push_back({"expect CALLBACK [ARGUMENT=VALUE ...]",
+                       "fail unless there was such a callback since the last command"});
         return all;
     }();
     return syntaxes;
+}
+
+bool IsExpectation(const ScriptStep& step)
+{
+    return step.command >= Commands().size();
 }
 
 } // namespace deskplayer

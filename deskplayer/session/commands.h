@@ -24,8 +24,11 @@ struct Command {
 /** All commands, in the order of the help. */
 const std::vector<Command>& Commands();
 
-/** Their syntaxes, in the same order. */
+/** Their syntaxes, in the same order, and those of expectations. */
 const std::vector<CommandSyntax>& CommandSyntaxes();
+
+/** Whether a step of CommandSyntaxes() is an expectation, which no command performs. */
+bool IsExpectation(const ScriptStep& step);
 
 } // namespace deskplayer
 

@@ -1,11 +1,10 @@
 #include "session/script.h"
 
 #include <algorithm>
-#include <charconv>
-#include <limits>
-#include <optional>
-#include <system_error>
+#include <stdexcept>
 
+#include "session/scriptwords.h"
+#include "text/choice.h"
 #include "text/printable.h"
 #include "text/timetext.h"
 
@@ -79,156 +78,25 @@ std::string_view TakeLine(std::string_view& text)
     return line;
 }
 
-constexpr std::string_view NumberPlaceholder = "NUMBER";
-constexpr std::string_view TimePlaceholder = "TIME";
+constexpr std::string_view FurtherArguments = "[ARGUMENT=VALUE ...]"; ///< in a pattern
 constexpr std::string_view EndOfLine;
-
-constexpr std::string_view Unexpected = "unexpected";
-
-/** The meaning of a word at its position. */
-struct Meaning {
-    std::uint64_t value = 0;
-    std::string_view problem; ///< empty if the word fits
-};
-
-/**
- * Removes leading digits from @p text. A number that does not fit the result becomes the greatest
- * one, which is out of range wherever numbers are used.
- */
-std::optional<std::uint32_t> TakeNumber(std::string_view& text)
-{
-    std::uint32_t number = 0;
-    const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), number);
-    if (error == std::errc::invalid_argument) {
-        return std::nullopt;
-    }
-    text.remove_prefix(std::size_t(end - text.data()));
-    return error == std::errc() ? number : std::numeric_limits<std::uint32_t>::max();
-}
-
-/** Removes @p character from the front of @p text. @return false if it is not there */
-bool TakeCharacter(std::string_view& text, char character)
-{
-    const bool found = !text.empty() && text.front() == character;
-    text.remove_prefix(found ? 1 : 0);
-    return found;
-}
-
-Meaning ReadNumber(std::string_view word)
-{
-    const auto number = TakeNumber(word);
-    if (!number) {
-        return {0, Unexpected};
-    }
-    if (!word.empty()) {
-        return {0, "is not a whole number"};
-    }
-    if (*number > GreatestNumber) {
-        return {0, "is not between 0 and 65535"};
-    }
-    return {*number, ""};
-}
-
-/** Removes a decimal fraction from the front of @p text. @return thousandths; 0 without one */
-std::optional<std::uint64_t> TakeThousandths(std::string_view& text)
-{
-    if (!TakeCharacter(text, '.')) {
-        return 0;
-    }
-    const std::size_t sizeBefore = text.size();
-    const auto number = TakeNumber(text);
-    const std::size_t digits = sizeBefore - text.size();
-    if (!number || digits > 3) {
-        return std::nullopt;
-    }
-    constexpr std::uint64_t thousandths[] = {100, 10, 1};
-    return *number * thousandths[digits - 1];
-}
-
-/** The number of milliseconds in a unit of time. */
-std::optional<std::uint64_t> ReadUnit(std::string_view unit)
-{
-    if (unit == "ms") {
-        return 1;
-    }
-    if (unit == "s" || unit.empty()) {
-        return 1000;
-    }
-    if (unit == "m") {
-        return 60 * 1000;
-    }
-    if (unit == "h") {
-        return 3600 * 1000;
-    }
-    return std::nullopt;
-}
-
-Meaning ReadTime(std::string_view word)
-{
-    constexpr Meaning notATime{0, "is not a time"};
-
-    const auto first = TakeNumber(word);
-    if (!first) {
-        return {0, Unexpected};
-    }
-    std::uint64_t whole = *first;
-    std::size_t colons = 0;
-    while (colons < 2 && TakeCharacter(word, ':')) {
-        const auto part = TakeNumber(word);
-        if (!part) {
-            return notATime;
-        }
-        if (*part > 59) {
-            return {0, "is not a time: minutes and seconds must be below 60"};
-        }
-        whole = whole * 60 + *part;
-        ++colons;
-    }
-    const auto thousandths = TakeThousandths(word);
-    const auto unit = ReadUnit(word);
-    if (!thousandths || !unit || (colons > 0 && !word.empty())) {
-        return notATime;
-    }
-    if (*thousandths * *unit % 1000 != 0) {
-        return {0, "is finer than a millisecond"};
-    }
-    constexpr std::uint64_t ticksPerMillisecond = TicksPerSecond / 1000;
-    const std::uint64_t milliseconds = whole * *unit + *thousandths * *unit / 1000;
-    if (milliseconds > LongestSession.count() / ticksPerMillisecond) {
-        return {0, "is more than 1000 hours"};
-    }
-    return {milliseconds * ticksPerMillisecond, ""};
-}
-
-bool IsPlaceholder(std::string_view patternWord)
-{
-    return patternWord == NumberPlaceholder || patternWord == TimePlaceholder;
-}
-
-/** Reads @p word as @p patternWord of a command's pattern. */
-Meaning Read(std::string_view patternWord, std::string_view word)
-{
-    if (patternWord == NumberPlaceholder) {
-        return ReadNumber(word);
-    }
-    if (patternWord == TimePlaceholder) {
-        return ReadTime(word);
-    }
-    return {0, patternWord == word ? "" : Unexpected};
-}
 
 enum Timing { TimingAt, TimingAfter, TimingWithLineBefore };
 
 /** A possible form of a line: a command, with or without a time before it. */
 struct Form {
-    Words words; ///< including placeholders
+    Words words;                 ///< including placeholders
+    bool takesArguments = false; ///< any number of them, after the words
     std::size_t command = 0;
     Timing timing = TimingWithLineBefore;
 
-    /** The word at @p position; EndOfLine after the last word. */
+    /** The word at @p position; after the last word, a further argument or EndOfLine. */
     std::string_view At(std::size_t position) const
     {
-        return position < words.size() ? words[position] : EndOfLine;
+        if (position < words.size()) {
+            return words[position];
+        }
+        return takesArguments ? ArgumentPlaceholder : EndOfLine;
     }
 };
 
@@ -239,8 +107,10 @@ std::vector<Form> FormsOf(const std::vector<CommandSyntax>& syntaxes)
     std::vector<Form> forms;
     const auto add = [&](const Words& time, Timing timing) {
         for (std::size_t command = 0; command < syntaxes.size(); ++command) {
-            const Words pattern = SplitAtBlanks(syntaxes[command].pattern);
-            forms.push_back({time, command, timing});
+            const std::string_view text = syntaxes[command].pattern;
+            const std::size_t arguments = text.find(FurtherArguments);
+            const Words pattern = SplitAtBlanks(text.substr(0, arguments));
+            forms.push_back({time, arguments != std::string_view::npos, command, timing});
             Words& words = forms.back().words;
             words.insert(words.end(), pattern.begin(), pattern.end());
         }
@@ -260,13 +130,7 @@ std::string Quoted(std::string_view word)
 
 std::string Description(std::string_view patternWord)
 {
-    if (patternWord == NumberPlaceholder) {
-        return "a NUMBER";
-    }
-    if (patternWord == TimePlaceholder) {
-        return "a TIME (such as 1:02:03.5, 02:03, 3.25, 2s, 500ms, 1.5m or 1h)";
-    }
-    return patternWord == EndOfLine ? "the end of the line" : std::string(patternWord);
+    return patternWord == EndOfLine ? "the end of the line" : DescribePatternWord(patternWord);
 }
 
 /** The words of @p forms at @p position, such as "; expected next, previous or a NUMBER". */
@@ -296,7 +160,7 @@ const Form& FindForm(const Line& line, const Words& words, Forms forms)
         Forms matching;
         std::string_view problem = Unexpected;
         for (const Form* form : forms) {
-            const Meaning meaning = Read(form->At(position), word);
+            const Meaning meaning = ReadWord(form->At(position), word);
             if (meaning.problem.empty()) {
                 matching.push_back(form);
             } else if (meaning.problem != Unexpected) {
@@ -312,7 +176,7 @@ const Form& FindForm(const Line& line, const Words& words, Forms forms)
         forms = std::move(matching);
     }
     for (const Form* form : forms) {
-        if (form->At(words.size()) == EndOfLine) {
+        if (form->words.size() <= words.size()) {
             return *form;
         }
     }
@@ -323,7 +187,7 @@ const Form& FindForm(const Line& line, const Words& words, Forms forms)
 /** The time of a line that begins with "at" or "after" and the time @p word. */
 Ticks TimeOf(const Line& line, Timing timing, std::string_view word, const ScriptStep& previous)
 {
-    const Ticks time(Read(TimePlaceholder, word).value);
+    const Ticks time(ReadWord(TimePlaceholder, word).value);
     if (timing == TimingAt) {
         if (time < previous.time) {
             line.Fail(word.data(), TimeText(time) + " is earlier than line " +
@@ -339,8 +203,20 @@ Ticks TimeOf(const Line& line, Timing timing, std::string_view word, const Scrip
     return previous.time + time;
 }
 
+void CheckCallback(const Line& line, std::string_view word,
+                   const std::vector<std::string_view>& callbacks)
+{
+    try {
+        if (!callbacks.empty()) {
+            FindChoice(word, "a callback", callbacks);
+        }
+    } catch (const std::invalid_argument& error) {
+        line.Fail(word.data(), error.what());
+    }
+}
+
 ScriptStep ReadStep(const Line& line, const Words& words, const Form& form,
-                    const ScriptStep& previous)
+                    const ScriptStep& previous, const std::vector<std::string_view>& callbacks)
 {
     ScriptStep step;
     step.time = previous.time;
@@ -352,8 +228,14 @@ ScriptStep ReadStep(const Line& line, const Words& words, const Form& form,
         position = 2;
     }
     for (; position < words.size(); ++position) {
-        if (IsPlaceholder(form.words[position])) {
-            step.values.push_back(Read(form.words[position], words[position]).value);
+        const std::string_view patternWord = form.At(position);
+        if (IsValuePlaceholder(patternWord)) {
+            step.values.push_back(ReadWord(patternWord, words[position]).value);
+        } else if (IsWordPlaceholder(patternWord)) {
+            step.words.emplace_back(words[position]);
+        }
+        if (patternWord == CallbackPlaceholder) {
+            CheckCallback(line, words[position], callbacks);
         }
     }
     return step;
@@ -369,12 +251,17 @@ ScriptError::ScriptError(const std::string& fileName, std::size_t line, std::siz
 }
 
 std::vector<ScriptStep> ParseScript(std::string_view text, const std::string& fileName,
-                                    const std::vector<CommandSyntax>& syntaxes)
+                                    const std::vector<CommandSyntax>& syntaxes,
+                                    const std::vector<std::string_view>& callbacks)
 {
     if (text.size() > LongestScript) {
         throw ScriptError(fileName, 1, 1,
                           "the session has " + std::to_string(text.size()) +
                               " bytes; expected at most " + std::to_string(LongestScript));
+    }
+    constexpr std::string_view byteOrderMark = "\xEF\xBB\xBF";
+    if (text.substr(0, byteOrderMark.size()) == byteOrderMark) {
+        text.remove_prefix(byteOrderMark.size());
     }
     const std::vector<Form> forms = FormsOf(syntaxes);
     Forms allForms;
@@ -389,7 +276,8 @@ std::vector<ScriptStep> ParseScript(std::string_view text, const std::string& fi
         const Words words = line.GetWords();
         if (!words.empty()) {
             const Form& form = FindForm(line, words, allForms);
-            steps.push_back(ReadStep(line, words, form, steps.empty() ? start : steps.back()));
+            const ScriptStep& previous = steps.empty() ? start : steps.back();
+            steps.push_back(ReadStep(line, words, form, previous, callbacks));
         }
     }
     return steps;

@@ -44,8 +44,9 @@ constexpr std::uint64_t GreatestNumber = 65535;
  *
  *     "chapter next"    "chapter NUMBER"    "seek TIME"
  *
- * NUMBER is a decimal number from 0 to 65535, TIME a time as above, given in 45 kHz ticks. The
- * first word is neither "at" nor "after".
+ * NUMBER is a decimal number from 0 to 65535, TIME a time as above, given in 45 kHz ticks.
+ * CALLBACK is the name of a callback. "[ARGUMENT=VALUE ...]", only at the end, is any number of
+ * arguments of a callback. The first word is neither "at" nor "after".
  *
  * Patterns may share their first words, and one may be a prefix of another. If several match a
  * line, the first in the table is used.
@@ -59,7 +60,8 @@ struct CommandSyntax {
 struct ScriptStep {
     Ticks time{0};                     ///< of the session; never decreases
     std::size_t command = 0;           ///< index of its syntax
-    std::vector<std::uint64_t> values; ///< of the placeholders, in order
+    std::vector<std::uint64_t> values; ///< of NUMBER and TIME, in order
+    std::vector<std::string> words;    ///< of CALLBACK and ARGUMENT=VALUE, in order
     std::size_t line = 0;              ///< from 1
 };
 
@@ -85,16 +87,19 @@ public:
 /**
  * Reads a script.
  *
- * Lines end in LF or CR LF, which the last line may lack. Comments may contain any bytes except
- * control characters. Time and memory are linear in the length of the text.
+ * A byte order mark at the start is ignored. Lines end in LF or CR LF, which the last line may
+ * lack. Comments may contain any bytes except control characters. Time and memory are linear in the
+ * length of the text.
  *
  * @param text     the whole script
  * @param fileName for messages
  * @param syntaxes all commands; their patterns are used only during the call
+ * @param callbacks the names that are valid as CALLBACK; if there are none, any word is
  * @throw ScriptError for the first malformed line; the message lists what is valid there
  */
 std::vector<ScriptStep> ParseScript(std::string_view text, const std::string& fileName,
-                                    const std::vector<CommandSyntax>& syntaxes);
+                                    const std::vector<CommandSyntax>& syntaxes,
+                                    const std::vector<std::string_view>& callbacks = {});
 
 } // namespace deskplayer
 

@@ -42,6 +42,15 @@ void PlaySession(const std::vector<ScriptStep>& steps, Desk& desk, const Session
 {
     for (const ScriptStep& step : steps) {
         Pass(step.time - desk.Clock().Now(), desk, hooks);
+        if (IsExpectation(step)) {
+            if (hooks.onExpectation) {
+                hooks.onExpectation(step);
+            }
+            continue;
+        }
+        if (hooks.beforeCommand) {
+            hooks.beforeCommand();
+        }
         const Outcome outcome = Commands()[step.command].perform(desk, step.values);
         if (!outcome.IsDone() && hooks.onRefused) {
             hooks.onRefused(step.line, outcome.Reason());

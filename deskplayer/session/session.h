@@ -14,12 +14,21 @@
 namespace deskplayer
 {
 
-/** What a session calls when time passes and when a command is refused. */
+/** What a session calls when time passes, for commands and for expectations. */
 struct SessionHooks {
     /**
      * Called before the clock advances by @p time; a session in real time waits here. May be empty.
      */
     std::function<void(Ticks time)> beforeTimePasses;
+
+    /** Called before a command is carried out. May be empty. */
+    std::function<void()> beforeCommand;
+
+    /**
+     * Called for an expectation at its time, with the name of a callback and its arguments as the
+     * words of the step; no words expect no callback. May be empty: nothing is expected then.
+     */
+    std::function<void(const ScriptStep& step)> onExpectation;
 
     /** Called when a command was refused, with its line and the reason. May be empty. */
     std::function<void(std::size_t line, const std::string& reason)> onRefused;

@@ -4,6 +4,7 @@
 #include <cstdlib>
 #include <filesystem>
 #include <regex>
+#include <utility>
 #include <vector>
 
 #include "disc/testdiscs.h"
@@ -74,13 +75,28 @@ TEST_F(DeskPlayerPlayback, PlaysEveryDiscToTheEndOfItsMedia)
             SCOPED_TRACE(entry.path().filename());
             const ProgramResult result = RunDeskPlayer({entry.path()});
             EXPECT_EQ(result.status, 0);
-            EXPECT_EQ(result.errors, "");
+            EXPECT_EQ(Without("; its play items are played in sequence", result.errors), "");
             EXPECT_EQ(LastLine(result.output).substr(sizeof "hh:mm:ss.mmm"),
                       " Finished                    reason=EndOfMedia");
             ++discs;
         }
     }
     EXPECT_GE(discs, 15);
+}
+
+TEST_F(DeskPlayerPlayback, SaysThatRandomAndShuffleAreNotSimulated)
+{
+    for (const auto& [type, name] : {std::pair{'\2', "random"}, std::pair{'\3', "shuffle"}}) {
+        Patch(45, std::string(1, type));
+
+        const ProgramResult result = RunDeskPlayer({disc, "--only", "Finished"});
+
+        EXPECT_EQ(result.status, 0);
+        EXPECT_EQ(result.errors, "bdmv-deskplayer: play list 1: the playback type is " +
+                                     std::string(name) +
+                                     "; its play items are played in sequence\n");
+        EXPECT_EQ(result.output, "00:03:02.000  Finished                    reason=EndOfMedia\n");
+    }
 }
 
 TEST_F(DeskPlayerPlayback, TakesTheDurationOfThePlayListInRealTime)

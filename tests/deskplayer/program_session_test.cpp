@@ -14,14 +14,12 @@ namespace
 
 using DeskPlayerSession = ScratchFolder;
 
-TEST_F(DeskPlayerSession, WithAllEventsCallsEveryCallback)
+TEST_F(DeskPlayerSession, WithAllEventsCallsEveryCallbackAsExpected)
 {
-    const ProgramResult result = RunDeskPlayer({SampleDisc, "--session", AllEvents});
+    const ProgramResult result = RunDeskPlayer({SampleDisc, "--strict", "--session", AllEvents});
 
     EXPECT_EQ(result.status, 0);
-    EXPECT_EQ(result.errors, "bdmv-deskplayer: " + AllEvents +
-                                 ":8: refused at 00:00:02.000: SkipToNextPoint is forbidden by "
-                                 "play item 0\n");
+    EXPECT_EQ(result.errors, "");
     std::set<std::string> called;
     for (const std::string& line : LinesOf(result.output)) {
         const std::string callback = line.substr(sizeof "hh:mm:ss.mmm ");
@@ -45,6 +43,71 @@ TEST_F(DeskPlayerSession, WithTheEveningSessionPlaysToTheEnd)
                                  "play item 0\n");
     EXPECT_EQ(LastLine(result.output),
               "08:03:35.000  Finished                    reason=EndOfMedia");
+}
+
+TEST_F(DeskPlayerSession, FailsWithStrictIfACommandWasRefused)
+{
+    const std::string refused = WriteFile("a.session", "play\npause\nplay\nafter 1s stop\n");
+    const std::string accepted = WriteFile("b.session", "play\npause\nafter 1s stop\n");
+
+    const ProgramResult strict =
+        RunDeskPlayer({SampleDisc, "--strict", "--session", refused, "--only", "Stopped"});
+    const ProgramResult lenient =
+        RunDeskPlayer({SampleDisc, "--session", refused, "--only", "Stopped"});
+
+    EXPECT_EQ(strict.status, 4);
+    EXPECT_EQ(lenient.status, 0);
+    EXPECT_EQ(strict.output, "00:00:01.000  Stopped\n") << "the session continues";
+    EXPECT_EQ(strict.output, lenient.output);
+    EXPECT_EQ(strict.errors, "bdmv-deskplayer: " + refused +
+                                 ":3: refused at 00:00:00.000: not stopped or finished, but "
+                                 "paused\n");
+    EXPECT_EQ(strict.errors, lenient.errors);
+    EXPECT_EQ(RunDeskPlayer({SampleDisc, "--strict", "--session", accepted}).status, 0);
+}
+
+TEST_F(DeskPlayerSession, FailsIfAnExpectationIsNotMet)
+{
+    const std::string session =
+        WriteFile("a.session", "expect nothing\n"
+                               "play\n"
+                               "after 2.5s expect PlayStarted\n"
+                               "expect PlayItem playItemId=0\n"
+                               "expect CurrentTimePosition position=00:00:02.000\n"
+                               "subtitle off\n"
+                               "expect PresentationGraphicsDisplay shown=true\n"
+                               "pause\n"
+                               "expect nothing\n"
+                               "expect Paused\n"
+                               "pause\n"
+                               "expect Paused\n"
+                               "expect nothing\n"
+                               "after 1s stop\n"
+                               "expect Stopped\n");
+
+    const ProgramResult result =
+        RunDeskPlayer({SampleDisc, "--playlist", "1", "--session", session, "--only", "Stopped"});
+
+    EXPECT_EQ(result.status, 4);
+    EXPECT_EQ(result.output, "00:00:03.500  Stopped\n") << "the session continues";
+    const std::vector<std::string> lines = LinesOf(result.errors);
+    const std::string start = "bdmv-deskplayer: " + session;
+    ASSERT_EQ(lines.size(), 4U) << result.errors;
+    EXPECT_EQ(lines[0], start + ":7: expected PresentationGraphicsDisplay shown=true by "
+                                "00:00:02.500; since the last command: "
+                                "PresentationGraphicsDisplay shown=false");
+    EXPECT_EQ(lines[1], start + ":9: expected nothing by 00:00:02.500; since the last command: "
+                                "Paused");
+    EXPECT_EQ(lines[3], start + ":12: expected Paused by 00:00:02.500; since the last command: "
+                                "nothing");
+}
+
+TEST_F(DeskPlayerSession, RefusesAnExpectationOfAnUnknownCallback)
+{
+    const std::string session = WriteFile("a.session", "play\nexpect playstarted\n");
+
+    ExpectUsageError({SampleDisc, "--session", session},
+                     session + ":2:8: 'playstarted' is not a callback; did you mean PlayStarted?");
 }
 
 TEST_F(DeskPlayerSession, AlwaysHasTheSameOutput)

@@ -48,6 +48,9 @@ TEST_F(DeskPlayerTerminal, ShowsColoursUnlessTheEnvironmentForbidsThem)
 {
     const std::vector<std::string> arguments = {SampleDisc, "--only", "Finished"};
     unsetenv("NO_COLOR");
+    setenv("TERM", "dumb", 1);
+    EXPECT_EQ(RunDeskPlayerOnTerminal(arguments).output.find('\x1B'), std::string::npos);
+    setenv("TERM", "xterm", 1);
     EXPECT_NE(RunDeskPlayerOnTerminal(arguments).output.find('\x1B'), std::string::npos);
     setenv("NO_COLOR", "1", 1);
     EXPECT_EQ(RunDeskPlayerOnTerminal(arguments).output,

@@ -16,7 +16,8 @@ TEST(DeskPlayerUsage, IsDescribedByHelp)
     EXPECT_EQ(help.errors, "");
     for (const char* const option :
          {"--help", "--version", "--commands", "--playlist", "--list", "--describe", "--session",
-          "--realtime", "--remote", "--format", "--output", "--listen", "--only", "--log"}) {
+          "--strict", "--realtime", "--remote", "--format", "--output", "--listen", "--only",
+          "--log"}) {
         EXPECT_NE(help.output.find(option), std::string::npos) << option;
     }
 
@@ -29,9 +30,10 @@ TEST(DeskPlayerUsage, IsDescribedByHelp)
     const ProgramResult commands = RunDeskPlayer({"--commands"});
     EXPECT_EQ(commands.status, 0);
     EXPECT_EQ(LinesOf(commands.output).front(),
-              "play                                start at the beginning of the play list");
-    EXPECT_EQ(LinesOf(commands.output).back(),
-              "fail stream                         make the stream run out of data");
+              "play                                  start at the beginning of the play list");
+    EXPECT_EQ(LinesOf(commands.output).back(), "expect CALLBACK [ARGUMENT=VALUE ...]  fail unless "
+                                               "there was such a callback since the last "
+                                               "command");
 }
 
 TEST(DeskPlayerUsage, IsRefusedWithStatus2WhenInvalid)
@@ -45,6 +47,8 @@ TEST(DeskPlayerUsage, IsRefusedWithStatus2WhenInvalid)
         {SampleDisc, "--describe", "100000"},
         {SampleDisc, "--no-such-option"},
         {SampleDisc, "--session"},
+        {SampleDisc, "--strict"},
+        {SampleDisc, "--strict", "--remote"},
         {SampleDisc, "--log", "NoSuchComponent=Event"}};
     for (const std::vector<std::string>& arguments : wrong) {
         const ProgramResult result = RunDeskPlayer(arguments);

@@ -180,7 +180,7 @@ PageHasTheOptionsOfTheProgram() {
 PageHasTheCommandsOfTheProgram() {
     same 'commands of page and program' \
         "$(sed -n '/^\.Sh SESSIONS/,/^\.Sh KEYS/s/^\.It Ic //p' "$page" | sed 's/ Ar / /')" \
-        "$("$program" --commands | cut -c -36 | sed 's/ *$//')"
+        "$("$program" --commands | cut -c -38 | sed 's/ *$//')"
 }
 
 PageHasTheKeysOfTheProgram() {

@@ -225,7 +225,7 @@ TEST(DescribePlayList, ExplainsTheValues)
 {
     EXPECT_EQ(
         DescriptionOf(RichPlayList()),
-        R"(play list 00000: version 0300, playback type 2 (random), playback count 258, duration 90010 (00:00:02.000)
+        R"(play list 00000: version 0300, playback type 2 (random; played in sequence), playback count 258, duration 90010 (00:00:02.000)
   flags: random access flag no, audio mixing yes, lossless bypass no, base view is right eye yes
   user operations: mask 3C00000000000000 (forbids ChapterSearch, TimeSearch, SkipToNextPoint, SkipBackToPreviousPoint)
   play item 0: clip 00000, codec M2TS, STC sequence 3, connection condition 6 (seamless, on the same time line)

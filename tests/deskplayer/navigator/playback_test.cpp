@@ -351,26 +351,122 @@ TEST(Playback, StepsBackToTheStartAndKeepsItsDirection)
     EXPECT_FALSE(desk.navigator.Step().IsDone());
 }
 
-TEST(Playback, RefusesToStepOutOfAnItem)
+TEST(Playback, StepsIntoTheNextItem)
 {
-    TestDesk desk(ListOf({Item(1), Item(1)}));
+    TestDesk desk(ListOf({Item(1), Item(0), Item(1)}, {Entry(0, Ticks(0)), Entry(2, Ticks(0))}));
     desk.Start(Second - Ticks(900));
     desk.Do(desk.navigator.Pause());
-    const std::string before = desk.Snapshot();
 
-    EXPECT_EQ(desk.navigator.Step().Reason(),
-              "the play item has no further picture in this direction");
-    EXPECT_EQ(desk.Take(), "");
-    EXPECT_EQ(desk.Snapshot(), before);
-
-    desk.Do(
-        desk.navigator.SetPlayMode(bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedNormal)));
-    desk.Do(desk.navigator.SearchTime(Second + Ticks(899)));
-    EXPECT_EQ(desk.navigator.Step().Reason(),
-              "the play item has no further picture in this direction");
-    desk.Do(desk.navigator.SearchTime(Second + Ticks(900)));
     EXPECT_TRUE(desk.navigator.Step().IsDone());
+
+    EXPECT_EQ(desk.Take(), "0+44100 CurrentTimePosition(45000)\n"
+                           "0+44100 PlayItem(7, 1, VideoFormatType1080p, "
+                           "VideoAspectRatioTypeNoInfo)\n"
+                           "0+44100 PlayItem(7, 2, VideoFormatType1080p, "
+                           "VideoAspectRatioTypeNoInfo)\n"
+                           "0+44100 MarkInfo(7, 1, 45000)\n"
+                           "0+44100 ChapterNumber(2)\n"
+                           "0+44100 Stepped(45000, PlayDirectionForward)\n");
+    EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Paused);
+}
+
+TEST(Playback, StepsToTheStartOfTheNextItemFromTheMiddleOfTheLastPicture)
+{
+    TestDesk desk(ListOf({Item(1), Item(1)}));
+    desk.Start(Second - Ticks(10));
+    desk.Do(desk.navigator.Pause());
+
+    EXPECT_TRUE(desk.navigator.Step().IsDone());
+
     EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), Second);
+    EXPECT_EQ(desk.navigator.Context().GetPlayItemId(), 1);
+}
+
+TEST(Playback, StepsBackToTheLastPictureOfThePreviousItem)
+{
+    PlayItem first = Item(1);
+    first.streams.primaryVideo.front().attributes.frameRate = 2; // 1875 ticks a picture
+    TestDesk desk(ListOf({first, Item(0), Item(1)}));
+    for (const Ticks position : {Second, Second + Ticks(899)}) {
+        desk.Start();
+        desk.Do(desk.navigator.Pause());
+        desk.Do(desk.navigator.SetPlayMode(
+            bd::PlayMode(bd::PlayDirectionBackward, bd::PlaySpeedNormal)));
+        desk.Do(desk.navigator.SearchTime(position));
+
+        EXPECT_TRUE(desk.navigator.Step().IsDone());
+
+        EXPECT_EQ(desk.navigator.Context().GetPlayItemId(), 0);
+        EXPECT_EQ(desk.navigator.Context().GetCurrentTimePosition(), 45000U - 1875U);
+        desk.Do(desk.navigator.Stop());
+    }
+}
+
+TEST(Playback, RefusesToStepWhereNoPictureFollows)
+{
+    struct {
+        PlayList playList;
+        Ticks position;
+        bd::PlayDirectionDef direction;
+        const char* reason;
+    } const cases[] = {
+        {ListOf({Item(1)}), Second - Ticks(900), bd::PlayDirectionForward,
+         "no further picture before a still or the end"},
+        {ListOf({Item(1), Item(0)}), Second - Ticks(900), bd::PlayDirectionForward,
+         "no further picture before a still or the end"},
+        {ListOf({WithTimedStill(Item(1), 5), Item(1)}), Second - Ticks(900),
+         bd::PlayDirectionForward, "no further picture before a still or the end"},
+        {ListOf({Item(1), WithTimedStill(Item(0), 5), Item(1)}), Second - Ticks(900),
+         bd::PlayDirectionForward, "no further picture before a still or the end"},
+        {ListOf({Item(1)}), Ticks(0), bd::PlayDirectionBackward, "this is the first picture"},
+        {ListOf({Item(1)}), Ticks(899), bd::PlayDirectionBackward, "this is the first picture"}};
+    for (const auto& item : cases) {
+        TestDesk desk(item.playList);
+        desk.Start();
+        desk.Do(desk.navigator.Pause());
+        desk.Do(desk.navigator.SetPlayMode(bd::PlayMode(item.direction, bd::PlaySpeedNormal)));
+        desk.Do(desk.navigator.SearchTime(item.position));
+        const std::string before = desk.Snapshot();
+
+        EXPECT_EQ(desk.navigator.Step().Reason(), item.reason);
+        EXPECT_EQ(desk.Take(), "");
+        EXPECT_EQ(desk.Snapshot(), before);
+    }
+}
+
+TEST(Playback, StepsFromTheLastPictureToTheStartOfARepeatedTitle)
+{
+    TestDesk desk(ListOf({Item(1), Item(1)}));
+    desk.Start(2 * Second - Ticks(900));
+    desk.Do(desk.navigator.Pause());
+    desk.Do(desk.navigator.RepeatTitle());
+
+    EXPECT_TRUE(desk.navigator.Step().IsDone());
+
+    EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), Ticks(0));
+    EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Paused);
+}
+
+TEST(Playback, RefusesToStepInARepeatedTitleWithoutLength)
+{
+    TestDesk desk(ListOf({Item(0), Item(0)}));
+    desk.Start();
+    desk.Do(desk.navigator.Pause());
+    desk.Do(desk.navigator.RepeatTitle());
+
+    EXPECT_FALSE(desk.navigator.Step().IsDone());
+}
+
+TEST(Playback, StepsFromTheLastPictureOfARepeatedChapterThatEndsInAStill)
+{
+    TestDesk desk(ListOf({WithEndlessStill(Item(1))}, {Entry(0, Second / 2)}));
+    desk.Start(Second - Ticks(900));
+    desk.Do(desk.navigator.Pause());
+    desk.Do(desk.navigator.RepeatChapter());
+
+    EXPECT_TRUE(desk.navigator.Step().IsDone());
+
+    EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), Second / 2);
 }
 
 TEST(Playback, LeavesATimedStillAfterItsTime)

@@ -173,6 +173,95 @@ TEST(Position, SkipsBackToTheStartOfTheFirstChapterAtAnyTime)
     EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), Second);
 }
 
+/** An item of ten seconds with chapters 3 and 5; the marks of the others are after its end. */
+PlayList ChaptersThreeAndFive()
+{
+    return ListOf({Item(10)}, {Entry(0, 11 * Second), Entry(0, 11 * Second), Entry(0, 2 * Second),
+                               Entry(0, 11 * Second), Entry(0, 6 * Second), Entry(0, 11 * Second)});
+}
+
+TEST(Position, SkipsForwardOverChaptersWithoutAPosition)
+{
+    TestDesk desk(ChaptersThreeAndFive());
+    desk.Start(Second);
+
+    EXPECT_TRUE(desk.navigator.SkipToNextChapter().IsDone());
+    EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), 2 * Second);
+    EXPECT_TRUE(desk.navigator.SkipToNextChapter().IsDone());
+    EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), 6 * Second);
+    EXPECT_EQ(desk.navigator.SkipToNextChapter().Reason(),
+              "no chapter 6; chapters are numbered 1 to 5");
+}
+
+TEST(Position, SkipsBackOverChaptersWithoutAPosition)
+{
+    TestDesk desk(ChaptersThreeAndFive());
+    desk.Start(7 * Second);
+
+    EXPECT_TRUE(desk.navigator.SkipToPreviousChapter().IsDone());
+    EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), 2 * Second);
+    desk.navigator.Advance(Second);
+    EXPECT_TRUE(desk.navigator.SkipToPreviousChapter().IsDone());
+    EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), 2 * Second);
+}
+
+TEST(Position, RefusesAChapterWithoutAPosition)
+{
+    TestDesk desk(ChaptersThreeAndFive());
+    desk.Start(Second);
+
+    EXPECT_EQ(desk.navigator.SearchChapter(4).Reason(),
+              "the mark of chapter 4 is outside its play item");
+    EXPECT_EQ(desk.navigator.SearchChapter(0).Reason(),
+              "no chapter 0; chapters are numbered 1 to 5");
+}
+
+/** FourChapters() whose second item may be entered in sequence only. */
+PlayList WithoutRandomAccessToTheSecondItem()
+{
+    PlayList playList = FourChapters();
+    playList.playItems[1].randomAccessFlag = true;
+    return playList;
+}
+
+TEST(Position, RefusesToJumpIntoAnItemWithoutRandomAccess)
+{
+    TestDesk desk(WithoutRandomAccessToTheSecondItem());
+    desk.Start(6 * Second);
+    const std::string before = desk.Snapshot();
+
+    const std::string reason = "play item 1 does not permit random access";
+    EXPECT_EQ(desk.navigator.SearchTime(10 * Second).Reason(), reason);
+    EXPECT_EQ(desk.navigator.SearchChapter(4).Reason(), reason);
+    EXPECT_EQ(desk.navigator.SkipToNextChapter().Reason(), reason);
+    EXPECT_EQ(desk.Take(), "");
+    EXPECT_EQ(desk.Snapshot(), before);
+
+    EXPECT_TRUE(desk.navigator.SearchTime(10 * Second - Ticks(1)).IsDone());
+}
+
+TEST(Position, JumpsWithinAnItemWithoutRandomAccessAndOutOfIt)
+{
+    TestDesk desk(WithoutRandomAccessToTheSecondItem());
+    desk.Start(11 * Second);
+
+    EXPECT_TRUE(desk.navigator.SearchTime(19 * Second).IsDone());
+    EXPECT_TRUE(desk.navigator.SearchChapter(3).IsDone());
+    EXPECT_TRUE(desk.navigator.SkipToPreviousChapter().IsDone());
+    EXPECT_EQ(Ticks(desk.navigator.Context().GetCurrentTimePosition()), 5 * Second);
+}
+
+TEST(Position, RefusesToSkipBackIntoAnItemWithoutRandomAccess)
+{
+    PlayList playList = FourChapters();
+    playList.playItems[0].randomAccessFlag = true;
+    TestDesk desk(playList);
+    desk.Start(11 * Second);
+
+    EXPECT_EQ(desk.navigator.SkipToPreviousChapter().Reason(),
+              "play item 0 does not permit random access");
+}
+
 TEST(Position, RefusesChaptersThatDoNotExist)
 {
     TestDesk desk(FourChapters());

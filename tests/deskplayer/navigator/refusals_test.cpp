@@ -84,7 +84,10 @@ const NamedOperation Unmaskable[] = {
     {"EndChapterTitleRepeat", [](TestDesk& d) { return d.navigator.EndChapterTitleRepeat(); }},
     {"SetTrigger", [](TestDesk& d) { return d.navigator.SetTrigger(Second); }},
     {"SelectStyle", [](TestDesk& d) { return d.navigator.SelectStyle(2); }},
-    {"Zoom", [](TestDesk& d) { return d.navigator.Zoom({}); }},
+    {"Zoom",
+     [](TestDesk& d) {
+         return d.navigator.Zoom({WholePicture, WholePicture, 0});
+     }},
     {"GoToStandby", [](TestDesk& d) { return d.navigator.GoToStandby(); }},
     {"FailPreload", [](TestDesk& d) { return d.navigator.FailPreload(); }},
     {"Starve", [](TestDesk& d) { return d.navigator.Starve(); }},

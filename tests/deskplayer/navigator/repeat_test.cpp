@@ -272,6 +272,18 @@ TEST(Repeat, EndsTheRepeatOfAChapterOrThePlayList)
     }
 }
 
+TEST(Repeat, BetweenTwoPointsContinuesWhenTheRepeatOfAChapterEnds)
+{
+    TestDesk desk(ListOf({Item(10)}));
+    desk.Start();
+    SetPoints(desk, Second);
+
+    EXPECT_TRUE(desk.navigator.EndChapterTitleRepeat().IsDone());
+
+    EXPECT_EQ(desk.navigator.Context().GetCurrentABRepeatState(), bd::TRIGGER_B);
+    EXPECT_TRUE(desk.navigator.IsRepeating());
+}
+
 TEST(Repeat, AllowsOnlyOneKindAtATime)
 {
     TestDesk desk(ListOf({Item(10)}, {Entry(0, Ticks(0))}));

@@ -1,6 +1,7 @@
 #include <gtest/gtest.h>
 
 #include <functional>
+#include <utility>
 
 #include "../testdesk.h"
 
@@ -174,6 +175,26 @@ TEST(Streams, AreShownAndHidden)
     }
 }
 
+TEST(Streams, ThatAnItemLacksCanBeHiddenButNotShown)
+{
+    TestDesk desk(ListOf({RichItem(10), Item(10)}));
+    desk.Start(Second);
+    desk.Do(desk.navigator.ShowSecondaryVideo(true));
+    desk.Do(desk.navigator.ShowSecondaryAudio(true));
+    desk.Do(desk.navigator.SearchTime(11 * Second));
+
+    EXPECT_EQ(desk.navigator.ShowSecondaryVideo(true).Reason(),
+              "the play item has no secondary video");
+    EXPECT_EQ(desk.navigator.ShowSecondaryAudio(true).Reason(),
+              "the play item has no secondary audio");
+    EXPECT_EQ(desk.Take(), "");
+
+    EXPECT_TRUE(desk.navigator.ShowSecondaryVideo(false).IsDone());
+    EXPECT_TRUE(desk.navigator.ShowSecondaryAudio(false).IsDone());
+    EXPECT_EQ(desk.Take(), "1 SecondaryVideoDisplay(0, false)\n"
+                           "1 SecondaryAudioDisplay(0, false)\n");
+}
+
 TEST(Streams, HiddenSubtitlesAreNotAvailable)
 {
     TestDesk desk(ListOf({RichItem(10)}));
@@ -234,6 +255,38 @@ TEST(Zoom, IsAnnouncedWithItsParameters)
     EXPECT_TRUE(desk.navigator.Zoom({{1, 2, 3, 4}, {5, 6, 7, 8}, 9}).IsDone());
 
     EXPECT_EQ(desk.Take(), "1 ZoomModeSet(((1, 2, 3, 4), (5, 6, 7, 8), 9))\n");
+}
+
+TEST(Streams, AreZoomedToTheBordersOfThePicture)
+{
+    TestDesk desk(ListOf({Item(10)}));
+    desk.Start(Second);
+
+    EXPECT_TRUE(desk.navigator.Zoom({WholePicture, WholePicture, 0}).IsDone());
+    EXPECT_TRUE(desk.navigator.Zoom({{1919, 1079, 1, 1}, WholePicture, 0}).IsDone());
+}
+
+TEST(Streams, AreNotZoomedToRectanglesOutsideThePicture)
+{
+    TestDesk desk(ListOf({Item(10)}));
+    desk.Start(Second);
+    const std::string before = desk.Snapshot();
+    const struct {
+        bd::ZoomRectangleDef rectangle;
+        const char* reason;
+    } cases[] = {{{0, 0, 0, 0}, "a rectangle of 0x0 has no area"},
+                 {{0, 0, 1, 0}, "a rectangle of 1x0 has no area"},
+                 {{0, 0, 0, 1}, "a rectangle of 0x1 has no area"},
+                 {{1919, 0, 2, 1}, "the rectangle extends to 1921,1, but the picture is 1920x1080"},
+                 {{0, 1080, 1, 1}, "the rectangle extends to 1,1081, but the picture is 1920x1080"},
+                 {{65535, 65535, 65535, 65535},
+                  "the rectangle extends to 131070,131070, but the picture is 1920x1080"}};
+    for (const auto& wrong : cases) {
+        EXPECT_EQ(desk.navigator.Zoom({wrong.rectangle, WholePicture, 0}).Reason(), wrong.reason);
+        EXPECT_EQ(desk.navigator.Zoom({WholePicture, wrong.rectangle, 0}).Reason(), wrong.reason);
+    }
+    EXPECT_EQ(desk.Take(), "");
+    EXPECT_EQ(desk.Snapshot(), before);
 }
 
 /** A play item whose secondary streams come from a sub path of @p type. */
@@ -319,6 +372,25 @@ TEST(SecondaryStreams, AreAnnouncedUnavailableOnceInAnItemWithoutThem)
                   "10 SecondaryAudioInfo(0)\n"
                   "10 SecondaryAudioDisplay(0, false)\n");
     }
+}
+
+TEST(SecondaryStreams, ThatAreAsyncAreAnnouncedInANewItemAtAnySpeed)
+{
+    PlayList playList = WithSecondaryStreamsOf(bd::SubPathOutOfMuxASynchPipPresentationPath);
+    std::swap(playList.playItems[0], playList.playItems[1]);
+    TestDesk desk(playList);
+    desk.Start();
+    desk.navigator.SetPlayMode(Fast());
+    desk.Take();
+
+    desk.navigator.SearchTime(15 * Second);
+
+    const std::string received = desk.Take();
+    EXPECT_NE(received.find(Available), std::string::npos) << received;
+    EXPECT_EQ(received.find("Unavailable"), std::string::npos) << received;
+    desk.navigator.SetPlayMode(bd::PlayMode());
+    EXPECT_EQ(desk.Take(),
+              std::string("0 PlayMode(PlayDirectionForward, PlaySpeedNormal)\n") + Available);
 }
 
 TEST(SecondaryStreams, OfAMissingSubPathAreSync)

@@ -81,17 +81,17 @@ TEST(OutputFilter, NamesAnUnknownInterfaceAndAllInterfaces)
 {
     OutputFilter filter;
 
-    EXPECT_EQ(MessageOf([&] { filter.KeepInterfaces("control,buttons"); }),
-              "'buttons' is not a listener interface; expected control, settings, button or "
+    EXPECT_EQ(MessageOf([&] { filter.KeepInterfaces("control,remote"); }),
+              "'remote' is not a listener interface; expected control, settings, button or "
               "interactive");
 }
 
 TEST(OutputFilter, NamesAnUnknownCallbackAndAllCallbacks)
 {
     OutputFilter filter;
-    const std::string message = MessageOf([&] { filter.KeepCallbacks("PlayItem,playitem"); });
+    const std::string message = MessageOf([&] { filter.KeepCallbacks("PlayItem,Picture"); });
 
-    EXPECT_EQ(message.rfind("'playitem' is not a callback; expected PlayStarted, ", 0), 0U)
+    EXPECT_EQ(message.rfind("'Picture' is not a callback; expected PlayStarted, ", 0), 0U)
         << message;
     for (const CallbackInfo& info : AllCallbacks) {
         EXPECT_NE(message.find(' ' + std::string(info.name)), std::string::npos) << info.name;

@@ -178,7 +178,7 @@ TEST(WantsColours, OnATerminal)
     const Terminal terminal;
     ASSERT_NE(terminal.FileDescriptor(), -1);
 
-    EXPECT_TRUE(WantsColours(terminal.FileDescriptor(), nullptr));
+    EXPECT_TRUE(WantsColours(terminal.FileDescriptor(), nullptr, "xterm"));
 }
 
 TEST(WantsColours, NotInAFile)
@@ -186,7 +186,7 @@ TEST(WantsColours, NotInAFile)
     const int file = open("/dev/null", O_WRONLY);
     ASSERT_NE(file, -1);
 
-    EXPECT_FALSE(WantsColours(file, nullptr));
+    EXPECT_FALSE(WantsColours(file, nullptr, "xterm"));
 
     close(file);
 }
@@ -196,8 +196,17 @@ TEST(WantsColours, NotIfNoColorHasAValue)
     const Terminal terminal;
     ASSERT_NE(terminal.FileDescriptor(), -1);
 
-    EXPECT_FALSE(WantsColours(terminal.FileDescriptor(), "1"));
-    EXPECT_FALSE(WantsColours(terminal.FileDescriptor(), "0"));
+    EXPECT_FALSE(WantsColours(terminal.FileDescriptor(), "1", "xterm"));
+    EXPECT_FALSE(WantsColours(terminal.FileDescriptor(), "0", "xterm"));
+}
+
+TEST(WantsColours, NotOnADumbTerminal)
+{
+    const Terminal terminal;
+    ASSERT_NE(terminal.FileDescriptor(), -1);
+
+    EXPECT_FALSE(WantsColours(terminal.FileDescriptor(), nullptr, "dumb"));
+    EXPECT_TRUE(WantsColours(terminal.FileDescriptor(), nullptr, nullptr));
 }
 
 TEST(WantsColours, IfNoColorIsEmpty)
@@ -205,7 +214,7 @@ TEST(WantsColours, IfNoColorIsEmpty)
     const Terminal terminal;
     ASSERT_NE(terminal.FileDescriptor(), -1);
 
-    EXPECT_TRUE(WantsColours(terminal.FileDescriptor(), ""));
+    EXPECT_TRUE(WantsColours(terminal.FileDescriptor(), "", "xterm"));
 }
 
 } // namespace

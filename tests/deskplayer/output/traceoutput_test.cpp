@@ -276,6 +276,42 @@ TEST(TraceOutput, ShowsSuspendedAndStandby)
               "Playing 4000-5000");
 }
 
+TEST(TraceOutput, ReturnsToTheStateBeforeASuspension)
+{
+    TracedSession session;
+    session->PlayStarted();
+    session.PassSecond();
+    session->Paused();
+    session.PassSecond();
+    session->Suspended();
+    session.PassSecond();
+    session->Resumed();
+    session.PassSecond();
+    session->StillOn();
+    session.PassSecond();
+    session->Suspended();
+    session.PassSecond();
+    session->Resumed();
+    session.PassSecond();
+    session->StillOff();
+    session.PassSecond();
+    session->Stopped();
+
+    EXPECT_EQ(session.Slices("playback"),
+              "Playing 0-1000, Paused 1000-2000, Suspended 2000-3000, Paused 3000-4000, "
+              "Still 4000-5000, Suspended 5000-6000, Still 6000-7000, Playing 7000-8000");
+}
+
+TEST(TraceOutput, ShowsPlayingAfterASuspensionThatBeganBeforeIt)
+{
+    TracedSession session;
+    session->Resumed();
+    session.PassSecond();
+    session->Stopped();
+
+    EXPECT_EQ(session.Slices("playback"), "Playing 0-1000");
+}
+
 TEST(TraceOutput, IgnoresTheEndOfAStillThatPlaybackHasLeft)
 {
     TracedSession session;

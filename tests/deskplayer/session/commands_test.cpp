@@ -217,13 +217,25 @@ TEST(Commands, AreAllCoveredByExamples)
             << example.line;
     }
 
+    patterns.insert("expect nothing"); // expectations are not performed
+    patterns.insert("expect CALLBACK [ARGUMENT=VALUE ...]");
     std::set<std::string_view> all;
     for (const CommandSyntax& syntax : CommandSyntaxes()) {
         EXPECT_TRUE(all.insert(syntax.pattern).second) << syntax.pattern << " occurs twice";
         EXPECT_FALSE(syntax.help.empty()) << syntax.pattern;
     }
     EXPECT_EQ(patterns, all);
-    EXPECT_EQ(Commands().size(), CommandSyntaxes().size());
+    EXPECT_EQ(Commands().size() + 2, CommandSyntaxes().size());
+}
+
+TEST(Commands, AreNotExpectations)
+{
+    const std::vector<ScriptStep> steps =
+        ParseScript("fail stream\nexpect nothing\nexpect Paused", "a.session", CommandSyntaxes());
+
+    EXPECT_FALSE(IsExpectation(steps[0]));
+    EXPECT_TRUE(IsExpectation(steps[1]));
+    EXPECT_TRUE(IsExpectation(steps[2]));
 }
 
 TEST(Commands, GoToStandbyAndWakeUpWithTheStoredData)

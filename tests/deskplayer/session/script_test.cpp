@@ -29,7 +29,9 @@ enum Command : std::size_t {
     CommandSubtitleOn,
     CommandSubtitle,
     CommandSubtitleStyle,
-    CommandLoop
+    CommandLoop,
+    CommandExpectNothing,
+    CommandExpect
 };
 
 const std::vector<CommandSyntax> Syntaxes = {
@@ -44,6 +46,8 @@ const std::vector<CommandSyntax> Syntaxes = {
     {"subtitle NUMBER", ""},
     {"subtitle style NUMBER", ""},
     {"loop TIME to TIME times NUMBER", ""},
+    {"expect nothing", ""},
+    {"expect CALLBACK [ARGUMENT=VALUE ...]", ""},
 };
 
 const std::string TimeHelp = "a TIME (such as 1:02:03.5, 02:03, 3.25, 2s, 500ms, 1.5m or 1h)";
@@ -105,6 +109,61 @@ std::string Repeat(std::size_t times, const std::string& text)
 TEST(ParseScript, ReadsNothingFromAnEmptyText)
 {
     EXPECT_TRUE(Parse("").empty());
+}
+
+TEST(ParseScript, IgnoresAByteOrderMarkAtTheStart)
+{
+    EXPECT_EQ(ParseLine("\xEF\xBB\xBFplay").command, CommandPlay);
+    EXPECT_EQ(ErrorOf("\xEF\xBB\xBFplay now"),
+              "1:6: unexpected 'now'; expected the end of the line");
+    EXPECT_EQ(ErrorOf("play\n\xEF\xBB\xBFplay").substr(0, 4), "2:1:");
+}
+
+TEST(ParseScript, ReadsAnExpectation)
+{
+    using Words = std::vector<std::string>;
+
+    EXPECT_EQ(ParseLine("expect nothing").command, CommandExpectNothing);
+    EXPECT_EQ(ParseLine("expect nothing").words, Words());
+    EXPECT_EQ(ParseLine("after 1s expect Paused").command, CommandExpect);
+    EXPECT_EQ(ParseLine("after 1s expect Paused").words, Words{"Paused"});
+    EXPECT_EQ(ParseLine("expect PlayItem a=1 b=x=y  # why").words,
+              (Words{"PlayItem", "a=1", "b=x=y"}));
+}
+
+TEST(ParseScript, NamesTheProblemOfAnExpectation)
+{
+    const std::string further =
+        "expected an ARGUMENT=VALUE (such as number=2) or the end of the line";
+
+    EXPECT_EQ(ErrorOf("expect"), "1:7: the line ends here; expected nothing or a CALLBACK");
+    for (const std::string wrong : {"x", "=x", "x=", "="}) {
+        EXPECT_EQ(ErrorOf("expect Paused a=1 " + wrong),
+                  "1:19: unexpected '" + wrong + "'; " + further);
+    }
+    EXPECT_EQ(ErrorOf("expect nothing a=1"),
+              "1:16: unexpected 'a=1'; expected the end of the line");
+}
+
+TEST(ParseScript, AcceptsOnlyTheGivenCallbacks)
+{
+    const std::vector<std::string_view> callbacks = {"Paused", "Stopped"};
+
+    EXPECT_EQ(ParseScript("expect Stopped", "file", Syntaxes, callbacks).size(), 1u);
+    EXPECT_EQ(ParseScript("expect nothing", "file", Syntaxes, callbacks).size(), 1u);
+    try {
+        ParseScript("play\nexpect stopped", "file", Syntaxes, callbacks);
+        ADD_FAILURE() << "nothing was thrown";
+    } catch (const ScriptError& error) {
+        EXPECT_STREQ(error.what(), "file:2:8: 'stopped' is not a callback; did you mean Stopped?");
+    }
+}
+
+TEST(ParseScript, NamesNegativeTimesAndNumbers)
+{
+    EXPECT_EQ(ErrorOf("after -1s play"), "1:7: '-1s' is negative; expected " + TimeHelp);
+    EXPECT_EQ(ErrorOf("chapter -1"), "1:9: '-1' is negative; expected next, previous or a NUMBER");
+    EXPECT_EQ(ErrorOf("chapter -x"), "1:9: unexpected '-x'; expected next, previous or a NUMBER");
 }
 
 TEST(ParseScript, ReadsOneCommandPerLine)
@@ -286,12 +345,13 @@ TEST(ParseScriptRefuses, AnUnknownWord)
 TEST(ParseScriptRefuses, AnUnknownFirstWordAndNamesEveryFirstWordOnce)
 {
     EXPECT_EQ(ErrorOf("\n  chaptr next"), "2:3: unexpected 'chaptr'; expected at, after, "
-                                          "play, chapter, seek, forward, subtitle or loop");
+                                          "play, chapter, seek, forward, subtitle, loop or expect");
 }
 
 TEST(ParseScriptRefuses, ASecondTimeOnALine)
 {
-    const std::string commands = "; expected play, chapter, seek, forward, subtitle or loop";
+    const std::string commands =
+        "; expected play, chapter, seek, forward, subtitle, loop or expect";
     EXPECT_EQ(ErrorOf("at 2s at 3s play"), "1:7: unexpected 'at'" + commands);
     EXPECT_EQ(ErrorOf("after 2s 3s play"), "1:10: unexpected '3s'" + commands);
 }
@@ -370,7 +430,7 @@ TEST(ParseScriptRefuses, NumbersWithTrailingCharacters)
 
 TEST(ParseScriptRefuses, NumbersWithASign)
 {
-    EXPECT_EQ(ErrorOf("subtitle style -1"), "1:16: unexpected '-1'; expected a NUMBER");
+    EXPECT_EQ(ErrorOf("subtitle style -1"), "1:16: '-1' is negative; expected a NUMBER");
     EXPECT_EQ(ErrorOf("subtitle style +1"), "1:16: unexpected '+1'; expected a NUMBER");
 }
 
@@ -385,7 +445,7 @@ TEST(ParseScriptRefuses, MalformedTimes)
 
 TEST(ParseScriptRefuses, WordsInPlaceOfATime)
 {
-    for (const std::string time : {"soon", "-1", "+1", ".5", ":30", "s"}) {
+    for (const std::string time : {"soon", "-", "+1", ".5", ":30", "s"}) {
         EXPECT_EQ(TimeErrorOf(time), "1:6: unexpected '" + time + "'");
     }
 }
@@ -432,7 +492,7 @@ TEST(ParseScriptRefuses, ALineWithoutATimeAfterAtOrAfter)
 
 TEST(ParseScriptRefuses, ATimeWithoutACommand)
 {
-    const std::string commands = "expected play, chapter, seek, forward, subtitle or loop";
+    const std::string commands = "expected play, chapter, seek, forward, subtitle, loop or expect";
     EXPECT_EQ(ErrorOf("at 3s"), "1:6: the line ends here; " + commands);
     EXPECT_EQ(ErrorOf("after 3s # play"), "1:9: the line ends here; " + commands);
 }

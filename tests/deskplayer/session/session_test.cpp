@@ -254,6 +254,45 @@ TEST(FromStartToEnd, ReportsEverySecondOfTwoHours)
     EXPECT_NE(received.find("\n3601 CurrentTimePosition(162045000)\n"), std::string::npos);
 }
 
+TEST(SessionExpectations, AreCheckedAtTheirTimeWithoutEndingTheirCommand)
+{
+    TestDesk desk(ListOf({Item(10)}));
+    std::string calls;
+    SessionHooks hooks = desk.Hooks();
+    hooks.beforeCommand = [&] { calls += "command\n"; };
+    hooks.onExpectation = [&](const ScriptStep& step) {
+        calls += std::to_string(desk.clock.Now() / Second) + " line " + std::to_string(step.line);
+        for (const std::string& word : step.words) {
+            calls += " " + word;
+        }
+        calls += "\n";
+    };
+
+    PlaySession(ParseScript("play\n"
+                            "expect nothing\n"
+                            "after 2s expect PlayStarted\n"
+                            "pause\n"
+                            "after 1s expect Paused a=1 b=2\n",
+                            "a.session", CommandSyntaxes()),
+                desk.desk, hooks);
+
+    EXPECT_EQ(calls, "command\n"
+                     "0 line 2\n"
+                     "2 line 3 PlayStarted\n"
+                     "command\n"
+                     "3 line 5 Paused a=1 b=2\n");
+}
+
+TEST(SessionExpectations, AreIgnoredWithoutAHook)
+{
+    TestDesk desk(ListOf({Item(10)}));
+
+    PlaySession(ParseScript("expect Stopped\nplay\n", "a.session", CommandSyntaxes()), desk.desk,
+                desk.Hooks());
+
+    EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Finished);
+}
+
 } // namespace
 
 } // namespace deskplayer
