@@ -77,7 +77,10 @@ void Play(LoadedPlayList playList, const std::vector<ScriptStep>& steps, const O
 
     if (options.remote) {
         std::cerr << RemoteHelp();
-        PlayByRemote(desk, STDIN_FILENO, PrintMessage);
+        RemoteHooks hooks;
+        hooks.beforeWaiting = [&stream] { stream.flush(); };
+        hooks.onRefused = PrintMessage;
+        PlayByRemote(desk, STDIN_FILENO, hooks);
         return;
     }
 

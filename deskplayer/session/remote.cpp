@@ -182,13 +182,15 @@ std::string RemoteHelp()
     return help.str();
 }
 
-void PlayByRemote(Desk& desk, int keys,
-                  const std::function<void(const std::string& reason)>& onRefused)
+void PlayByRemote(Desk& desk, int keys, const RemoteHooks& hooks)
 {
     const SingleKeys singleKeys(keys);
     const Clock::time_point start = Clock::now();
     desk.Navigator().Play();
     while (desk.Navigator().CurrentStatus() != Status::Finished) {
+        if (hooks.beforeWaiting) {
+            hooks.beforeWaiting();
+        }
         pollfd input = {keys, POLLIN, 0};
         const int ready = poll(&input, 1, TimeoutOf(desk.Navigator()));
         const Ticks now = TimeSince(start);
@@ -209,8 +211,8 @@ void PlayByRemote(Desk& desk, int keys,
             continue;
         }
         const Outcome outcome = found->perform(desk);
-        if (!outcome.IsDone()) {
-            onRefused(outcome.Reason());
+        if (!outcome.IsDone() && hooks.onRefused) {
+            hooks.onRefused(outcome.Reason());
         }
     }
 }

@@ -28,6 +28,18 @@ const std::vector<RemoteKey>& RemoteKeys();
 /** The keys and their descriptions, in a few lines. */
 std::string RemoteHelp();
 
+/** What a remote calls. Each may be empty. */
+struct RemoteHooks {
+    /**
+     * Called before every wait for a key or for the next change, when all callbacks so far have
+     * been delivered.
+     */
+    std::function<void()> beforeWaiting;
+
+    /** Called with the reason when the operation of a key was refused. */
+    std::function<void(const std::string& reason)> onRefused;
+};
+
 /**
  * Plays in real time, controlled by keys from a terminal, until `q`, Ctrl-C, the end of the input,
  * or the end of playback. Input that is not a terminal is read unchanged.
@@ -35,11 +47,9 @@ std::string RemoteHelp();
  * The terminal's settings are restored at the end, even if a signal ends the program.
  *
  * @param keys file descriptor to read single characters from
- * @param onRefused called with the reason when the operation of a key was refused
  * @throw any exception thrown by a listener
  */
-void PlayByRemote(Desk& desk, int keys,
-                  const std::function<void(const std::string& reason)>& onRefused);
+void PlayByRemote(Desk& desk, int keys, const RemoteHooks& hooks);
 
 } // namespace deskplayer
 

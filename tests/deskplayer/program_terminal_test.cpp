@@ -1,7 +1,10 @@
 #include <gtest/gtest.h>
 
+#include <chrono>
+#include <csignal>
 #include <cstdlib>
 #include <string>
+#include <thread>
 #include <vector>
 
 #include "programtest.h"
@@ -10,6 +13,19 @@ namespace
 {
 
 using DeskPlayerTerminal = ScratchDisc;
+
+/** Waits for a file that another process writes. @return whether @p text appeared in it in time */
+bool AppearsIn(const fs::path& file, const std::string& text)
+{
+    const auto end = std::chrono::steady_clock::now() + std::chrono::seconds(20);
+    while (std::chrono::steady_clock::now() < end) {
+        if (ReadContents(file).find(text) != std::string::npos) {
+            return true;
+        }
+        std::this_thread::sleep_for(std::chrono::milliseconds(10));
+    }
+    return false;
+}
 
 TEST_F(DeskPlayerTerminal, ShowsProgressIfPlaybackTakesLong)
 {
@@ -64,6 +80,35 @@ TEST_F(DeskPlayerTerminal, ShowsTheKeysOfTheRemoteAndEndsWithoutInput)
     EXPECT_EQ(result.status, 0);
     EXPECT_EQ(result.output, "00:00:00.000  PlayStarted\n");
     EXPECT_NE(result.errors.find("space pause/continue"), std::string::npos) << result.errors;
+}
+
+TEST_F(DeskPlayerTerminal, WritesEveryCallbackOfTheRemoteAtOnceWhereverTheOutputGoes)
+{
+    const std::string file = folder / "out.txt";
+    for (const bool redirected : {false, true}) {
+        fs::remove(file);
+        std::vector<std::string> arguments = {SampleDisc, "--remote"};
+        if (!redirected) {
+            arguments.insert(arguments.end(), {"--output", file});
+        }
+        TerminalProgram program(arguments, redirected ? file : "");
+        EXPECT_TRUE(AppearsIn(file, "CurrentTimePosition")) << redirected;
+        program.Press(" ");
+        EXPECT_TRUE(AppearsIn(file, "Paused\n")) << redirected;
+
+        program.Send(SIGTERM);
+
+        EXPECT_EQ(program.Finish().status, -1);
+        EXPECT_NE(ReadContents(file).find("Paused\n"), std::string::npos);
+    }
+}
+
+TEST_F(DeskPlayerTerminal, WritesEveryCallbackInRealTimeAtOnce)
+{
+    const std::string file = folder / "out.txt";
+    TerminalProgram program({SampleDisc, "--realtime"}, file);
+
+    EXPECT_TRUE(AppearsIn(file, "00:00:01.000  CurrentTimePosition"));
 }
 
 } // namespace

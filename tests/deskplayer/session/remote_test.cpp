@@ -88,8 +88,9 @@ std::string Press(TestDesk& desk, const std::string& pressed)
     std::string refusals;
     Keys keys(pressed);
     keys.End();
-    PlayByRemote(desk.desk, keys.Descriptor(),
-                 [&refusals](const std::string& reason) { refusals += reason + "\n"; });
+    RemoteHooks hooks;
+    hooks.onRefused = [&refusals](const std::string& reason) { refusals += reason + "\n"; };
+    PlayByRemote(desk.desk, keys.Descriptor(), hooks);
     return refusals;
 }
 
@@ -221,7 +222,9 @@ TEST(Remote, LeavesAStill)
     ASSERT_EQ(pipe(ends), 0);
     presser.onStill = [&ends] { EXPECT_EQ(write(ends[1], "o", 1), 1); };
 
-    PlayByRemote(desk.desk, ends[0], [](const std::string& reason) { ADD_FAILURE() << reason; });
+    RemoteHooks hooks;
+    hooks.onRefused = [](const std::string& reason) { ADD_FAILURE() << reason; };
+    PlayByRemote(desk.desk, ends[0], hooks);
 
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Finished);
     close(ends[0]);
@@ -287,6 +290,19 @@ TEST(Remote, IgnoresUnknownKeys)
     TestDesk desk(LongPlayList());
 
     EXPECT_EQ(CallbacksOfKeys(desk, "", others), "");
+}
+
+TEST(Remote, CallsBeforeEveryWaitAfterTheCallbacks)
+{
+    TestDesk desk(LongPlayList());
+    Keys keys(" q");
+    std::vector<Status> statuses;
+    RemoteHooks hooks;
+    hooks.beforeWaiting = [&] { statuses.push_back(desk.navigator.CurrentStatus()); };
+
+    PlayByRemote(desk.desk, keys.Descriptor(), hooks);
+
+    EXPECT_EQ(statuses, (std::vector<Status>{Status::Playing, Status::Paused}));
 }
 
 TEST(Remote, ExplainsEveryKey)
