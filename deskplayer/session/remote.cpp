@@ -56,7 +56,7 @@ Outcome PerformCommand(Desk& desk, std::string_view pattern)
 }
 
 /** Signals that terminate a program and that it can handle. */
-constexpr std::array<int, 4> TerminatingSignals = {SIGHUP, SIGINT, SIGQUIT, SIGTERM};
+constexpr std::array<int, 5> TerminatingSignals = {SIGHUP, SIGINT, SIGQUIT, SIGTERM, SIGPIPE};
 
 /** The terminal to restore when a signal ends the program. Only one remote exists at a time. */
 int g_Terminal = -1;

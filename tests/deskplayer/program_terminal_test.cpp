@@ -1,4 +1,7 @@
+#include <fcntl.h>
 #include <gtest/gtest.h>
+#include <sys/stat.h>
+#include <unistd.h>
 
 #include <chrono>
 #include <csignal>
@@ -101,6 +104,24 @@ TEST_F(DeskPlayerTerminal, WritesEveryCallbackOfTheRemoteAtOnceWhereverTheOutput
         EXPECT_EQ(program.Finish().status, -1);
         EXPECT_NE(ReadContents(file).find("Paused\n"), std::string::npos);
     }
+}
+
+TEST_F(DeskPlayerTerminal, IsRestoredWhenTheReaderOfTheOutputHasEnded)
+{
+    const std::string pipe = folder / "pipe";
+    ASSERT_EQ(mkfifo(pipe.c_str(), 0600), 0);
+    const int reader = open(pipe.c_str(), O_RDONLY | O_NONBLOCK | O_CLOEXEC);
+    TerminalProgram program({SampleDisc, "--remote"}, pipe);
+    char first = '\0';
+    while (read(reader, &first, 1) != 1) {
+        std::this_thread::sleep_for(std::chrono::milliseconds(10));
+    }
+    EXPECT_FALSE(program.HasUsualSettings());
+
+    close(reader);
+
+    EXPECT_EQ(program.Finish().status, -1) << "ended by SIGPIPE";
+    EXPECT_TRUE(program.HasUsualSettings());
 }
 
 TEST_F(DeskPlayerTerminal, WritesEveryCallbackInRealTimeAtOnce)

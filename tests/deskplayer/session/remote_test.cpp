@@ -419,7 +419,7 @@ TEST(RemoteTerminal, IsRestoredWhenASignalEndsTheProgram)
 {
     const Terminal terminal;
     const termios before = terminal.Settings();
-    for (const int signal : {SIGHUP, SIGINT, SIGQUIT, SIGTERM}) {
+    for (const int signal : {SIGHUP, SIGINT, SIGQUIT, SIGTERM, SIGPIPE}) {
         EXPECT_EXIT(
             {
                 TestDesk desk(LongPlayList());
