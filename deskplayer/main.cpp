@@ -51,6 +51,10 @@ OutputOptions OutputOptionsOf(const Options& options)
     } catch (const std::invalid_argument& error) {
         throw UsageError(error.what());
     }
+    if (output.format == OutputFormat::Trace && (options.list || options.describe)) {
+        throw UsageError(std::string(options.list ? "--list" : "--describe") +
+                         " excludes --format trace");
+    }
     output.coloured =
         options.output.empty() && WantsColours(STDOUT_FILENO, std::getenv("NO_COLOR"));
     return output;

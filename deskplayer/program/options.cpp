@@ -31,6 +31,15 @@ public:
     }
 };
 
+/** Refuses an empty value, which is what a shell makes of an unset variable. */
+CLI::Validator NotEmpty(const std::string& expected)
+{
+    return {[expected](const std::string& value) {
+                return value.empty() ? "empty value; expected " + expected : std::string();
+            },
+            ""};
+}
+
 } // namespace
 
 void AddOptions(CLI::App& app, Options& options)
@@ -59,30 +68,37 @@ void AddOptions(CLI::App& app, Options& options)
     auto* const session =
         app.add_option("--session", options.session,
                        "Session file to carry out; by default, play from start to end")
+            ->check(NotEmpty("the name of a file"))
             ->type_name("FILE");
     auto* const realTime =
         app.add_flag("--realtime", options.realTime, "Play in real time instead of at once");
     auto* const remote = app.add_flag("--remote", options.remote,
                                       "Play in real time, with single keys as a remote control")
                              ->excludes(session);
-    for (CLI::Option* const playing : {playList, session, realTime, remote}) {
-        playing->excludes(list)->excludes(describe);
-    }
-
     app.add_option("--format", options.format,
                    "Output format: text, json (one object per line) or trace (for trace viewers)")
         ->type_name("FORMAT");
     app.add_option("--output", options.output, "File to write; standard output by default")
+        ->check(NotEmpty("the name of a file"))
         ->type_name("FILE");
-    app.add_option("--listen", options.listen,
-                   "Listener interfaces to write: control, settings, button, interactive")
-        ->type_name("NAME,...");
-    app.add_option("--only", options.only, "Callbacks to write: PlayItem, AudioInfo, ...")
-        ->type_name("NAME,...");
-    app.add_option("--log", options.log,
-                   "Log lines to write to standard error, such as BdmvNavigator=Event for those "
-                   "of events")
-        ->type_name("TEXT");
+    auto* const listen =
+        app.add_option("--listen", options.listen,
+                       "Listener interfaces to write: control, settings, button, interactive")
+            ->check(NotEmpty("names of listener interfaces"))
+            ->type_name("NAME,...");
+    auto* const only =
+        app.add_option("--only", options.only, "Callbacks to write: PlayItem, AudioInfo, ...")
+            ->check(NotEmpty("names of callbacks"))
+            ->type_name("NAME,...");
+    auto* const log =
+        app.add_option("--log", options.log,
+                       "Log lines to write to standard error, such as BdmvNavigator=Event for "
+                       "those of events")
+            ->type_name("TEXT");
+    for (CLI::Option* const playing : {playList, session, realTime, remote, listen, only, log}) {
+        playing->excludes(list)->excludes(describe);
+    }
+
     app.footer(
         "A session file has one command per line, which may begin with a time:\n"
         "\"at 00:01:30.500 chapter next\", \"after 2s pause\". --commands lists the commands.\n\n"

@@ -65,6 +65,15 @@ TEST(DeskPlayerUsage, RefusesOptionsThatExcludeEachOther)
                                                          {"--describe", "1", "--realtime"},
                                                          {"--describe", "1", "--session", Evening},
                                                          {"--describe", "1", "--remote"},
+                                                         {"--list", "--listen", "control"},
+                                                         {"--list", "--only", "PlayItem"},
+                                                         {"--list", "--log", "*=*"},
+                                                         {"--list", "--log", ""},
+                                                         {"--list", "--format", "trace"},
+                                                         {"--describe", "1", "--listen", "button"},
+                                                         {"--describe", "1", "--only", "PlayItem"},
+                                                         {"--describe", "1", "--log", "*=*"},
+                                                         {"--describe", "1", "--format", "trace"},
                                                          {"--remote", "--session", Evening}};
     for (std::vector<std::string> arguments : pairs) {
         SCOPED_TRACE(arguments.front() + " and others");
@@ -74,6 +83,22 @@ TEST(DeskPlayerUsage, RefusesOptionsThatExcludeEachOther)
         EXPECT_EQ(result.output, "");
         EXPECT_NE(result.errors.find(" excludes "), std::string::npos) << result.errors;
     }
+}
+
+TEST(DeskPlayerUsage, RefusesEmptyNames)
+{
+    for (const std::string option : {"--session", "--output", "--listen", "--only"}) {
+        for (const std::vector<std::string>& words :
+             std::vector<std::vector<std::string>>{{option, ""}, {option + "="}}) {
+            std::vector<std::string> arguments = {SampleDisc};
+            arguments.insert(arguments.end(), words.begin(), words.end());
+            const ProgramResult result = RunDeskPlayer(arguments);
+            EXPECT_EQ(result.status, 2) << option;
+            EXPECT_EQ(result.output, "");
+            EXPECT_NE(result.errors.find(option), std::string::npos) << result.errors;
+        }
+    }
+    EXPECT_EQ(RunDeskPlayer({SampleDisc, "--log", ""}).status, 0) << "switches every line off";
 }
 
 } // namespace
