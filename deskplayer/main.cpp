@@ -29,6 +29,7 @@
 #include "program/target.h"
 #include "session/remote.h"
 #include "session/session.h"
+#include "text/printable.h"
 #include "text/timetext.h"
 
 namespace deskplayer
@@ -101,7 +102,7 @@ void Play(LoadedPlayList playList, const std::vector<ScriptStep>& steps, const O
         }
     };
     hooks.onRefused = [&options, &desk](std::size_t line, const std::string& reason) {
-        PrintMessage(options.session + ":" + std::to_string(line) + ": refused at " +
+        PrintMessage(Printable(options.session) + ":" + std::to_string(line) + ": refused at " +
                      TimeText(desk.Clock().Now()) + ": " + reason);
     };
     if (options.session.empty()) {
@@ -146,29 +147,37 @@ void ConfigureLog(const Options& options)
     }
 }
 
+/** @return the exit status */
+int ParseAndRun(int argc, char** argv)
+{
+    Options options;
+    CLI::App app("Plays a play list of a Blu-ray disc without its streams and writes every "
+                 "callback that the navigator's listeners receive, with its time and arguments.",
+                 "bdmv-deskplayer");
+    AddOptions(app, options);
+    try {
+        app.parse(argc, argv);
+    } catch (const CLI::Success& text) {
+        Target target("");
+        std::ostream& stream = target.Open();
+        app.exit(text, stream, stream);
+        target.Finish();
+        return ExitOk;
+    } catch (const CLI::ParseError& error) {
+        throw UsageError(Printable(error.what()) + "; see --help");
+    }
+    ConfigureLog(options);
+    return Run(options);
+}
+
 } // namespace
 
 } // namespace deskplayer
 
 int main(int argc, char** argv)
 {
-    deskplayer::Options options;
-    CLI::App app("Plays a play list of a Blu-ray disc without its streams and writes every "
-                 "callback that the navigator's listeners receive, with its time and arguments.",
-                 "bdmv-deskplayer");
-    deskplayer::AddOptions(app, options);
     try {
-        app.parse(argc, argv);
-    } catch (const CLI::ParseError& error) {
-        if (app.exit(error) != 0) {
-            return deskplayer::ExitUsage;
-        }
-        return std::cout.flush() ? deskplayer::ExitOk : deskplayer::ExitOutput;
-    }
-
-    try {
-        deskplayer::ConfigureLog(options);
-        return deskplayer::Run(options);
+        return deskplayer::ParseAndRun(argc, argv);
     } catch (const deskplayer::DiscError& error) {
         deskplayer::PrintMessage(error.what());
         return deskplayer::ExitDisc;

@@ -1,8 +1,8 @@
 #include "program/options.h"
 
 #include <iomanip>
-#include <iostream>
 #include <memory>
+#include <sstream>
 
 #include "bdmvnavigator/version.h"
 #include "session/commands.h"
@@ -13,11 +13,14 @@ namespace deskplayer
 namespace
 {
 
-void PrintCommands()
+std::string CommandTable()
 {
+    std::ostringstream table;
     for (const CommandSyntax& syntax : CommandSyntaxes()) {
-        std::cout << std::left << std::setw(36) << syntax.pattern << syntax.help << '\n';
+        table << (table.tellp() > 0 ? "\n" : "") << std::left << std::setw(36) << syntax.pattern
+              << syntax.help;
     }
+    return table.str();
 }
 
 /** Help without the lists of mutually exclusive options. */
@@ -49,8 +52,8 @@ void AddOptions(CLI::App& app, Options& options)
     app.add_flag_callback(
         "--commands",
         [] {
-            PrintCommands();
-            throw CLI::Success();
+            // Like the version, a text that replaces the action.
+            throw CLI::CallForVersion(CommandTable(), CLI::ExitCodes::Success);
         },
         "Print the commands of sessions and exit");
     app.add_option("DISC", options.disc, "A BDMV folder or its parent")->required()->type_name("");

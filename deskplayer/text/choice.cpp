@@ -15,7 +15,7 @@ std::size_t FindChoice(std::string_view word, std::string_view kind,
     if (found != choices.end()) {
         return static_cast<std::size_t>(found - choices.begin());
     }
-    std::string message = "'" + Printable(std::string(word)) + "' is not ";
+    std::string message = "'" + Printable(word) + "' is not ";
     message.append(kind).append("; expected ").append(choices.front());
     for (std::size_t i = 1; i < choices.size(); ++i) {
         message.append(i + 1 < choices.size() ? ", " : " or ").append(choices[i]);

@@ -50,7 +50,8 @@ TEST(DeskPlayerUsage, IsRefusedWithStatus2WhenInvalid)
         const ProgramResult result = RunDeskPlayer(arguments);
         EXPECT_EQ(result.status, 2);
         EXPECT_EQ(result.output, "");
-        EXPECT_NE(result.errors, "");
+        EXPECT_EQ(result.errors.rfind("bdmv-deskplayer: ", 0), 0U) << result.errors;
+        EXPECT_EQ(LinesOf(result.errors).size(), 1U) << result.errors;
     }
 }
 
@@ -99,6 +100,28 @@ TEST(DeskPlayerUsage, RefusesEmptyNames)
         }
     }
     EXPECT_EQ(RunDeskPlayer({SampleDisc, "--log", ""}).status, 0) << "switches every line off";
+}
+
+TEST(DeskPlayerUsage, EscapesEveryNameInTheSameWay)
+{
+    const std::string name = "caf\xC3\xA9\x1B[2J\n\xE9\\";
+    const std::string escaped = "caf\xC3\xA9\\x1B[2J\\x0A\\xE9\\x5C";
+    const std::vector<std::vector<std::string>> commandLines = {
+        {name},
+        {SampleDisc, name},
+        {SampleDisc, "--" + name},
+        {SampleDisc, "--playlist", name},
+        {SampleDisc, "--format", name},
+        {SampleDisc, "--listen", name},
+        {SampleDisc, "--session", name},
+        {SampleDisc, "--output", "no/such/" + name}};
+    for (const std::vector<std::string>& arguments : commandLines) {
+        const ProgramResult result = RunDeskPlayer(arguments);
+        EXPECT_NE(result.status, 0);
+        EXPECT_EQ(result.errors.rfind("bdmv-deskplayer: ", 0), 0U) << result.errors;
+        EXPECT_EQ(LinesOf(result.errors).size(), 1U) << result.errors;
+        EXPECT_NE(result.errors.find(escaped), std::string::npos) << result.errors;
+    }
 }
 
 } // namespace
