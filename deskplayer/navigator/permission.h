@@ -29,7 +29,8 @@ public:
 
     /**
      * Whether the play list and the active play item permit an operation; the reason names which of
-     * them forbids it. Everything is permitted while nothing plays.
+     * them forbids it, or the debug override of the masks. Everything is permitted while nothing
+     * plays.
      */
     Outcome CheckMask(bd::UserOperationMaskDef operation) const;
 

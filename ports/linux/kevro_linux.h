@@ -62,7 +62,7 @@ bool KEVRO_Log_Configure(const char* text, char* message, size_t messageSize);
  * - `stderr`: standard error.
  * - `file:PATH[,size=BYTES][,files=N]`: a file, to which lines are appended. A line that would make
  *   it larger than BYTES (default 1048576) starts a new file; the newest N (default 3) old files
- *   are kept, numbered from 1 before the extension. Missing directories are created. PATH must not
+ *   are kept, numbered from 1 before the extension. Its directory must exist. PATH must not
  *   contain a comma.
  * - `syslog[:IDENT]`: the system's logger, facility user, under the name IDENT or, without it, the
  *   program's.
@@ -81,7 +81,8 @@ bool KEVRO_Log_ConfigureSink(const char* text, char* message, size_t messageSize
  * The number of lines lost since the start: dropped by a full queue, or rejected by the sink.
  *
  * Never decreases. A log line reports the loss, too, as soon as the queue has caught up or the sink
- * accepts lines again.
+ * accepts lines again. The first line that a sink rejects is reported at once, with the system's
+ * reason, in one line on standard error.
  */
 KEVRO_UInt64 KEVRO_Log_GetDroppedLines(void);
 

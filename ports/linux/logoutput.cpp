@@ -8,6 +8,7 @@
 #include <spdlog/details/log_msg.h>
 
 #include "bd/logging.h"
+#include "printable.h"
 
 namespace kevro
 {
@@ -159,8 +160,27 @@ bool Output::TryWrite(const LogLine& line) noexcept
             line.time, spdlog::source_loc(), spdlog::string_view_t(), Severity(line.level),
             spdlog::string_view_t(text.data(), text.size())));
         return true;
-    } catch (...) {
+    } catch (const spdlog::spdlog_ex& failure) {
+        ReportFailure(failure.what());
         return false;
+    } catch (...) {
+        return false; // no memory, which says nothing about the destination
+    }
+}
+
+/** The log itself can report lost lines only once the destination accepts lines again. */
+void Output::ReportFailure(std::string_view reason) noexcept
+{
+    if (std::exchange(m_FailureReported, true)) {
+        return;
+    }
+    try {
+        TextBuffer text;
+        AppendPrintable(text, reason);
+        std::fprintf(stderr, "Log lines are lost: %.*s\n", static_cast<int>(text.size()),
+                     text.data());
+    } catch (...) {
+        // The lines are counted nevertheless.
     }
 }
 

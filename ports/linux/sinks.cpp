@@ -10,6 +10,7 @@
 #include <syslog.h>
 #include <unistd.h>
 
+#include <spdlog/details/os.h>
 #include <spdlog/sinks/base_sink.h>
 #include <spdlog/sinks/rotating_file_sink.h>
 
@@ -108,6 +109,13 @@ std::unique_ptr<spdlog::sinks::sink> MakeFileSink(const std::string& path, std::
                                                   std::size_t files)
 {
     spdlog::file_event_handlers handlers;
+    handlers.before_open = [](const spdlog::filename_t& file) {
+        // spdlog would create missing directories: a misspelt path must not leave any.
+        const spdlog::filename_t directory = spdlog::details::os::dir_name(file);
+        if (!directory.empty() && !spdlog::details::os::path_exists(directory)) {
+            spdlog::throw_spdlog_ex("Failed opening file " + file + " for writing", ENOENT);
+        }
+    };
     handlers.after_open = [](const spdlog::filename_t&, std::FILE* file) {
         // Unbuffered, a full disk is noticed at the line that is lost, and a crash loses none.
         std::setvbuf(file, nullptr, _IONBF, 0);
