@@ -23,6 +23,7 @@
 #include "output/outputformat.h"
 #include "output/textoutput.h"
 #include "program/failure.h"
+#include "program/logclock.h"
 #include "program/options.h"
 #include "program/progress.h"
 #include "program/sessionfile.h"
@@ -77,6 +78,7 @@ void Play(LoadedPlayList playList, const std::vector<ScriptStep>& steps, const O
           const OutputOptions& outputOptions, std::ostream& stream)
 {
     Desk desk(std::move(playList));
+    const LogClock logClock(desk.Clock());
     const std::unique_ptr<Output> output = MakeOutput(outputOptions, stream, desk.Clock());
     desk.Listeners().AddListener(output.get());
 

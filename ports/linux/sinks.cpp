@@ -14,13 +14,13 @@
 #include <spdlog/sinks/base_sink.h>
 #include <spdlog/sinks/rotating_file_sink.h>
 
+#include "logclock.h"
+
 namespace kevro
 {
 
 namespace
 {
-
-constexpr char LinePattern[] = "%Y-%m-%d %H:%M:%S.%f %v";
 
 /** Standard error. Unlike spdlog's own sink it throws when a line could not be written. */
 class StderrSink final : public spdlog::sinks::base_sink<std::mutex>
@@ -101,7 +101,7 @@ private:
 std::unique_ptr<spdlog::sinks::sink> MakeStderrSink()
 {
     auto sink = std::make_unique<StderrSink>();
-    sink->set_pattern(LinePattern);
+    sink->set_formatter(MakeLineFormatter());
     return sink;
 }
 
@@ -122,7 +122,7 @@ std::unique_ptr<spdlog::sinks::sink> MakeFileSink(const std::string& path, std::
     };
     auto sink =
         std::make_unique<spdlog::sinks::rotating_file_sink_mt>(path, size, files, false, handlers);
-    sink->set_pattern(LinePattern);
+    sink->set_formatter(MakeLineFormatter());
     return sink;
 }
 
