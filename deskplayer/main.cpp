@@ -26,6 +26,7 @@
 #include "program/logclock.h"
 #include "program/options.h"
 #include "program/progress.h"
+#include "program/remotescreen.h"
 #include "program/sessionfile.h"
 #include "program/target.h"
 #include "session/remote.h"
@@ -83,11 +84,8 @@ void Play(LoadedPlayList playList, const std::vector<ScriptStep>& steps, const O
     desk.Listeners().AddListener(output.get());
 
     if (options.remote) {
-        std::cerr << RemoteHelp();
-        RemoteHooks hooks;
-        hooks.beforeWaiting = [&stream] { stream.flush(); };
-        hooks.onRefused = PrintMessage;
-        PlayByRemote(desk, STDIN_FILENO, hooks);
+        RemoteScreen screen(desk, stream);
+        PlayByRemote(desk, STDIN_FILENO, screen.Hooks());
         return;
     }
 

@@ -15,6 +15,8 @@ namespace
 /** The value of g_u1Bduopmask that reports every operation as forbidden. */
 constexpr int MaskOverrideForbidsAll = 2;
 
+} // namespace
+
 const char* StatusName(Status status)
 {
     switch (status) {
@@ -35,8 +37,6 @@ const char* StatusName(Status status)
     }
     return "";
 }
-
-} // namespace
 
 Outcome Permission::CheckMask(bd::UserOperationMaskDef operation) const
 {

@@ -14,6 +14,9 @@
 namespace deskplayer
 {
 
+/** A status as refusals name it: "playing", "in a still". */
+const char* StatusName(Status status);
+
 /** Checks operations against the mask of the disc and the status of playback. Changes nothing. */
 class Permission
 {

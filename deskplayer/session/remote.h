@@ -22,7 +22,10 @@ struct RemoteKey {
     Outcome (*perform)(Desk& desk);
 };
 
-/** All keys except those that quit, `q` and Ctrl-C. */
+/** The key whose only operation is RemoteHooks::onKey(), where a program lists the keys. */
+constexpr char HelpKey = '?';
+
+/** All keys except the one for help and those that quit, `q` and Ctrl-C. */
 const std::vector<RemoteKey>& RemoteKeys();
 
 /** The keys and their descriptions, in a few lines. */
@@ -36,13 +39,19 @@ struct RemoteHooks {
      */
     std::function<void()> beforeWaiting;
 
-    /** Called with the reason when the operation of a key was refused. */
+    /** Called after every wait, before anything else happens. */
+    std::function<void()> afterWaiting;
+
+    /** Called with every key that does not quit, before its operation. */
+    std::function<void(char key)> onKey;
+
+    /** Called with the reason when the operation of a key was refused, or when there is none. */
     std::function<void(const std::string& reason)> onRefused;
 };
 
 /**
  * Plays in real time, controlled by keys from a terminal, until `q`, Ctrl-C, the end of the input,
- * or the end of playback. Input that is not a terminal is read unchanged.
+ * or the end of playback. Input that is not a terminal is read unchanged. Line ends are no keys.
  *
  * The terminal's settings are restored at the end, even if a signal ends the program.
  *

@@ -1,6 +1,7 @@
 #include "program.h"
 
 #include <fcntl.h>
+#include <poll.h>
 #include <pty.h>
 #include <sys/wait.h>
 #include <termios.h>
@@ -119,7 +120,9 @@ TerminalProgram::~TerminalProgram()
 bool TerminalProgram::WaitFor(const std::string& text)
 {
     std::size_t found = m_Output.find(text, m_Seen);
-    while (found == std::string::npos && Read()) {
+    constexpr int silence = 20000; // milliseconds
+    pollfd shown = {m_Screen, POLLIN, 0};
+    while (found == std::string::npos && poll(&shown, 1, silence) > 0 && Read()) {
         found = m_Output.find(text, m_Seen);
     }
     if (found == std::string::npos) {

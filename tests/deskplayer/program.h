@@ -41,7 +41,11 @@ public:
     TerminalProgram(const TerminalProgram&) = delete;
     TerminalProgram& operator=(const TerminalProgram&) = delete;
 
-    /** Waits until the screen has shown @p text since the last wait. @return false at the end */
+    /**
+     * Waits until the screen has shown @p text since the last wait.
+     *
+     * @return false if the program ended, or showed nothing for 20 s
+     */
     bool WaitFor(const std::string& text);
 
     void Press(const std::string& keys) const;

@@ -124,6 +124,32 @@ TEST_F(DeskPlayerTerminal, IsRestoredWhenTheReaderOfTheOutputHasEnded)
     EXPECT_TRUE(program.HasUsualSettings());
 }
 
+TEST_F(DeskPlayerTerminal, HasAStatusLineThatAnswersEveryKey)
+{
+    TerminalProgram program({SampleDisc, "--remote", "--only", "Paused"});
+    EXPECT_TRUE(program.WaitFor("quit\r\nplaying  00:00:0"));
+    EXPECT_TRUE(program.WaitFor(" of 00:02:54  chapter 1 of 7  audio 1 of "));
+
+    program.Press(" ");
+    EXPECT_TRUE(program.WaitFor("  \r")) << "the line is erased before a callback";
+    EXPECT_TRUE(program.WaitFor("Paused"));
+    EXPECT_TRUE(program.WaitFor("\npaused  00:00:0"));
+
+    program.Press("o");
+    EXPECT_TRUE(program.WaitFor("\rrefused: not in a still, but paused  paused  00:00:0"));
+    program.Press("y");
+    EXPECT_TRUE(program.WaitFor("\rrefused: no key 'y'; ? lists the keys  paused  00:00:0"));
+    program.Press("?");
+    EXPECT_TRUE(program.WaitFor("space pause/continue"));
+    EXPECT_TRUE(program.WaitFor("quit\r\npaused  00:00:0"));
+    EXPECT_TRUE(program.WaitFor("chapter 1 of 7  audio 1 of ")) << "no refusal any more";
+
+    program.Press("q");
+    const ProgramResult result = program.Finish();
+    EXPECT_EQ(result.status, 0);
+    EXPECT_EQ(result.output.substr(result.output.size() - 3), "  \r") << "erased at the end";
+}
+
 TEST_F(DeskPlayerTerminal, WritesEveryCallbackInRealTimeAtOnce)
 {
     const std::string file = folder / "out.txt";

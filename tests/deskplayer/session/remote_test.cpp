@@ -13,6 +13,7 @@
 #include <sstream>
 
 #include "../testdesk.h"
+#include "text/printable.h"
 
 namespace deskplayer
 {
@@ -125,6 +126,20 @@ TEST(Remote, PerformsTheActionOfEveryKey)
         {"f", 'w',
          "PlayMode(PlayDirectionForward, "
          "PlaySpeedNormal)\nPictureInPictureAvailable()\nSecondaryAudioAvailable()\n"},
+        {"", 'd',
+         "PlayMode(PlayDirectionForward, "
+         "PlaySpeedSlow1)\nPictureInPictureUnavailable()\nSecondaryAudioUnavailable()\n"},
+        {"d", 'd', "PlayMode(PlayDirectionForward, PlaySpeedSlow2)\n"},
+        {"f", 'd', "PlayMode(PlayDirectionForward, PlaySpeedSlow1)\n"},
+        {"nd", 'v', "PlayMode(PlayDirectionBackward, PlaySpeedSlow1)\n"},
+        {"nv", 'v', "PlayMode(PlayDirectionBackward, PlaySpeedSlow2)\n"},
+        {"", 'h', "JumpOccurred()\nMarkInfo(7, 0, 0)\n"},
+        {"", 'l', nullptr}, // reports a position that depends on the wall clock
+        {"", 'b', nullptr}, // likewise
+        {"", 'u', "PresentationGraphicsDisplay(false)\n"},
+        {"u", 'u', "PresentationGraphicsDisplay(true)\n"},
+        {"", 'i', "SecondaryVideoDisplay(1, true)\n"},
+        {"i", 'i', "SecondaryVideoDisplay(1, false)\n"},
         {"", 'n', "JumpOccurred()\nMarkInfo(7, 1, 27000000)\nChapterNumber(2)\n"},
         {"n", 'p', "JumpOccurred()\nMarkInfo(7, 0, 0)\nChapterNumber(1)\n"},
         {"", 'o', "not in a still, but playing\n"},
@@ -274,22 +289,108 @@ TEST(Remote, EndsAtTheEndOfPlayback)
     EXPECT_GE(desk.clock.Now(), Second / 10) << "on the wall clock";
 }
 
-TEST(Remote, IgnoresUnknownKeys)
+TEST(Remote, SeeksTenSecondsBackAndAhead)
 {
+    TestDesk desk(LongPlayList());
+    PlaybackContext& context = desk.navigator.Context();
+
+    CallbacksOfKeys(desk, " ", "lll");
+    EXPECT_GE(Ticks(context.GetCurrentTimePosition()), 30 * Second);
+    EXPECT_LT(Ticks(context.GetCurrentTimePosition()), 60 * Second);
+
+    TestDesk again(LongPlayList());
+    CallbacksOfKeys(again, "n", "h");
+    EXPECT_GE(Ticks(again.navigator.Context().GetCurrentTimePosition()), 590 * Second);
+    EXPECT_LT(Ticks(again.navigator.Context().GetCurrentTimePosition()), 600 * Second);
+}
+
+TEST(Remote, SetsAThenBAndThenEndsTheRepeat)
+{
+    TestDesk desk(LongPlayList());
+    PlaybackContext& context = desk.navigator.Context();
+
+    Press(desk, "b");
+    EXPECT_EQ(context.GetCurrentABRepeatState(), bd::TRIGGER_A);
+
+    TestDesk both(LongPlayList());
+    Press(both, "blb");
+    EXPECT_EQ(both.navigator.Context().GetCurrentABRepeatState(), bd::TRIGGER_B);
+
+    TestDesk ended(LongPlayList());
+    Press(ended, "blbb");
+    EXPECT_EQ(ended.navigator.Context().GetCurrentABRepeatState(), bd::TRIGGER_AB_NONE);
+}
+
+TEST(Remote, PlaysNoSlowerThanTheSlowest)
+{
+    TestDesk desk(LongPlayList());
+
+    CallbacksOfKeys(desk, " ", std::string(20, 'd'));
+    EXPECT_EQ(desk.navigator.Context().GetPlayMode(),
+              bd::PlayMode(bd::PlayDirectionForward, bd::PlaySpeedSlow5));
+}
+
+TEST(Remote, RefusesEveryUnknownKey)
+{
+    std::string refusals;
     std::string others;
     for (int key = 0; key < 256; ++key) {
         const auto character = static_cast<char>(key);
         const auto& known = RemoteKeys();
-        if (character != 'q' && character != ControlC &&
+        if (std::string("q?\r\n").find(character) == std::string::npos && character != ControlC &&
             std::none_of(known.begin(), known.end(), [character](const RemoteKey& remoteKey) {
                 return remoteKey.key == character;
             })) {
             others += character;
+            refusals += "no key '" + Printable({&character, 1}) + "'; ? lists the keys\n";
         }
     }
     TestDesk desk(LongPlayList());
 
-    EXPECT_EQ(CallbacksOfKeys(desk, "", others), "");
+    EXPECT_EQ(CallbacksOfKeys(desk, "", others), refusals);
+}
+
+TEST(Remote, IgnoresLineEndsAndTheKeyForHelp)
+{
+    TestDesk desk(LongPlayList());
+
+    EXPECT_EQ(CallbacksOfKeys(desk, "", "\r\n?"), "");
+}
+
+TEST(Remote, ReportsEveryKeyBeforeItsOperation)
+{
+    TestDesk desk(LongPlayList());
+    Keys keys(" ?y\nq");
+    std::string pressed;
+    RemoteHooks hooks;
+    hooks.onKey = [&](char key) {
+        pressed += key;
+        if (key == ' ') {
+            EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Playing);
+        }
+    };
+
+    PlayByRemote(desk.desk, keys.Descriptor(), hooks);
+
+    EXPECT_EQ(pressed, " ?y");
+}
+
+TEST(Remote, CallsAfterEveryWaitBeforeTimePasses)
+{
+    TestDesk desk(ListOf({ItemOfTicks(Second / 10)}));
+    Keys keys("");
+    std::string calls;
+    RemoteHooks hooks;
+    hooks.beforeWaiting = [&] { calls += "before "; };
+    hooks.afterWaiting = [&] {
+        calls += "after ";
+        EXPECT_NE(desk.navigator.CurrentStatus(), Status::Finished);
+    };
+
+    PlayByRemote(desk.desk, keys.Descriptor(), hooks);
+
+    EXPECT_EQ(calls.rfind("before after ", 0), 0U) << calls;
+    EXPECT_EQ(calls.substr(calls.size() - 13), "before after ");
 }
 
 TEST(Remote, CallsBeforeEveryWaitAfterTheCallbacks)
@@ -308,12 +409,13 @@ TEST(Remote, CallsBeforeEveryWaitAfterTheCallbacks)
 TEST(Remote, ExplainsEveryKey)
 {
     const std::string help = RemoteHelp();
-    std::set<char> keys = {'q'};
+    std::set<char> keys = {'q', '?'};
     for (const RemoteKey& key : RemoteKeys()) {
         EXPECT_TRUE(keys.insert(key.key).second) << key.key << " occurs twice";
         const std::string name = key.key == ' ' ? "space" : std::string(1, key.key);
         EXPECT_NE((" " + help).find(name + " " + key.help), std::string::npos) << key.help;
     }
+    EXPECT_NE(help.find("? list the keys "), std::string::npos);
     EXPECT_NE(help.find("q or Ctrl-C quit\n"), std::string::npos);
 }
 
