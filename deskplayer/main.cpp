@@ -23,9 +23,11 @@
 #include "output/outputformat.h"
 #include "output/textoutput.h"
 #include "program/failure.h"
+#include "program/logclock.h"
 #include "program/options.h"
 #include "program/playbacktype.h"
 #include "program/progress.h"
+#include "program/remotescreen.h"
 #include "program/sessionchecks.h"
 #include "program/sessionfile.h"
 #include "program/target.h"
@@ -52,6 +54,10 @@ OutputOptions OutputOptionsOf(const Options& options)
     } catch (const std::invalid_argument& error) {
         throw UsageError(error.what());
     }
+    if (output.format == OutputFormat::Trace && (options.list || options.describe)) {
+        throw UsageError(std::string(options.list ? "--list" : "--describe") +
+                         " excludes --format trace");
+    }
     output.coloured = options.output.empty() &&
                       WantsColours(STDOUT_FILENO, std::getenv("NO_COLOR"), std::getenv("TERM"));
     return output;
@@ -74,12 +80,13 @@ int Play(LoadedPlayList playList, const std::vector<ScriptStep>& steps, const Op
          const OutputOptions& outputOptions, std::ostream& stream)
 {
     Desk desk(std::move(playList));
+    const LogClock logClock(desk.Clock());
     const std::unique_ptr<Output> output = MakeOutput(outputOptions, stream, desk.Clock());
     desk.Listeners().AddListener(output.get());
 
     if (options.remote) {
-        std::cerr << RemoteHelp();
-        PlayByRemote(desk, STDIN_FILENO, PrintMessage);
+        RemoteScreen screen(desk, stream);
+        PlayByRemote(desk, STDIN_FILENO, screen.Hooks());
         return ExitOk;
     }
 
@@ -141,29 +148,37 @@ void ConfigureLog(const Options& options)
     }
 }
 
+/** @return the exit status */
+int ParseAndRun(int argc, char** argv)
+{
+    Options options;
+    CLI::App app("Plays a play list of a Blu-ray disc without its streams and writes every "
+                 "callback that the navigator's listeners receive, with its time and arguments.",
+                 "bdmv-deskplayer");
+    AddOptions(app, options);
+    try {
+        app.parse(argc, argv);
+    } catch (const CLI::Success& text) {
+        Target target("");
+        std::ostream& stream = target.Open();
+        app.exit(text, stream, stream);
+        target.Finish();
+        return ExitOk;
+    } catch (const CLI::ParseError& error) {
+        throw UsageError(Printable(error.what()) + "; see --help");
+    }
+    ConfigureLog(options);
+    return Run(options);
+}
+
 } // namespace
 
 } // namespace deskplayer
 
 int main(int argc, char** argv)
 {
-    deskplayer::Options options;
-    CLI::App app("Plays a play list of a Blu-ray disc without its streams and writes every "
-                 "callback that the navigator's listeners receive, with its time and arguments.",
-                 "bdmv-deskplayer");
-    deskplayer::AddOptions(app, options);
     try {
-        app.parse(argc, argv);
-    } catch (const CLI::ParseError& error) {
-        if (app.exit(error) != 0) {
-            return deskplayer::ExitUsage;
-        }
-        return std::cout.flush() ? deskplayer::ExitOk : deskplayer::ExitOutput;
-    }
-
-    try {
-        deskplayer::ConfigureLog(options);
-        return deskplayer::Run(options);
+        return deskplayer::ParseAndRun(argc, argv);
     } catch (const deskplayer::DiscError& error) {
         deskplayer::PrintMessage(error.what());
         return deskplayer::ExitDisc;

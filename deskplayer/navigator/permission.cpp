@@ -12,6 +12,11 @@ namespace deskplayer
 namespace
 {
 
+/** The value of g_u1Bduopmask that reports every operation as forbidden. */
+constexpr int MaskOverrideForbidsAll = 2;
+
+} // namespace
+
 const char* StatusName(Status status)
 {
     switch (status) {
@@ -33,8 +38,6 @@ const char* StatusName(Status status)
     return "";
 }
 
-} // namespace
-
 Outcome Permission::CheckMask(bd::UserOperationMaskDef operation) const
 {
     if (m_rState.status == Status::Stopped || m_rState.status == Status::Standby ||
@@ -48,6 +51,10 @@ Outcome Permission::CheckMask(bd::UserOperationMaskDef operation) const
     const bool byItem = item != nullptr && bdmv::UOMaskTable(item->uoMask).IsSet(operation);
     if (!byPlayList && !byItem) {
         return Outcome::Done();
+    }
+    if (g_u1Bduopmask == MaskOverrideForbidsAll) {
+        return Outcome::Refused(NameOf(operation) +
+                                " is forbidden by the debug override KEVRO_UOPMASK=2");
     }
     const std::string list = "play list " + std::to_string(loaded.number);
     const std::string playItem = "play item " + std::to_string(m_rState.item);

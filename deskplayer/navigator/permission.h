@@ -14,6 +14,9 @@
 namespace deskplayer
 {
 
+/** A status as refusals name it: "playing", "in a still". */
+const char* StatusName(Status status);
+
 /** Checks operations against the mask of the disc and the status of playback. Changes nothing. */
 class Permission
 {
@@ -29,7 +32,8 @@ public:
 
     /**
      * Whether the play list and the active play item permit an operation; the reason names which of
-     * them forbids it. Everything is permitted while nothing plays.
+     * them forbids it, or the debug override of the masks. Everything is permitted while nothing
+     * plays.
      */
     Outcome CheckMask(bd::UserOperationMaskDef operation) const;
 

@@ -55,6 +55,9 @@ public:
     /** Answers queries about playback, streams and position, for events and for callers. */
     PlaybackContext& Context() { return m_Context; }
 
+    /** The play list and its time line. */
+    const LoadedPlayList& LoadedList() const { return m_PlayList; }
+
     /** @copydoc Playhead::IsRepeating() */
     bool IsRepeating() const { return m_Playhead.IsRepeating(); }
 

@@ -68,12 +68,6 @@ ordered_json Metadata(const char* name, std::size_t thread, const char* member, 
             {"args", {{member, value}}}};
 }
 
-/** Whole microseconds, which are precise enough to distinguish 45 kHz ticks. */
-std::uint64_t Microseconds(Ticks time)
-{
-    return (time.count() * 200 + 4) / 9;
-}
-
 /** @param name of an argument of the callback */
 template <typename Value> const Value& ValueOf(std::string_view name, const Callback& callback)
 {

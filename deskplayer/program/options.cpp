@@ -1,8 +1,8 @@
 #include "program/options.h"
 
 #include <iomanip>
-#include <iostream>
 #include <memory>
+#include <sstream>
 
 #include "bdmvnavigator/version.h"
 #include "session/commands.h"
@@ -13,11 +13,14 @@ namespace deskplayer
 namespace
 {
 
-void PrintCommands()
+std::string CommandTable()
 {
+    std::ostringstream table;
     for (const CommandSyntax& syntax : CommandSyntaxes()) {
-        std::cout << std::left << std::setw(38) << syntax.pattern << syntax.help << '\n';
+        table << (table.tellp() > 0 ? "\n" : "") << std::left << std::setw(38) << syntax.pattern
+              << syntax.help;
     }
+    return table.str();
 }
 
 /** Help without the lists of mutually exclusive options. */
@@ -31,6 +34,15 @@ public:
     }
 };
 
+/** Refuses an empty value, which is what a shell makes of an unset variable. */
+CLI::Validator NotEmpty(const std::string& expected)
+{
+    return {[expected](const std::string& value) {
+                return value.empty() ? "empty value; expected " + expected : std::string();
+            },
+            ""};
+}
+
 } // namespace
 
 void AddOptions(CLI::App& app, Options& options)
@@ -41,8 +53,8 @@ void AddOptions(CLI::App& app, Options& options)
     app.add_flag_callback(
         "--commands",
         [] {
-            PrintCommands();
-            throw CLI::Success();
+            // Like the version, a text that replaces the action.
+            throw CLI::CallForVersion(CommandTable(), CLI::ExitCodes::Success);
         },
         "Print the commands of sessions and exit");
     app.add_option("DISC", options.disc, "A BDMV folder or its parent")->required()->type_name("");
@@ -60,6 +72,7 @@ void AddOptions(CLI::App& app, Options& options)
             ->excludes(list);
     auto* const session = app.add_option("--session", options.session,
                                          "Session file to run; by default, play from start to end")
+                              ->check(NotEmpty("the name of a file"))
                               ->type_name("FILE");
     auto* const strict = app.add_flag("--strict", options.strict,
                                       "Exit with status 4 if a command of the session was refused")
@@ -69,25 +82,32 @@ void AddOptions(CLI::App& app, Options& options)
     auto* const remote =
         app.add_flag("--remote", options.remote, "Play in real time, controlled by single keys")
             ->excludes(session);
-    for (CLI::Option* const playing : {playList, session, strict, realTime, remote}) {
-        playing->excludes(list)->excludes(describe);
-    }
-
     app.add_option("--format", options.format,
                    "Output format: text, json (one object per line) or trace (for trace viewers)")
         ->type_name("FORMAT");
     app.add_option("--output", options.output, "File to write; standard output by default")
+        ->check(NotEmpty("the name of a file"))
         ->type_name("FILE");
-    app.add_option(
-           "--listen", options.listen,
-           "Write only callbacks of these interfaces: control, settings, button, interactive")
-        ->type_name("NAME,...");
-    app.add_option("--only", options.only, "Write only these callbacks, such as PlayItem,AudioInfo")
-        ->type_name("NAME,...");
-    app.add_option("--log", options.log,
-                   "Log lines to write to standard error, such as BdmvNavigator=Event for those "
-                   "of events")
-        ->type_name("TEXT");
+    auto* const listen =
+        app.add_option(
+               "--listen", options.listen,
+               "Write only callbacks of these interfaces: control, settings, button, interactive")
+            ->check(NotEmpty("names of listener interfaces"))
+            ->type_name("NAME,...");
+    auto* const only = app.add_option("--only", options.only,
+                                      "Write only these callbacks, such as PlayItem,AudioInfo")
+                           ->check(NotEmpty("names of callbacks"))
+                           ->type_name("NAME,...");
+    auto* const log =
+        app.add_option("--log", options.log,
+                       "Log lines to write to standard error, such as BdmvNavigator=Event for "
+                       "those of events")
+            ->type_name("TEXT");
+    for (CLI::Option* const playing :
+         {playList, session, strict, realTime, remote, listen, only, log}) {
+        playing->excludes(list)->excludes(describe);
+    }
+
     app.footer(
         "A session file has one command per line, which may begin with a time:\n"
         "\"at 00:01:30.500 chapter next\", \"after 2s pause\". --commands lists the commands.\n\n"

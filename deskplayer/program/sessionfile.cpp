@@ -10,6 +10,7 @@
 #include "output/callbacks.h"
 #include "program/failure.h"
 #include "session/commands.h"
+#include "text/printable.h"
 
 namespace deskplayer
 {
@@ -55,16 +56,16 @@ std::string ReadSession(const std::string& fileName)
     ssize_t size = 1;
     while (size > 0 && text.size() <= LongestScript) {
         if (!file.WaitForInput()) {
-            throw UsageError(fileName + ": timed out waiting for input");
+            throw UsageError(Printable(fileName) + ": timed out waiting for input");
         }
         size = file.Read(buffer.data(), buffer.size());
         if (size < 0) {
-            throw UsageError(fileName + ": cannot read session, expected a text file");
+            throw UsageError(Printable(fileName) + ": cannot read session, expected a text file");
         }
         text.append(buffer.data(), static_cast<std::size_t>(size));
     }
     if (text.size() > LongestScript) {
-        throw UsageError(fileName + ": session too long, expected at most " +
+        throw UsageError(Printable(fileName) + ": session too long, expected at most " +
                          std::to_string(LongestScript) + " bytes");
     }
     return text;

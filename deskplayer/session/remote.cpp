@@ -11,6 +11,8 @@
 #include <cstddef>
 #include <sstream>
 
+#include "text/printable.h"
+
 namespace deskplayer
 {
 
@@ -35,15 +37,68 @@ Outcome PlayOrStop(Desk& desk)
                                                                    : desk.Navigator().Stop();
 }
 
+Outcome SetSpeed(Desk& desk, bd::PlayDirectionDef direction, int speed)
+{
+    return desk.Navigator().SetPlayMode(
+        bd::PlayMode(direction, static_cast<bd::PlaySpeedDef>(speed)));
+}
+
 /** One step faster in a direction; from another direction or slow motion, the first fast step. */
 Outcome Faster(Desk& desk, bd::PlayDirectionDef direction)
 {
     const bd::PlayMode& mode = desk.Navigator().Context().GetPlayMode();
     const bool accelerates = mode.Direction() == direction && mode.Speed() >= bd::PlaySpeedNormal;
-    const int speed = accelerates ? std::min<int>(mode.Speed() + 1, bd::PlaySpeedFast12)
-                                  : static_cast<int>(bd::PlaySpeedFast1);
-    return desk.Navigator().SetPlayMode(
-        bd::PlayMode(direction, static_cast<bd::PlaySpeedDef>(speed)));
+    return SetSpeed(desk, direction,
+                    accelerates ? std::min<int>(mode.Speed() + 1, bd::PlaySpeedFast12)
+                                : static_cast<int>(bd::PlaySpeedFast1));
+}
+
+/** One step slower in a direction; from another direction or fast play, the first slow step. */
+Outcome Slower(Desk& desk, bd::PlayDirectionDef direction)
+{
+    const bd::PlayMode& mode = desk.Navigator().Context().GetPlayMode();
+    const bool slowsDown = mode.Direction() == direction && mode.Speed() <= bd::PlaySpeedNormal;
+    return SetSpeed(desk, direction,
+                    slowsDown ? std::max<int>(mode.Speed() - 1, bd::PlaySpeedSlow5)
+                              : static_cast<int>(bd::PlaySpeedSlow1));
+}
+
+constexpr Ticks SeekDistance = std::chrono::seconds(10);
+
+Outcome SeekBackward(Desk& desk)
+{
+    const Ticks position(desk.Navigator().Context().GetCurrentTimePosition());
+    return desk.Navigator().SearchTime(position - std::min(position, SeekDistance));
+}
+
+Outcome SeekForward(Desk& desk)
+{
+    const Ticks position(desk.Navigator().Context().GetCurrentTimePosition());
+    return desk.Navigator().SearchTime(position + SeekDistance);
+}
+
+/** Sets A, then B, and then ends the repeat. */
+Outcome NextStepOfABRepeat(Desk& desk)
+{
+    switch (desk.Navigator().Context().GetCurrentABRepeatState()) {
+    case bd::TRIGGER_A:
+        return desk.Navigator().SetPointB();
+    case bd::TRIGGER_B:
+        return desk.Navigator().EndABRepeat();
+    default:
+        return desk.Navigator().SetPointA();
+    }
+}
+
+Outcome ShowOrHideSubtitles(Desk& desk)
+{
+    return desk.Navigator().ShowSubtitles(!desk.Navigator().Context().GetPgTextStDisplay());
+}
+
+Outcome ShowOrHidePictureInPicture(Desk& desk)
+{
+    return desk.Navigator().ShowSecondaryVideo(
+        !desk.Navigator().Context().GetSecondaryVideoDisplay());
 }
 
 Outcome PerformCommand(Desk& desk, std::string_view pattern)
@@ -56,7 +111,7 @@ Outcome PerformCommand(Desk& desk, std::string_view pattern)
 }
 
 /** Signals that terminate a program and that it can handle. */
-constexpr std::array<int, 4> TerminatingSignals = {SIGHUP, SIGINT, SIGQUIT, SIGTERM};
+constexpr std::array<int, 5> TerminatingSignals = {SIGHUP, SIGINT, SIGQUIT, SIGTERM, SIGPIPE};
 
 /** The terminal to restore when a signal ends the program. Only one remote exists at a time. */
 int g_Terminal = -1;
@@ -134,6 +189,19 @@ Ticks TimeSince(Clock::time_point start)
     return std::chrono::duration_cast<Ticks>(Clock::now() - start);
 }
 
+Outcome Perform(Desk& desk, char key)
+{
+    const auto found =
+        std::find_if(RemoteKeys().begin(), RemoteKeys().end(),
+                     [key](const RemoteKey& candidate) { return candidate.key == key; });
+    if (found != RemoteKeys().end()) {
+        return found->perform(desk);
+    }
+    return key == HelpKey ? Outcome::Done()
+                          : Outcome::Refused("no key '" + Printable({&key, 1}) + "'; " + HelpKey +
+                                             " lists the keys");
+}
+
 } // namespace
 
 const std::vector<RemoteKey>& RemoteKeys()
@@ -144,12 +212,19 @@ const std::vector<RemoteKey>& RemoteKeys()
         {'.', "step", [](Desk& d) { return PerformCommand(d, "step"); }},
         {'f', "faster", [](Desk& d) { return Faster(d, bd::PlayDirectionForward); }},
         {'r', "faster backward", [](Desk& d) { return Faster(d, bd::PlayDirectionBackward); }},
+        {'d', "slower", [](Desk& d) { return Slower(d, bd::PlayDirectionForward); }},
+        {'v', "slower backward", [](Desk& d) { return Slower(d, bd::PlayDirectionBackward); }},
         {'w', "normal speed", [](Desk& d) { return PerformCommand(d, "forward"); }},
         {'n', "next chapter", [](Desk& d) { return PerformCommand(d, "chapter next"); }},
         {'p', "previous chapter", [](Desk& d) { return PerformCommand(d, "chapter previous"); }},
+        {'h', "back 10 s", SeekBackward},
+        {'l', "ahead 10 s", SeekForward},
+        {'b', "A-B repeat", NextStepOfABRepeat},
         {'o', "leave a still", [](Desk& d) { return PerformCommand(d, "still off"); }},
         {'a', "next audio", [](Desk& d) { return PerformCommand(d, "audio next"); }},
         {'s', "next subtitle", [](Desk& d) { return PerformCommand(d, "subtitle next"); }},
+        {'u', "subtitles on/off", ShowOrHideSubtitles},
+        {'i', "pip on/off", ShowOrHidePictureInPicture},
         {'g', "next angle", [](Desk& d) { return PerformCommand(d, "angle next"); }},
         {'m', "open menu", [](Desk& d) { return PerformCommand(d, "menu on"); }},
         {'c', "close menu", [](Desk& d) { return PerformCommand(d, "menu off"); }},
@@ -178,19 +253,25 @@ std::string RemoteHelp()
             help << '\n';
         }
     }
-    help << QuitKey << " or Ctrl-C quit\n";
+    help << (column % keysPerLine == 0 ? "" : "\n") << HelpKey << " list the keys         "
+         << QuitKey << " or Ctrl-C quit\n";
     return help.str();
 }
 
-void PlayByRemote(Desk& desk, int keys,
-                  const std::function<void(const std::string& reason)>& onRefused)
+void PlayByRemote(Desk& desk, int keys, const RemoteHooks& hooks)
 {
     const SingleKeys singleKeys(keys);
     const Clock::time_point start = Clock::now();
     desk.Navigator().Play();
     while (desk.Navigator().CurrentStatus() != Status::Finished) {
+        if (hooks.beforeWaiting) {
+            hooks.beforeWaiting();
+        }
         pollfd input = {keys, POLLIN, 0};
         const int ready = poll(&input, 1, TimeoutOf(desk.Navigator()));
+        if (hooks.afterWaiting) {
+            hooks.afterWaiting();
+        }
         const Ticks now = TimeSince(start);
         if (now > desk.Clock().Now()) {
             desk.Clock().Advance(desk.Navigator().Advance(now - desk.Clock().Now()));
@@ -202,15 +283,15 @@ void PlayByRemote(Desk& desk, int keys,
         if (read(keys, &key, 1) <= 0 || key == QuitKey || key == ControlC) {
             return;
         }
-        const auto found =
-            std::find_if(RemoteKeys().begin(), RemoteKeys().end(),
-                         [key](const RemoteKey& candidate) { return candidate.key == key; });
-        if (found == RemoteKeys().end()) {
+        if (key == '\n' || key == '\r') {
             continue;
         }
-        const Outcome outcome = found->perform(desk);
-        if (!outcome.IsDone()) {
-            onRefused(outcome.Reason());
+        if (hooks.onKey) {
+            hooks.onKey(key);
+        }
+        const Outcome outcome = Perform(desk, key);
+        if (!outcome.IsDone() && hooks.onRefused) {
+            hooks.onRefused(outcome.Reason());
         }
     }
 }

@@ -48,7 +48,7 @@ public:
             const auto byte = static_cast<unsigned char>(character);
             if ((byte < 0x20 && character != '\t') || byte == 0x7F) {
                 Fail(&character,
-                     "'" + Printable({character}) + "' is a control character; expected text");
+                     "'" + Printable({&character, 1}) + "' is a control character; expected text");
             }
         }
         return SplitAtBlanks(m_Text.substr(0, m_Text.find('#')));
@@ -125,7 +125,7 @@ std::string Quoted(std::string_view word)
 {
     constexpr std::size_t longest = 40;
     const char* const dots = word.size() > longest ? "..." : "";
-    return "'" + Printable(std::string(word.substr(0, longest))) + dots + "'";
+    return "'" + Printable(FirstCharacters(word, longest)) + dots + "'";
 }
 
 std::string Description(std::string_view patternWord)

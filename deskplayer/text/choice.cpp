@@ -61,7 +61,7 @@ std::size_t FindChoice(std::string_view word, std::string_view kind,
     if (found != choices.end()) {
         return static_cast<std::size_t>(found - choices.begin());
     }
-    std::string message = "'" + Printable(std::string(word)) + "' is not ";
+    std::string message = "'" + Printable(word) + "' is not ";
     message.append(kind);
     if (const std::string_view similar = SimilarChoice(word, choices); !similar.empty()) {
         throw std::invalid_argument(message.append("; did you mean ").append(similar).append("?"));

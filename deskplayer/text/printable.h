@@ -5,13 +5,21 @@
 #ifndef DESKPLAYER_TEXT_PRINTABLE_H
 #define DESKPLAYER_TEXT_PRINTABLE_H
 
+#include <cstddef>
 #include <string>
+#include <string_view>
 
 namespace deskplayer
 {
 
-/** @p text with every byte except printable ASCII, and the backslash, written as \\xNN. */
-std::string Printable(const std::string& text);
+/**
+ * @p text as it appears in every message: valid UTF-8 as it is, and every byte of control
+ * characters, of the backslash and of anything else written as \\xNN.
+ */
+std::string Printable(std::string_view text);
+
+/** The start of @p text, at most @p longest bytes, that ends between two characters. */
+std::string_view FirstCharacters(std::string_view text, std::size_t longest);
 
 } // namespace deskplayer
 

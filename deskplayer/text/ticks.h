@@ -21,6 +21,12 @@ constexpr std::uint32_t TicksPerSecond = 45000;
  */
 using Ticks = std::chrono::duration<std::uint64_t, std::ratio<1, TicksPerSecond>>;
 
+/** The nearest whole number of microseconds, which is different for every tick. */
+constexpr std::uint64_t Microseconds(Ticks time)
+{
+    return (time.count() * 200 + 4) / 9;
+}
+
 } // namespace deskplayer
 
 #endif

@@ -62,7 +62,7 @@ bool KEVRO_Log_Configure(const char* text, char* message, size_t messageSize);
  * - `stderr`: standard error.
  * - `file:PATH[,size=BYTES][,files=N]`: a file, to which lines are appended. A line that would make
  *   it larger than BYTES (default 1048576) starts a new file; the newest N (default 3) old files
- *   are kept, numbered from 1 before the extension. Missing directories are created. PATH must not
+ *   are kept, numbered from 1 before the extension. Its directory must exist. PATH must not
  *   contain a comma.
  * - `syslog[:IDENT]`: the system's logger, facility user, under the name IDENT or, without it, the
  *   program's.
@@ -78,10 +78,28 @@ bool KEVRO_Log_Configure(const char* text, char* message, size_t messageSize);
 bool KEVRO_Log_ConfigureSink(const char* text, char* message, size_t messageSize);
 
 /**
+ * Makes lines show the time of a clock of the program, such as the position of a simulation.
+ *
+ * While a clock is set, a line begins with the clock's time as hours, minutes, seconds and
+ * microseconds, `00:01:30.500000`, instead of the local date and time. A line keeps the time at
+ * which it was logged, however long it waits in a queue. The system's logger shows its own time.
+ *
+ * Returns when no thread is calling the previous clock, so that what it uses may be destroyed.
+ *
+ * @param microseconds returns the time since the clock's zero, of which no more than 292 years are
+ *                     shown. It is called for every line, on the thread that logs, by one thread
+ *                     at a time; it must not log or call functions of this header. Null returns to
+ *                     the local date and time.
+ * @param user         passed to @p microseconds
+ */
+void KEVRO_Log_SetClock(KEVRO_UInt64 (*microseconds)(void* user), void* user);
+
+/**
  * The number of lines lost since the start: dropped by a full queue, or rejected by the sink.
  *
  * Never decreases. A log line reports the loss, too, as soon as the queue has caught up or the sink
- * accepts lines again.
+ * accepts lines again. The first line that a sink rejects is reported at once, with the system's
+ * reason, in one line on standard error.
  */
 KEVRO_UInt64 KEVRO_Log_GetDroppedLines(void);
 

@@ -10,6 +10,7 @@
 #include <spdlog/common.h>
 
 #include "kevro/kevro_types.h"
+#include "logclock.h"
 
 namespace kevro
 {
@@ -19,7 +20,7 @@ using TextBuffer = spdlog::memory_buf_t;
 
 /** A line as its writer passed it; the text is borrowed. */
 struct LogLine {
-    spdlog::log_clock::time_point time;
+    LineTime time;
     KEVRO_UInt32 component;
     KEVRO_Int32 level;
     std::string_view text;

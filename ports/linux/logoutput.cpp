@@ -8,6 +8,7 @@
 #include <spdlog/details/log_msg.h>
 
 #include "bd/logging.h"
+#include "printable.h"
 
 namespace kevro
 {
@@ -16,7 +17,7 @@ namespace
 {
 
 /**
- * The parts of a queued line besides its time and its text.
+ * The parts of a queued line besides its time point and its text.
  *
  * spdlog's messages have no field for them, but the queue copies the name of a message's logger
  * next to the text. That name is not used here, so these bytes are passed in its place.
@@ -25,6 +26,8 @@ struct Heading {
     KEVRO_UInt64 number; ///< of the line, from 1
     KEVRO_UInt32 component;
     KEVRO_Int32 level;
+    KEVRO_UInt32 timeIsOfProgram;
+    KEVRO_UInt32 reserved; ///< fills the structure: no byte is passed uninitialised
 
     spdlog::string_view_t AsName() const
     {
@@ -99,8 +102,8 @@ void Output::log(const spdlog::details::log_msg& message)
     // Not while lines are waiting: each report could displace one of them.
     const KEVRO_UInt64 lost = m_Queue->queue_size() == 0 ? CountLost(lock) : 0;
     lock.unlock();
-    const bool written =
-        WriteToDestination({message.time, heading.component, heading.level, text}, lost);
+    const bool written = WriteToDestination(
+        {{message.time, heading.timeIsOfProgram}, heading.component, heading.level, text}, lost);
     lock.lock();
     // The queue keeps the order: every earlier line has been written or dropped.
     MarkDone(lock, heading.number, written);
@@ -133,13 +136,14 @@ void Output::WriteDirectly(Lock& lock, const LogLine& line) noexcept
 
 void Output::Queue(const Lock& /*lock*/, const LogLine& line)
 {
-    const Heading heading = {m_Accepted + 1, line.component, line.level};
+    const Heading heading = {m_Accepted + 1, line.component, line.level, line.time.isOfProgram, 0};
     // Not through the logger: some of its versions hide that memory ran out.
-    m_Queue->post_log(std::shared_ptr<spdlog::async_logger>(m_Logger),
-                      spdlog::details::log_msg(
-                          line.time, spdlog::source_loc(), heading.AsName(), Severity(line.level),
-                          spdlog::string_view_t(line.text.data(), line.text.size())),
-                      spdlog::async_overflow_policy::overrun_oldest);
+    m_Queue->post_log(
+        std::shared_ptr<spdlog::async_logger>(m_Logger),
+        spdlog::details::log_msg(line.time.point, spdlog::source_loc(), heading.AsName(),
+                                 Severity(line.level),
+                                 spdlog::string_view_t(line.text.data(), line.text.size())),
+        spdlog::async_overflow_policy::overrun_oldest);
     ++m_Accepted;
 }
 
@@ -156,11 +160,30 @@ bool Output::TryWrite(const LogLine& line) noexcept
         TextBuffer text;
         AppendLine(text, line);
         m_Destination->log(spdlog::details::log_msg(
-            line.time, spdlog::source_loc(), spdlog::string_view_t(), Severity(line.level),
+            line.time.point, spdlog::source_loc(), NameForClock(line.time), Severity(line.level),
             spdlog::string_view_t(text.data(), text.size())));
         return true;
-    } catch (...) {
+    } catch (const spdlog::spdlog_ex& failure) {
+        ReportFailure(failure.what());
         return false;
+    } catch (...) {
+        return false; // no memory, which says nothing about the destination
+    }
+}
+
+/** The log itself can report lost lines only once the destination accepts lines again. */
+void Output::ReportFailure(std::string_view reason) noexcept
+{
+    if (std::exchange(m_FailureReported, true)) {
+        return;
+    }
+    try {
+        TextBuffer text;
+        AppendPrintable(text, reason);
+        std::fprintf(stderr, "Log lines are lost: %.*s\n", static_cast<int>(text.size()),
+                     text.data());
+    } catch (...) {
+        // The lines are counted nevertheless.
     }
 }
 
@@ -173,7 +196,7 @@ void Output::ReportLost(KEVRO_UInt64 lost) noexcept
     char text[64];
     const int length =
         std::snprintf(text, sizeof(text), "lines lost: %" PRIu64, lost - m_ReportedLost);
-    if (TryWrite({spdlog::log_clock::now(), bd::CompIdCommon, KEVRO_Log_LevelWarning,
+    if (TryWrite({CurrentTime(), bd::CompIdCommon, KEVRO_Log_LevelWarning,
                   std::string_view(text, static_cast<std::size_t>(length))})) {
         m_ReportedLost = lost;
     }

@@ -10,6 +10,7 @@
 #include <memory>
 #include <mutex>
 #include <string>
+#include <string_view>
 
 #include <spdlog/async_logger.h>
 #include <spdlog/details/thread_pool.h>
@@ -71,12 +72,14 @@ private:
     void Queue(const Lock& lock, const LogLine& line);
     bool WriteToDestination(const LogLine& line, KEVRO_UInt64 lost) noexcept;
     bool TryWrite(const LogLine& line) noexcept;
+    void ReportFailure(std::string_view reason) noexcept;
     void ReportLost(KEVRO_UInt64 lost) noexcept;
     void MarkDone(const Lock& lock, KEVRO_UInt64 done, bool written) noexcept;
 
     const std::unique_ptr<spdlog::sinks::sink> m_Destination;
     std::mutex m_WriteMutex;         ///< held while the destination writes a line
     KEVRO_UInt64 m_ReportedLost = 0; ///< guarded by m_WriteMutex
+    bool m_FailureReported = false;  ///< guarded by m_WriteMutex
 
     std::mutex& m_rMutex; ///< never held while a line is written
     std::condition_variable m_Progress;

@@ -8,7 +8,7 @@ void KEVRO_Log_VWrite(KEVRO_UInt32 component, KEVRO_Int32 level, KEVRO_Bool, con
                       va_list args)
 {
     using namespace kevro;
-    LogLine line = {spdlog::log_clock::now(), component, level, {}};
+    LogLine line = {CurrentTime(), component, level, {}};
     va_list argsAgain;
     va_copy(argsAgain, args);
     try {

@@ -10,16 +10,17 @@
 #include <syslog.h>
 #include <unistd.h>
 
+#include <spdlog/details/os.h>
 #include <spdlog/sinks/base_sink.h>
 #include <spdlog/sinks/rotating_file_sink.h>
+
+#include "logclock.h"
 
 namespace kevro
 {
 
 namespace
 {
-
-constexpr char LinePattern[] = "%Y-%m-%d %H:%M:%S.%f %v";
 
 /** Standard error. Unlike spdlog's own sink it throws when a line could not be written. */
 class StderrSink final : public spdlog::sinks::base_sink<std::mutex>
@@ -100,7 +101,7 @@ private:
 std::unique_ptr<spdlog::sinks::sink> MakeStderrSink()
 {
     auto sink = std::make_unique<StderrSink>();
-    sink->set_pattern(LinePattern);
+    sink->set_formatter(MakeLineFormatter());
     return sink;
 }
 
@@ -108,13 +109,20 @@ std::unique_ptr<spdlog::sinks::sink> MakeFileSink(const std::string& path, std::
                                                   std::size_t files)
 {
     spdlog::file_event_handlers handlers;
+    handlers.before_open = [](const spdlog::filename_t& file) {
+        // spdlog would create missing directories: a misspelt path must not leave any.
+        const spdlog::filename_t directory = spdlog::details::os::dir_name(file);
+        if (!directory.empty() && !spdlog::details::os::path_exists(directory)) {
+            spdlog::throw_spdlog_ex("Failed opening file " + file + " for writing", ENOENT);
+        }
+    };
     handlers.after_open = [](const spdlog::filename_t&, std::FILE* file) {
         // Unbuffered, a full disk is noticed at the line that is lost, and a crash loses none.
         std::setvbuf(file, nullptr, _IONBF, 0);
     };
     auto sink =
         std::make_unique<spdlog::sinks::rotating_file_sink_mt>(path, size, files, false, handlers);
-    sink->set_pattern(LinePattern);
+    sink->set_formatter(MakeLineFormatter());
     return sink;
 }
 

@@ -17,7 +17,8 @@ namespace kevro
 
 std::unique_ptr<spdlog::sinks::sink> MakeStderrSink();
 
-/** Opens the file; throws when that fails. See KEVRO_Log_ConfigureSink() for the parameters. */
+/** Opens the file in an existing directory; throws when that fails. See KEVRO_Log_ConfigureSink()
+ * for the parameters. */
 std::unique_ptr<spdlog::sinks::sink> MakeFileSink(const std::string& path, std::size_t size,
                                                   std::size_t files);
 

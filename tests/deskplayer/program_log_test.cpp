@@ -1,8 +1,13 @@
 #include <gtest/gtest.h>
 
+#include <cstdint>
+#include <cstdio>
+#include <cstdlib>
+#include <nlohmann/json.hpp>
 #include <regex>
 #include <set>
 #include <string>
+#include <vector>
 
 #include "programtest.h"
 
@@ -73,7 +78,7 @@ TEST(DeskPlayerLog, HasALineForEveryEvent)
     const ProgramResult result = RunDeskPlayer(
         {SampleDisc, "--session", AllEvents, "--log", "BdmvNavigator=Event+hifreq|Warning"});
 
-    const std::regex eventLine(".{26} BdmvNavigator Event: (Sending [^(].*)");
+    const std::regex eventLine(".{15} BdmvNavigator Event: (Sending [^(].*)");
     const std::regex value("[0-9]+|TRUE|FALSE");
     std::set<std::string> logged;
     for (const std::string& line : LinesOf(result.errors)) {
@@ -95,9 +100,50 @@ TEST(DeskPlayerLog, GoesToStandardError)
 
     const std::vector<std::string> lines = LinesOf(result.errors);
     ASSERT_EQ(lines.size(), 12U);
-    const std::string tag = "....-..-.. ..:..:..\\....... BdmvNavigator Event: ";
+    const std::string tag = "..:..:..\\....... BdmvNavigator Event: ";
     EXPECT_TRUE(std::regex_match(lines.front(), std::regex(tag + "Sending PlayStarted")));
     EXPECT_TRUE(std::regex_match(lines.back(), std::regex(tag + "Sending Finished - reason: 0")));
+}
+
+TEST(DeskPlayerLog, CarriesTheTimeOfTheSessionToTheTick)
+{
+    const std::vector<std::string> arguments = {SampleDisc, "--session", AllEvents,
+                                                "--format", "json",      "--only",
+                                                "MarkInfo", "--log",     "BdmvNavigator=Event"};
+    const ProgramResult result = RunDeskPlayer(arguments);
+
+    std::vector<std::string> ofCallbacks;
+    for (const std::string& line : LinesOf(result.output)) {
+        const auto ticks = nlohmann::json::parse(line).at("ticks").get<std::uint64_t>();
+        const auto microseconds = static_cast<unsigned long>((ticks * 200 + 4) / 9);
+        char time[64];
+        std::snprintf(time, sizeof time, "%02lu:%02lu:%02lu.%06lu", microseconds / 3600000000,
+                      microseconds / 60000000 % 60, microseconds / 1000000 % 60,
+                      microseconds % 1000000);
+        ofCallbacks.emplace_back(time);
+    }
+    std::vector<std::string> ofLines;
+    for (const std::string& line : LinesOf(result.errors)) {
+        if (line.find("Sending MarkInfo") != std::string::npos) {
+            ofLines.push_back(line.substr(0, line.find(' ')));
+        }
+    }
+    EXPECT_GT(ofLines.size(), 5U);
+    EXPECT_EQ(ofLines, ofCallbacks);
+}
+
+TEST(DeskPlayerLog, IsTheSameInEveryRun)
+{
+    for (const char* const sink : {"stderr", "stderr,queue=1000"}) {
+        setenv("KEVRO_LOG_SINK", sink, 1);
+        const std::vector<std::string> arguments = {SampleDisc, "--session", AllEvents, "--log",
+                                                    "*=*"};
+        const ProgramResult first = RunDeskPlayer(arguments);
+        const ProgramResult second = RunDeskPlayer(arguments);
+        unsetenv("KEVRO_LOG_SINK");
+        EXPECT_GT(LinesOf(first.errors).size(), 100U);
+        EXPECT_EQ(first.errors, second.errors) << sink;
+    }
 }
 
 } // namespace

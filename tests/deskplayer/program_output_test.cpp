@@ -171,23 +171,32 @@ TEST_F(DeskPlayerOutput, RefusesUnknownFormatsInterfacesAndCallbacks)
         << result.errors;
 }
 
-TEST_F(DeskPlayerOutput, IsReportedWithStatus1IfItCannotBeWritten)
+TEST_F(DeskPlayerOutput, IsReportedWithStatus1AndTheReasonIfItCannotBeWritten)
 {
-    for (const std::vector<std::string>& arguments : std::vector<std::vector<std::string>>{
-             {SampleDisc}, {SampleDisc, "--list"}, {SampleDisc, "--describe", "1"}}) {
+    for (const std::vector<std::string>& arguments :
+         std::vector<std::vector<std::string>>{{SampleDisc},
+                                               {SampleDisc, "--list"},
+                                               {SampleDisc, "--describe", "1"},
+                                               {"--commands"},
+                                               {"--version"},
+                                               {"--help"}}) {
         const ProgramResult result = RunDeskPlayer(arguments, "/dev/full");
         EXPECT_EQ(result.status, 1);
-        EXPECT_EQ(result.errors, "bdmv-deskplayer: standard output: could not be written\n");
+        EXPECT_EQ(result.errors, "bdmv-deskplayer: standard output: cannot be written: No space "
+                                 "left on device\n");
     }
-    EXPECT_EQ(RunDeskPlayer({"--commands"}, "/dev/full").status, 1);
-    EXPECT_EQ(RunDeskPlayer({"--help"}, "/dev/full").status, 1);
 
     const ProgramResult full = RunDeskPlayer({SampleDisc, "--output", "/dev/full"});
     EXPECT_EQ(full.status, 1);
-    EXPECT_EQ(full.errors, "bdmv-deskplayer: /dev/full: could not be written\n");
+    EXPECT_EQ(full.errors,
+              "bdmv-deskplayer: /dev/full: cannot be written: No space left on device\n");
     const ProgramResult nowhere = RunDeskPlayer({SampleDisc, "--output", "no/such/folder/out"});
     EXPECT_EQ(nowhere.status, 1);
-    EXPECT_EQ(nowhere.errors, "bdmv-deskplayer: no/such/folder/out: cannot be written\n");
+    EXPECT_EQ(nowhere.errors, "bdmv-deskplayer: no/such/folder/out: cannot be written: No such "
+                              "file or directory\n");
+    const ProgramResult isFolder = RunDeskPlayer({SampleDisc, "--output", folder});
+    EXPECT_EQ(isFolder.errors,
+              "bdmv-deskplayer: " + folder.string() + ": cannot be written: Is a directory\n");
 }
 
 } // namespace

@@ -170,6 +170,19 @@ TEST_F(DeskPlayerSession, PlaysTwoHoursToTheEnd)
     EXPECT_EQ(LastLine(result.output), "02:00:01.000  Stopped");
 }
 
+TEST_F(DeskPlayerSession, IsNamedWithoutControlCharacters)
+{
+    const std::string refused = WriteFile("a\nb\xC3\xA9.session", "stop\n");
+    const std::string wrong = WriteFile("c\nd\xC3\xA9.session", "caf\xC3\xA9\n");
+
+    EXPECT_NE(RunDeskPlayer({SampleDisc, "--session", refused})
+                  .errors.find("a\\x0Ab\xC3\xA9.session:1: refused at "),
+              std::string::npos);
+    EXPECT_NE(RunDeskPlayer({SampleDisc, "--session", wrong})
+                  .errors.find("c\\x0Ad\xC3\xA9.session:1:1: unexpected 'caf\xC3\xA9'"),
+              std::string::npos);
+}
+
 TEST_F(DeskPlayerSession, IsReadFromAPipe)
 {
     const std::string pipe = folder / "pipe.session";

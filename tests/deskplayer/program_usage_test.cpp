@@ -54,7 +54,8 @@ TEST(DeskPlayerUsage, IsRefusedWithStatus2WhenInvalid)
         const ProgramResult result = RunDeskPlayer(arguments);
         EXPECT_EQ(result.status, 2);
         EXPECT_EQ(result.output, "");
-        EXPECT_NE(result.errors, "");
+        EXPECT_EQ(result.errors.rfind("bdmv-deskplayer: ", 0), 0U) << result.errors;
+        EXPECT_EQ(LinesOf(result.errors).size(), 1U) << result.errors;
     }
 }
 
@@ -69,6 +70,15 @@ TEST(DeskPlayerUsage, RefusesOptionsThatExcludeEachOther)
                                                          {"--describe", "1", "--realtime"},
                                                          {"--describe", "1", "--session", Evening},
                                                          {"--describe", "1", "--remote"},
+                                                         {"--list", "--listen", "control"},
+                                                         {"--list", "--only", "PlayItem"},
+                                                         {"--list", "--log", "*=*"},
+                                                         {"--list", "--log", ""},
+                                                         {"--list", "--format", "trace"},
+                                                         {"--describe", "1", "--listen", "button"},
+                                                         {"--describe", "1", "--only", "PlayItem"},
+                                                         {"--describe", "1", "--log", "*=*"},
+                                                         {"--describe", "1", "--format", "trace"},
                                                          {"--remote", "--session", Evening}};
     for (std::vector<std::string> arguments : pairs) {
         SCOPED_TRACE(arguments.front() + " and others");
@@ -77,6 +87,44 @@ TEST(DeskPlayerUsage, RefusesOptionsThatExcludeEachOther)
         EXPECT_EQ(result.status, 2);
         EXPECT_EQ(result.output, "");
         EXPECT_NE(result.errors.find(" excludes "), std::string::npos) << result.errors;
+    }
+}
+
+TEST(DeskPlayerUsage, RefusesEmptyNames)
+{
+    for (const std::string option : {"--session", "--output", "--listen", "--only"}) {
+        for (const std::vector<std::string>& words :
+             std::vector<std::vector<std::string>>{{option, ""}, {option + "="}}) {
+            std::vector<std::string> arguments = {SampleDisc};
+            arguments.insert(arguments.end(), words.begin(), words.end());
+            const ProgramResult result = RunDeskPlayer(arguments);
+            EXPECT_EQ(result.status, 2) << option;
+            EXPECT_EQ(result.output, "");
+            EXPECT_NE(result.errors.find(option), std::string::npos) << result.errors;
+        }
+    }
+    EXPECT_EQ(RunDeskPlayer({SampleDisc, "--log", ""}).status, 0) << "switches every line off";
+}
+
+TEST(DeskPlayerUsage, EscapesEveryNameInTheSameWay)
+{
+    const std::string name = "caf\xC3\xA9\x1B[2J\n\xE9\\";
+    const std::string escaped = "caf\xC3\xA9\\x1B[2J\\x0A\\xE9\\x5C";
+    const std::vector<std::vector<std::string>> commandLines = {
+        {name},
+        {SampleDisc, name},
+        {SampleDisc, "--" + name},
+        {SampleDisc, "--playlist", name},
+        {SampleDisc, "--format", name},
+        {SampleDisc, "--listen", name},
+        {SampleDisc, "--session", name},
+        {SampleDisc, "--output", "no/such/" + name}};
+    for (const std::vector<std::string>& arguments : commandLines) {
+        const ProgramResult result = RunDeskPlayer(arguments);
+        EXPECT_NE(result.status, 0);
+        EXPECT_EQ(result.errors.rfind("bdmv-deskplayer: ", 0), 0U) << result.errors;
+        EXPECT_EQ(LinesOf(result.errors).size(), 1U) << result.errors;
+        EXPECT_NE(result.errors.find(escaped), std::string::npos) << result.errors;
     }
 }
 

@@ -189,7 +189,7 @@ PageHasTheKeysOfTheProgram() {
         "$({
             sed -n "s/^ *{'\\(.\\)', \".*/\\1/p" "$sources/deskplayer/session/remote.cpp" |
                 sed 's/^ $/space/'
-            echo q
+            printf '%s\n' '?' q
         } | sorted)"
 }
 

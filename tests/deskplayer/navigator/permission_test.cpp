@@ -2,7 +2,9 @@
 
 #include <gtest/gtest.h>
 
+#include "database/uomasktable.h"
 #include "parts.h"
+#include "text/names.h"
 
 namespace deskplayer
 {
@@ -40,6 +42,19 @@ TEST_F(PermissionWhilePlaying, NamesThePlayListOrItemThatForbidsAnOperation)
               "PauseOn is forbidden by play item 0");
     EXPECT_EQ(permission.CheckMask(bd::UserOperationStop).Reason(),
               "Stop is forbidden by play list 7 and its play item 0");
+}
+
+TEST_F(PermissionWhilePlaying, NamesTheOverrideThatForbidsEveryOperation)
+{
+    g_u1Bduopmask = 2;
+    for (const auto operation : {bd::UserOperationTimeSearch, bd::UserOperationPauseOn,
+                                 bd::UserOperationStop, bd::UserOperationChapterSearch}) {
+        EXPECT_EQ(permission.CheckMask(operation).Reason(),
+                  NameOf(operation) + " is forbidden by the debug override KEVRO_UOPMASK=2");
+    }
+    g_u1Bduopmask = 1;
+    EXPECT_TRUE(permission.CheckMask(bd::UserOperationStop).IsDone());
+    g_u1Bduopmask = 0;
 }
 
 TEST_F(PermissionWhilePlaying, IsGivenWhileNothingPlays)

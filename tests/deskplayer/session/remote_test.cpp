@@ -13,6 +13,7 @@
 #include <sstream>
 
 #include "../testdesk.h"
+#include "text/printable.h"
 
 namespace deskplayer
 {
@@ -88,8 +89,9 @@ std::string Press(TestDesk& desk, const std::string& pressed)
     std::string refusals;
     Keys keys(pressed);
     keys.End();
-    PlayByRemote(desk.desk, keys.Descriptor(),
-                 [&refusals](const std::string& reason) { refusals += reason + "\n"; });
+    RemoteHooks hooks;
+    hooks.onRefused = [&refusals](const std::string& reason) { refusals += reason + "\n"; };
+    PlayByRemote(desk.desk, keys.Descriptor(), hooks);
     return refusals;
 }
 
@@ -124,6 +126,20 @@ TEST(Remote, PerformsTheActionOfEveryKey)
         {"f", 'w',
          "PlayMode(PlayDirectionForward, "
          "PlaySpeedNormal)\nPictureInPictureAvailable()\nSecondaryAudioAvailable()\n"},
+        {"", 'd',
+         "PlayMode(PlayDirectionForward, "
+         "PlaySpeedSlow1)\nPictureInPictureUnavailable()\nSecondaryAudioUnavailable()\n"},
+        {"d", 'd', "PlayMode(PlayDirectionForward, PlaySpeedSlow2)\n"},
+        {"f", 'd', "PlayMode(PlayDirectionForward, PlaySpeedSlow1)\n"},
+        {"nd", 'v', "PlayMode(PlayDirectionBackward, PlaySpeedSlow1)\n"},
+        {"nv", 'v', "PlayMode(PlayDirectionBackward, PlaySpeedSlow2)\n"},
+        {"", 'h', "JumpOccurred()\nMarkInfo(7, 0, 0)\n"},
+        {"", 'l', nullptr}, // reports a position that depends on the wall clock
+        {"", 'b', nullptr}, // likewise
+        {"", 'u', "PresentationGraphicsDisplay(false)\n"},
+        {"u", 'u', "PresentationGraphicsDisplay(true)\n"},
+        {"", 'i', "SecondaryVideoDisplay(1, true)\n"},
+        {"i", 'i', "SecondaryVideoDisplay(1, false)\n"},
         {"", 'n', "JumpOccurred()\nMarkInfo(7, 1, 27000000)\nChapterNumber(2)\n"},
         {"n", 'p', "JumpOccurred()\nMarkInfo(7, 0, 0)\nChapterNumber(1)\n"},
         {"", 'o', "not in a still, but playing\n"},
@@ -221,7 +237,9 @@ TEST(Remote, LeavesAStill)
     ASSERT_EQ(pipe(ends), 0);
     presser.onStill = [&ends] { EXPECT_EQ(write(ends[1], "o", 1), 1); };
 
-    PlayByRemote(desk.desk, ends[0], [](const std::string& reason) { ADD_FAILURE() << reason; });
+    RemoteHooks hooks;
+    hooks.onRefused = [](const std::string& reason) { ADD_FAILURE() << reason; };
+    PlayByRemote(desk.desk, ends[0], hooks);
 
     EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Finished);
     close(ends[0]);
@@ -271,33 +289,133 @@ TEST(Remote, EndsAtTheEndOfPlayback)
     EXPECT_GE(desk.clock.Now(), Second / 10) << "on the wall clock";
 }
 
-TEST(Remote, IgnoresUnknownKeys)
+TEST(Remote, SeeksTenSecondsBackAndAhead)
 {
+    TestDesk desk(LongPlayList());
+    PlaybackContext& context = desk.navigator.Context();
+
+    CallbacksOfKeys(desk, " ", "lll");
+    EXPECT_GE(Ticks(context.GetCurrentTimePosition()), 30 * Second);
+    EXPECT_LT(Ticks(context.GetCurrentTimePosition()), 60 * Second);
+
+    TestDesk again(LongPlayList());
+    CallbacksOfKeys(again, "n", "h");
+    EXPECT_GE(Ticks(again.navigator.Context().GetCurrentTimePosition()), 590 * Second);
+    EXPECT_LT(Ticks(again.navigator.Context().GetCurrentTimePosition()), 600 * Second);
+}
+
+TEST(Remote, SetsAThenBAndThenEndsTheRepeat)
+{
+    TestDesk desk(LongPlayList());
+    PlaybackContext& context = desk.navigator.Context();
+
+    Press(desk, "b");
+    EXPECT_EQ(context.GetCurrentABRepeatState(), bd::TRIGGER_A);
+
+    TestDesk both(LongPlayList());
+    Press(both, "blb");
+    EXPECT_EQ(both.navigator.Context().GetCurrentABRepeatState(), bd::TRIGGER_B);
+
+    TestDesk ended(LongPlayList());
+    Press(ended, "blbb");
+    EXPECT_EQ(ended.navigator.Context().GetCurrentABRepeatState(), bd::TRIGGER_AB_NONE);
+}
+
+TEST(Remote, PlaysNoSlowerThanTheSlowest)
+{
+    TestDesk desk(LongPlayList());
+
+    CallbacksOfKeys(desk, " ", std::string(20, 'd'));
+    EXPECT_EQ(desk.navigator.Context().GetPlayMode(),
+              bd::PlayMode(bd::PlayDirectionForward, bd::PlaySpeedSlow5));
+}
+
+TEST(Remote, RefusesEveryUnknownKey)
+{
+    std::string refusals;
     std::string others;
     for (int key = 0; key < 256; ++key) {
         const auto character = static_cast<char>(key);
         const auto& known = RemoteKeys();
-        if (character != 'q' && character != ControlC &&
+        if (std::string("q?\r\n").find(character) == std::string::npos && character != ControlC &&
             std::none_of(known.begin(), known.end(), [character](const RemoteKey& remoteKey) {
                 return remoteKey.key == character;
             })) {
             others += character;
+            refusals += "no key '" + Printable({&character, 1}) + "'; ? lists the keys\n";
         }
     }
     TestDesk desk(LongPlayList());
 
-    EXPECT_EQ(CallbacksOfKeys(desk, "", others), "");
+    EXPECT_EQ(CallbacksOfKeys(desk, "", others), refusals);
+}
+
+TEST(Remote, IgnoresLineEndsAndTheKeyForHelp)
+{
+    TestDesk desk(LongPlayList());
+
+    EXPECT_EQ(CallbacksOfKeys(desk, "", "\r\n?"), "");
+}
+
+TEST(Remote, ReportsEveryKeyBeforeItsOperation)
+{
+    TestDesk desk(LongPlayList());
+    Keys keys(" ?y\nq");
+    std::string pressed;
+    RemoteHooks hooks;
+    hooks.onKey = [&](char key) {
+        pressed += key;
+        if (key == ' ') {
+            EXPECT_EQ(desk.navigator.CurrentStatus(), Status::Playing);
+        }
+    };
+
+    PlayByRemote(desk.desk, keys.Descriptor(), hooks);
+
+    EXPECT_EQ(pressed, " ?y");
+}
+
+TEST(Remote, CallsAfterEveryWaitBeforeTimePasses)
+{
+    TestDesk desk(ListOf({ItemOfTicks(Second / 10)}));
+    Keys keys("");
+    std::string calls;
+    RemoteHooks hooks;
+    hooks.beforeWaiting = [&] { calls += "before "; };
+    hooks.afterWaiting = [&] {
+        calls += "after ";
+        EXPECT_NE(desk.navigator.CurrentStatus(), Status::Finished);
+    };
+
+    PlayByRemote(desk.desk, keys.Descriptor(), hooks);
+
+    EXPECT_EQ(calls.rfind("before after ", 0), 0U) << calls;
+    EXPECT_EQ(calls.substr(calls.size() - 13), "before after ");
+}
+
+TEST(Remote, CallsBeforeEveryWaitAfterTheCallbacks)
+{
+    TestDesk desk(LongPlayList());
+    Keys keys(" q");
+    std::vector<Status> statuses;
+    RemoteHooks hooks;
+    hooks.beforeWaiting = [&] { statuses.push_back(desk.navigator.CurrentStatus()); };
+
+    PlayByRemote(desk.desk, keys.Descriptor(), hooks);
+
+    EXPECT_EQ(statuses, (std::vector<Status>{Status::Playing, Status::Paused}));
 }
 
 TEST(Remote, ExplainsEveryKey)
 {
     const std::string help = RemoteHelp();
-    std::set<char> keys = {'q'};
+    std::set<char> keys = {'q', '?'};
     for (const RemoteKey& key : RemoteKeys()) {
         EXPECT_TRUE(keys.insert(key.key).second) << key.key << " occurs twice";
         const std::string name = key.key == ' ' ? "space" : std::string(1, key.key);
         EXPECT_NE((" " + help).find(name + " " + key.help), std::string::npos) << key.help;
     }
+    EXPECT_NE(help.find("? list the keys "), std::string::npos);
     EXPECT_NE(help.find("q or Ctrl-C quit\n"), std::string::npos);
 }
 
@@ -403,7 +521,7 @@ TEST(RemoteTerminal, IsRestoredWhenASignalEndsTheProgram)
 {
     const Terminal terminal;
     const termios before = terminal.Settings();
-    for (const int signal : {SIGHUP, SIGINT, SIGQUIT, SIGTERM}) {
+    for (const int signal : {SIGHUP, SIGINT, SIGQUIT, SIGTERM, SIGPIPE}) {
         EXPECT_EXIT(
             {
                 TestDesk desk(LongPlayList());

@@ -20,6 +20,15 @@ TEST(Ticks, ConvertExactlyFromSecondsAndMilliseconds)
                   "a number without a unit is not a time");
 }
 
+TEST(Ticks, AreDistinguishedByTheNearestMicrosecond)
+{
+    EXPECT_EQ(Microseconds(Ticks(0)), 0U);
+    EXPECT_EQ(Microseconds(Ticks(1)), 22U);
+    EXPECT_EQ(Microseconds(Ticks(2)), 44U);
+    EXPECT_EQ(Microseconds(Ticks(44)), 978U);
+    EXPECT_EQ(Microseconds(Ticks(45)), 1000U);
+}
+
 TEST(TimeText, ShowsHoursMinutesSecondsAndMilliseconds)
 {
     EXPECT_EQ(TimeText(std::chrono::hours(100) + std::chrono::milliseconds(3723004)),

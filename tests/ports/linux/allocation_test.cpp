@@ -35,6 +35,15 @@ TEST_F(LogAllocation, DoesNotOccurForAQueuedLineOfTwoHundredBytes)
     EXPECT_EQ(AllocationsOfALine(std::string(200, 'x')), 0U);
 }
 
+TEST_F(LogAllocation, DoesNotOccurWithAClockOfTheProgram)
+{
+    KEVRO_Log_SetClock([](void*) { return KEVRO_UInt64{0}; }, nullptr);
+    EXPECT_EQ(AllocationsOfALine(std::string(200, 'x')), 0U);
+    porttesting::ConfigureSink("file:" + m_LogFile + ",queue=2");
+    EXPECT_EQ(AllocationsOfALine(std::string(200, 'x')), 0U);
+    KEVRO_Log_SetClock(nullptr, nullptr);
+}
+
 TEST_F(LogAllocation, DoesNotOccurWhenTheQueueDropsLines)
 {
     porttesting::ConfigureSink("file:" + m_LogFile + ",queue=1");

@@ -143,12 +143,32 @@ TEST_F(LogSink, AppendsToAFile)
     EXPECT_EQ(WithoutTime(lines[1]), "BdmvNavigator Event: added");
 }
 
-TEST_F(LogSink, CreatesTheDirectoriesOfAFile)
+TEST_F(LogSink, RefusesAFileInAMissingDirectoryAndCreatesNone)
 {
+    ConfigureSink("file:" + m_LogFile);
     const std::string file = m_Directory.Path("one/two/log");
-    ConfigureSink("file:" + file);
-    EventLogger().Log("here");
-    EXPECT_EQ(ReadLines(file).size(), 1U);
+
+    EXPECT_EQ(RefusalOf("file:" + file),
+              "Failed opening file " + file + " for writing: No such file or directory");
+
+    EXPECT_FALSE(std::filesystem::exists(m_Directory.Path("one")));
+    EventLogger().Log("still here");
+    EXPECT_EQ(ReadLines(m_LogFile).size(), 1U);
+}
+
+TEST_F(LogSink, DoesNotCreateAgainADirectoryThatWasRemoved)
+{
+    const std::string directory = m_Directory.Path("one");
+    std::filesystem::create_directory(directory);
+    ConfigureSink("file:" + directory + "/log,size=10");
+    EventLogger().Log("fills the file");
+    std::filesystem::remove_all(directory);
+
+    testing::internal::CaptureStderr();
+    EventLogger().Log("starts a new file");
+    testing::internal::GetCapturedStderr();
+
+    EXPECT_FALSE(std::filesystem::exists(directory));
 }
 
 TEST_F(LogSink, RotatesAFileAndKeepsTheNewest)
@@ -426,6 +446,20 @@ TEST_F(LogSink, CountsLinesThatTheSinkRejects)
     }
     ConfigureSink("stderr");
     EXPECT_EQ(KEVRO_Log_GetDroppedLines(), before + 4);
+}
+
+TEST_F(LogSink, ReportsTheFirstRejectedLineOnceOnStandardError)
+{
+    const std::string report =
+        "Log lines are lost: Failed writing to file /dev/full: No space left on device\n";
+    testing::internal::CaptureStderr();
+    for (const char* sink : {"file:/dev/full", "file:/dev/full,queue=10"}) {
+        ConfigureSink(sink);
+        EventLogger().Log("lost");
+        EventLogger().Log("lost, too");
+    }
+    ConfigureSink("file:" + m_LogFile);
+    EXPECT_EQ(testing::internal::GetCapturedStderr(), report + report) << "once per sink";
 }
 
 TEST_F(LogSink, ReportsTheNumberOfLostLinesWhenItAcceptsLinesAgain)
