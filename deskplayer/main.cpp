@@ -62,7 +62,7 @@ LoadedPlayList Load(const Disc& disc, const Options& options)
         return LoadPlayList(disc, *options.playList, disc.ReadPlayList(*options.playList));
     }
     LongestPlayList longest = disc.FindLongestPlayList();
-    for (const std::string& line : longest.unreadable) {
+    for (const std::string& line : longest.skipped) {
         PrintMessage("skipped: " + line);
     }
     return LoadPlayList(disc, longest.number, std::move(longest.playList));

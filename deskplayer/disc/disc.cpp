@@ -7,6 +7,7 @@
 #include <utility>
 
 #include "disc/timeline.h"
+#include "text/timetext.h"
 
 namespace deskplayer
 {
@@ -141,25 +142,29 @@ LongestPlayList Disc::FindLongestPlayList() const
 {
     std::optional<std::uint32_t> longest;
     Ticks greatestDuration(0);
-    std::vector<std::string> unreadable;
+    std::vector<std::string> skipped;
     for (const std::uint32_t number : PlayListNumbers()) {
         try {
             const Ticks duration = BuildTimeLine(ReadPlayList(number)).duration;
-            if (!longest || duration > greatestDuration) {
+            if (duration > LongestDuration) {
+                skipped.push_back("BDMV/" + PlayListFileName(number) + ": lasts " +
+                                  TimeText(duration) + ", expected at most " +
+                                  TimeText(LongestDuration));
+            } else if (!longest || duration > greatestDuration) {
                 longest = number;
                 greatestDuration = duration;
             }
         } catch (const DiscError& error) {
-            unreadable.emplace_back(error.what());
+            skipped.emplace_back(error.what());
         }
     }
     if (!longest) {
         throw FileError((m_Bdmv / "PLAYLIST").string(),
-                        unreadable.empty() ? "no play list, expected files such as 00000.mpls"
-                                           : "no play list can be read: " + unreadable.front());
+                        skipped.empty() ? "no play list, expected files such as 00000.mpls"
+                                        : "no play list can be played: " + skipped.front());
     }
     // Read again rather than kept: keeping it would double the peak memory.
-    return {*longest, ReadPlayList(*longest), std::move(unreadable)};
+    return {*longest, ReadPlayList(*longest), std::move(skipped)};
 }
 
 } // namespace deskplayer

@@ -39,7 +39,7 @@ constexpr std::uintmax_t LargestFile = std::uintmax_t{4} * 1024 * 1024;
 struct LongestPlayList {
     std::uint32_t number = 0;
     PlayList playList;
-    std::vector<std::string> unreadable; ///< one message for each play list that was skipped
+    std::vector<std::string> skipped; ///< one message for each play list that was skipped
 };
 
 /**
@@ -75,9 +75,10 @@ public:
 
     /**
      * Reads all play lists and chooses the longest; among equals, the one with the lowest number.
-     * Those that cannot be read are skipped and reported in the result.
+     * Those that cannot be read or last longer than LongestDuration are skipped and reported in
+     * the result.
      *
-     * @throw FileError there are no play lists, or none can be read
+     * @throw FileError there are no play lists, or none can be played
      */
     LongestPlayList FindLongestPlayList() const;
 

@@ -19,9 +19,6 @@
 namespace deskplayer
 {
 
-/** The longest play list that is played. No disc has one as long. */
-constexpr Ticks LongestDuration = std::chrono::hours(100);
-
 /** A play list, its time line, and the aspect ratios from its clips. */
 struct LoadedPlayList {
     std::uint32_t number = 0;

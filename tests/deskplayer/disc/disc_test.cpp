@@ -250,7 +250,7 @@ TEST_F(DiscFiles, FindsTheLongestPlayList)
     const LongestPlayList longest = MakeDisc().FindLongestPlayList();
     EXPECT_EQ(longest.number, 1u);
     EXPECT_EQ(longest.playList.playItems.at(0).outTime, 35u);
-    EXPECT_TRUE(longest.unreadable.empty());
+    EXPECT_TRUE(longest.skipped.empty());
 }
 
 TEST_F(DiscFiles, FindsTheLowestNumberAmongTheLongestPlayLists)
@@ -274,11 +274,41 @@ TEST_F(DiscFiles, ReportsTheSkippedPlayLists)
     fs::create_directory(PathOf("PLAYLIST/00002.mpls"));
     const LongestPlayList longest = MakeDisc().FindLongestPlayList();
     EXPECT_EQ(longest.number, 1u);
-    EXPECT_EQ(longest.unreadable,
+    EXPECT_EQ(longest.skipped,
               (std::vector<std::string>{
                   "BDMV/PLAYLIST/00000.mpls: offset 0: type indicator is \"dama\", but expected "
                   "\"MPLS\"",
                   PathOf("PLAYLIST/00002.mpls").string() + ": expected a regular file"}));
+}
+
+TEST_F(DiscFiles, SkipsPlayListsThatAreTooLongToPlay)
+{
+    constexpr std::uint32_t hours10 = 10 * 3600 * 45000;
+    const auto writeHundredHoursAnd = [this](const std::string& name, std::uint32_t ticks) {
+        PlayListBytes playList;
+        playList.itemCount = 11;
+        for (unsigned number = 0; number < playList.itemCount; ++number) {
+            PlayItemBytes item;
+            item.outTime = item.inTime + (number < 10 ? hours10 : ticks);
+            const Bytes bytes = item.Make();
+            playList.items.insert(playList.items.end(), bytes.begin(), bytes.end());
+        }
+        Write("PLAYLIST/" + name + ".mpls", playList.Make());
+    };
+    writeHundredHoursAnd("00000", 45);
+    EXPECT_EQ(FileErrorOf([&] { MakeDisc().FindLongestPlayList(); }),
+              PathOf("PLAYLIST").string() +
+                  ": no play list can be played: BDMV/PLAYLIST/00000.mpls: lasts 100:00:00.001, "
+                  "expected at most 100:00:00.000");
+
+    WritePlayList("00001", 10);
+    EXPECT_EQ(MakeDisc().FindLongestPlayList().number, 1u);
+    EXPECT_EQ(MakeDisc().FindLongestPlayList().skipped,
+              std::vector<std::string>{"BDMV/PLAYLIST/00000.mpls: lasts 100:00:00.001, expected at "
+                                       "most 100:00:00.000"});
+
+    writeHundredHoursAnd("00002", 0);
+    EXPECT_EQ(MakeDisc().FindLongestPlayList().number, 2u);
 }
 
 TEST_F(DiscFiles, ReportsThatThereIsNoPlayList)
@@ -287,12 +317,12 @@ TEST_F(DiscFiles, ReportsThatThereIsNoPlayList)
               PathOf("PLAYLIST").string() + ": no play list, expected files such as 00000.mpls");
 }
 
-TEST_F(DiscFiles, ReportsThatNoPlayListCanBeRead)
+TEST_F(DiscFiles, ReportsThatNoPlayListCanBePlayed)
 {
     Write("PLAYLIST/00000.mpls", {});
     EXPECT_EQ(FileErrorOf([&] { MakeDisc().FindLongestPlayList(); }),
               PathOf("PLAYLIST").string() +
-                  ": no play list can be read: BDMV/PLAYLIST/00000.mpls: offset 0: file has 0 "
+                  ": no play list can be played: BDMV/PLAYLIST/00000.mpls: offset 0: file has 0 "
                   "bytes left, but expected 4 bytes for type indicator");
 }
 
