@@ -119,6 +119,9 @@ int Run(const Options& options)
         DescribePlayList(target.Open(), disc, *options.describe, playList);
     } else {
         LoadedPlayList playList = Load(disc, options);
+        for (const std::string& note : playList.notes) {
+            PrintMessage(note);
+        }
         const std::vector<ScriptStep> steps =
             options.session.empty() ? std::vector<ScriptStep>() : ReadSessionFile(options.session);
         Play(std::move(playList), steps, options, outputOptions, target.Open());

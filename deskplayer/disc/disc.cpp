@@ -38,6 +38,9 @@ Bytes ReadFile(const fs::path& path, std::uintmax_t largest)
 {
     std::error_code error;
     const fs::file_status status = fs::status(path, error);
+    if (status.type() == fs::file_type::not_found) {
+        throw MissingFileError(path.string(), error.message() + ", expected a file");
+    }
     if (error) {
         throw FileError(path.string(), error.message() + ", expected a file");
     }
@@ -120,12 +123,6 @@ PlayList Disc::ReadPlayList(std::uint32_t number) const
 ClipInfo Disc::ReadClipInfo(const std::string& clip) const
 {
     return Read(ClipInfoFileName(clip), LargestFile, ParseClipInfo);
-}
-
-bool Disc::HasClipInfo(const std::string& clip) const
-{
-    std::error_code error;
-    return fs::exists(m_Bdmv / ClipInfoFileName(clip), error);
 }
 
 Index Disc::ReadIndex() const

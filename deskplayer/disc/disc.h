@@ -45,10 +45,10 @@ struct LongestPlayList {
 /**
  * Reads the files of one disc. Nothing is cached; only the path of the folder is stored.
  *
- * All operations throw FileError if a file is missing, is not a regular file, is larger than
- * LargestPlayListFile or LargestFile or cannot be read, and FormatError if its contents are
- * malformed; both are DiscErrors. The copies in BDMV/BACKUP are not used, so that damage to a disc
- * is reported.
+ * All operations throw MissingFileError if a file is missing, FileError if it is not a regular
+ * file, is larger than LargestPlayListFile or LargestFile or cannot be read, and FormatError if its
+ * contents are malformed; both are DiscErrors. The copies in BDMV/BACKUP are not used, so that
+ * damage to a disc is reported.
  */
 class Disc
 {
@@ -69,9 +69,6 @@ public:
 
     Index ReadIndex() const;
     MovieObjects ReadMovieObjects() const;
-
-    /** Whether clip information exists, even if it cannot be read. */
-    bool HasClipInfo(const std::string& clip) const;
 
     /**
      * Reads all play lists and chooses the longest; among equals, the one with the lowest number.

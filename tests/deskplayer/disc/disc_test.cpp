@@ -179,17 +179,30 @@ protected:
 
     Stream& Video() { return m_PlayList.playItems.at(0).streams.primaryVideo.at(0); }
 
-    AspectRatio Find() { return AspectRatios(MakeDisc()).Find(m_PlayList, 0, Video()); }
+    AspectRatio Find()
+    {
+        m_Missing.clear();
+        m_Unreadable.clear();
+        const Disc disc = MakeDisc();
+        AspectRatios ratios(
+            disc, {[this](const std::string& message) { m_Missing.push_back(message); },
+                   [this](const std::string& message) { m_Unreadable.push_back(message); }});
+        ratios.Find(m_PlayList, 0, Video());
+        return ratios.Find(m_PlayList, 0, Video());
+    }
 
-    void ExpectNotKnown(const std::string& reason, bool damaged)
+    /** @return the reason */
+    std::string ExpectNotKnown(const std::string& reason)
     {
         const AspectRatio ratio = Find();
         EXPECT_EQ(ratio.code, std::nullopt);
         EXPECT_NE(ratio.reason.find(reason), std::string::npos) << ratio.reason;
-        EXPECT_EQ(ratio.damaged, damaged);
+        return ratio.reason;
     }
 
     PlayList m_PlayList;
+    std::vector<std::string> m_Missing;
+    std::vector<std::string> m_Unreadable;
 };
 
 TEST_F(AspectRatioLookup, ComesFromTheClipInformation)
@@ -210,27 +223,31 @@ TEST_F(AspectRatioLookup, ComesFromTheClipThatTheSubPathNames)
 TEST_F(AspectRatioLookup, IsUnknownWithoutClipInformation)
 {
     fs::remove(PathOf("CLIPINF/00000.clpi"));
-    ExpectNotKnown("00000.clpi: No such file or directory", false);
+    const std::string reason = ExpectNotKnown("00000.clpi: No such file or directory");
+    EXPECT_EQ(m_Missing, std::vector<std::string>{reason}) << "once for each clip";
+    EXPECT_TRUE(m_Unreadable.empty());
 }
 
 TEST_F(AspectRatioLookup, IsUnknownIfTheClipHasNoSuchStream)
 {
     Video().pid = 1;
-    ExpectNotKnown("not in the clip information", false);
+    ExpectNotKnown("not in the clip information");
     Video().pid = 0xFFFF;
-    ExpectNotKnown("not in the clip information", false);
+    ExpectNotKnown("not in the clip information");
 }
 
 TEST_F(AspectRatioLookup, IsUnknownIfNoClipIsNamed)
 {
     Video().entryType = EntryTypeSubPath;
-    ExpectNotKnown("its clip is not known", false);
+    ExpectNotKnown("its clip is not known");
 }
 
 TEST_F(AspectRatioLookup, IsUnknownIfTheClipInformationIsDamaged)
 {
     fs::resize_file(PathOf("CLIPINF/00000.clpi"), 50);
-    ExpectNotKnown("BDMV/CLIPINF/00000.clpi: offset ", true);
+    const std::string reason = ExpectNotKnown("BDMV/CLIPINF/00000.clpi: offset ");
+    EXPECT_EQ(m_Unreadable, std::vector<std::string>{reason}) << "once for each clip";
+    EXPECT_TRUE(m_Missing.empty());
 }
 
 TEST_F(AspectRatioLookup, IsReadOncePerClip)
