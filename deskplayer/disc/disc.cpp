@@ -17,23 +17,6 @@ namespace
 
 namespace fs = std::filesystem;
 
-bool IsFolder(const fs::path& path)
-{
-    std::error_code error;
-    return fs::is_directory(path, error);
-}
-
-fs::path FindBdmv(const fs::path& folder)
-{
-    if (IsFolder(folder / "BDMV")) {
-        return folder / "BDMV";
-    }
-    if (IsFolder(folder / "PLAYLIST")) {
-        return folder;
-    }
-    throw FileError(folder.string(), "not a disc, expected a BDMV folder or its parent");
-}
-
 Bytes ReadFile(const fs::path& path, std::uintmax_t largest)
 {
     std::error_code error;
@@ -64,7 +47,8 @@ Bytes ReadFile(const fs::path& path, std::uintmax_t largest)
     return bytes;
 }
 
-/** The number in the name of a play list file; nothing if the name is not one of a play list. */
+/** The number in the lower-case name of a play list file; nothing if the name is not one of a play
+ * list. */
 std::optional<std::uint32_t> NumberOfPlayList(const std::string& fileName)
 {
     if (fileName.size() != 10 || fileName.substr(5) != ".mpls" ||
@@ -88,23 +72,16 @@ std::string ClipInfoFileName(const std::string& clip)
 
 } // namespace
 
-Disc::Disc(const fs::path& folder) : m_Bdmv(FindBdmv(folder)) {}
+Disc::Disc(const fs::path& folder) : m_Folder(folder) {}
 
 std::vector<std::uint32_t> Disc::PlayListNumbers() const
 {
-    const fs::path folder = m_Bdmv / "PLAYLIST";
     std::vector<std::uint32_t> numbers;
-    std::error_code error;
-    for (fs::directory_iterator entry(folder, error), end; !error && entry != end;
-         entry.increment(error)) {
-        if (const auto number = NumberOfPlayList(entry->path().filename().string())) {
+    for (const std::string& name : m_Folder.LowerCaseNamesIn("PLAYLIST")) {
+        if (const auto number = NumberOfPlayList(name)) {
             numbers.push_back(*number);
         }
     }
-    if (error) {
-        throw FileError(folder.string(), error.message() + ", expected a folder of play lists");
-    }
-    std::sort(numbers.begin(), numbers.end());
     return numbers;
 }
 
@@ -112,7 +89,8 @@ template <typename Value>
 Value Disc::Read(const std::string& name, std::uintmax_t largest,
                  Value (*parse)(const Bytes&, const std::string&)) const
 {
-    return parse(ReadFile(m_Bdmv / name, largest), "BDMV/" + name);
+    const fs::path path = m_Folder.PathOf(name);
+    return parse(ReadFile(path, largest), m_Folder.DisplayNameOf(path));
 }
 
 PlayList Disc::ReadPlayList(std::uint32_t number) const
@@ -156,7 +134,7 @@ LongestPlayList Disc::FindLongestPlayList() const
         }
     }
     if (!longest) {
-        throw FileError((m_Bdmv / "PLAYLIST").string(),
+        throw FileError(m_Folder.PathOf("PLAYLIST").string(),
                         skipped.empty() ? "no play list, expected files such as 00000.mpls"
                                         : "no play list can be played: " + skipped.front());
     }

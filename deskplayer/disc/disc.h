@@ -18,6 +18,7 @@
 #include <vector>
 
 #include "disc/clipinfo.h"
+#include "disc/discfolder.h"
 #include "disc/errors.h"
 #include "disc/index.h"
 #include "disc/movieobject.h"
@@ -43,7 +44,8 @@ struct LongestPlayList {
 };
 
 /**
- * Reads the files of one disc. Nothing is cached; only the path of the folder is stored.
+ * Reads the files of one disc, whatever the case of their names. Only the path of the folder and
+ * the names of its files are stored. Not for use by several threads at a time.
  *
  * All operations throw MissingFileError if a file is missing, FileError if it is not a regular
  * file, is larger than LargestPlayListFile or LargestFile or cannot be read, and FormatError if its
@@ -84,7 +86,7 @@ private:
     Value Read(const std::string& name, std::uintmax_t largest,
                Value (*parse)(const Bytes&, const std::string&)) const;
 
-    std::filesystem::path m_Bdmv;
+    mutable DiscFolder m_Folder; ///< caches listings
 };
 
 } // namespace deskplayer

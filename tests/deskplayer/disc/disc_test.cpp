@@ -69,11 +69,49 @@ TEST_F(DiscFiles, IsNotFoundInAFolderWithoutBdmv)
 TEST_F(DiscFiles, ListsPlayListsOfFiveDigitsInOrder)
 {
     for (const char* const name : {"00800.mpls", "00001.mpls", "99999.mpls", "00000.mpls",
-                                   "0001.mpls", "000010.mpls", "0000a.mpls", "00002.MPLS",
+                                   "0001.mpls", "000010.mpls", "0000a.mpls", "00002.MPLSX",
                                    "00003.mpls~", "00004.clpi", ".mpls", "00005", "1.mplsmpls"}) {
         Write(std::string("PLAYLIST/") + name, {});
     }
     EXPECT_EQ(MakeDisc().PlayListNumbers(), (std::vector<std::uint32_t>{0, 1, 800, 99999}));
+}
+
+TEST_F(DiscFiles, AreFoundWhateverTheCaseOfTheirNames)
+{
+    WritePlayList("00001", 30);
+    Write("CLIPINF/00000.CLPI", ReadContents(TestDisc("ntsc43") / "BDMV/CLIPINF/00000.clpi"));
+    Write("INDEX.BDMV", ReadContents(TestDisc("ntsc43") / "BDMV/index.bdmv"));
+    Write("movieobject.bdmv", ReadContents(TestDisc("ntsc43") / "BDMV/MovieObject.bdmv"));
+    fs::rename(PathOf("PLAYLIST/00001.mpls"), PathOf("PLAYLIST/00001.MPLS"));
+    fs::rename(PathOf("PLAYLIST"), PathOf("playlist"));
+    fs::rename(PathOf("CLIPINF"), PathOf("Clipinf"));
+    fs::rename(m_Folder / "BDMV", m_Folder / "bdmv");
+
+    for (const fs::path& folder : {m_Folder, m_Folder / "bdmv"}) {
+        const Disc disc(folder);
+        EXPECT_EQ(disc.PlayListNumbers(), std::vector<std::uint32_t>{1});
+        EXPECT_EQ(disc.ReadPlayList(1).playItems.at(0).outTime, 35u);
+        EXPECT_EQ(disc.ReadClipInfo("00000").version, "0200");
+        EXPECT_EQ(disc.ReadIndex().version, "0200");
+        EXPECT_EQ(disc.ReadMovieObjects().version, "0200");
+    }
+}
+
+TEST_F(DiscFiles, PrefersTheFileWithTheExactName)
+{
+    WritePlayList("00001", 30);
+    fs::rename(PathOf("PLAYLIST/00001.mpls"), PathOf("PLAYLIST/00001.MPLS"));
+    WritePlayList("00001", 10);
+    EXPECT_EQ(MakeDisc().PlayListNumbers(), std::vector<std::uint32_t>{1});
+    EXPECT_EQ(MakeDisc().ReadPlayList(1).playItems.at(0).outTime, 15u);
+}
+
+TEST_F(DiscFiles, AreNamedInMessagesAsTheyAreFound)
+{
+    Write("PLAYLIST/00001.MPLS", Ascii("nonsense"));
+    EXPECT_EQ(
+        FormatErrorOf([&] { MakeDisc().ReadPlayList(1); }),
+        "BDMV/PLAYLIST/00001.MPLS: offset 0: type indicator is \"nons\", but expected \"MPLS\"");
 }
 
 TEST_F(DiscFiles, ReportsAMissingPlayListFolder)
