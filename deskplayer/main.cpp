@@ -108,7 +108,7 @@ void Play(LoadedPlayList playList, const std::vector<ScriptStep>& steps, const O
 int Run(const Options& options)
 {
     const OutputOptions outputOptions = OutputOptionsOf(options);
-    const Disc disc(options.disc);
+    const Disc disc(options.disc, BackupCopies::Use, PrintMessage);
     Target target(options.output);
     int status = ExitOk;
     if (options.list) {

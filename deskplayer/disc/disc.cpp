@@ -3,10 +3,12 @@
 #include <algorithm>
 #include <cerrno>
 #include <fstream>
+#include <set>
 #include <system_error>
 #include <utility>
 
 #include "disc/timeline.h"
+#include "text/printable.h"
 #include "text/timetext.h"
 
 namespace deskplayer
@@ -16,6 +18,8 @@ namespace
 {
 
 namespace fs = std::filesystem;
+
+const std::string BackupFolder = "BACKUP/";
 
 Bytes ReadFile(const fs::path& path, std::uintmax_t largest)
 {
@@ -72,25 +76,67 @@ std::string ClipInfoFileName(const std::string& clip)
 
 } // namespace
 
-Disc::Disc(const fs::path& folder) : m_Folder(folder) {}
+Disc::Disc(const fs::path& folder, BackupCopies backupCopies, MessageHandler onBackupCopy)
+    : m_Folder(folder), m_BackupCopies(backupCopies), m_OnBackupCopy(std::move(onBackupCopy))
+{
+}
 
 std::vector<std::uint32_t> Disc::PlayListNumbers() const
 {
-    std::vector<std::uint32_t> numbers;
-    for (const std::string& name : m_Folder.LowerCaseNamesIn("PLAYLIST")) {
-        if (const auto number = NumberOfPlayList(name)) {
-            numbers.push_back(*number);
+    std::set<std::uint32_t> numbers;
+    const auto addFrom = [&](const std::string& folder) {
+        for (const std::string& name : m_Folder.LowerCaseNamesIn(folder)) {
+            if (const auto number = NumberOfPlayList(name)) {
+                numbers.insert(*number);
+            }
+        }
+    };
+    if (m_BackupCopies == BackupCopies::Use) {
+        try {
+            addFrom(BackupFolder + "PLAYLIST");
+        } catch (const FileError&) {
+            // Most discs in a folder have no backup copies.
         }
     }
-    return numbers;
+    try {
+        addFrom("PLAYLIST");
+    } catch (const FileError&) {
+        if (numbers.empty()) {
+            throw;
+        }
+    }
+    return std::vector<std::uint32_t>(numbers.begin(), numbers.end());
 }
 
 template <typename Value>
 Value Disc::Read(const std::string& name, std::uintmax_t largest,
                  Value (*parse)(const Bytes&, const std::string&)) const
 {
-    const fs::path path = m_Folder.PathOf(name);
-    return parse(ReadFile(path, largest), m_Folder.DisplayNameOf(path));
+    const auto read = [&](const fs::path& path) {
+        return parse(ReadFile(path, largest), m_Folder.DisplayNameOf(path));
+    };
+    try {
+        return read(m_Folder.PathOf(name));
+    } catch (const DiscError& error) {
+        if (m_BackupCopies == BackupCopies::Ignore) {
+            throw;
+        }
+        const fs::path copy = m_Folder.PathOf(BackupFolder + name);
+        std::optional<Value> value;
+        try {
+            value = read(copy);
+        } catch (const DiscError&) {
+            // The message about the file itself is the one that helps.
+        }
+        if (!value) {
+            throw;
+        }
+        if (m_OnBackupCopy && m_Reported.insert(name).second) {
+            m_OnBackupCopy(std::string(error.what()) + "; using the copy " +
+                           Printable(m_Folder.DisplayNameOf(copy)));
+        }
+        return std::move(*value);
+    }
 }
 
 PlayList Disc::ReadPlayList(std::uint32_t number) const

@@ -14,6 +14,7 @@
 #include <cstdint>
 #include <filesystem>
 #include <optional>
+#include <set>
 #include <string>
 #include <vector>
 
@@ -43,25 +44,30 @@ struct LongestPlayList {
     std::vector<std::string> skipped; ///< one message for each play list that was skipped
 };
 
+/** Whether the copies in BDMV/BACKUP replace files that are missing or damaged. */
+enum class BackupCopies { Use, Ignore };
+
 /**
  * Reads the files of one disc, whatever the case of their names. Only the path of the folder and
  * the names of its files are stored. Not for use by several threads at a time.
  *
  * All operations throw MissingFileError if a file is missing, FileError if it is not a regular
  * file, is larger than LargestPlayListFile or LargestFile or cannot be read, and FormatError if its
- * contents are malformed; both are DiscErrors. The copies in BDMV/BACKUP are not used, so that
- * damage to a disc is reported.
+ * contents are malformed; both are DiscErrors.
+ * If a file is missing or damaged, the copy in BDMV/BACKUP is read instead, if that is possible.
  */
 class Disc
 {
 public:
     /**
      * @param folder a BDMV folder or its parent
+     * @param onBackupCopy receives the reason, once for each file, why its copy is used
      * @throw FileError @p folder is neither
      */
-    explicit Disc(const std::filesystem::path& folder);
+    explicit Disc(const std::filesystem::path& folder,
+                  BackupCopies backupCopies = BackupCopies::Use, MessageHandler onBackupCopy = {});
 
-    /** Numbers of the files PLAYLIST/nnnnn.mpls, in ascending order. */
+    /** Numbers of the files PLAYLIST/nnnnn.mpls and of their copies, in ascending order. */
     std::vector<std::uint32_t> PlayListNumbers() const;
 
     PlayList ReadPlayList(std::uint32_t number) const;
@@ -87,6 +93,9 @@ private:
                Value (*parse)(const Bytes&, const std::string&)) const;
 
     mutable DiscFolder m_Folder; ///< caches listings
+    BackupCopies m_BackupCopies;
+    MessageHandler m_OnBackupCopy;
+    mutable std::set<std::string> m_Reported; ///< names of files whose copies were used
 };
 
 } // namespace deskplayer

@@ -105,6 +105,15 @@ TEST_F(FaultyDisc, IsPlayedIfClipInformationIsNotAFile)
                  "regular file\n");
 }
 
+TEST_F(FaultyDisc, IsPlayedFromBackupCopies)
+{
+    fs::create_directories(disc / "BDMV/BACKUP/PLAYLIST");
+    fs::copy(playList, disc / "BDMV/BACKUP/PLAYLIST");
+    Patch(0, "INDX");
+    ExpectPlayed(disc, "bdmv-deskplayer: BDMV/PLAYLIST/00001\\.mpls: offset 0: .*INDX.*; using the "
+                       "copy BDMV/BACKUP/PLAYLIST/00001\\.mpls\n");
+}
+
 TEST_F(FaultyDisc, IsPlayedWithoutANoteIfThereIsNoClipInformation)
 {
     fs::remove_all(disc / "BDMV/CLIPINF");

@@ -97,6 +97,90 @@ TEST_F(DiscFiles, AreFoundWhateverTheCaseOfTheirNames)
     }
 }
 
+/** A disc with a play list of 30 ticks in its backup folder. */
+class BackupFiles : public DiscFiles
+{
+protected:
+    BackupFiles()
+    {
+        fs::create_directories(PathOf("BACKUP/PLAYLIST"));
+        WritePlayList("00001", 30);
+        fs::rename(PathOf("PLAYLIST/00001.mpls"), PathOf("BACKUP/PLAYLIST/00001.mpls"));
+    }
+
+    /** The disc, whose messages are kept. */
+    Disc MakeDiscWithCopies()
+    {
+        return Disc(m_Folder, BackupCopies::Use,
+                    [this](const std::string& message) { m_Messages.push_back(message); });
+    }
+
+    std::vector<std::string> m_Messages;
+};
+
+TEST_F(BackupFiles, ReplaceAMissingFile)
+{
+    const Disc disc = MakeDiscWithCopies();
+    EXPECT_EQ(disc.PlayListNumbers(), std::vector<std::uint32_t>{1});
+    EXPECT_EQ(disc.ReadPlayList(1).playItems.at(0).outTime, 35u);
+    EXPECT_EQ(m_Messages, std::vector<std::string>{
+                              PathOf("PLAYLIST/00001.mpls").string() +
+                              ": No such file or directory, expected a file; using the copy "
+                              "BDMV/BACKUP/PLAYLIST/00001.mpls"});
+}
+
+TEST_F(BackupFiles, ReplaceADamagedFileWithOneMessage)
+{
+    Write("PLAYLIST/00001.mpls", Ascii("nonsense"));
+    const Disc disc = MakeDiscWithCopies();
+    disc.ReadPlayList(1);
+    EXPECT_EQ(disc.ReadPlayList(1).playItems.at(0).outTime, 35u);
+    EXPECT_EQ(m_Messages,
+              std::vector<std::string>{
+                  "BDMV/PLAYLIST/00001.mpls: offset 0: type indicator is \"nons\", but expected "
+                  "\"MPLS\"; using the copy BDMV/BACKUP/PLAYLIST/00001.mpls"});
+}
+
+TEST_F(BackupFiles, ReplaceAMissingPlayListFolder)
+{
+    fs::remove_all(PathOf("PLAYLIST"));
+    EXPECT_EQ(MakeDisc().PlayListNumbers(), std::vector<std::uint32_t>{1});
+    EXPECT_EQ(MakeDisc().ReadPlayList(1).playItems.size(), 1u);
+}
+
+TEST_F(BackupFiles, AreFoundWhateverTheCaseOfTheirNames)
+{
+    fs::rename(PathOf("BACKUP/PLAYLIST/00001.mpls"), PathOf("BACKUP/PLAYLIST/00001.MPLS"));
+    fs::rename(PathOf("BACKUP"), PathOf("backup"));
+    EXPECT_EQ(MakeDisc().PlayListNumbers(), std::vector<std::uint32_t>{1});
+    EXPECT_EQ(MakeDisc().ReadPlayList(1).playItems.size(), 1u);
+}
+
+TEST_F(BackupFiles, AreNotUsedForASoundFile)
+{
+    WritePlayList("00001", 10);
+    EXPECT_EQ(MakeDiscWithCopies().ReadPlayList(1).playItems.at(0).outTime, 15u);
+    EXPECT_TRUE(m_Messages.empty());
+}
+
+TEST_F(BackupFiles, AreNotUsedIfTheyAreDamagedAsWell)
+{
+    Write("PLAYLIST/00001.mpls", Ascii("nonsense"));
+    Write("BACKUP/PLAYLIST/00001.mpls", Ascii("damaged!"));
+    const Disc disc = MakeDiscWithCopies();
+    EXPECT_EQ(
+        FormatErrorOf([&] { disc.ReadPlayList(1); }),
+        "BDMV/PLAYLIST/00001.mpls: offset 0: type indicator is \"nons\", but expected \"MPLS\"");
+    EXPECT_TRUE(m_Messages.empty());
+}
+
+TEST_F(BackupFiles, AreIgnoredIfTheCallerWantsTheFilesThemselves)
+{
+    const Disc disc(m_Folder, BackupCopies::Ignore);
+    EXPECT_TRUE(disc.PlayListNumbers().empty());
+    EXPECT_NE(FileErrorOf([&] { disc.ReadPlayList(1); }), "");
+}
+
 TEST_F(DiscFiles, PrefersTheFileWithTheExactName)
 {
     WritePlayList("00001", 30);
