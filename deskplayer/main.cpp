@@ -113,10 +113,13 @@ int Run(const Options& options)
     int status = ExitOk;
     if (options.list) {
         const std::vector<std::uint32_t> numbers = disc.PlayListNumbers();
-        status = ListPlayLists(target.Open(), disc, numbers) == 0 ? ExitOk : ExitDisc;
+        status = ListPlayLists(target.Open(), disc, numbers, PrintMessage) == 0 ? ExitOk : ExitDisc;
     } else if (options.describe) {
         const PlayList playList = disc.ReadPlayList(*options.describe);
-        DescribePlayList(target.Open(), disc, *options.describe, playList);
+        status =
+            DescribePlayList(target.Open(), disc, *options.describe, playList, PrintMessage) == 0
+                ? ExitOk
+                : ExitDisc;
     } else {
         LoadedPlayList playList = Load(disc, options);
         for (const std::string& note : playList.notes) {

@@ -10,6 +10,7 @@
 #include "disc/aspectratios.h"
 #include "disc/codes.h"
 #include "disc/timeline.h"
+#include "listing/faults.h"
 #include "text/codes.h"
 #include "text/names.h"
 #include "text/printable.h"
@@ -194,9 +195,9 @@ class Description
 {
 public:
     Description(std::ostream& output, const Disc& disc, std::uint32_t number,
-                const PlayList& playList)
-        : m_rOutput(output), m_AspectRatios(disc), m_Number(number), m_rPlayList(playList),
-          m_TimeLine(BuildTimeLine(playList))
+                const PlayList& playList, Faults& faults)
+        : m_rOutput(output), m_AspectRatios(disc, faults.OfClips()), m_Number(number),
+          m_rPlayList(playList), m_TimeLine(BuildTimeLine(playList))
     {
     }
 
@@ -386,10 +387,12 @@ private:
 
 } // namespace
 
-void DescribePlayList(std::ostream& output, const Disc& disc, std::uint32_t number,
-                      const PlayList& playList)
+std::size_t DescribePlayList(std::ostream& output, const Disc& disc, std::uint32_t number,
+                             const PlayList& playList, const MessageHandler& onFault)
 {
-    Description(output, disc, number, playList).Write();
+    Faults faults(onFault);
+    Description(output, disc, number, playList, faults).Write();
+    return faults.Count();
 }
 
 } // namespace deskplayer

@@ -11,6 +11,7 @@
 #include "disc/aspectratios.h"
 #include "disc/codes.h"
 #include "disc/timeline.h"
+#include "listing/faults.h"
 #include "text/printable.h"
 #include "text/timetext.h"
 
@@ -83,13 +84,14 @@ std::string IndexText(const Index& index)
     return text + ", " + std::to_string(titles) + (titles == 1 ? " title" : " titles");
 }
 
-void ListTitles(std::ostream& output, const Disc& disc)
+void ListTitles(std::ostream& output, const Disc& disc, Faults& faults)
 {
     Index index;
     try {
         index = disc.ReadIndex();
     } catch (const DiscError& error) {
         output << "Index           " << error.what() << '\n';
+        faults.Add(error.what());
         return;
     }
     output << "Index           " << IndexText(index) << '\n'
@@ -233,18 +235,18 @@ void ListPlayList(std::ostream& output, const PlayList& playList, AspectRatios& 
 } // namespace
 
 std::size_t ListPlayLists(std::ostream& output, const Disc& disc,
-                          const std::vector<std::uint32_t>& numbers)
+                          const std::vector<std::uint32_t>& numbers, const MessageHandler& onFault)
 {
-    ListTitles(output, disc);
+    Faults faults(onFault);
+    ListTitles(output, disc, faults);
     output << '\n';
     if (numbers.empty()) {
         output << "There are no play lists.\n";
-        return 0;
+        return faults.Count();
     }
 
     output << "Number  Duration      Items  Chapters  Angles  Streams\n";
-    AspectRatios aspectRatios(disc);
-    std::size_t unreadable = 0;
+    AspectRatios aspectRatios(disc, faults.OfClips());
     for (const std::uint32_t number : numbers) {
         char label[16];
         std::snprintf(label, sizeof label, "%05" PRIu32 "   ", number);
@@ -253,10 +255,10 @@ std::size_t ListPlayLists(std::ostream& output, const Disc& disc,
             ListPlayList(output, disc.ReadPlayList(number), aspectRatios);
         } catch (const DiscError& error) {
             output << error.what() << '\n';
-            ++unreadable;
+            faults.Add(error.what());
         }
     }
-    return unreadable;
+    return faults.Count();
 }
 
 } // namespace deskplayer

@@ -40,9 +40,29 @@ TEST_F(DeskPlayerListing, ListsTheReadablePlayListsOfADamagedDisc)
 
     EXPECT_EQ(result.status, 3);
     EXPECT_NE(result.output.find("\n00001 "), std::string::npos);
-    EXPECT_TRUE(
-        std::regex_search(result.output + result.errors, std::regex("00003.*offset 0: .*INDX")))
-        << result.output << result.errors;
+    EXPECT_TRUE(std::regex_match(
+        result.errors, std::regex("bdmv-deskplayer: .*00003\\.mpls: offset 0: .*INDX.*\n")))
+        << result.errors;
+}
+
+TEST_F(DeskPlayerListing, EndsWithStatus3AndAMessageForEachFault)
+{
+    fs::remove(disc / "BDMV/index.bdmv");
+    fs::remove(disc / "BDMV/CLIPINF/00002.clpi");
+    const std::string missingClip = "bdmv-deskplayer: .*/CLIPINF/00002\\.clpi: No such file.*\n";
+
+    const ProgramResult list = RunDeskPlayer({disc, "--list"});
+    EXPECT_EQ(list.status, 3);
+    EXPECT_NE(list.output.find("\n00001   00:02:54.000"), std::string::npos) << list.output;
+    EXPECT_TRUE(std::regex_search(
+        list.errors, std::regex("^bdmv-deskplayer: .*/index\\.bdmv: No such file.*\n")))
+        << list.errors;
+
+    const ProgramResult description = RunDeskPlayer({disc, "--describe", "1"});
+    EXPECT_EQ(description.status, 3);
+    EXPECT_NE(description.output.find("chapter 1: "), std::string::npos) << description.output;
+    EXPECT_TRUE(std::regex_match(description.errors, std::regex(missingClip)))
+        << description.errors;
 }
 
 TEST_F(DeskPlayerListing, RefusesToDescribeAMissingPlayList)
