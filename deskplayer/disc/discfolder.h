@@ -54,8 +54,8 @@ private:
 
     std::filesystem::path Find(const std::filesystem::path& folder, const std::string& name);
 
+    std::map<std::filesystem::path, Names> m_Listings; ///< before m_Bdmv, whose search uses it
     std::filesystem::path m_Bdmv;
-    std::map<std::filesystem::path, Names> m_Listings;
 };
 
 } // namespace deskplayer
