@@ -19,6 +19,7 @@
 #include "kevro_linux.h"
 #include "listing/description.h"
 #include "listing/listing.h"
+#include "listing/listingjson.h"
 #include "navigator/desk.h"
 #include "output/outputformat.h"
 #include "output/textoutput.h"
@@ -50,6 +51,9 @@ OutputOptions OutputOptionsOf(const Options& options)
         }
     } catch (const std::invalid_argument& error) {
         throw UsageError(error.what());
+    }
+    if ((options.list || options.describe) && output.format == OutputFormat::Trace) {
+        throw UsageError("--format trace: not for --list and --describe, expected text or json");
     }
     output.coloured =
         options.output.empty() && WantsColours(STDOUT_FILENO, std::getenv("NO_COLOR"));
@@ -111,15 +115,17 @@ int Run(const Options& options)
     const Disc disc(options.disc, BackupCopies::Use, PrintMessage);
     Target target(options.output);
     int status = ExitOk;
+    const bool json = outputOptions.format == OutputFormat::Json;
     if (options.list) {
         const std::vector<std::uint32_t> numbers = disc.PlayListNumbers();
-        status = ListPlayLists(target.Open(), disc, numbers, PrintMessage) == 0 ? ExitOk : ExitDisc;
+        const auto list = json ? ListPlayListsAsJson : ListPlayLists;
+        status = list(target.Open(), disc, numbers, PrintMessage) == 0 ? ExitOk : ExitDisc;
     } else if (options.describe) {
         const PlayList playList = disc.ReadPlayList(*options.describe);
-        status =
-            DescribePlayList(target.Open(), disc, *options.describe, playList, PrintMessage) == 0
-                ? ExitOk
-                : ExitDisc;
+        const auto describe = json ? DescribePlayListAsJson : DescribePlayList;
+        const std::size_t faults =
+            describe(target.Open(), disc, *options.describe, playList, PrintMessage);
+        status = faults == 0 ? ExitOk : ExitDisc;
     } else {
         LoadedPlayList playList = Load(disc, options);
         for (const std::string& note : playList.notes) {

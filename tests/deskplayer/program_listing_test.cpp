@@ -65,6 +65,25 @@ TEST_F(DeskPlayerListing, EndsWithStatus3AndAMessageForEachFault)
         << description.errors;
 }
 
+TEST_F(DeskPlayerListing, IsWrittenAsJson)
+{
+    const ProgramResult list = RunDeskPlayer({SampleDisc, "--list", "--format", "json"});
+    EXPECT_EQ(list.status, 0);
+    EXPECT_EQ(list.output.rfind(R"({"part":"index","version":"0200",)", 0), 0u) << list.output;
+
+    const ProgramResult description =
+        RunDeskPlayer({SampleDisc, "--describe", "2", "--format", "json"});
+    EXPECT_EQ(description.status, 0);
+    EXPECT_EQ(description.output.rfind(R"({"part":"playList","number":2,)", 0), 0u)
+        << description.output;
+}
+
+TEST_F(DeskPlayerListing, IsNotWrittenAsATrace)
+{
+    ExpectUsageError({SampleDisc, "--list", "--format", "trace"},
+                     "--format trace: not for --list and --describe, expected text or json");
+}
+
 TEST_F(DeskPlayerListing, RefusesToDescribeAMissingPlayList)
 {
     const ProgramResult result = RunDeskPlayer({SampleDisc, "--describe", "7"});
