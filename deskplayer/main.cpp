@@ -15,6 +15,8 @@
 #include <utility>
 #include <vector>
 
+#include "check/check.h"
+#include "check/faultoutput.h"
 #include "disc/disc.h"
 #include "kevro_linux.h"
 #include "listing/description.h"
@@ -52,8 +54,9 @@ OutputOptions OutputOptionsOf(const Options& options)
     } catch (const std::invalid_argument& error) {
         throw UsageError(error.what());
     }
-    if ((options.list || options.describe) && output.format == OutputFormat::Trace) {
-        throw UsageError("--format trace: not for --list and --describe, expected text or json");
+    if ((options.list || options.describe || options.check) &&
+        output.format == OutputFormat::Trace) {
+        throw UsageError("--format trace: only for playing, expected text or json");
     }
     output.coloured =
         options.output.empty() && WantsColours(STDOUT_FILENO, std::getenv("NO_COLOR"));
@@ -85,11 +88,11 @@ void Play(LoadedPlayList playList, const std::vector<ScriptStep>& steps, const O
         return;
     }
 
-    Progress progress(desk.Clock(), options);
+    Progress progress(options);
     SessionHooks hooks;
     const auto start = std::chrono::steady_clock::now();
     hooks.beforeTimePasses = [&](Ticks time) {
-        progress.Update();
+        progress.Update([&desk] { return TimeText(desk.Clock().Now()); });
         if (options.realTime) {
             stream.flush();
             std::this_thread::sleep_until(
@@ -109,6 +112,23 @@ void Play(LoadedPlayList playList, const std::vector<ScriptStep>& steps, const O
 }
 
 /** @return the exit status */
+int Check(const Options& options, OutputFormat format, std::ostream& stream)
+{
+    const Disc disc(options.disc, BackupCopies::Ignore);
+    const auto write = format == OutputFormat::Json ? WriteFaultAsJson : WriteFault;
+    Progress progress(options);
+    const std::size_t faults = CheckDisc(
+        disc,
+        [&](const Fault& fault) {
+            progress.Clear();
+            write(stream, fault);
+            stream.flush();
+        },
+        [&progress](const std::string& file) { progress.Update([&file] { return file; }); });
+    return faults == 0 ? ExitOk : ExitDisc;
+}
+
+/** @return the exit status */
 int Run(const Options& options)
 {
     const OutputOptions outputOptions = OutputOptionsOf(options);
@@ -116,7 +136,9 @@ int Run(const Options& options)
     Target target(options.output);
     int status = ExitOk;
     const bool json = outputOptions.format == OutputFormat::Json;
-    if (options.list) {
+    if (options.check) {
+        status = Check(options, outputOptions.format, target.Open());
+    } else if (options.list) {
         const std::vector<std::uint32_t> numbers = disc.PlayListNumbers();
         const auto list = json ? ListPlayListsAsJson : ListPlayLists;
         status = list(target.Open(), disc, numbers, PrintMessage) == 0 ? ExitOk : ExitDisc;

@@ -26,18 +26,18 @@ Bytes ReadFile(const fs::path& path, std::uintmax_t largest)
     std::error_code error;
     const fs::file_status status = fs::status(path, error);
     if (status.type() == fs::file_type::not_found) {
-        throw MissingFileError(path.string(), error.message() + ", expected a file");
+        throw MissingFileError(path.string(), error.message(), "a file");
     }
     if (error) {
-        throw FileError(path.string(), error.message() + ", expected a file");
+        throw FileError(path.string(), error.message(), "a file");
     }
     if (!fs::is_regular_file(status)) {
-        throw FileError(path.string(), "expected a regular file");
+        throw FileError(path.string(), "", "a regular file");
     }
     const std::uintmax_t size = fs::file_size(path, error); // the maximum value on failure
     if (size > largest) {
-        throw FileError(path.string(), "has " + std::to_string(size) + " bytes, expected at most " +
-                                           std::to_string(largest));
+        throw FileError(path.string(), "has " + std::to_string(size) + " bytes",
+                        "at most " + std::to_string(largest));
     }
 
     Bytes bytes(static_cast<std::size_t>(size));
@@ -45,17 +45,17 @@ Bytes ReadFile(const fs::path& path, std::uintmax_t largest)
     std::ifstream stream(path, std::ios::binary);
     stream.read(reinterpret_cast<char*>(bytes.data()), static_cast<std::streamsize>(size));
     if (!stream) {
-        throw FileError(path.string(), "cannot be read: " + std::generic_category().message(errno) +
-                                           ", expected " + std::to_string(size) + " bytes");
+        throw FileError(path.string(), "cannot be read: " + std::generic_category().message(errno),
+                        std::to_string(size) + " bytes");
     }
     return bytes;
 }
 
 /** The number in the lower-case name of a play list file; nothing if the name is not one of a play
  * list. */
-std::optional<std::uint32_t> NumberOfPlayList(const std::string& fileName)
+std::optional<std::uint32_t> NumberInName(const std::string& fileName, const char* extension)
 {
-    if (fileName.size() != 10 || fileName.substr(5) != ".mpls" ||
+    if (fileName.size() != 10 || fileName.substr(5) != extension ||
         fileName.find_first_not_of("0123456789") != 5) {
         return std::nullopt;
     }
@@ -85,8 +85,9 @@ std::vector<std::uint32_t> Disc::PlayListNumbers() const
 {
     std::set<std::uint32_t> numbers;
     const auto addFrom = [&](const std::string& folder) {
-        for (const std::string& name : m_Folder.LowerCaseNamesIn(folder)) {
-            if (const auto number = NumberOfPlayList(name)) {
+        for (const std::string& name :
+             m_Folder.LowerCaseNamesIn(folder, "a folder of play lists")) {
+            if (const auto number = NumberInName(name, ".mpls")) {
                 numbers.insert(*number);
             }
         }
@@ -137,6 +138,17 @@ Value Disc::Read(const std::string& name, std::uintmax_t largest,
         }
         return std::move(*value);
     }
+}
+
+std::vector<std::string> Disc::ClipNames() const
+{
+    std::vector<std::string> clips;
+    for (const std::string& name : m_Folder.LowerCaseNamesIn("CLIPINF", "a folder of clips")) {
+        if (NumberInName(name, ".clpi")) {
+            clips.push_back(name.substr(0, 5));
+        }
+    }
+    return clips;
 }
 
 PlayList Disc::ReadPlayList(std::uint32_t number) const

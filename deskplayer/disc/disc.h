@@ -70,6 +70,9 @@ public:
     /** Numbers of the files PLAYLIST/nnnnn.mpls and of their copies, in ascending order. */
     std::vector<std::uint32_t> PlayListNumbers() const;
 
+    /** Names of the clips CLIPINF/nnnnn.clpi, in ascending order. Copies are not included. */
+    std::vector<std::string> ClipNames() const;
+
     PlayList ReadPlayList(std::uint32_t number) const;
 
     /** @param clip five digits, as in ClipReference::name */

@@ -77,7 +77,8 @@ std::string DiscFolder::DisplayNameOf(const fs::path& path) const
     return "BDMV/" + path.lexically_relative(m_Bdmv).string();
 }
 
-std::vector<std::string> DiscFolder::LowerCaseNamesIn(const std::string& name)
+std::vector<std::string> DiscFolder::LowerCaseNamesIn(const std::string& name,
+                                                      const std::string& expected)
 {
     const fs::path folder = PathOf(name);
     std::error_code error;
@@ -86,7 +87,7 @@ std::vector<std::string> DiscFolder::LowerCaseNamesIn(const std::string& name)
         names.push_back(entry.first);
     }
     if (error) {
-        throw FileError(folder.string(), error.message() + ", expected a folder of play lists");
+        throw FileError(folder.string(), error.message(), expected);
     }
     return names;
 }

@@ -44,9 +44,10 @@ public:
      * Names of the entries of a folder, with upper-case letters replaced by lower-case ones.
      *
      * @param name such as "PLAYLIST"
+     * @param expected for messages
      * @throw FileError the folder cannot be read
      */
-    std::vector<std::string> LowerCaseNamesIn(const std::string& name);
+    std::vector<std::string> LowerCaseNamesIn(const std::string& name, const std::string& expected);
 
 private:
     /** Actual names by their lower-case form. */

@@ -32,6 +32,18 @@ public:
      * @param problem what was found at @p path, and what was expected
      */
     FileError(const std::string& path, const std::string& problem);
+
+    /** The same, but what was found and what was expected can be told apart. */
+    FileError(const std::string& path, const std::string& found, const std::string& expected);
+
+    const std::string& Path() const { return m_Path; }
+    const std::string& Found() const { return m_Found; }
+    const std::string& Expected() const { return m_Expected; } ///< empty if part of Found()
+
+private:
+    std::string m_Path;
+    std::string m_Found;
+    std::string m_Expected;
 };
 
 /** A file does not exist. */

@@ -56,6 +56,11 @@ void AddOptions(CLI::App& app, Options& options)
             ->check(CLI::Range(0, 99999).description(""))
             ->type_name("N")
             ->excludes(list);
+    auto* const check =
+        app.add_flag("--check", options.check,
+                     "Print what is wrong with the disc: a line for each fault in its metadata")
+            ->excludes(list)
+            ->excludes(describe);
     auto* const session =
         app.add_option("--session", options.session,
                        "Session file to carry out; by default, play from start to end")
@@ -66,7 +71,7 @@ void AddOptions(CLI::App& app, Options& options)
                                       "Play in real time, with single keys as a remote control")
                              ->excludes(session);
     for (CLI::Option* const playing : {playList, session, realTime, remote}) {
-        playing->excludes(list)->excludes(describe);
+        playing->excludes(list)->excludes(describe)->excludes(check);
     }
 
     app.add_option("--format", options.format,
@@ -88,11 +93,12 @@ void AddOptions(CLI::App& app, Options& options)
         "\"at 00:01:30.500 chapter next\", \"after 2s pause\". --commands lists the commands.\n\n"
         "Examples:\n"
         "  bdmv-deskplayer --list disc\n"
+        "  bdmv-deskplayer --check disc\n"
         "  bdmv-deskplayer disc --session evening.session\n"
         "  bdmv-deskplayer disc --only PlayItem,ChapterNumber --format json\n"
         "  bdmv-deskplayer disc --remote\n\n"
         "Exit status: 0 success, 1 the output could not be written, 2 wrong usage or a session\n"
-        "that cannot be read, 3 the disc cannot be read.");
+        "that cannot be read, 3 the disc cannot be read or has faults.");
 }
 
 } // namespace deskplayer

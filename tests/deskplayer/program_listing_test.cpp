@@ -78,10 +78,35 @@ TEST_F(DeskPlayerListing, IsWrittenAsJson)
         << description.output;
 }
 
+TEST_F(DeskPlayerListing, ChecksADisc)
+{
+    const ProgramResult sound =
+        RunDeskPlayer({fs::path(BDMVNAVIGATOR_TEST_DISCS) / "titles", "--check"});
+    EXPECT_EQ(sound.status, 0);
+    EXPECT_EQ(sound.output, "");
+    EXPECT_EQ(sound.errors, "");
+
+    fs::create_directory(disc / "BDMV/BACKUP");
+    fs::copy(disc / "BDMV/index.bdmv", disc / "BDMV/BACKUP");
+    fs::resize_file(disc / "BDMV/index.bdmv", 0);
+    const ProgramResult text = RunDeskPlayer({disc, "--check"});
+    EXPECT_EQ(text.status, 3);
+    EXPECT_EQ(LinesOf(text.output).front(),
+              "BDMV/index.bdmv: offset 0: file has 0 bytes left, but expected 4 bytes for type "
+              "indicator");
+    EXPECT_EQ(text.errors, "");
+
+    const ProgramResult json = RunDeskPlayer({disc, "--check", "--format", "json"});
+    EXPECT_EQ(json.status, 3);
+    EXPECT_EQ(LinesOf(json.output).front(),
+              R"({"file":"BDMV/index.bdmv","offset":0,"found":"file has 0 bytes left",)"
+              R"("expected":"4 bytes for type indicator"})");
+}
+
 TEST_F(DeskPlayerListing, IsNotWrittenAsATrace)
 {
     ExpectUsageError({SampleDisc, "--list", "--format", "trace"},
-                     "--format trace: not for --list and --describe, expected text or json");
+                     "--format trace: only for playing, expected text or json");
 }
 
 TEST_F(DeskPlayerListing, RefusesToDescribeAMissingPlayList)
