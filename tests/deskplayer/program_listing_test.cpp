@@ -80,8 +80,7 @@ TEST_F(DeskPlayerListing, IsWrittenAsJson)
 
 TEST_F(DeskPlayerListing, ChecksADisc)
 {
-    const ProgramResult sound =
-        RunDeskPlayer({fs::path(BDMVNAVIGATOR_TEST_DISCS) / "titles", "--check"});
+    const ProgramResult sound = RunDeskPlayer({SampleDisc, "--check"});
     EXPECT_EQ(sound.status, 0);
     EXPECT_EQ(sound.output, "");
     EXPECT_EQ(sound.errors, "");
