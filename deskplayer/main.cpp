@@ -15,10 +15,13 @@
 #include <utility>
 #include <vector>
 
+#include "check/check.h"
+#include "check/faultoutput.h"
 #include "disc/disc.h"
 #include "kevro_linux.h"
 #include "listing/description.h"
 #include "listing/listing.h"
+#include "listing/listingjson.h"
 #include "navigator/desk.h"
 #include "output/outputformat.h"
 #include "output/textoutput.h"
@@ -54,9 +57,9 @@ OutputOptions OutputOptionsOf(const Options& options)
     } catch (const std::invalid_argument& error) {
         throw UsageError(error.what());
     }
-    if (output.format == OutputFormat::Trace && (options.list || options.describe)) {
-        throw UsageError(std::string(options.list ? "--list" : "--describe") +
-                         " excludes --format trace");
+    if ((options.list || options.describe || options.check) &&
+        output.format == OutputFormat::Trace) {
+        throw UsageError("--format trace: only for playing, expected text or json");
     }
     output.coloured = options.output.empty() &&
                       WantsColours(STDOUT_FILENO, std::getenv("NO_COLOR"), std::getenv("TERM"));
@@ -69,7 +72,7 @@ LoadedPlayList Load(const Disc& disc, const Options& options)
         return LoadPlayList(disc, *options.playList, disc.ReadPlayList(*options.playList));
     }
     LongestPlayList longest = disc.FindLongestPlayList();
-    for (const std::string& line : longest.unreadable) {
+    for (const std::string& line : longest.skipped) {
         PrintMessage("skipped: " + line);
     }
     return LoadPlayList(disc, longest.number, std::move(longest.playList));
@@ -90,11 +93,11 @@ int Play(LoadedPlayList playList, const std::vector<ScriptStep>& steps, const Op
         return ExitOk;
     }
 
-    Progress progress(desk.Clock(), options);
+    Progress progress(options);
     SessionHooks hooks;
     const auto start = std::chrono::steady_clock::now();
     hooks.beforeTimePasses = [&](Ticks time) {
-        progress.Update();
+        progress.Update([&desk] { return TimeText(desk.Clock().Now()); });
         if (options.realTime) {
             stream.flush();
             std::this_thread::sleep_until(
@@ -113,21 +116,48 @@ int Play(LoadedPlayList playList, const std::vector<ScriptStep>& steps, const Op
 }
 
 /** @return the exit status */
+int Check(const Options& options, OutputFormat format, std::ostream& stream)
+{
+    const Disc disc(options.disc, BackupCopies::Ignore);
+    const auto write = format == OutputFormat::Json ? WriteFaultAsJson : WriteFault;
+    Progress progress(options);
+    const std::size_t faults = CheckDisc(
+        disc,
+        [&](const Fault& fault) {
+            progress.Clear();
+            write(stream, fault);
+            stream.flush();
+        },
+        [&progress](const std::string& file) { progress.Update([&file] { return file; }); });
+    return faults == 0 ? ExitOk : ExitDisc;
+}
+
+/** @return the exit status */
 int Run(const Options& options)
 {
     const OutputOptions outputOptions = OutputOptionsOf(options);
-    const Disc disc(options.disc);
+    const Disc disc(options.disc, BackupCopies::Use, PrintMessage);
     Target target(options.output);
     int status = ExitOk;
-    if (options.list) {
+    const bool json = outputOptions.format == OutputFormat::Json;
+    if (options.check) {
+        status = Check(options, outputOptions.format, target.Open());
+    } else if (options.list) {
         const std::vector<std::uint32_t> numbers = disc.PlayListNumbers();
-        status = ListPlayLists(target.Open(), disc, numbers) == 0 ? ExitOk : ExitDisc;
+        const auto list = json ? ListPlayListsAsJson : ListPlayLists;
+        status = list(target.Open(), disc, numbers, PrintMessage) == 0 ? ExitOk : ExitDisc;
     } else if (options.describe) {
         const PlayList playList = disc.ReadPlayList(*options.describe);
-        DescribePlayList(target.Open(), disc, *options.describe, playList);
+        const auto describe = json ? DescribePlayListAsJson : DescribePlayList;
+        const std::size_t faults =
+            describe(target.Open(), disc, *options.describe, playList, PrintMessage);
+        status = faults == 0 ? ExitOk : ExitDisc;
     } else {
         LoadedPlayList playList = Load(disc, options);
         ReportPlaybackType(playList);
+        for (const std::string& note : playList.notes) {
+            PrintMessage(note);
+        }
         const std::vector<ScriptStep> steps =
             options.session.empty() ? std::vector<ScriptStep>() : ReadSessionFile(options.session);
         status = Play(std::move(playList), steps, options, outputOptions, target.Open());

@@ -5,6 +5,18 @@
 namespace deskplayer
 {
 
+namespace
+{
+
+void Report(const MessageHandler& handler, const std::string& message)
+{
+    if (handler) {
+        handler(message);
+    }
+}
+
+} // namespace
+
 AspectRatio AspectRatios::Find(const PlayList& playList, std::size_t playItem, const Stream& stream)
 {
     const std::optional<std::string> name = ClipOfStream(playList, playItem, stream);
@@ -13,7 +25,7 @@ AspectRatio AspectRatios::Find(const PlayList& playList, std::size_t playItem, c
     }
     const Clip& clip = Read(*name);
     if (!clip.problem.empty()) {
-        return {std::nullopt, clip.problem, clip.damaged};
+        return {std::nullopt, clip.problem};
     }
     const auto ratio = std::lower_bound(
         clip.ratios.begin(), clip.ratios.end(), stream.pid,
@@ -31,9 +43,12 @@ const AspectRatios::Clip& AspectRatios::Read(const std::string& name)
     if (isNew) {
         try {
             clip.ratios = AspectRatiosOf(m_rDisc.ReadClipInfo(name));
+        } catch (const MissingFileError& error) {
+            clip.problem = error.what();
+            Report(m_Handlers.onMissing, clip.problem);
         } catch (const DiscError& error) {
             clip.problem = error.what();
-            clip.damaged = m_rDisc.HasClipInfo(name);
+            Report(m_Handlers.onUnreadable, clip.problem);
         }
     }
     return clip;

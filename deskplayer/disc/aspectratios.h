@@ -21,8 +21,13 @@ namespace deskplayer
 /** The code of an aspect ratio, or the reason why it is unknown. */
 struct AspectRatio {
     std::optional<std::uint8_t> code;
-    std::string reason;   ///< one line; empty if the code is known
-    bool damaged = false; ///< clip information exists but cannot be read
+    std::string reason; ///< one line; empty if the code is known
+};
+
+/** Receive the reason, once for each clip, why its clip information is not used. */
+struct ClipInfoHandlers {
+    MessageHandler onMissing;    ///< there is no file
+    MessageHandler onUnreadable; ///< there is one, but it cannot be read or is damaged
 };
 
 /**
@@ -36,7 +41,10 @@ class AspectRatios
 {
 public:
     /** @param disc must outlive this object */
-    explicit AspectRatios(const Disc& disc) : m_rDisc(disc) {}
+    explicit AspectRatios(const Disc& disc, ClipInfoHandlers handlers = {})
+        : m_rDisc(disc), m_Handlers(std::move(handlers))
+    {
+    }
 
     /**
      * The aspect ratio of a video stream, from the clip that carries it.
@@ -49,12 +57,12 @@ private:
     struct Clip {
         std::vector<std::pair<std::uint16_t, std::uint8_t>> ratios; ///< see AspectRatiosOf()
         std::string problem; ///< empty if the clip could be read
-        bool damaged = false;
     };
 
     const Clip& Read(const std::string& name);
 
     const Disc& m_rDisc;
+    const ClipInfoHandlers m_Handlers;
     std::map<std::string, Clip> m_Clips;
 };
 

@@ -3,10 +3,13 @@
 #include <algorithm>
 #include <cerrno>
 #include <fstream>
+#include <set>
 #include <system_error>
 #include <utility>
 
 #include "disc/timeline.h"
+#include "text/printable.h"
+#include "text/timetext.h"
 
 namespace deskplayer
 {
@@ -16,37 +19,25 @@ namespace
 
 namespace fs = std::filesystem;
 
-bool IsFolder(const fs::path& path)
-{
-    std::error_code error;
-    return fs::is_directory(path, error);
-}
-
-fs::path FindBdmv(const fs::path& folder)
-{
-    if (IsFolder(folder / "BDMV")) {
-        return folder / "BDMV";
-    }
-    if (IsFolder(folder / "PLAYLIST")) {
-        return folder;
-    }
-    throw FileError(folder.string(), "not a disc, expected a BDMV folder or its parent");
-}
+const std::string BackupFolder = "BACKUP/";
 
 Bytes ReadFile(const fs::path& path, std::uintmax_t largest)
 {
     std::error_code error;
     const fs::file_status status = fs::status(path, error);
+    if (status.type() == fs::file_type::not_found) {
+        throw MissingFileError(path.string(), error.message(), "a file");
+    }
     if (error) {
-        throw FileError(path.string(), error.message() + ", expected a file");
+        throw FileError(path.string(), error.message(), "a file");
     }
     if (!fs::is_regular_file(status)) {
-        throw FileError(path.string(), "expected a regular file");
+        throw FileError(path.string(), "", "a regular file");
     }
     const std::uintmax_t size = fs::file_size(path, error); // the maximum value on failure
     if (size > largest) {
-        throw FileError(path.string(), "has " + std::to_string(size) + " bytes, expected at most " +
-                                           std::to_string(largest));
+        throw FileError(path.string(), "has " + std::to_string(size) + " bytes",
+                        "at most " + std::to_string(largest));
     }
 
     Bytes bytes(static_cast<std::size_t>(size));
@@ -54,16 +45,17 @@ Bytes ReadFile(const fs::path& path, std::uintmax_t largest)
     std::ifstream stream(path, std::ios::binary);
     stream.read(reinterpret_cast<char*>(bytes.data()), static_cast<std::streamsize>(size));
     if (!stream) {
-        throw FileError(path.string(), "cannot be read: " + std::generic_category().message(errno) +
-                                           ", expected " + std::to_string(size) + " bytes");
+        throw FileError(path.string(), "cannot be read: " + std::generic_category().message(errno),
+                        std::to_string(size) + " bytes");
     }
     return bytes;
 }
 
-/** The number in the name of a play list file; nothing if the name is not one of a play list. */
-std::optional<std::uint32_t> NumberOfPlayList(const std::string& fileName)
+/** The number in the lower-case name of a play list file; nothing if the name is not one of a play
+ * list. */
+std::optional<std::uint32_t> NumberInName(const std::string& fileName, const char* extension)
 {
-    if (fileName.size() != 10 || fileName.substr(5) != ".mpls" ||
+    if (fileName.size() != 10 || fileName.substr(5) != extension ||
         fileName.find_first_not_of("0123456789") != 5) {
         return std::nullopt;
     }
@@ -84,31 +76,79 @@ std::string ClipInfoFileName(const std::string& clip)
 
 } // namespace
 
-Disc::Disc(const fs::path& folder) : m_Bdmv(FindBdmv(folder)) {}
+Disc::Disc(const fs::path& folder, BackupCopies backupCopies, MessageHandler onBackupCopy)
+    : m_Folder(folder), m_BackupCopies(backupCopies), m_OnBackupCopy(std::move(onBackupCopy))
+{
+}
 
 std::vector<std::uint32_t> Disc::PlayListNumbers() const
 {
-    const fs::path folder = m_Bdmv / "PLAYLIST";
-    std::vector<std::uint32_t> numbers;
-    std::error_code error;
-    for (fs::directory_iterator entry(folder, error), end; !error && entry != end;
-         entry.increment(error)) {
-        if (const auto number = NumberOfPlayList(entry->path().filename().string())) {
-            numbers.push_back(*number);
+    std::set<std::uint32_t> numbers;
+    const auto addFrom = [&](const std::string& folder) {
+        for (const std::string& name :
+             m_Folder.LowerCaseNamesIn(folder, "a folder of play lists")) {
+            if (const auto number = NumberInName(name, ".mpls")) {
+                numbers.insert(*number);
+            }
+        }
+    };
+    if (m_BackupCopies == BackupCopies::Use) {
+        try {
+            addFrom(BackupFolder + "PLAYLIST");
+        } catch (const FileError&) {
+            // Most discs in a folder have no backup copies.
         }
     }
-    if (error) {
-        throw FileError(folder.string(), error.message() + ", expected a folder of play lists");
+    try {
+        addFrom("PLAYLIST");
+    } catch (const FileError&) {
+        if (numbers.empty()) {
+            throw;
+        }
     }
-    std::sort(numbers.begin(), numbers.end());
-    return numbers;
+    return std::vector<std::uint32_t>(numbers.begin(), numbers.end());
 }
 
 template <typename Value>
 Value Disc::Read(const std::string& name, std::uintmax_t largest,
                  Value (*parse)(const Bytes&, const std::string&)) const
 {
-    return parse(ReadFile(m_Bdmv / name, largest), "BDMV/" + name);
+    const auto read = [&](const fs::path& path) {
+        return parse(ReadFile(path, largest), m_Folder.DisplayNameOf(path));
+    };
+    try {
+        return read(m_Folder.PathOf(name));
+    } catch (const DiscError& error) {
+        if (m_BackupCopies == BackupCopies::Ignore) {
+            throw;
+        }
+        const fs::path copy = m_Folder.PathOf(BackupFolder + name);
+        std::optional<Value> value;
+        try {
+            value = read(copy);
+        } catch (const DiscError&) {
+            // The message about the file itself is the one that helps.
+        }
+        if (!value) {
+            throw;
+        }
+        if (m_OnBackupCopy && m_Reported.insert(name).second) {
+            m_OnBackupCopy(std::string(error.what()) + "; using the copy " +
+                           Printable(m_Folder.DisplayNameOf(copy)));
+        }
+        return std::move(*value);
+    }
+}
+
+std::vector<std::string> Disc::ClipNames() const
+{
+    std::vector<std::string> clips;
+    for (const std::string& name : m_Folder.LowerCaseNamesIn("CLIPINF", "a folder of clips")) {
+        if (NumberInName(name, ".clpi")) {
+            clips.push_back(name.substr(0, 5));
+        }
+    }
+    return clips;
 }
 
 PlayList Disc::ReadPlayList(std::uint32_t number) const
@@ -119,12 +159,6 @@ PlayList Disc::ReadPlayList(std::uint32_t number) const
 ClipInfo Disc::ReadClipInfo(const std::string& clip) const
 {
     return Read(ClipInfoFileName(clip), LargestFile, ParseClipInfo);
-}
-
-bool Disc::HasClipInfo(const std::string& clip) const
-{
-    std::error_code error;
-    return fs::exists(m_Bdmv / ClipInfoFileName(clip), error);
 }
 
 Index Disc::ReadIndex() const
@@ -141,25 +175,29 @@ LongestPlayList Disc::FindLongestPlayList() const
 {
     std::optional<std::uint32_t> longest;
     Ticks greatestDuration(0);
-    std::vector<std::string> unreadable;
+    std::vector<std::string> skipped;
     for (const std::uint32_t number : PlayListNumbers()) {
         try {
             const Ticks duration = BuildTimeLine(ReadPlayList(number)).duration;
-            if (!longest || duration > greatestDuration) {
+            if (duration > LongestDuration) {
+                skipped.push_back("BDMV/" + PlayListFileName(number) + ": lasts " +
+                                  TimeText(duration) + ", expected at most " +
+                                  TimeText(LongestDuration));
+            } else if (!longest || duration > greatestDuration) {
                 longest = number;
                 greatestDuration = duration;
             }
         } catch (const DiscError& error) {
-            unreadable.emplace_back(error.what());
+            skipped.emplace_back(error.what());
         }
     }
     if (!longest) {
-        throw FileError((m_Bdmv / "PLAYLIST").string(),
-                        unreadable.empty() ? "no play list, expected files such as 00000.mpls"
-                                           : "no play list can be read: " + unreadable.front());
+        throw FileError(m_Folder.PathOf("PLAYLIST").string(),
+                        skipped.empty() ? "no play list, expected files such as 00000.mpls"
+                                        : "no play list can be played: " + skipped.front());
     }
     // Read again rather than kept: keeping it would double the peak memory.
-    return {*longest, ReadPlayList(*longest), std::move(unreadable)};
+    return {*longest, ReadPlayList(*longest), std::move(skipped)};
 }
 
 } // namespace deskplayer

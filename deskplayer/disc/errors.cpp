@@ -6,7 +6,14 @@ namespace deskplayer
 {
 
 FileError::FileError(const std::string& path, const std::string& problem)
-    : DiscError(Printable(path) + ": " + problem)
+    : DiscError(Printable(path) + ": " + problem), m_Path(path), m_Found(problem)
+{
+}
+
+FileError::FileError(const std::string& path, const std::string& found, const std::string& expected)
+    : DiscError(Printable(path) + ": " + found + (found.empty() ? "" : ", ") + "expected " +
+                expected),
+      m_Path(path), m_Found(found), m_Expected(expected)
 {
 }
 

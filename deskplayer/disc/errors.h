@@ -6,6 +6,7 @@
 #define DESKPLAYER_DISC_ERRORS_H
 
 #include <cstddef>
+#include <functional>
 #include <stdexcept>
 #include <string>
 
@@ -19,6 +20,9 @@ public:
     using std::runtime_error::runtime_error;
 };
 
+/** Receives a message of one line. */
+using MessageHandler = std::function<void(const std::string& message)>;
+
 /** A file or folder is missing or cannot be read. */
 class FileError : public DiscError
 {
@@ -28,6 +32,25 @@ public:
      * @param problem what was found at @p path, and what was expected
      */
     FileError(const std::string& path, const std::string& problem);
+
+    /** The same, but what was found and what was expected can be told apart. */
+    FileError(const std::string& path, const std::string& found, const std::string& expected);
+
+    const std::string& Path() const { return m_Path; }
+    const std::string& Found() const { return m_Found; }
+    const std::string& Expected() const { return m_Expected; } ///< empty if part of Found()
+
+private:
+    std::string m_Path;
+    std::string m_Found;
+    std::string m_Expected;
+};
+
+/** A file does not exist. */
+class MissingFileError : public FileError
+{
+public:
+    using FileError::FileError;
 };
 
 /** The contents of a file violate the format or contradict each other. */

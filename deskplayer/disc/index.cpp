@@ -13,6 +13,7 @@ constexpr std::size_t IndexObjectSize = 12;
 IndexObject ReadIndexObject(ByteReader& reader)
 {
     IndexObject object;
+    object.offset = static_cast<std::uint32_t>(reader.Offset());
     const std::uint8_t types = reader.UInt8("object type");
     object.objectType = types >> 6;
     object.accessType = types >> 4 & 3;

@@ -24,6 +24,7 @@ struct IndexObject {
     std::uint8_t playbackType = 0; ///< 0 movie, 1 interactive; 2 and 3 the same for Java objects
     std::uint16_t movieObject = 0; ///< number of the movie object, if it is one
     std::string javaObject;        ///< five-character name, if it is a Java object
+    std::uint32_t offset = 0;      ///< from the start of the file
 };
 
 struct Index {

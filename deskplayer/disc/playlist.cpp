@@ -20,6 +20,12 @@ constexpr std::size_t SmallestSubPlayItem = 30;
 constexpr std::size_t MarkSize = 14;
 constexpr std::size_t ExtensionEntrySize = 12;
 
+/** Files are far smaller than what 32 bits can address. */
+std::uint32_t OffsetOf(const ByteReader& reader)
+{
+    return static_cast<std::uint32_t>(reader.Offset());
+}
+
 std::string ReadClipName(ByteReader& reader)
 {
     const std::size_t offset = reader.Offset();
@@ -35,6 +41,7 @@ std::string ReadClipName(ByteReader& reader)
 ClipReference ReadClipReference(ByteReader& reader)
 {
     ClipReference reference;
+    reference.offset = OffsetOf(reader);
     reference.name = ReadClipName(reader);
     reference.codec = reader.Text(4, "codec");
     reference.stcSequence = reader.UInt8("STC sequence");
@@ -64,6 +71,7 @@ std::uint32_t ReadOutTime(ByteReader& reader, std::uint32_t inTime)
 
 void ReadStreamEntry(ByteReader entry, Stream& stream)
 {
+    stream.offset = OffsetOf(entry);
     stream.entryType = entry.UInt8("entry type");
     switch (stream.entryType) {
     case EntryTypePlayItem:
@@ -173,6 +181,7 @@ StreamTable ReadStreamTable(ByteReader table, bool hasEnhancementVideo)
 PlayItem ReadPlayItem(ByteReader body, bool hasEnhancementVideo)
 {
     PlayItem item;
+    item.clip.offset = OffsetOf(body);
     item.clip.name = ReadClipName(body);
     item.clip.codec = body.Text(4, "codec");
     const std::uint16_t angleAndConnection = body.UInt16("connection condition");
@@ -202,6 +211,7 @@ PlayItem ReadPlayItem(ByteReader body, bool hasEnhancementVideo)
 SubPlayItem ReadSubPlayItem(ByteReader body)
 {
     SubPlayItem item;
+    item.clip.offset = OffsetOf(body);
     item.clip.name = ReadClipName(body);
     item.clip.codec = body.Text(4, "codec");
     const std::uint32_t connectionAndClips = body.UInt32("connection condition");
@@ -273,6 +283,7 @@ std::vector<Mark> ReadMarks(ByteReader section)
     }
     std::vector<Mark> marks(section.Count16(MarkSize, "number of marks"));
     for (Mark& mark : marks) {
+        mark.offset = OffsetOf(section);
         section.Skip(1, "padding");
         mark.type = section.UInt8("mark type");
         mark.playItem = section.UInt16("play item of the mark");

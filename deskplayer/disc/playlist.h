@@ -39,6 +39,7 @@ struct ClipReference {
     std::string name;  ///< five digits: CLIPINF/nnnnn.clpi, STREAM/nnnnn.m2ts
     std::string codec; ///< "M2TS", rarely "FMTS"
     std::uint8_t stcSequence = 0;
+    std::uint32_t offset = 0; ///< of the name, from the start of the file
 };
 
 constexpr std::uint8_t EntryTypePlayItem = 1;         ///< in the clip of the play item
@@ -52,6 +53,7 @@ struct Stream {
     std::uint16_t pid = 0;    ///< 0 if the entry type is reserved
     std::uint8_t subPath = 0; ///< entry types 2 to 4: number of the sub path, from 0
     std::uint8_t subClip = 0; ///< entry type 2: number of the clip in the sub play item, from 0
+    std::uint32_t offset = 0; ///< of the entry type, from the start of the file
     StreamAttributes attributes;
     std::vector<std::uint8_t> primaryAudioReferences;   ///< of secondary audio; from 0
     std::vector<std::uint8_t> secondaryAudioReferences; ///< of secondary video; from 0
@@ -122,6 +124,7 @@ struct Mark {
     std::uint32_t time = 0;     ///< on the clip of that play item, not always between IN and OUT
     std::uint16_t pid = 0;      ///< PID of its stream, or MarkForAllStreams
     std::uint32_t duration = 0;
+    std::uint32_t offset = 0; ///< from the start of the file
 };
 
 /** A block of the extension data. Its bytes are not read, so it may lie outside the file. */

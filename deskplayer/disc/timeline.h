@@ -5,6 +5,7 @@
 #ifndef DESKPLAYER_DISC_TIMELINE_H
 #define DESKPLAYER_DISC_TIMELINE_H
 
+#include <chrono>
 #include <cstddef>
 #include <optional>
 #include <vector>
@@ -43,6 +44,9 @@ struct TimeLine {
      */
     std::vector<Chapter> chapters;
 };
+
+/** The longest play list that is played. No disc has one as long. */
+constexpr Ticks LongestDuration = std::chrono::hours(100);
 
 /** Lays out @p playList. Takes time proportional to the number of play items and marks. */
 TimeLine BuildTimeLine(const PlayList& playList);

@@ -10,7 +10,8 @@
 #include "disc/aspectratios.h"
 #include "disc/codes.h"
 #include "disc/timeline.h"
-#include "text/codes.h"
+#include "listing/codenames.h"
+#include "listing/faults.h"
 #include "text/names.h"
 #include "text/printable.h"
 #include "text/timetext.h"
@@ -29,42 +30,6 @@ struct Field {
 };
 
 using Fields = std::vector<Field>;
-
-const CodeName g_PlaybackTypes[] = {
-    {PlaybackTypeInSequence, "in sequence"},
-    {PlaybackTypeRandom, "random; played in sequence"},
-    {PlaybackTypeShuffle, "shuffle; played in sequence"},
-};
-
-const CodeName g_ConnectionConditions[] = {
-    {1, "not seamless"},
-    {5, "seamless"},
-    {6, "seamless, on the same time line"},
-};
-
-const CodeName g_StillModes[] = {
-    {StillModeNone, "none"},
-    {StillModeTimed, "timed"},
-    {StillModeEndless, "endless"},
-};
-
-const CodeName g_EntryTypes[] = {
-    {EntryTypePlayItem, "play item"},
-    {EntryTypeSubPath, "sub path"},
-    {EntryTypePlayItemSubPath3, "play item, for a sub path"},
-    {EntryTypePlayItemSubPath4, "play item, for a sub path"},
-};
-
-const CodeName g_MarkTypes[] = {
-    {MarkTypeEntry, "entry"},
-    {MarkTypeLink, "link"},
-};
-
-template <typename Table> std::string NameIn(const Table& table, std::uint8_t code)
-{
-    const CodeName* const entry = FindCode(table, code);
-    return entry == nullptr ? "reserved" : entry->name;
-}
 
 std::string Hex(std::uint64_t value, int digits)
 {
@@ -104,8 +69,7 @@ Field Time(const char* name, std::uint32_t ticks)
 /** @param meaning may repeat the code, as codes.h does for reserved ones */
 Field Code(const char* name, std::uint8_t code, const std::string& meaning)
 {
-    const bool reserved = meaning.rfind("reserved", 0) == 0;
-    return {name, std::to_string(code), reserved ? "reserved" : meaning};
+    return {name, std::to_string(code), WithoutCode(meaning)};
 }
 
 Field Language(const std::string& language)
@@ -145,7 +109,7 @@ Fields ClipFields(const ClipReference& clip)
 
 Field ConnectionCondition(std::uint8_t code)
 {
-    return Code("connection condition", code, NameIn(g_ConnectionConditions, code));
+    return Code("connection condition", code, ConnectionConditionName(code));
 }
 
 Fields VideoFields(const StreamAttributes& attributes, const AspectRatio& aspectRatio)
@@ -194,9 +158,9 @@ class Description
 {
 public:
     Description(std::ostream& output, const Disc& disc, std::uint32_t number,
-                const PlayList& playList)
-        : m_rOutput(output), m_AspectRatios(disc), m_Number(number), m_rPlayList(playList),
-          m_TimeLine(BuildTimeLine(playList))
+                const PlayList& playList, Faults& faults)
+        : m_rOutput(output), m_AspectRatios(disc, faults.OfClips()), m_Number(number),
+          m_rPlayList(playList), m_TimeLine(BuildTimeLine(playList))
     {
     }
 
@@ -246,7 +210,7 @@ private:
         const ApplicationInfo& info = m_rPlayList.applicationInfo;
         Line(0, "play list " + Digits(m_Number),
              {{"version", m_rPlayList.version},
-              Code("playback type", info.playbackType, NameIn(g_PlaybackTypes, info.playbackType)),
+              Code("playback type", info.playbackType, PlaybackTypeName(info.playbackType)),
               Number("playback count", info.playbackCount),
               Time("duration", m_TimeLine.duration)});
         Line(1, "flags",
@@ -268,7 +232,7 @@ private:
               Time("start", m_TimeLine.itemStarts[number]),
               Time("duration", item.outTime - item.inTime)});
         Line(2, "still",
-             {Code("mode", item.stillMode, NameIn(g_StillModes, item.stillMode)),
+             {Code("mode", item.stillMode, StillModeName(item.stillMode)),
               Number("seconds", item.stillTime)});
         Line(2, "flags", {YesNo("random access flag", item.randomAccessFlag)});
         Line(2, "user operations", {UOMask(item.uoMask)});
@@ -319,7 +283,7 @@ private:
     Fields StreamFields(std::size_t playItem, const Stream& stream)
     {
         Fields fields = {
-            Code("entry type", stream.entryType, NameIn(g_EntryTypes, stream.entryType)),
+            Code("entry type", stream.entryType, EntryTypeName(stream.entryType)),
             {"PID", "0x" + Hex(stream.pid, 4)},
         };
         if (stream.entryType == EntryTypeSubPath || stream.entryType == EntryTypePlayItemSubPath3 ||
@@ -368,7 +332,7 @@ private:
         const Mark& mark = m_rPlayList.marks[number];
         const std::optional<Ticks> position = m_TimeLine.markPositions[number];
         Line(1, "mark " + std::to_string(number),
-             {Code("type", mark.type, NameIn(g_MarkTypes, mark.type)),
+             {Code("type", mark.type, MarkTypeName(mark.type)),
               Number("play item", mark.playItem),
               Time("time", mark.time),
               {"PID", "0x" + Hex(mark.pid, 4), mark.pid == MarkForAllStreams ? "all streams" : ""},
@@ -386,10 +350,12 @@ private:
 
 } // namespace
 
-void DescribePlayList(std::ostream& output, const Disc& disc, std::uint32_t number,
-                      const PlayList& playList)
+std::size_t DescribePlayList(std::ostream& output, const Disc& disc, std::uint32_t number,
+                             const PlayList& playList, const MessageHandler& onFault)
 {
-    Description(output, disc, number, playList).Write();
+    Faults faults(onFault);
+    Description(output, disc, number, playList, faults).Write();
+    return faults.Count();
 }
 
 } // namespace deskplayer

@@ -15,6 +15,7 @@
 #ifndef DESKPLAYER_LISTING_DESCRIPTION_H
 #define DESKPLAYER_LISTING_DESCRIPTION_H
 
+#include <cstddef>
 #include <cstdint>
 #include <ostream>
 
@@ -30,9 +31,11 @@ namespace deskplayer
  * If clip information cannot be read, the reason is printed in place of the aspect ratio.
  *
  * @param playList the one with this @p number, read from @p disc
+ * @param onFault receives a line for each clip information that is missing or cannot be read
+ * @return the number of faults
  */
-void DescribePlayList(std::ostream& output, const Disc& disc, std::uint32_t number,
-                      const PlayList& playList);
+std::size_t DescribePlayList(std::ostream& output, const Disc& disc, std::uint32_t number,
+                             const PlayList& playList, const MessageHandler& onFault = {});
 
 } // namespace deskplayer
 

@@ -11,6 +11,8 @@
 #include "disc/aspectratios.h"
 #include "disc/codes.h"
 #include "disc/timeline.h"
+#include "listing/faults.h"
+#include "listing/summary.h"
 #include "text/printable.h"
 #include "text/timetext.h"
 
@@ -20,13 +22,7 @@ namespace deskplayer
 namespace
 {
 
-using Lines = std::vector<std::string>;
-
-/** Describes the aspect ratio of a video stream. */
-using AspectText = std::function<std::string(const Stream&)>;
-
 constexpr std::size_t WidthOfFirstColumns = 47; ///< all columns but the streams
-constexpr std::size_t WidthOfStreams = 53;
 
 std::string ObjectText(const IndexObject& object)
 {
@@ -83,13 +79,14 @@ std::string IndexText(const Index& index)
     return text + ", " + std::to_string(titles) + (titles == 1 ? " title" : " titles");
 }
 
-void ListTitles(std::ostream& output, const Disc& disc)
+void ListTitles(std::ostream& output, const Disc& disc, Faults& faults)
 {
     Index index;
     try {
         index = disc.ReadIndex();
     } catch (const DiscError& error) {
         output << "Index           " << error.what() << '\n';
+        faults.Add(error.what());
         return;
     }
     output << "Index           " << IndexText(index) << '\n'
@@ -102,81 +99,6 @@ void ListTitles(std::ostream& output, const Disc& disc)
         output << label << "  " << ObjectText(title) << ", " << AccessText(title.accessType)
                << '\n';
     }
-}
-
-std::string StreamText(const StreamAttributes& attributes)
-{
-    const std::string coding = CodingTypeName(attributes.codingType);
-    switch (KindOfStream(attributes.codingType)) {
-    case StreamKindVideo: {
-        const std::string text = coding + ", " + VideoFormatName(attributes.videoFormat) + ", " +
-                                 FrameRateName(attributes.frameRate);
-        return attributes.codingType == CodingTypeH265
-                   ? text + ", " + DynamicRangeName(attributes.dynamicRange) + " dynamic range"
-                   : text;
-    }
-    case StreamKindAudio:
-        return LanguageName(attributes.language) + ": " + coding + ", " +
-               AudioPresentationName(attributes.audioPresentation) + ", " +
-               SampleRateName(attributes.sampleRate);
-    case StreamKindGraphics:
-    case StreamKindTextSubtitle:
-        return LanguageName(attributes.language);
-    default:
-        return coding;
-    }
-}
-
-/** Adds one line per stream. */
-void AddStreams(Lines& lines, const std::string& label, const std::vector<Stream>& streams,
-                const AspectText& aspectText)
-{
-    for (const Stream& stream : streams) {
-        const bool video = KindOfStream(stream.attributes.codingType) == StreamKindVideo;
-        lines.push_back(label + StreamText(stream.attributes) + (video ? aspectText(stream) : ""));
-    }
-}
-
-/** Adds the languages of streams, as many as fit on each line. */
-void AddLanguages(Lines& lines, const std::string& label, const std::vector<Stream>& streams)
-{
-    std::string line = label;
-    for (std::size_t number = 0; number < streams.size(); ++number) {
-        const bool last = number + 1 == streams.size();
-        const std::string word = StreamText(streams[number].attributes) + (last ? "" : ",");
-        if (number > 0 && line.size() + 1 + word.size() > WidthOfStreams) {
-            lines.push_back(line);
-            line.assign(label.size() - 1, ' ');
-        }
-        line += (number > 0 ? " " : "") + word;
-    }
-    if (!streams.empty()) {
-        lines.push_back(line);
-    }
-}
-
-Lines StreamLines(const StreamTable& streams, const AspectText& aspectText)
-{
-    Lines lines;
-    AddStreams(lines, "video: ", streams.primaryVideo, aspectText);
-    AddStreams(lines, "enhancement video: ", streams.enhancementVideo, aspectText);
-    AddStreams(lines, "audio: ", streams.primaryAudio, aspectText);
-    AddLanguages(lines, "subtitles: ", streams.pg);
-    AddLanguages(lines, "menus: ", streams.ig);
-    AddStreams(lines, "secondary video: ", streams.secondaryVideo, aspectText);
-    AddStreams(lines, "secondary audio: ", streams.secondaryAudio, aspectText);
-    AddLanguages(lines, "picture-in-picture subtitles: ", streams.pipPg);
-    return lines;
-}
-
-std::size_t LongestItem(const PlayList& playList)
-{
-    const auto shorter = [](const PlayItem& left, const PlayItem& right) {
-        return left.outTime - left.inTime < right.outTime - right.inTime;
-    };
-    const auto& items = playList.playItems;
-    const auto longest = std::max_element(items.begin(), items.end(), shorter);
-    return static_cast<std::size_t>(longest - items.begin());
 }
 
 /** The streams of the longest play item, and the number of play items with other streams. */
@@ -192,26 +114,12 @@ Lines StreamLines(const PlayList& playList, AspectRatios& aspectRatios)
         return code ? ", " + AspectRatioName(*code) : ", aspect ratio unknown";
     });
 
-    // Aspect ratios are ignored: comparing them would require reading the clips of all play items.
-    const AspectText nothing = [](const Stream&) { return ""; };
-    const Lines common = StreamLines(shown, nothing);
-    const auto others = std::count_if(
-        playList.playItems.begin(), playList.playItems.end(),
-        [&](const PlayItem& item) { return StreamLines(item.streams, nothing) != common; });
+    const std::size_t others = ItemsWithOtherStreams(playList, longest);
     if (others > 0) {
         lines.push_back("other streams in " + std::to_string(others) + " of " +
                         std::to_string(playList.playItems.size()) + " play items");
     }
     return lines;
-}
-
-std::size_t MostAngles(const PlayList& playList)
-{
-    std::size_t most = 0;
-    for (const PlayItem& item : playList.playItems) {
-        most = std::max(most, NumberOfAngles(item));
-    }
-    return most;
 }
 
 void ListPlayList(std::ostream& output, const PlayList& playList, AspectRatios& aspectRatios)
@@ -233,18 +141,18 @@ void ListPlayList(std::ostream& output, const PlayList& playList, AspectRatios& 
 } // namespace
 
 std::size_t ListPlayLists(std::ostream& output, const Disc& disc,
-                          const std::vector<std::uint32_t>& numbers)
+                          const std::vector<std::uint32_t>& numbers, const MessageHandler& onFault)
 {
-    ListTitles(output, disc);
+    Faults faults(onFault);
+    ListTitles(output, disc, faults);
     output << '\n';
     if (numbers.empty()) {
         output << "There are no play lists.\n";
-        return 0;
+        return faults.Count();
     }
 
     output << "Number  Duration      Items  Chapters  Angles  Streams\n";
-    AspectRatios aspectRatios(disc);
-    std::size_t unreadable = 0;
+    AspectRatios aspectRatios(disc, faults.OfClips());
     for (const std::uint32_t number : numbers) {
         char label[16];
         std::snprintf(label, sizeof label, "%05" PRIu32 "   ", number);
@@ -253,10 +161,10 @@ std::size_t ListPlayLists(std::ostream& output, const Disc& disc,
             ListPlayList(output, disc.ReadPlayList(number), aspectRatios);
         } catch (const DiscError& error) {
             output << error.what() << '\n';
-            ++unreadable;
+            faults.Add(error.what());
         }
     }
-    return unreadable;
+    return faults.Count();
 }
 
 } // namespace deskplayer

@@ -34,10 +34,13 @@ namespace deskplayer
  * the reason.
  *
  * @param numbers of the play lists, as returned by Disc::PlayListNumbers()
- * @return the number of play lists that cannot be read
+ * @param onFault receives a line for each file that is missing or cannot be read: the index, a play
+ *        list, or clip information with the aspect ratio of a stream in the table
+ * @return the number of faults
  */
 std::size_t ListPlayLists(std::ostream& output, const Disc& disc,
-                          const std::vector<std::uint32_t>& numbers);
+                          const std::vector<std::uint32_t>& numbers,
+                          const MessageHandler& onFault = {});
 
 } // namespace deskplayer
 

@@ -39,15 +39,15 @@ LoadedPlayList LoadPlayList(const Disc& disc, std::uint32_t number, PlayList pla
                         "lasts " + TimeText(loaded.timeLine.duration) + ", expected at most " +
                             TimeText(LongestDuration));
     }
-    AspectRatios aspectRatios(disc);
+    AspectRatios aspectRatios(disc,
+                              {{}, [&loaded](const std::string& reason) {
+                                   loaded.notes.push_back("aspect ratio not known: " + reason);
+                               }});
     for (std::size_t item = 0; item < loaded.playList.playItems.size(); ++item) {
         const std::vector<Stream>& videos = loaded.playList.playItems[item].streams.primaryVideo;
         if (!videos.empty()) {
-            const AspectRatio ratio = aspectRatios.Find(loaded.playList, item, videos.front());
-            if (ratio.damaged) {
-                throw DiscError(ratio.reason);
-            }
-            loaded.aspectRatios[item] = ratio.code;
+            loaded.aspectRatios[item] =
+                aspectRatios.Find(loaded.playList, item, videos.front()).code;
         }
     }
     return loaded;

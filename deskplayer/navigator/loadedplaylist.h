@@ -8,6 +8,7 @@
 #include <cstddef>
 #include <cstdint>
 #include <optional>
+#include <string>
 #include <utility>
 #include <vector>
 
@@ -18,9 +19,6 @@
 
 namespace deskplayer
 {
-
-/** Maximum duration of a play list that is played; no real disc reaches it. */
-constexpr Ticks LongestDuration = std::chrono::hours(100);
 
 /** A play list, its time line, and the aspect ratios from its clips. */
 struct LoadedPlayList {
@@ -36,16 +34,19 @@ struct LoadedPlayList {
 
     /** The aspect ratio code of the first primary video stream of every play item. */
     std::vector<std::optional<std::uint8_t>> aspectRatios;
+
+    /** One line for each clip whose information exists but cannot be read. */
+    std::vector<std::string> notes;
 };
 
 /** Adds the time line to a play list. */
 LoadedPlayList LayOut(std::uint32_t number, PlayList playList);
 
 /**
- * Adds time line and aspect ratios to a play list that was read from @p disc.
+ * Adds time line and aspect ratios to a play list that was read from @p disc. Clip information that
+ * is missing or cannot be read does not stop playback: the aspect ratio is then unknown.
  *
- * @throw DiscError clip information exists but cannot be read, or the play list is longer than
- * LongestDuration
+ * @throw FileError the play list is longer than LongestDuration
  */
 LoadedPlayList LoadPlayList(const Disc& disc, std::uint32_t number, PlayList playList);
 

@@ -70,6 +70,11 @@ void AddOptions(CLI::App& app, Options& options)
             ->check(CLI::Range(0, 99999).description(""))
             ->type_name("N")
             ->excludes(list);
+    auto* const check =
+        app.add_flag("--check", options.check,
+                     "Print what is wrong with the disc: a line for each fault in its metadata")
+            ->excludes(list)
+            ->excludes(describe);
     auto* const session = app.add_option("--session", options.session,
                                          "Session file to run; by default, play from start to end")
                               ->check(NotEmpty("the name of a file"))
@@ -105,7 +110,7 @@ void AddOptions(CLI::App& app, Options& options)
             ->type_name("TEXT");
     for (CLI::Option* const playing :
          {playList, session, strict, realTime, remote, listen, only, log}) {
-        playing->excludes(list)->excludes(describe);
+        playing->excludes(list)->excludes(describe)->excludes(check);
     }
 
     app.footer(
@@ -113,12 +118,13 @@ void AddOptions(CLI::App& app, Options& options)
         "\"at 00:01:30.500 chapter next\", \"after 2s pause\". --commands lists the commands.\n\n"
         "Examples:\n"
         "  bdmv-deskplayer --list disc\n"
+        "  bdmv-deskplayer --check disc\n"
         "  bdmv-deskplayer disc --session evening.session\n"
         "  bdmv-deskplayer disc --only PlayItem,ChapterNumber --format json\n"
         "  bdmv-deskplayer disc --remote\n\n"
         "Exit status: 0 success, 1 the output could not be written, 2 incorrect usage or a\n"
-        "session that cannot be read, 3 the disc cannot be read, 4 the session failed: an\n"
-        "expectation was not met or, with --strict, a command was refused.");
+        "session that cannot be read, 3 the disc cannot be read or has faults, 4 the session\n"
+        "failed: an expectation was not met or, with --strict, a command was refused.");
 }
 
 } // namespace deskplayer

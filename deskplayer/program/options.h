@@ -19,6 +19,7 @@ struct Options {
     std::string disc;
     std::optional<std::uint32_t> playList;
     bool list = false;
+    bool check = false;
     std::optional<std::uint32_t> describe;
     std::string session;
     bool strict = false;

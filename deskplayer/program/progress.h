@@ -1,6 +1,6 @@
 /**
  * @file
- * Progress of a long session.
+ * Progress of a long operation.
  */
 #ifndef DESKPLAYER_PROGRAM_PROGRESS_H
 #define DESKPLAYER_PROGRAM_PROGRESS_H
@@ -12,50 +12,55 @@
 #include <iostream>
 #include <string>
 
-#include "navigator/virtualclock.h"
 #include "program/options.h"
-#include "text/timetext.h"
 
 namespace deskplayer
 {
 
-/** Shows the time of the session on a terminal once playback takes more than a second. */
+/** Shows a line on a terminal once the operation takes more than a second. */
 class Progress
 {
 public:
-    /** @param options if they send output to the same terminal, progress is not shown */
-    Progress(const VirtualClock& clock, const Options& options)
-        : m_rClock(clock), m_Possible(isatty(STDERR_FILENO) != 0 &&
-                                      (isatty(STDOUT_FILENO) == 0 || !options.output.empty()))
+    /**
+     * @param options if they send the output of playback to the same terminal, progress is not
+     *        shown; a check clears it before it writes
+     */
+    explicit Progress(const Options& options)
+        : m_Possible(isatty(STDERR_FILENO) != 0 &&
+                     (options.check || isatty(STDOUT_FILENO) == 0 || !options.output.empty()))
     {
     }
 
-    ~Progress()
-    {
-        if (m_Shown) {
-            std::cerr << '\r' << std::string(Width, ' ') << '\r';
-        }
-    }
+    ~Progress() { Clear(); }
 
     Progress(const Progress&) = delete;
     Progress& operator=(const Progress&) = delete;
 
-    void Update()
+    /** @param text returns the line; called only if it is shown, at most five times a second */
+    template <typename Text> void Update(const Text& text)
     {
         const auto now = std::chrono::steady_clock::now();
         if (m_Possible && now >= m_Next) {
             m_Next = now + std::chrono::milliseconds(200);
-            m_Shown = true;
-            std::cerr << "\r" << TimeText(m_rClock.Now()) << std::flush;
+            Clear();
+            const std::string line = text();
+            std::cerr << line << std::flush;
+            m_Width = line.size();
+        }
+    }
+
+    /** Removes the line, so that another one can be written. */
+    void Clear()
+    {
+        if (m_Width > 0) {
+            std::cerr << '\r' << std::string(m_Width, ' ') << '\r' << std::flush;
+            m_Width = 0;
         }
     }
 
 private:
-    static constexpr std::size_t Width = sizeof "00:00:00.000";
-
-    const VirtualClock& m_rClock;
     const bool m_Possible;
-    bool m_Shown = false;
+    std::size_t m_Width = 0; ///< of the text shown
     std::chrono::steady_clock::time_point m_Next =
         std::chrono::steady_clock::now() + std::chrono::seconds(1);
 };

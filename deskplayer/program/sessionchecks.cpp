@@ -47,7 +47,7 @@ void SessionChecks::CheckExpectation(const ScriptStep& step)
 
 void SessionChecks::Report(std::size_t line, const std::string& message) const
 {
-    PrintMessage(m_rOptions.session + ":" + std::to_string(line) + ": " + message);
+    PrintMessage(Printable(m_rOptions.session) + ":" + std::to_string(line) + ": " + message);
 }
 
 void SessionChecks::ReportRefusal(std::size_t line, const std::string& reason)

@@ -15,9 +15,9 @@ TEST(DeskPlayerUsage, IsDescribedByHelp)
     EXPECT_EQ(help.status, 0);
     EXPECT_EQ(help.errors, "");
     for (const char* const option :
-         {"--help", "--version", "--commands", "--playlist", "--list", "--describe", "--session",
-          "--strict", "--realtime", "--remote", "--format", "--output", "--listen", "--only",
-          "--log"}) {
+         {"--help", "--version", "--commands", "--playlist", "--list", "--check", "--describe",
+          "--session", "--strict", "--realtime", "--remote", "--format", "--output", "--listen",
+          "--only", "--log"}) {
         EXPECT_NE(help.output.find(option), std::string::npos) << option;
     }
 
@@ -62,6 +62,12 @@ TEST(DeskPlayerUsage, IsRefusedWithStatus2WhenInvalid)
 TEST(DeskPlayerUsage, RefusesOptionsThatExcludeEachOther)
 {
     const std::vector<std::vector<std::string>> pairs = {{"--list", "--describe", "1"},
+                                                         {"--check", "--list"},
+                                                         {"--check", "--describe", "1"},
+                                                         {"--check", "--playlist", "1"},
+                                                         {"--check", "--session", Evening},
+                                                         {"--check", "--realtime"},
+                                                         {"--check", "--remote"},
                                                          {"--list", "--playlist", "1"},
                                                          {"--list", "--session", Evening},
                                                          {"--list", "--realtime"},

@@ -134,6 +134,7 @@ const std::map<std::string, std::vector<std::string>> Allowed = {
     {"deskplayer/navigator",
      Library + std::vector<std::string>{"deskplayer/disc", "deskplayer/text"}},
     {"deskplayer/session", {"deskplayer/navigator", "deskplayer/text"}},
+    {"deskplayer/check", {"deskplayer/disc", "deskplayer/text"}},
     {"deskplayer/listing", {"deskplayer/disc", "deskplayer/text"}},
     {"deskplayer/output",
      Library + std::vector<std::string>{"deskplayer/navigator", "deskplayer/text"}},

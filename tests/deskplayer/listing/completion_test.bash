@@ -76,6 +76,13 @@ OffersPlayListsOfADiscWithABlankInItsName() {
     expect '7' '"a disc"' --playlist ''
 }
 
+OffersPlayListsWhateverTheCaseOfNames() {
+    mkdir -p "$folder/documents/bdmv/playlist"
+    touch "$folder/documents/bdmv/playlist/00009.MPLS"
+    expect '9' documents --playlist ''
+    expect '9' documents/bdmv --playlist ''
+}
+
 OffersPlayListsOfADiscInTheHomeFolder() {
     HOME=$folder expect '0 12345 8 80 800' '~/disc' --playlist ''
 }

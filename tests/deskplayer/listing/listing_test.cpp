@@ -434,11 +434,55 @@ TEST(ListPlayLists, CountsUnreadablePlayListsAndGivesTheReasons)
         << listing;
 }
 
-TEST(ListPlayLists, CountsNoUnreadablePlayListsIfAllCanBeRead)
+TEST(ListPlayLists, HasNoFaultsIfEverythingCanBeRead)
 {
     const Disc disc(TestDisc("titles"));
     std::ostringstream output;
     EXPECT_EQ(ListPlayLists(output, disc, disc.PlayListNumbers()), 0u);
+}
+
+/** Lists play list 0 and returns the faults. */
+std::vector<std::string> FaultsOf(const ScratchDisc& scratch)
+{
+    std::vector<std::string> faults;
+    std::ostringstream output;
+    const std::size_t count =
+        ListPlayLists(output, scratch.Read(), {0},
+                      [&](const std::string& message) { faults.push_back(message); });
+    EXPECT_EQ(count, faults.size());
+    return faults;
+}
+
+TEST(ListPlayLists, ReportsAMissingIndexAsAFault)
+{
+    const ScratchDisc scratch("pip");
+    scratch.Remove("index.bdmv");
+    const std::vector<std::string> faults = FaultsOf(scratch);
+    ASSERT_EQ(faults.size(), 1u);
+    EXPECT_NE(faults[0].find("index.bdmv: "), std::string::npos);
+}
+
+TEST(ListPlayLists, ReportsAnUnreadablePlayListAsAFault)
+{
+    const ScratchDisc scratch("pip");
+    scratch.Write("PLAYLIST/00000.mpls", Ascii("INDX"));
+    const std::vector<std::string> faults = FaultsOf(scratch);
+    ASSERT_EQ(faults.size(), 1u);
+    EXPECT_EQ(faults[0].rfind("BDMV/PLAYLIST/00000.mpls: offset 0: ", 0), 0u);
+}
+
+TEST(ListPlayLists, ReportsMissingAndDamagedClipInformationAsAFault)
+{
+    const ScratchDisc scratch("pip");
+    scratch.Write("CLIPINF/00000.clpi", Ascii("HDMV"));
+    std::vector<std::string> faults = FaultsOf(scratch);
+    ASSERT_EQ(faults.size(), 1u);
+    EXPECT_EQ(faults[0].rfind("BDMV/CLIPINF/00000.clpi: offset 4: ", 0), 0u);
+
+    scratch.Remove("CLIPINF/00000.clpi");
+    faults = FaultsOf(scratch);
+    ASSERT_EQ(faults.size(), 1u);
+    EXPECT_NE(faults[0].find("00000.clpi: No such file or directory"), std::string::npos);
 }
 
 TEST(ListPlayLists, ContinuesWithoutAnIndex)

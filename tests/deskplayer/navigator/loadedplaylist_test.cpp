@@ -52,6 +52,7 @@ TEST(LoadedPlayList, LoadsWithoutClips)
     const LoadedPlayList loaded = LoadPlayList(SampleDisc(), 1, ListOf({Item(10), withoutVideo}));
 
     EXPECT_EQ(loaded.aspectRatios, std::vector<std::optional<std::uint8_t>>(2, std::nullopt));
+    EXPECT_TRUE(loaded.notes.empty());
 }
 
 /** A play list that is @p more longer than the maximum. */
