@@ -36,6 +36,8 @@
 #include "program/target.h"
 #include "session/remote.h"
 #include "session/session.h"
+#include "text/printable.h"
+#include "text/timetext.h"
 
 namespace deskplayer
 {

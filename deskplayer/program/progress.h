@@ -44,8 +44,8 @@ public:
             m_Next = now + std::chrono::milliseconds(200);
             Clear();
             const std::string line = text();
-            std::cerr << line << std::flush;
-            m_Width = line.size();
+            std::cerr << '\r' << line << std::flush;
+            m_Width = line.size() + 1; // and the cursor
         }
     }
 
@@ -60,7 +60,7 @@ public:
 
 private:
     const bool m_Possible;
-    std::size_t m_Width = 0; ///< of the text shown
+    std::size_t m_Width = 0; ///< to erase; 0 if nothing is shown
     std::chrono::steady_clock::time_point m_Next =
         std::chrono::steady_clock::now() + std::chrono::seconds(1);
 };

@@ -6,6 +6,7 @@
 #include <chrono>
 #include <csignal>
 #include <cstdlib>
+#include <regex>
 #include <string>
 #include <thread>
 #include <vector>
@@ -39,6 +40,21 @@ TEST_F(DeskPlayerTerminal, ShowsProgressIfPlaybackTakesLong)
 
     EXPECT_EQ(result.status, 0);
     EXPECT_EQ(result.output, "\r00:00:01.000\r             \r") << "erased at the end";
+}
+
+TEST_F(DeskPlayerTerminal, ShowsProgressIfACheckTakesLong)
+{
+    fs::resize_file(playList, 1024 * 1024);
+    for (int number = 10000; number < 18000; ++number) {
+        fs::create_symlink(playList, disc / "BDMV/PLAYLIST" / (std::to_string(number) + ".mpls"));
+    }
+
+    const ProgramResult result = RunDeskPlayerOnTerminal({disc, "--check"});
+
+    EXPECT_EQ(result.status, 0);
+    EXPECT_TRUE(
+        std::regex_match(result.output, std::regex("(\rBDMV/PLAYLIST/1[0-9]{4}\\.mpls\r {25}\r)+")))
+        << testing::PrintToString(result.output);
 }
 
 TEST_F(DeskPlayerTerminal, IsNeededForProgress)

@@ -402,8 +402,16 @@ TEST(ParseScriptRefuses, AnythingWhenThereAreNoCommands)
 TEST(ParseScriptRefuses, WithTheColumnInBytes)
 {
     EXPECT_EQ(ErrorOf("\tplay \t now").substr(0, 5), "1:9: ");
-    EXPECT_EQ(ErrorOf("chapter \xC3\xA4"),
-              "1:9: unexpected '\\xC3\\xA4'; expected next, previous or a NUMBER");
+    EXPECT_EQ(ErrorOf("chapter \xC3\xA4 5"),
+              "1:9: unexpected '\xC3\xA4'; expected next, previous or a NUMBER");
+    EXPECT_EQ(ErrorOf("chapter next \xC3\xA4 \xE4").substr(0, 6), "1:14: ");
+}
+
+TEST(ParseScriptRefuses, LongWordsCutBetweenTwoCharacters)
+{
+    const std::string start(39, 'a');
+    EXPECT_EQ(ErrorOf("chapter " + start + "\xC3\xA4"),
+              "1:9: unexpected '" + start + "...'; expected next, previous or a NUMBER");
 }
 
 TEST(ParseScriptRefuses, NumbersAboveTheMaximum)
