@@ -61,7 +61,10 @@ OutputOptions OutputOptionsOf(const Options& options)
     }
     if ((options.list || options.describe || options.check) &&
         output.format == OutputFormat::Trace) {
-        throw UsageError("--format trace: only for playing, expected text or json");
+        throw UsageError(std::string(options.list       ? "--list"
+                                     : options.describe ? "--describe"
+                                                        : "--check") +
+                         " excludes --format trace");
     }
     output.coloured = options.output.empty() &&
                       WantsColours(STDOUT_FILENO, std::getenv("NO_COLOR"), std::getenv("TERM"));

@@ -85,6 +85,9 @@ TEST(DeskPlayerUsage, RefusesOptionsThatExcludeEachOther)
                                                          {"--describe", "1", "--only", "PlayItem"},
                                                          {"--describe", "1", "--log", "*=*"},
                                                          {"--describe", "1", "--format", "trace"},
+                                                         {"--check", "--only", "PlayItem"},
+                                                         {"--check", "--log", "*=*"},
+                                                         {"--check", "--format", "trace"},
                                                          {"--remote", "--session", Evening}};
     for (std::vector<std::string> arguments : pairs) {
         SCOPED_TRACE(arguments.front() + " and others");

@@ -175,6 +175,24 @@ TEST_F(ChangedDisc, HasAFaultForAStreamWithInvalidReferences)
     ExpectFaultAfterPatch(secondaryVideo.offset + 1, 1, 9, "sub path of the stream is 9");
 }
 
+TEST(CheckDisc, HasAFaultForAReferenceToAStreamThatDoesNotExist)
+{
+    const ScratchDisc scratch("secaudio");
+    const Disc disc = scratch.Read();
+    const Stream audio = disc.ReadPlayList(0).playItems.at(0).streams.secondaryAudio.at(0);
+    ASSERT_FALSE(audio.primaryAudioReferences.empty());
+    const std::size_t reference = audio.offset + 9 + 6 + 2; // after entry, attributes and count
+    Bytes bytes = ReadContents(TestDisc("secaudio") / "BDMV/PLAYLIST/00000.mpls");
+    ASSERT_EQ(bytes.at(reference), audio.primaryAudioReferences[0]);
+    bytes[reference] = 99;
+    scratch.Write("PLAYLIST/00000.mpls", bytes);
+
+    const std::vector<Fault> faults = FaultsOf(disc);
+    ASSERT_EQ(faults.size(), 1u);
+    EXPECT_EQ(faults[0].offset, audio.offset);
+    EXPECT_NE(faults[0].found.find("refers to number 99"), std::string::npos);
+}
+
 TEST_F(ChangedDisc, HasAFaultForAMarkWithInvalidReferences)
 {
     const Mark mark = Read().ReadPlayList(0).marks.at(0);

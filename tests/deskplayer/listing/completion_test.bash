@@ -57,7 +57,7 @@ sorted() { tr -s ' \n' '\n' | LC_ALL=C sort; }
 
 OffersOptions() {
     expect '--list --listen --log' --l
-    expect '--session' disc --s
+    expect '--session --strict' disc --s
     expect '--remote' --playlist 1 disc --rem
 }
 
