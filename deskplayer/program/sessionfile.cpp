@@ -76,6 +76,7 @@ std::string ReadSession(const std::string& fileName)
 std::vector<ScriptStep> ReadSessionFile(const std::string& fileName)
 {
     std::vector<std::string_view> callbacks;
+    callbacks.reserve(AllCallbacks.size());
     for (const CallbackInfo& info : AllCallbacks) {
         callbacks.push_back(info.name);
     }

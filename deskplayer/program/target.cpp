@@ -6,6 +6,7 @@
 
 #include <cerrno>
 #include <system_error>
+#include <utility>
 
 #include "program/failure.h"
 #include "text/printable.h"
@@ -55,7 +56,7 @@ bool DescriptorBuffer::WriteAll()
     return m_Error == 0;
 }
 
-Target::Target(const std::string& fileName) : m_FileName(fileName), m_Stream(&m_Buffer)
+Target::Target(std::string fileName) : m_FileName(std::move(fileName)), m_Stream(&m_Buffer)
 {
     m_Buffer.Attach(STDOUT_FILENO);
 }

@@ -46,7 +46,7 @@ class Target
 {
 public:
     /** @param fileName empty for standard output */
-    explicit Target(const std::string& fileName);
+    explicit Target(std::string fileName);
     ~Target();
 
     Target(const Target&) = delete;

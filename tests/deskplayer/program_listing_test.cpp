@@ -104,7 +104,7 @@ TEST_F(DeskPlayerListing, ChecksADisc)
 
 TEST_F(DeskPlayerListing, IsNotWrittenAsATrace)
 {
-    ExpectUsageError({SampleDisc, "--list", "--format", "trace"}, " excludes --format trace");
+    ExpectUsageError({SampleDisc, "--list", "--format", "trace"}, "--list excludes --format trace");
 }
 
 TEST_F(DeskPlayerListing, RefusesToDescribeAMissingPlayList)
