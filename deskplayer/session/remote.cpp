@@ -253,7 +253,7 @@ std::string RemoteHelp()
             help << '\n';
         }
     }
-    help << (column % keysPerLine == 0 ? "" : "\n") << HelpKey << " list the keys         "
+    help << (column % keysPerLine == 0 ? "" : "\n") << HelpKey << " list the keys       "
          << QuitKey << " or Ctrl-C quit\n";
     return help.str();
 }
