@@ -1,6 +1,7 @@
 #include "check/check.h"
 
 #include <optional>
+#include <utility>
 #include <vector>
 
 #include "check/clips.h"
@@ -36,14 +37,14 @@ public:
         }
 
         Clips clips;
-        const auto names = Read("BDMV/CLIPINF", [this] { return m_rDisc.ClipNames(); });
-        for (const std::string& name : names.value_or(std::vector<std::string>())) {
+        for (const std::string& name :
+             ReadNames("BDMV/CLIPINF", [this] { return m_rDisc.ClipNames(); })) {
             clips[name] = Read("BDMV/CLIPINF/" + name + ".clpi",
                                [&] { return ClipContents(m_rDisc.ReadClipInfo(name)); });
         }
 
-        const auto numbers = Read("BDMV/PLAYLIST", [this] { return m_rDisc.PlayListNumbers(); });
-        for (const std::uint32_t number : numbers.value_or(std::vector<std::uint32_t>())) {
+        for (const std::uint32_t number :
+             ReadNames("BDMV/PLAYLIST", [this] { return m_rDisc.PlayListNumbers(); })) {
             const std::string file =
                 "BDMV/PLAYLIST/" + std::to_string(100000 + number).substr(1) + ".mpls";
             if (const auto playList = Read(file, [&] { return m_rDisc.ReadPlayList(number); })) {
@@ -69,6 +70,14 @@ private:
             m_Report({error.Path(), std::nullopt, error.Found(), error.Expected()});
         }
         return std::nullopt;
+    }
+
+    /** The files of a folder; none, after a report, if reading fails. */
+    template <typename ReadFolder>
+    auto ReadNames(const std::string& folder, const ReadFolder& read) -> decltype(read())
+    {
+        auto names = Read(folder, read);
+        return names ? std::move(*names) : decltype(read())();
     }
 
     void CheckIndex(const Index& index, std::size_t movieObjects)
