@@ -1,5 +1,6 @@
 #include <gtest/gtest.h>
 
+#include <cinttypes>
 #include <cstdint>
 #include <cstdio>
 #include <cstdlib>
@@ -115,11 +116,11 @@ TEST(DeskPlayerLog, CarriesTheTimeOfTheSessionToTheTick)
     std::vector<std::string> ofCallbacks;
     for (const std::string& line : LinesOf(result.output)) {
         const auto ticks = nlohmann::json::parse(line).at("ticks").get<std::uint64_t>();
-        const auto microseconds = static_cast<unsigned long>((ticks * 200 + 4) / 9);
+        const std::uint64_t microseconds = (ticks * 200 + 4) / 9;
         char time[64];
-        std::snprintf(time, sizeof time, "%02lu:%02lu:%02lu.%06lu", microseconds / 3600000000,
-                      microseconds / 60000000 % 60, microseconds / 1000000 % 60,
-                      microseconds % 1000000);
+        std::snprintf(time, sizeof time, "%02" PRIu64 ":%02" PRIu64 ":%02" PRIu64 ".%06" PRIu64,
+                      microseconds / 3600000000, microseconds / 60000000 % 60,
+                      microseconds / 1000000 % 60, microseconds % 1000000);
         ofCallbacks.emplace_back(time);
     }
     std::vector<std::string> ofLines;
