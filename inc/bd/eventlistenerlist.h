@@ -87,7 +87,7 @@ public:
     bool RemoveListener(T* listener)
     {
         const Guard<ThreadMutex> guard(m_ListenersLock);
-        const typename Listeners::iterator found = Find(listener);
+        const auto found = Find(listener);
         if (found == m_Listeners.end()) {
             return false;
         }

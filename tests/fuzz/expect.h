@@ -5,8 +5,12 @@
 #ifndef FUZZ_EXPECT_H
 #define FUZZ_EXPECT_H
 
+#include <algorithm>
 #include <cstdlib>
+#include <string>
 #include <string_view>
+
+#include "text/printable.h"
 
 namespace fuzz
 {
@@ -18,12 +22,13 @@ inline void Expect(bool holds)
     }
 }
 
+/** Expects valid UTF-8 without control characters; a backslash begins an escape sequence. */
 inline void ExpectPrintableLine(std::string_view text)
 {
     Expect(!text.empty());
-    for (const char character : text) {
-        Expect(character >= 0x20 && character < 0x7F);
-    }
+    std::string unescaped(text);
+    unescaped.erase(std::remove(unescaped.begin(), unescaped.end(), '\\'), unescaped.end());
+    Expect(deskplayer::Printable(unescaped) == unescaped);
 }
 
 } // namespace fuzz
