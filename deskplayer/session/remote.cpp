@@ -253,8 +253,8 @@ std::string RemoteHelp()
             help << '\n';
         }
     }
-    help << (column % keysPerLine == 0 ? "" : "\n") << HelpKey << " list the keys       "
-         << QuitKey << " or Ctrl-C quit\n";
+    help << (column % keysPerLine == 0 ? "" : "\n") << HelpKey << " list the keys       " << QuitKey
+         << " or Ctrl-C quit\n";
     return help.str();
 }
 
