@@ -1,5 +1,6 @@
 # The installed package: find_package(bdmvnavigator) provides bdmvnavigator::bdmvnavigator and, if the
-# port was built and its dependency is found, bdmvnavigator::kevro.
+# port was built and its dependency is found, bdmvnavigator::kevro. Each component provides one more
+# target.
 include(CMakePackageConfigHelpers)
 
 set(package_dir ${CMAKE_INSTALL_LIBDIR}/cmake/bdmvnavigator)
@@ -22,6 +23,14 @@ if(BDMVNAVIGATOR_BUILD_PORT)
     ARCHIVE DESTINATION ${CMAKE_INSTALL_LIBDIR})
   install(EXPORT bdmvnavigator-kevro-targets NAMESPACE bdmvnavigator:: DESTINATION ${package_dir})
 endif()
+
+# A component of the package: its target and its headers, "NAME/...".
+foreach(kit IN LISTS bdmvnavigator_kits)
+  install(DIRECTORY kits/${kit} DESTINATION ${header_dir} FILES_MATCHING PATTERN "*.h")
+  install(TARGETS bdmvnavigator_${kit} EXPORT bdmvnavigator-${kit}-targets
+    ARCHIVE DESTINATION ${CMAKE_INSTALL_LIBDIR})
+  install(EXPORT bdmvnavigator-${kit}-targets NAMESPACE bdmvnavigator:: DESTINATION ${package_dir})
+endforeach()
 
 if(BDMVNAVIGATOR_BUILD_DESKPLAYER)
   install(TARGETS bdmv-deskplayer RUNTIME DESTINATION ${CMAKE_INSTALL_BINDIR})

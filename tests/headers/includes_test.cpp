@@ -21,7 +21,8 @@ namespace fs = std::filesystem;
 
 const fs::path Root = BDMVNAVIGATOR_SOURCE_DIR;
 const std::vector<std::string> IncludeRoots = {
-    "inc", "bdmv/inc", "bdmv", "prv_inc", "deskplayer", "ports/linux", "measure/bench", "tests"};
+    "inc",        "bdmv/inc",    "bdmv",          "prv_inc", "kits",
+    "deskplayer", "ports/linux", "measure/bench", "tests"};
 
 /** An #include line of a file. */
 struct Include {
@@ -129,6 +130,9 @@ const std::map<std::string, std::vector<std::string>> Allowed = {
     {"bdmv/inc", {"inc", "prv_inc"}},
     {"bdmv", {"bdmv/inc", "inc", "prv_inc"}},
     {"ports", {"bdmv/inc", "inc", "prv_inc"}},
+    {"kits/navigatorkit", Library},
+    {"kits/clientkit", Library},
+    {"kits/testkit", Library + std::vector<std::string>{"kits/clientkit"}},
     {"deskplayer/text", Library},
     {"deskplayer/disc", {"deskplayer/text"}},
     {"deskplayer/navigator",
