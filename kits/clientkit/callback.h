@@ -22,6 +22,9 @@
  * of callbacks::SystemSuspended are a pointer and a size, and the program of
  * callbacks::ExecuteButton is shared. Releasing a program runs its destructor: a value that holds
  * the last pointer to one runs it when it is assigned or destroyed.
+ *
+ * Names. Inside a class derived from CallbackListener, PlayItem is the method; the type is written
+ * callbacks::PlayItem.
  */
 #ifndef CLIENTKIT_CALLBACK_H
 #define CLIENTKIT_CALLBACK_H
