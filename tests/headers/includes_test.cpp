@@ -133,7 +133,7 @@ const std::map<std::string, std::vector<std::string>> Allowed = {
     {"kits/navigatorkit", Library},
     {"kits/clientkit", Library},
     {"kits/testkit", Library + std::vector<std::string>{"kits/clientkit"}},
-    {"deskplayer/text", Library},
+    {"deskplayer/text", Library + std::vector<std::string>{"kits/clientkit"}},
     {"deskplayer/disc", {"deskplayer/text"}},
     {"deskplayer/navigator",
      Library + std::vector<std::string>{"deskplayer/disc", "deskplayer/text"}},
@@ -141,7 +141,8 @@ const std::map<std::string, std::vector<std::string>> Allowed = {
     {"deskplayer/check", {"deskplayer/disc", "deskplayer/text"}},
     {"deskplayer/listing", {"deskplayer/disc", "deskplayer/text"}},
     {"deskplayer/output",
-     Library + std::vector<std::string>{"deskplayer/navigator", "deskplayer/text"}},
+     Library +
+         std::vector<std::string>{"kits/clientkit", "deskplayer/navigator", "deskplayer/text"}},
     {"deskplayer", Library + std::vector<std::string>{"ports"}},
     {"examples", Library + std::vector<std::string>{"deskplayer"}},
     {"measure", AllFolders},
