@@ -136,7 +136,7 @@ const std::map<std::string, std::vector<std::string>> Allowed = {
     {"deskplayer/text", Library + std::vector<std::string>{"kits/clientkit"}},
     {"deskplayer/disc", {"deskplayer/text"}},
     {"deskplayer/navigator",
-     Library + std::vector<std::string>{"deskplayer/disc", "deskplayer/text"}},
+     Library + std::vector<std::string>{"kits/navigatorkit", "deskplayer/disc", "deskplayer/text"}},
     {"deskplayer/session", {"deskplayer/navigator", "deskplayer/text"}},
     {"deskplayer/check", {"deskplayer/disc", "deskplayer/text"}},
     {"deskplayer/listing", {"deskplayer/disc", "deskplayer/text"}},
