@@ -70,7 +70,7 @@ public:
     std::size_t Count(bdmv::CallbackId id) const
     {
         const std::lock_guard<std::mutex> lock(m_Mutex);
-        return m_Received[id];
+        return m_Tallies[static_cast<std::size_t>(id)].received;
     }
 
     /**
@@ -79,8 +79,7 @@ public:
     std::vector<bdmv::Callback> Take()
     {
         const std::lock_guard<std::mutex> lock(m_Mutex);
-        m_Received.fill(0);
-        m_Awaited.fill(0);
+        m_Tallies.fill(Tally());
         return std::exchange(m_Callbacks, {});
     }
 
@@ -110,13 +109,20 @@ public:
     {
         const std::chrono::milliseconds day = std::chrono::hours(24);
         std::unique_lock<std::mutex> lock(m_Mutex);
+        Tally& tally = m_Tallies[static_cast<std::size_t>(id)];
         const bool received = m_HasReceived.wait_for(
-            lock, std::min(timeout, day), [this, id] { return m_Received[id] > m_Awaited[id]; });
-        m_Awaited[id] += received ? 1 : 0;
+            lock, std::min(timeout, day), [&tally] { return tally.received > tally.awaited; });
+        tally.awaited += received ? 1 : 0;
         return received;
     }
 
 private:
+    /** The callbacks of one kind since they were last cleared. */
+    struct Tally {
+        std::size_t received = 0;
+        std::size_t awaited = 0; ///< those that satisfied a call of WaitFor()
+    };
+
     void OnCallback(const bdmv::Callback& callback) override
     {
         Keep(callback);
@@ -129,7 +135,7 @@ private:
     {
         const std::lock_guard<std::mutex> lock(m_Mutex);
         m_Callbacks.push_back(WithOwnBytes(callback));
-        ++m_Received[callback.Id()];
+        ++m_Tallies[static_cast<std::size_t>(callback.Id())].received;
         m_HasReceived.notify_all();
     }
 
@@ -148,9 +154,7 @@ private:
     mutable std::mutex m_Mutex;
     std::condition_variable m_HasReceived;
     std::vector<bdmv::Callback> m_Callbacks;
-    std::array<std::size_t, bdmv::Callback__sizeof> m_Received = {};
-    std::array<std::size_t, bdmv::Callback__sizeof> m_Awaited =
-        {}; ///< those that WaitFor() returned
+    std::array<Tally, bdmv::Callback__sizeof> m_Tallies = {};
     std::deque<std::vector<unsigned char>> m_Blocks;
 };
 

@@ -1,6 +1,8 @@
 #include "testkit/fakeplatform.h"
 
 #include <gtest/gtest.h>
+#include <setjmp.h>
+#include <signal.h>
 
 #include <csignal>
 #include <cstdlib>
@@ -105,21 +107,29 @@ TEST(FakePlatform, LeavesDefaultsBehind)
     EXPECT_EQ(KEVRO_Osa_TaskAtomicAdd(&counter, 1), 4);
 }
 
-/** Ends the program in order, so that a measurement of coverage is written. */
-void Exit(int)
+sigjmp_buf g_AfterAbort;
+
+void LeaveAbort(int)
 {
+    siglongjmp(g_AfterAbort, 1);
+}
+
+/** Ends the program in order although the assertion aborts, so that its coverage is written. */
+void FailAnAssertionAndExit()
+{
+    std::signal(SIGABRT, LeaveAbort);
+    if (sigsetjmp(g_AfterAbort, 1) == 0) {
+        Assert("expression", "file.cpp", 7);
+        std::exit(1);
+    }
     std::exit(7);
 }
 
 TEST(FakePlatformDeathTest, IsNeededToSurviveAFailedAssertion)
 {
     testing::FLAGS_gtest_death_test_style = "threadsafe";
-    EXPECT_EXIT(
-        {
-            std::signal(SIGABRT, Exit);
-            Assert("expression", "file.cpp", 7);
-        },
-        testing::ExitedWithCode(7), "file.cpp:7: assertion failed: expression");
+    EXPECT_EXIT(FailAnAssertionAndExit(), testing::ExitedWithCode(7),
+                "file.cpp:7: assertion failed: expression");
 }
 
 } // namespace
