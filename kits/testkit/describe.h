@@ -60,12 +60,18 @@ inline std::string Describe(const bdmv::IProgramData::RefPtr& program);
 /** The bytes of a block and its size, in decimal. */
 inline std::string DescribeBytes(const void* data, bd::UInt32 size);
 
+/** Appends to a list that is separated by commas. */
+inline void AppendTo(std::string& list, const std::string& text)
+{
+    list += (list.empty() ? "" : ", ") + text;
+}
+
 /** The values, separated by commas. */
 template <typename... Values> std::string DescribeAll(const Values&... values)
 {
-    std::string text;
-    ((text += (text.empty() ? "" : ", ") + Describe(values)), ...);
-    return text;
+    std::string list;
+    (AppendTo(list, Describe(values)), ...);
+    return list;
 }
 
 /** A call: its name and its arguments. */
@@ -138,7 +144,7 @@ inline std::string DescribeOperations(const bdmv::UOMaskTable& mask)
     std::string operations;
     for (const auto& operation : bdmv::NamesOf<bd::UserOperationMaskDef>()) {
         if (mask.IsSet(operation.code)) {
-            operations += (operations.empty() ? "" : ", ") + std::string(operation.name);
+            AppendTo(operations, operation.name);
         }
     }
     return "{" + operations + "}";

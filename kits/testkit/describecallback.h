@@ -105,7 +105,7 @@ inline std::string Describe(const bdmv::Callback& callback)
 {
     std::string text;
     for (const Argument& argument : ArgumentsOf(callback)) {
-        text += (text.empty() ? "" : ", ") + argument.name + "=" + argument.text;
+        AppendTo(text, argument.name + "=" + argument.text);
     }
     return NameOf(callback.Id()) + ("(" + text + ")");
 }

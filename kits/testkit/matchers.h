@@ -52,7 +52,7 @@ public:
         std::string differences;
         for (std::size_t i = 0; i < expected.size(); ++i) {
             if (actual[i].value != expected[i].value) {
-                differences += (differences.empty() ? "" : ", ") + expected[i].name;
+                AppendTo(differences, expected[i].name);
             }
         }
         if (!differences.empty()) {
@@ -96,6 +96,34 @@ public:
 
 private:
     bdmv::CallbackId m_Id;
+};
+
+/** Finds the name of an argument: pass it to the arguments' VisitArguments(). */
+class ArgumentName
+{
+public:
+    /** @param size in bytes: a structure and its first member have the same address */
+    ArgumentName(const void* argument, std::size_t size) : m_pArgument(argument), m_Size(size) {}
+
+    template <typename Visited> void operator()(const char* name, const Visited& visited)
+    {
+        Compare(name, &visited, sizeof visited);
+    }
+
+    /** "argument" if it was not visited, as a structure that outputs write member by member. */
+    const std::string& Get() const { return m_Name; }
+
+private:
+    void Compare(const char* name, const void* visited, std::size_t size)
+    {
+        if (visited == m_pArgument && size == m_Size) {
+            m_Name = name;
+        }
+    }
+
+    const void* m_pArgument;
+    std::size_t m_Size;
+    std::string m_Name = "argument";
 };
 
 /** Matches callbacks of a kind by one of their arguments. */
@@ -142,31 +170,12 @@ public:
     }
 
 private:
-    /** Finds the name of an argument by its address. */
-    struct Naming {
-        const Member* pAddress;
-        std::string name;
-
-        template <typename Visited>
-        void operator()([[maybe_unused]] const char* visitedName,
-                        [[maybe_unused]] const Visited& visited)
-        {
-            // A structure and its first member have the same address, but not the same type.
-            if constexpr (std::is_same_v<Visited, Member>) {
-                if (&visited == pAddress) {
-                    name = visitedName;
-                }
-            }
-        }
-    };
-
-    /** "argument" for a structure that outputs write member by member. */
     static std::string NameOfArgument(Member Arguments::*argument)
     {
         const Arguments arguments = {};
-        Naming naming = {&(arguments.*argument), "argument"};
-        Arguments::VisitArguments(arguments, naming);
-        return naming.name;
+        ArgumentName name(&(arguments.*argument), sizeof(Member));
+        Arguments::VisitArguments(arguments, name);
+        return name.Get();
     }
 
     Member Arguments::*m_Argument;

@@ -16,6 +16,17 @@ using bdmvtest::CountAllocations;
 using bdmvtest::CountLiveBlocks;
 using bdmvtest::FailAllocationAfter;
 
+// A sanitizer stops the program when an allocation is too large.
+#if defined(__SANITIZE_ADDRESS__) || defined(__SANITIZE_THREAD__)
+constexpr bool Sanitized = true;
+#elif !defined(__has_feature)
+constexpr bool Sanitized = false;
+#elif __has_feature(address_sanitizer) || __has_feature(thread_sanitizer)
+constexpr bool Sanitized = true;
+#else
+constexpr bool Sanitized = false;
+#endif
+
 TEST(AllocationCounter, CountsAllocationsAndLiveBlocks)
 {
     const std::size_t allocations = CountAllocations();
@@ -54,6 +65,17 @@ TEST(AllocationCounter, FailsTheChosenAllocationOnly)
     void* const third = ::operator new(1);
     ::operator delete(first);
     ::operator delete(third);
+}
+
+TEST(AllocationCounter, ReportsThatTheHeapIsExhausted)
+{
+    if (Sanitized) {
+        GTEST_SKIP() << "a sanitizer stops the program instead";
+    }
+    const long blocks = CountLiveBlocks();
+    volatile std::size_t tooMuch = std::numeric_limits<std::size_t>::max() / 2;
+    EXPECT_THROW(::operator delete(::operator new(tooMuch)), std::bad_alloc);
+    EXPECT_EQ(CountLiveBlocks(), blocks);
 }
 
 TEST(AllocationCounter, CountsForEachThreadApart)

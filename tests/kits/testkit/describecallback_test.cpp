@@ -37,6 +37,9 @@ TEST(DescribeCallback, ShowsTruthValuesAsWordsAndSmallNumbersInDecimal)
 
 TEST(DescribeCallback, ShowsAnEnumeratorWithoutANameInDecimal)
 {
+    EXPECT_EQ(
+        Describe(bdmv::Callback(callbacks::PlayMode{bd::PlayDirectionForward, bd::PlaySpeedFast2})),
+        "PlayMode(direction=Forward, speed=Fast2)");
     EXPECT_EQ(Describe(bdmv::Callback(callbacks::PlayMode{bd::PlayDirectionForward,
                                                           static_cast<bd::PlaySpeedDef>(99)})),
               "PlayMode(direction=Forward, speed=99)");

@@ -16,7 +16,7 @@ namespace
 using bdmvtest::FakePlatform;
 using bdmvtest::Journal;
 
-void Write(const char* format, ...)
+__attribute__((format(printf, 1, 2))) void Write(const char* format, ...)
 {
     va_list args;
     va_start(args, format);

@@ -122,15 +122,21 @@ TEST(HasMatcher, NamesTheArgumentAndItsEnumerator)
     EXPECT_EQ(ExplanationOf(Has(&callbacks::Playlist::playListId, 800), Item), "");
 }
 
-TEST(HasMatcher, PassesOnWhatTheInnerMatcherExplains)
+TEST(HasMatcher, AddsWhatTheInnerMatcherExplains)
 {
+    const auto isEven = testing::ResultOf([](bd::PlayListIdDef id) { return id % 2 == 0; }, true);
     EXPECT_EQ(
-        ExplanationOf(Has(&callbacks::Playlist::playListId, Gt(799u)), callbacks::Playlist{790}),
-        "whose playListId is 790");
-    EXPECT_EQ(ExplanationOf(Has(&callbacks::Playlist::playListId, testing::AllOf(Gt(1u), Gt(2u))),
-                            callbacks::Playlist{790})
-                  .substr(0, 23),
-              "whose playListId is 790");
+        ExplanationOf(Has(&callbacks::Playlist::playListId, isEven), callbacks::Playlist{791}),
+        "whose playListId is 791, which is mapped by the given callable to false "
+        "(of type bool)");
+}
+
+TEST(HasMatcher, FindsTheNameWhereverTheArgumentIs)
+{
+    EXPECT_EQ(DescriptionOf(Has(&callbacks::MarkInfo::markId, 3)),
+              "is MarkInfo whose markId is equal to 3");
+    EXPECT_EQ(DescriptionOf(Has(&callbacks::MarkInfo::time, 45000)),
+              "is MarkInfo whose time is equal to 45000");
 }
 
 TEST(HasMatcher, ShowsSmallNumbersAsNumbers)
