@@ -129,6 +129,8 @@ TEST(HasMatcher, AddsWhatTheInnerMatcherExplains)
         ExplanationOf(Has(&callbacks::Playlist::playListId, isEven), callbacks::Playlist{791}),
         "whose playListId is 791, which is mapped by the given callable to false "
         "(of type bool)");
+    EXPECT_EQ(ExplanationOf(Has(&callbacks::Playlist::playListId, 800), callbacks::Playlist{791}),
+              "whose playListId is 791");
 }
 
 TEST(HasMatcher, FindsTheNameWhereverTheArgumentIs)
