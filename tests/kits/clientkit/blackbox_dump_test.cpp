@@ -8,6 +8,7 @@
 #include <thread>
 #include <vector>
 
+#include "bd/mutexwatch.h"
 #include "bdmvnavigator/navigatorevent.h"
 #include "bdmvnavigator/navigatorlisteneradapter.h"
 #include "boxtest.h"
@@ -92,7 +93,7 @@ TEST_F(BlackBoxDump, CountsOnlyCallbacksBeforeItBegan)
               LineOf(1) + GapOf(2, "overwritten", 7));
 }
 
-TEST_F(BlackBoxDump, TellsWhatWasOverwrittenBeforeFromWhatIsOverwrittenMeanwhile)
+TEST_F(BlackBoxDump, DistinguishesEarlierLossesFromThoseDuringTheDump)
 {
     Deliver(box, {1, 2, 3, 4, 5});
 
@@ -127,6 +128,23 @@ TEST_F(BlackBoxDump, LetsAnotherThreadDeliverWhileASinkWaits)
                                              Deliver(box, {4, 5});
                                          }).join(); }),
               LineOf(1) + GapOf(1, "overwritten", 3) + LineOf(3));
+}
+
+TEST_F(BlackBoxDump, TakesTheLockForOneRecordOrPartOfABlockAtATime)
+{
+    const std::vector<bd::UInt8> block(100);
+    bdmv::BlackBox large(2, Ticks, block.size());
+    const auto locksOf = [](const auto& action) {
+        const std::size_t before = CountMutexLocks();
+        action();
+        EXPECT_EQ(CountMutexLocks() - before, CountMutexUnlocks() - before);
+        return CountMutexLocks() - before;
+    };
+
+    EXPECT_EQ(locksOf([&] { large.SystemSuspended(block.data(), 100); }), 1u);
+    EXPECT_EQ(locksOf([&] { Deliver(large, 1); }), 1u);
+    // The contents, two records, and of the block 64 bytes, 36 bytes and the end.
+    EXPECT_EQ(locksOf([&] { DumpOf(large); }), 1u + 2u + 3u);
 }
 
 TEST_F(BlackBoxDump, WorksInsideTheSinkOfAnother)

@@ -17,7 +17,7 @@ namespace
 {
 
 constexpr unsigned Callbacks = 3000;
-constexpr int Dumps = 100;
+constexpr int Dumps = 200;
 
 /** The number of the callback that is being delivered; read on the delivering thread. */
 unsigned g_Number = 0;

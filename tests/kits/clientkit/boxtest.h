@@ -16,7 +16,7 @@
 namespace bdmvtest
 {
 
-/** The bytes that were written, piece by piece. */
+/** Appends a piece to a std::string. */
 inline void AppendTo(void* text, const char* bytes, std::size_t size)
 {
     static_cast<std::string*>(text)->append(bytes, size);
@@ -37,7 +37,7 @@ public:
 
     static std::uint64_t Ticks() { return s_Ticks; }
 
-    /** A callback that its number tells from others, at a time of as many seconds. */
+    /** A callback with this number, delivered at that many seconds. */
     static void Deliver(bdmv::INavigatorListener& listener, bd::UInt16 number)
     {
         s_Ticks = std::uint64_t{45000} * number;
