@@ -3,6 +3,7 @@
 #include <atomic>
 #include <thread>
 
+#include "bdmvnavigator/navigatorlisteneradapter.h"
 #include "joiningclient.h"
 #include "randomcallbacks.h"
 
@@ -147,6 +148,51 @@ TEST(JoiningLate, MissesNothingAndRepeatsNothingWhileCallbacksAreDelivered)
     EXPECT_GT(received, 0);
     EXPECT_EQ(first.received.size(), delivered);
     EXPECT_EQ(relay.Status(), reference.statuses[delivered]);
+}
+
+/** Makes another thread deliver a callback while it is brought up to date itself. */
+class SlowClient : public bdmv::NavigatorListenerAdapter
+{
+public:
+    explicit SlowClient(bdmv::ListenerRelay& relay) : m_rRelay(relay) {}
+
+    void PlayStarted() override
+    {
+        std::atomic<bool> delivering{false};
+        deliverer = std::thread([this, &delivering] {
+            delivering = true;
+            m_rRelay.Paused();
+        });
+        while (!delivering) {
+            std::this_thread::yield();
+        }
+        // Gives the callback time to get as far as it can.
+        for (int i = 0; i < 100 && m_rRelay.Status().state.value == bdmv::PlaybackPlaying; ++i) {
+            std::this_thread::yield();
+        }
+    }
+
+    std::thread deliverer;
+
+private:
+    bdmv::ListenerRelay& m_rRelay;
+};
+
+TEST(JoiningLate, DoesNotRepeatACallbackThatHasWaitedForAnotherClientToJoin)
+{
+    for (int round = 0; round < 50; ++round) {
+        bdmv::ListenerRelay relay;
+        relay.PlayStarted();
+        SlowClient slow(relay);
+        bdmvtest::CallbackKeeper late;
+        relay.Join(slow);
+        relay.Join(late);
+        slow.deliverer.join();
+
+        EXPECT_EQ(std::count(late.callbacks.begin(), late.callbacks.end(),
+                             bdmv::Callback(callbacks::Paused{})),
+                  1);
+    }
 }
 
 TEST(JoiningLate, ReadsTheStatusWhileCallbacksAreDelivered)
