@@ -145,6 +145,34 @@ TEST_F(EventQueueThreads, DeliversEveryEventOnceInTheOrderOfItsProducer)
     EXPECT_LE(counters.mostAtOnce, 7U);
 }
 
+TEST_F(EventQueueThreads, LoseNothingWhenProducersPostAtTheSameInstant)
+{
+    for (int round = 0; round < 20; ++round) {
+        bdmv::EventQueue large(std::size_t(Producers) * EventsEach);
+        std::atomic<int> waiting{Producers};
+        std::vector<std::thread> producers;
+        for (int producer = 0; producer < Producers; ++producer) {
+            producers.emplace_back([this, producer, &large, &waiting] {
+                --waiting;
+                while (waiting != 0) {
+                    std::this_thread::yield();
+                }
+                for (int number = 0; number < EventsEach; ++number) {
+                    large.Post<NumberedEvent>(delivered, Delivered{producer, number});
+                }
+            });
+        }
+        for (std::thread& producer : producers) {
+            producer.join();
+        }
+        delivered.clear();
+        while (large.DispatchNext(listeners)) {
+        }
+        ExpectAllDelivered();
+        EXPECT_EQ(large.GetCounters().posted, std::uint64_t(Producers) * EventsEach);
+    }
+}
+
 TEST_F(EventQueueThreads, KeepTheOrderOfPostsThatFollowEachOther)
 {
     std::thread deliverer([this] { Run(); });
