@@ -94,9 +94,9 @@ protected:
     void Run() { queue.Run(listeners); }
 
     /** Posts, and tries again while the queue is full. @return the number of refusals */
-    std::uint64_t PostUntilTaken(Delivered event)
+    unsigned PostUntilTaken(Delivered event)
     {
-        std::uint64_t refusals = 0;
+        unsigned refusals = 0;
         while (!queue.Post<NumberedEvent>(delivered, event)) {
             ++refusals;
             std::this_thread::yield();
@@ -121,7 +121,7 @@ protected:
 TEST_F(EventQueueThreads, DeliversEveryEventOnceInTheOrderOfItsProducer)
 {
     std::thread deliverer([this] { Run(); });
-    std::atomic<std::uint64_t> refusals{0};
+    std::atomic<unsigned> refusals{0};
     std::vector<std::thread> producers;
     for (int producer = 0; producer < Producers; ++producer) {
         producers.emplace_back([this, producer, &refusals] {
