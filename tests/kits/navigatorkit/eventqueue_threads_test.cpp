@@ -147,7 +147,7 @@ TEST_F(EventQueueThreads, DeliversEveryEventOnceInTheOrderOfItsProducer)
 
 TEST_F(EventQueueThreads, LoseNothingWhenProducersPostAtTheSameInstant)
 {
-    for (int round = 0; round < 20; ++round) {
+    for (int round = 0; round < 60; ++round) {
         bdmv::EventQueue large(std::size_t(Producers) * EventsEach);
         std::atomic<int> waiting{Producers};
         std::vector<std::thread> producers;
