@@ -53,6 +53,10 @@ constexpr char ConcurrentName[] = "moodycamel::ConcurrentQueue";
 constexpr int ProducerCounts[] = {0, 1, 2}; ///< 0: the delivering thread posts
 constexpr int EventsARound = 256;           ///< posted before the producers wait for the delivery
 
+constexpr char PlainName[] = "plain listener";
+constexpr char StatusName[] = "StatusListener";
+constexpr char RelayName[] = "ListenerRelay, one client";
+
 constexpr char AllocationsCounter[] = "allocations";
 constexpr char WaitedCounter[] = "waited";
 
@@ -62,6 +66,7 @@ void RegisterEvents();
 void RegisterThreads();
 void RegisterLogLines();
 void RegisterQueues();
+void RegisterClientKit();
 
 inline std::string DeliveryRow(const std::string& callback, const std::string& subject, int count)
 {
@@ -86,6 +91,11 @@ inline std::string QueueRow(const std::string& queue, int producers)
 inline std::string LogRow(const std::string& what)
 {
     return "log/" + what;
+}
+
+inline std::string ClientKitRow(const std::string& callback, const std::string& listener)
+{
+    return "clientkit/" + callback + "/" + listener;
 }
 
 } // namespace bench

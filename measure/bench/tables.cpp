@@ -188,6 +188,35 @@ void PrintQueues(const Report& report, Goal& deque, Goal& fastest, Goal& allocat
     }
 }
 
+/** A listener of the client kit, and the goal for it; without a goal null. */
+struct ClientKitSubject {
+    const char* name;
+    Goal* goal;
+};
+
+void PrintClientKit(const Report& report, const std::vector<ClientKitSubject>& subjects)
+{
+    constexpr const char* Callbacks[] = {NoArguments, ByReference, ByValue};
+    std::printf("\nDelivery to one listener: ns, × plain listener\n  %-28s", "");
+    for (const char* const callback : Callbacks) {
+        std::printf("%25s", callback);
+    }
+    std::printf("\n");
+    for (const ClientKitSubject& subject : subjects) {
+        std::printf("  %-28s       ", subject.name);
+        for (const char* const callback : Callbacks) {
+            const double plain = report[ClientKitRow(callback, PlainName)].cpu;
+            const double time = report[ClientKitRow(callback, subject.name)].cpu;
+            PrintTime(time, plain);
+            std::printf("%7s", "");
+            if (subject.goal != nullptr) {
+                subject.goal->Judge(std::string(subject.name) + ", " + callback, time / plain);
+            }
+        }
+        std::printf("\n");
+    }
+}
+
 } // namespace
 
 void PrintTables(const Report& report)
@@ -199,16 +228,18 @@ void PrintTables(const Report& report)
     Goal deque("a queue's event, × deque", 0.6);
     Goal fastest("a queue's event, × the faster of the lock-free queues", 1.1);
     Goal queueAllocations("allocations from posting to the end of delivery", 0);
+    Goal status("a delivery to StatusListener, × plain listener", 3);
 
     PrintDelivery(report, delivery);
     PrintEvents(report, allocations, lineOff);
     PrintThreads(report);
     PrintLog(report, queued);
     PrintQueues(report, deque, fastest, queueAllocations);
+    PrintClientKit(report, {{PlainName, nullptr}, {StatusName, &status}, {RelayName, nullptr}});
 
     std::printf("\nGoals\n");
-    for (const Goal* goal :
-         {&delivery, &allocations, &lineOff, &queued, &deque, &fastest, &queueAllocations}) {
+    for (const Goal* goal : {&delivery, &allocations, &lineOff, &queued, &deque, &fastest,
+                             &queueAllocations, &status}) {
         goal->Print();
     }
 }
