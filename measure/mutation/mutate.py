@@ -54,6 +54,8 @@ AREAS = (
     Area("base", ("inc/bd/*.h", "bd/*.cpp"), ("tests/bd",), 40),
     Area("mask", ("bdmv/database/*.cpp", "bdmv/inc/database/uomasktable.h"),
          ("tests/bdmv/database",), 15),
+    Area("kits", ("kits/navigatorkit/*.h", "kits/navigatorkit/*.cpp", "kits/clientkit/*.h",
+                  "kits/clientkit/*.cpp"), ("tests/kits",), 60),
     Area("port", ("ports/linux/*.h", "ports/linux/*.cpp"), ("tests/ports/linux",), 40),
     Area("deskplayer", ("deskplayer/**/*.h", "deskplayer/**/*.cpp"), ("tests/deskplayer",), 60),
 )

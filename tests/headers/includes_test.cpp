@@ -112,8 +112,8 @@ namespace
 {
 
 const std::vector<std::string> Library = {"inc", "bdmv", "prv_inc", "bd"};
-const std::vector<std::string> AllFolders = {"inc",        "bdmv",     "prv_inc", "bd",   "ports",
-                                             "deskplayer", "examples", "measure", "tests"};
+const std::vector<std::string> AllFolders = {"inc",  "bdmv",       "prv_inc",  "bd",      "ports",
+                                             "kits", "deskplayer", "examples", "measure", "tests"};
 
 std::vector<std::string> operator+(std::vector<std::string> left,
                                    const std::vector<std::string>& right)

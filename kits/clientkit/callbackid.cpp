@@ -1,0 +1,40 @@
+#include "clientkit/callbackid.h"
+
+namespace bdmv
+{
+
+namespace
+{
+
+struct CallbackRow {
+    ListenerInterface interface;
+    const char* name;
+};
+
+const CallbackRow g_Callbacks[] = {
+#define BDMV_CALLBACK_ROW(interface, name) {ListenerInterface##interface, #name},
+    BDMV_CALLBACKS(BDMV_CALLBACK_ROW)
+#undef BDMV_CALLBACK_ROW
+};
+
+const char* const g_Interfaces[] = {"control", "settings", "button", "interactive"};
+
+} // namespace
+
+const char* NameOf(CallbackId id)
+{
+    return id >= 0 && id < Callback__sizeof ? g_Callbacks[id].name : "unknown";
+}
+
+ListenerInterface InterfaceOf(CallbackId id)
+{
+    return g_Callbacks[id].interface;
+}
+
+const char* NameOf(ListenerInterface interface)
+{
+    return interface >= 0 && interface < ListenerInterface__sizeof ? g_Interfaces[interface]
+                                                                   : "unknown";
+}
+
+} // namespace bdmv
