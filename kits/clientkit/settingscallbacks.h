@@ -8,6 +8,7 @@
 
 #include "bdmvnavigator/inavigatorlistener.h"
 #include "clientkit/callbackid.h"
+#include "clientkit/withoutarguments.h"
 
 namespace bdmv
 {
