@@ -4,6 +4,7 @@
 
 #include <stdexcept>
 #include <string>
+#include <thread>
 #include <vector>
 
 #include "bdmvnavigator/navigatorlisteneradapter.h"
@@ -137,6 +138,18 @@ TEST_F(SessionOnADesk, PassesOnWhatAListenerThrows)
 
     EXPECT_THROW((void)PlaySession(desk, Session("play\npause\nexpect Paused\n")),
                  std::runtime_error);
+}
+
+TEST_F(SessionOnADesk, LeavesNoListenerInTheList)
+{
+    // On a stack of its own, so that a listener left there would be called after its destruction.
+    std::thread([this] {
+        EXPECT_EQ(PlaySession(desk, Session("expect nothing\n")).unmet, Lines());
+    }).join();
+
+    PlayFromStartToEnd(desk);
+
+    EXPECT_EQ(desk.Now(), std::chrono::seconds(20));
 }
 
 TEST(Session, CanBePlayedOnSeveralDesks)
