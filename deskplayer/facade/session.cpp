@@ -6,9 +6,9 @@
 
 #include "facade/parts.h"
 #include "output/callbackrecorder.h"
-#include "output/callbacks.h"
 #include "session/session.h"
 #include "session/sessionfile.h"
+#include "text/names.h"
 #include "text/printable.h"
 #include "text/timetext.h"
 
@@ -23,16 +23,6 @@ struct Session::Script {
 
 namespace
 {
-
-std::vector<ScriptStep> StepsOf(std::string_view text, const std::string& name)
-{
-    std::vector<std::string_view> callbacks;
-    callbacks.reserve(AllCallbacks.size());
-    for (const CallbackInfo& info : AllCallbacks) {
-        callbacks.push_back(info.name);
-    }
-    return ParseScript(text, name, CommandSyntaxes(), callbacks);
-}
 
 /** Compares a session with what its author demands, while it is played. */
 class Checks
@@ -104,7 +94,8 @@ private:
 } // namespace
 
 Session::Session(std::string_view text, const std::string& name)
-    : m_pScript(std::make_shared<const Script>(Script{name, StepsOf(text, name)}))
+    : m_pScript(std::make_shared<const Script>(
+          Script{name, ParseScript(text, name, CommandSyntaxes(), CallbackNames())}))
 {
 }
 

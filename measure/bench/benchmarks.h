@@ -46,6 +46,17 @@ constexpr char LogSpdlog[] = "plain spdlog, null sink";
 constexpr char LogSpdlogQueue[] = "plain spdlog, queue, slow sink";
 constexpr char LogSpdlogQueueNull[] = "plain spdlog, queue, null sink";
 
+constexpr char QueueName[] = "bdmv::EventQueue";
+constexpr char DequeName[] = "std::deque, mutex, condition variable";
+constexpr char LockFreeName[] = "boost::lockfree::queue";
+constexpr char ConcurrentName[] = "moodycamel::ConcurrentQueue";
+constexpr int ProducerCounts[] = {0, 1, 2}; ///< 0: the delivering thread posts
+constexpr int EventsARound = 256;           ///< posted before the producers wait for the delivery
+
+constexpr char PlainName[] = "plain listener";
+constexpr char StatusName[] = "StatusListener";
+constexpr char RelayName[] = "ListenerRelay, one client";
+
 constexpr char AllocationsCounter[] = "allocations";
 constexpr char WaitedCounter[] = "waited";
 
@@ -54,6 +65,8 @@ void RegisterQtDelivery();
 void RegisterEvents();
 void RegisterThreads();
 void RegisterLogLines();
+void RegisterQueues();
+void RegisterClientKit();
 
 inline std::string DeliveryRow(const std::string& callback, const std::string& subject, int count)
 {
@@ -70,9 +83,19 @@ inline std::string ThreadRow(const std::string& lists, const std::string& subjec
     return "threads/" + lists + "/" + subject + "/" + std::to_string(threads);
 }
 
+inline std::string QueueRow(const std::string& queue, int producers)
+{
+    return "queue/" + queue + "/" + std::to_string(producers);
+}
+
 inline std::string LogRow(const std::string& what)
 {
     return "log/" + what;
+}
+
+inline std::string ClientKitRow(const std::string& callback, const std::string& listener)
+{
+    return "clientkit/" + callback + "/" + listener;
 }
 
 } // namespace bench
