@@ -1,5 +1,5 @@
-// Delivery, events, threads, log lines, queues and the client kit in one run, so that their times are
-// comparable.
+// Delivery, events, threads, log lines, queues and the client kit in one run, so that their times
+// are comparable.
 
 #include "benchmarks.h"
 #include "kevro_linux.h"
