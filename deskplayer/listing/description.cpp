@@ -84,7 +84,7 @@ Field UOMask(std::uint64_t mask)
     for (int bit = 0; bit < 64; ++bit) {
         if ((mask >> (63 - bit) & 1) != 0) {
             forbidden += forbidden.empty() ? "forbids " : ", ";
-            forbidden += NameOf(static_cast<bd::UserOperationMaskDef>(bit));
+            forbidden += NameOrNumber(static_cast<bd::UserOperationMaskDef>(bit));
         }
     }
     return {"mask", Hex(mask, 16), forbidden.empty() ? "forbids nothing" : forbidden};

@@ -97,7 +97,7 @@ ordered_json UOMaskJson(std::uint64_t mask)
     ordered_json forbidden = ordered_json::array();
     for (int bit = 0; bit < 64; ++bit) {
         if ((mask >> (63 - bit) & 1) != 0) {
-            forbidden.push_back(NameOf(static_cast<bd::UserOperationMaskDef>(bit)));
+            forbidden.push_back(NameOrNumber(static_cast<bd::UserOperationMaskDef>(bit)));
         }
     }
     return {{"mask", digits}, {"forbidden", forbidden}};

@@ -6,20 +6,19 @@
 #define DESKPLAYER_NAVIGATOR_EVENTDELIVERY_H
 
 #include <condition_variable>
-#include <cstdint>
-#include <deque>
 #include <exception>
-#include <memory>
 #include <mutex>
 #include <thread>
+#include <utility>
 
 #include "bdmvnavigator/inavigatorevent.h"
+#include "navigatorkit/eventqueue.h"
 
 namespace deskplayer
 {
 
 /**
- * A queue of events, and the thread that dispatches and deletes them in order.
+ * A queue of events, and the thread that delivers them in order.
  *
  * Call Post() and Settle() from the navigator's thread. From Post() until Settle() returns, the
  * delivering thread reads the playback context, so the navigator must not change it. Earlier writes
@@ -42,8 +41,17 @@ public:
     /** The list in which clients register. Any thread. */
     bdmv::INavigatorEvent::Listeners& Listeners() { return m_Listeners; }
 
-    /** Queues an event. */
-    void Post(std::unique_ptr<bdmv::INavigatorEvent> event);
+    /**
+     * Queues an event.
+     *
+     * @param arguments those of the event's constructor
+     * @return false, and nothing is queued, if the queue is full: 256 events fit between two calls
+     *         of Settle()
+     */
+    template <typename Event, typename... Arguments> bool Post(Arguments&&... arguments)
+    {
+        return m_Queue.Post<Event>(std::forward<Arguments>(arguments)...);
+    }
 
     /**
      * Waits until everything posted has been delivered.
@@ -53,17 +61,16 @@ public:
     void Settle();
 
 private:
+    class SettledEvent;
+
     void Deliver();
-    template <typename Condition>
-    void Wait(std::unique_lock<std::mutex>& lock, Condition condition);
 
     bdmv::INavigatorEvent::Listeners m_Listeners;
-    std::mutex m_Mutex; ///< guards the members below
-    std::condition_variable m_Changed;
-    std::deque<std::unique_ptr<bdmv::INavigatorEvent>> m_Queue;
-    std::uint64_t m_Undelivered = 0; ///< events queued or being dispatched
-    std::exception_ptr m_Failure;    ///< the first since the last Settle()
-    bool m_Ending = false;
+    bdmv::EventQueue m_Queue;
+    std::exception_ptr m_Failure; ///< the first since the last Settle(), of the delivering thread
+    std::mutex m_Mutex;           ///< guards m_IsSettled
+    std::condition_variable m_Settled;
+    bool m_IsSettled = false;
     std::thread m_Thread; ///< last, so that it starts after everything it uses is constructed
 };
 

@@ -5,7 +5,7 @@
 #ifndef DESKPLAYER_NAVIGATOR_EVENTSENDER_H
 #define DESKPLAYER_NAVIGATOR_EVENTSENDER_H
 
-#include <memory>
+#include <utility>
 
 #include "bdmvnavigator/iplaybackcontext.h"
 #include "navigator/eventdelivery.h"
@@ -32,9 +32,10 @@ public:
      * @param arguments the event's constructor arguments after the context
      * @throw any exception thrown by a listener
      */
-    template <typename Event, typename... Arguments> void Send(Arguments... arguments)
+    template <typename Event, typename... Arguments> void Send(Arguments&&... arguments)
     {
-        m_rDelivery.Post(std::make_unique<Event>(m_rContext, arguments...));
+        // There is a place: nothing has been posted since the last call.
+        m_rDelivery.Post<Event>(m_rContext, std::forward<Arguments>(arguments)...);
         m_rDelivery.Settle();
     }
 

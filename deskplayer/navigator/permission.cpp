@@ -53,12 +53,12 @@ Outcome Permission::CheckMask(bd::UserOperationMaskDef operation) const
         return Outcome::Done();
     }
     if (g_u1Bduopmask == MaskOverrideForbidsAll) {
-        return Outcome::Refused(NameOf(operation) +
+        return Outcome::Refused(NameOrNumber(operation) +
                                 " is forbidden by the debug override KEVRO_UOPMASK=2");
     }
     const std::string list = "play list " + std::to_string(loaded.number);
     const std::string playItem = "play item " + std::to_string(m_rState.item);
-    return Outcome::Refused(NameOf(operation) + " is forbidden by " +
+    return Outcome::Refused(NameOrNumber(operation) + " is forbidden by " +
                             (!byItem       ? list
                              : !byPlayList ? playItem
                                            : list + " and its " + playItem));

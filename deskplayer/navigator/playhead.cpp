@@ -135,7 +135,8 @@ Ticks Playhead::NextStop() const
 Ticks Playhead::NextStopForward() const
 {
     const Ticks position = m_rState.position;
-    Ticks stop = std::min(EndOfItem(m_rState.item), position - position % PositionInterval + PositionInterval);
+    Ticks stop = std::min(EndOfItem(m_rState.item),
+                          position - position % PositionInterval + PositionInterval);
     const auto consider = [&stop, position](std::optional<Ticks> candidate) {
         if (candidate && *candidate > position) {
             stop = std::min(stop, *candidate);

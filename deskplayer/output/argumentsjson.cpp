@@ -1,6 +1,7 @@
 #include "output/argumentsjson.h"
 
 #include "bd/constants.h"
+#include "output/arguments.h"
 
 namespace deskplayer
 {
@@ -30,13 +31,12 @@ ordered_json ToJson(const bd::ZoomRectangleDef& rectangle)
 
 } // namespace
 
-ordered_json ArgumentsJson(const Callback& callback)
+ordered_json ArgumentsJson(const bdmv::Callback& callback)
 {
     ordered_json arguments = ordered_json::object();
-    for (const Argument& argument : callback.arguments) {
-        arguments[argument.name] =
-            std::visit([](const auto& value) { return ToJson(value); }, argument.value);
-    }
+    VisitShownArguments(callback, [&arguments](const char* name, const auto& value) {
+        arguments[name] = ToJson(value);
+    });
     return arguments;
 }
 

@@ -7,7 +7,7 @@
 
 #include <nlohmann/json.hpp>
 
-#include "output/callbacklistener.h"
+#include "clientkit/callback.h"
 
 namespace deskplayer
 {
@@ -16,7 +16,7 @@ namespace deskplayer
  * An object with a member for every argument, in order. Positions are in 45 kHz ticks, or null;
  * rectangles are objects.
  */
-nlohmann::ordered_json ArgumentsJson(const Callback& callback);
+nlohmann::ordered_json ArgumentsJson(const bdmv::Callback& callback);
 
 } // namespace deskplayer
 

@@ -1,6 +1,7 @@
 #include "output/argumentstext.h"
 
 #include "bd/constants.h"
+#include "output/arguments.h"
 #include "text/timetext.h"
 
 namespace deskplayer
@@ -46,9 +47,13 @@ std::string ValueText(const bd::ZoomRectangleDef& rectangle)
 
 } // namespace
 
-std::string TextOf(const ArgumentValue& value)
+std::vector<ArgumentText> ArgumentTexts(const bdmv::Callback& callback)
 {
-    return std::visit([](const auto& content) { return ValueText(content); }, value);
+    std::vector<ArgumentText> texts;
+    VisitShownArguments(callback, [&texts](const char* name, const auto& value) {
+        texts.push_back({name, ValueText(value)});
+    });
+    return texts;
 }
 
 } // namespace deskplayer

@@ -6,14 +6,21 @@
 #define DESKPLAYER_OUTPUT_ARGUMENTSTEXT_H
 
 #include <string>
+#include <vector>
 
-#include "output/callbacklistener.h"
+#include "clientkit/callback.h"
 
 namespace deskplayer
 {
 
-/** A value without blanks: "true", "00:01:30.500", "1080p", "1920x1080+0+0". */
-std::string TextOf(const ArgumentValue& value);
+/** An argument of a callback. */
+struct ArgumentText {
+    const char* name;
+    std::string value; ///< without blanks: "true", "00:01:30.500", "1080p", "1920x1080+0+0"
+};
+
+/** The arguments of a callback, in order. */
+std::vector<ArgumentText> ArgumentTexts(const bdmv::Callback& callback);
 
 } // namespace deskplayer
 

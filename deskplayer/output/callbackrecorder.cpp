@@ -9,11 +9,11 @@
 namespace deskplayer
 {
 
-void CallbackRecorder::OnCallback(const Callback& callback)
+void CallbackRecorder::OnCallback(const bdmv::Callback& callback)
 {
-    Recorded recorded = {InfoOf(callback.id).name, {}};
-    for (const Argument& argument : callback.arguments) {
-        recorded.arguments.push_back(std::string(argument.name) + "=" + TextOf(argument.value));
+    Recorded recorded = {NameOf(callback.Id()), {}};
+    for (const ArgumentText& argument : ArgumentTexts(callback)) {
+        recorded.arguments.push_back(std::string(argument.name) + "=" + argument.value);
     }
     m_Callbacks.push_back(std::move(recorded));
 }

@@ -9,7 +9,7 @@
 #include <string_view>
 #include <vector>
 
-#include "output/callbacklistener.h"
+#include "clientkit/callback.h"
 
 namespace deskplayer
 {
@@ -20,7 +20,7 @@ namespace deskplayer
  * Records on the delivering thread. The navigator's thread may call the other operations whenever
  * no event is queued or being dispatched.
  */
-class CallbackRecorder : public CallbackListener
+class CallbackRecorder : public bdmv::CallbackListener
 {
 public:
     /** Forgets all callbacks. */
@@ -47,7 +47,7 @@ private:
         std::vector<std::string> arguments;
     };
 
-    void OnCallback(const Callback& callback) override;
+    void OnCallback(const bdmv::Callback& callback) override;
 
     std::vector<Recorded> m_Callbacks;
 };

@@ -6,14 +6,13 @@
 namespace deskplayer
 {
 
-void JsonOutput::Write(const Callback& callback)
+void JsonOutput::Write(const bdmv::Callback& callback)
 {
-    const CallbackInfo& info = InfoOf(callback.id);
     const Ticks now = Now();
     const nlohmann::ordered_json line = {{"ticks", now.count()},
                                          {"time", TimeText(now)},
-                                         {"interface", NameOf(info.interface)},
-                                         {"callback", info.name},
+                                         {"interface", NameOf(InterfaceOf(callback.Id()))},
+                                         {"callback", NameOf(callback.Id())},
                                          {"arguments", ArgumentsJson(callback)}};
     Stream() << line.dump() << '\n';
 }

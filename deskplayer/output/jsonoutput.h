@@ -21,7 +21,7 @@ public:
     using Output::Output;
 
 private:
-    void Write(const Callback& callback) override;
+    void Write(const bdmv::Callback& callback) override;
 };
 
 } // namespace deskplayer

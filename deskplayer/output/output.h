@@ -7,8 +7,8 @@
 
 #include <ostream>
 
+#include "clientkit/callback.h"
 #include "navigator/virtualclock.h"
-#include "output/callbacklistener.h"
 #include "output/outputfilter.h"
 
 namespace deskplayer
@@ -20,7 +20,7 @@ namespace deskplayer
  * Writes on the delivering thread and never flushes. The output is complete once this object is
  * destroyed; the state of the stream shows whether writing succeeded.
  */
-class Output : public CallbackListener
+class Output : public bdmv::CallbackListener
 {
 public:
     /** @param stream does not throw; it and @p clock must outlive the output */
@@ -41,15 +41,15 @@ protected:
 
 private:
     /** Called for every callback, for outputs that also need those the filter hides. */
-    virtual void Follow(const Callback& /*callback*/) {}
+    virtual void Follow(const bdmv::Callback& /*callback*/) {}
 
     /** Called for every callback that passes the filter, after Follow(). */
-    virtual void Write(const Callback& callback) = 0;
+    virtual void Write(const bdmv::Callback& callback) = 0;
 
-    void OnCallback(const Callback& callback) final
+    void OnCallback(const bdmv::Callback& callback) final
     {
         Follow(callback);
-        if (m_Filter.Passes(callback.id)) {
+        if (m_Filter.Passes(callback.Id())) {
             Write(callback);
         }
     }

@@ -1,20 +1,24 @@
 #include "output/outputfilter.h"
 
-#include <algorithm>
 #include <vector>
 
 #include "text/choice.h"
+#include "text/names.h"
 
 namespace deskplayer
 {
 
 void OutputFilter::KeepInterfaces(std::string_view interfaces)
 {
-    const std::vector<std::string_view> names(InterfaceNames.begin(), InterfaceNames.end());
+    std::vector<std::string_view> names;
+    for (int interface = 0; interface < bdmv::ListenerInterface__sizeof; ++interface) {
+        names.emplace_back(NameOf(static_cast<bdmv::ListenerInterface>(interface)));
+    }
     CallbackSet kept;
     for (const std::size_t chosen : FindChoices(interfaces, "a listener interface", names)) {
-        for (std::size_t id = 0; id < AllCallbacks.size(); ++id) {
-            if (AllCallbacks[id].interface == static_cast<ListenerInterface>(chosen)) {
+        for (std::size_t id = 0; id < kept.size(); ++id) {
+            if (InterfaceOf(static_cast<bdmv::CallbackId>(id)) ==
+                static_cast<bdmv::ListenerInterface>(chosen)) {
                 kept.set(id);
             }
         }
@@ -24,11 +28,8 @@ void OutputFilter::KeepInterfaces(std::string_view interfaces)
 
 void OutputFilter::KeepCallbacks(std::string_view callbacks)
 {
-    std::vector<std::string_view> names(AllCallbacks.size());
-    std::transform(AllCallbacks.begin(), AllCallbacks.end(), names.begin(),
-                   [](const CallbackInfo& info) { return info.name; });
     CallbackSet kept;
-    for (const std::size_t id : FindChoices(callbacks, "a callback", names)) {
+    for (const std::size_t id : FindChoices(callbacks, "a callback", CallbackNames())) {
         kept.set(id);
     }
     m_Passing &= kept;

@@ -8,7 +8,7 @@
 #include <bitset>
 #include <string_view>
 
-#include "output/callbacks.h"
+#include "clientkit/callbackid.h"
 
 namespace deskplayer
 {
@@ -20,7 +20,7 @@ public:
     /**
      * Keeps only the callbacks of some interfaces.
      *
-     * @param interfaces InterfaceNames separated by commas: "control,settings"
+     * @param interfaces names of bdmv::ListenerInterface separated by commas: "control,settings"
      * @throw std::invalid_argument names the unknown word and a similar one or all valid ones; the
      *        filter is unchanged
      */
@@ -29,15 +29,15 @@ public:
     /**
      * Keeps only some callbacks.
      *
-     * @param callbacks names of AllCallbacks separated by commas: "PlayItem,AudioInfo"
+     * @param callbacks names of bdmv::CallbackId separated by commas: "PlayItem,AudioInfo"
      * @throw std::invalid_argument as KeepInterfaces() does
      */
     void KeepCallbacks(std::string_view callbacks);
 
-    bool Passes(CallbackId id) const { return m_Passing[static_cast<std::size_t>(id)]; }
+    bool Passes(bdmv::CallbackId id) const { return m_Passing[static_cast<std::size_t>(id)]; }
 
 private:
-    using CallbackSet = std::bitset<AllCallbacks.size()>;
+    using CallbackSet = std::bitset<bdmv::Callback__sizeof>;
 
     CallbackSet m_Passing = CallbackSet().set();
 };

@@ -22,20 +22,8 @@ constexpr const char* Yellow = "\033[33m";
 constexpr const char* Magenta = "\033[35m";
 constexpr const char* Cyan = "\033[36m";
 
-const char* ColourOf(ListenerInterface interface)
-{
-    switch (interface) {
-    case ListenerInterface::Control:
-        return Green;
-    case ListenerInterface::Settings:
-        return Cyan;
-    case ListenerInterface::Button:
-        return Yellow;
-    case ListenerInterface::Interactive:
-        return Magenta;
-    }
-    return Reset;
-}
+/** Indexed by bdmv::ListenerInterface. */
+constexpr const char* Colours[] = {Green, Cyan, Yellow, Magenta};
 
 } // namespace
 
@@ -45,20 +33,21 @@ TextOutput::TextOutput(std::ostream& stream, const VirtualClock& clock, const Ou
 {
 }
 
-void TextOutput::Write(const Callback& callback)
+void TextOutput::Write(const bdmv::Callback& callback)
 {
-    const CallbackInfo& info = InfoOf(callback.id);
+    const std::string_view name = NameOf(callback.Id());
+    const std::vector<ArgumentText> arguments = ArgumentTexts(callback);
 
     Paint(TimeText(Now()), Dim);
     Stream() << "  ";
-    Paint(info.name, ColourOf(info.interface));
-    if (!callback.arguments.empty()) {
-        Stream() << std::string(NameWidth - info.name.size(), ' ');
+    Paint(name, Colours[InterfaceOf(callback.Id())]);
+    if (!arguments.empty()) {
+        Stream() << std::string(NameWidth - name.size(), ' ');
     }
-    for (const Argument& argument : callback.arguments) {
+    for (const ArgumentText& argument : arguments) {
         Stream() << ' ';
         Paint(std::string(argument.name) + "=", Dim);
-        Stream() << TextOf(argument.value);
+        Stream() << argument.value;
     }
     Stream() << '\n';
 }

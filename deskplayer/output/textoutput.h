@@ -30,7 +30,7 @@ public:
                bool coloured);
 
 private:
-    void Write(const Callback& callback) override;
+    void Write(const bdmv::Callback& callback) override;
     void Paint(std::string_view text, const char* colour);
 
     bool m_Coloured;

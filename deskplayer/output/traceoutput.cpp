@@ -1,14 +1,14 @@
 #include "output/traceoutput.h"
 
-#include <algorithm>
-#include <array>
 #include <utility>
 
 #include "output/argumentsjson.h"
+#include "text/names.h"
 
 namespace deskplayer
 {
 
+namespace callbacks = bdmv::callbacks;
 using nlohmann::ordered_json;
 
 /** In order from top to bottom. */
@@ -27,31 +27,33 @@ enum class TraceOutput::Track : std::size_t {
     SecondaryAudio,
     PipSubtitles,
     Menu,
-    FirstInterface ///< followed by one track for every other ListenerInterface
+    FirstInterface ///< followed by one track for every other bdmv::ListenerInterface
+};
+
+/** Keeps its arguments as they were when it began: a callback's bytes do not last. */
+struct TraceOutput::Slice {
+    std::string name;
+    ordered_json arguments;
 };
 
 namespace
 {
 
-/** Indexed by TraceOutput::Track. */
-constexpr std::array<std::string_view, 18> TrackNames{"playback",
-                                                      "play mode",
-                                                      "play list",
-                                                      "play item",
-                                                      "chapter",
-                                                      "video",
-                                                      "audio",
-                                                      "subtitles",
-                                                      "angle",
-                                                      "interactive graphics",
-                                                      "secondary video",
-                                                      "secondary audio",
-                                                      "picture-in-picture subtitles",
-                                                      "menu",
-                                                      NameOf(ListenerInterface::Control),
-                                                      NameOf(ListenerInterface::Settings),
-                                                      NameOf(ListenerInterface::Button),
-                                                      NameOf(ListenerInterface::Interactive)};
+/** The tracks before FirstInterface, indexed by TraceOutput::Track. */
+constexpr const char* TrackNames[] = {"playback",
+                                      "play mode",
+                                      "play list",
+                                      "play item",
+                                      "chapter",
+                                      "video",
+                                      "audio",
+                                      "subtitles",
+                                      "angle",
+                                      "interactive graphics",
+                                      "secondary video",
+                                      "secondary audio",
+                                      "picture-in-picture subtitles",
+                                      "menu"};
 
 constexpr int Process = 1;
 
@@ -68,13 +70,10 @@ ordered_json Metadata(const char* name, std::size_t thread, const char* member, 
             {"args", {{member, value}}}};
 }
 
-/** @param name of an argument of the callback */
-template <typename Value> const Value& ValueOf(std::string_view name, const Callback& callback)
+/** @tparam Arguments those of this callback */
+template <typename Arguments> const Arguments& In(const bdmv::Callback& callback)
 {
-    const auto argument =
-        std::find_if(callback.arguments.begin(), callback.arguments.end(),
-                     [name](const Argument& candidate) { return candidate.name == name; });
-    return std::get<Value>(argument->value);
+    return *callback.As<Arguments>();
 }
 
 } // namespace
@@ -83,8 +82,12 @@ TraceOutput::TraceOutput(std::ostream& stream, const VirtualClock& clock,
                          const OutputFilter& filter)
     : Output(stream, clock, filter)
 {
-    for (const std::string_view name : TrackNames) {
-        m_Tracks.push_back({std::string(name), false, std::nullopt});
+    for (const char* const name : TrackNames) {
+        m_Tracks.push_back({name, false, nullptr});
+    }
+    for (int interface = 0; interface < bdmv::ListenerInterface__sizeof; ++interface) {
+        m_Tracks.push_back(
+            {NameOf(static_cast<bdmv::ListenerInterface>(interface)), false, nullptr});
     }
     Append(Metadata("process_name", 0, "name", "session"));
 }
@@ -97,95 +100,100 @@ TraceOutput::~TraceOutput()
     Stream() << "\n]\n";
 }
 
-void TraceOutput::Follow(const Callback& callback)
+void TraceOutput::Follow(const bdmv::Callback& callback)
 {
-    switch (callback.id) {
-    case CallbackId::PlayStarted:
-    case CallbackId::Continued:
+    switch (callback.Id()) {
+    case bdmv::CallbackPlayStarted:
+    case bdmv::CallbackContinued:
         Begin(Track::Playback, Playing, callback);
         break;
-    case CallbackId::Paused:
+    case bdmv::CallbackPaused:
         Begin(Track::Playback, "Paused", callback);
         break;
-    case CallbackId::StillOn:
+    case bdmv::CallbackStillOn:
         Begin(Track::Playback, "Still", callback);
         break;
-    case CallbackId::StillOff:
+    case bdmv::CallbackStillOff:
         if (StateOf(Track::Playback).slice && StateOf(Track::Playback).slice->name == "Still") {
             Begin(Track::Playback, Playing, callback);
         }
         break;
-    case CallbackId::Suspended:
+    case bdmv::CallbackSuspended:
         m_BeforeSuspension = StateOf(Track::Playback).slice ? StateOf(Track::Playback).slice->name
                                                             : std::string(Playing);
         Begin(Track::Playback, "Suspended", callback);
         break;
-    case CallbackId::Resumed:
+    case bdmv::CallbackResumed:
         Begin(Track::Playback, m_BeforeSuspension, callback);
         break;
-    case CallbackId::SystemSuspended:
+    case bdmv::CallbackSystemSuspended:
         Begin(Track::Playback, "Standby", callback);
         break;
-    case CallbackId::SystemResumed:
-        if (ValueOf<bool>("playing", callback)) {
+    case bdmv::CallbackSystemResumed:
+        if (In<callbacks::SystemResumed>(callback).playing) {
             Begin(Track::Playback, Playing, callback);
         } else {
             EndPlayback();
         }
         break;
-    case CallbackId::PlayFailed:
-    case CallbackId::Stopped:
-    case CallbackId::Finished:
-    case CallbackId::ResumeFailed:
-    case CallbackId::SystemResumeFailed:
+    case bdmv::CallbackPlayFailed:
+    case bdmv::CallbackStopped:
+    case bdmv::CallbackFinished:
+    case bdmv::CallbackResumeFailed:
+    case bdmv::CallbackSystemResumeFailed:
         EndPlayback();
         break;
 
-    case CallbackId::PlayMode:
+    case bdmv::CallbackPlayMode:
         Begin(Track::PlayMode,
-              ValueOf<std::string>("direction", callback) + " " +
-                  ValueOf<std::string>("speed", callback),
+              NameOrNumber(In<callbacks::PlayMode>(callback).direction) + " " +
+                  NameOrNumber(In<callbacks::PlayMode>(callback).speed),
               callback);
         break;
-    case CallbackId::Playlist:
-        BeginNumbered(Track::PlayList, "playListId", callback);
+    case bdmv::CallbackPlaylist:
+        BeginNumbered(Track::PlayList, In<callbacks::Playlist>(callback).playListId, callback);
         break;
-    case CallbackId::PlayItem:
-        BeginNumbered(Track::PlayItem, "playItemId", callback);
+    case bdmv::CallbackPlayItem:
+        BeginNumbered(Track::PlayItem, In<callbacks::PlayItem>(callback).playItemId, callback);
         break;
-    case CallbackId::ChapterNumber:
-        BeginCounted(Track::Chapter, "chapter", callback);
-        break;
-
-    case CallbackId::VideoInfo:
-        BeginCounted(Track::Video, "number", callback);
-        break;
-    case CallbackId::AudioInfo:
-        BeginCounted(Track::Audio, "number", callback);
-        break;
-    case CallbackId::PresentationGraphicsInfo:
-        BeginCounted(Track::Subtitles, "number", callback);
-        break;
-    case CallbackId::AngleInfo:
-        BeginCounted(Track::Angle, "number", callback);
-        break;
-    case CallbackId::InteractiveGraphicsInfo:
-        BeginCounted(Track::InteractiveGraphics, "number", callback);
-        break;
-    case CallbackId::SecondaryVideoInfo:
-        BeginCounted(Track::SecondaryVideo, "number", callback);
-        break;
-    case CallbackId::SecondaryAudioInfo:
-        BeginCounted(Track::SecondaryAudio, "number", callback);
-        break;
-    case CallbackId::PipPgTextStInfo:
-        BeginCounted(Track::PipSubtitles, "number", callback);
+    case bdmv::CallbackChapterNumber:
+        BeginCounted(Track::Chapter, In<callbacks::ChapterNumber>(callback).chapter, callback);
         break;
 
-    case CallbackId::InteractiveGraphicsVisible:
+    case bdmv::CallbackVideoInfo:
+        BeginCounted(Track::Video, In<callbacks::VideoInfo>(callback).number, callback);
+        break;
+    case bdmv::CallbackAudioInfo:
+        BeginCounted(Track::Audio, In<callbacks::AudioInfo>(callback).number, callback);
+        break;
+    case bdmv::CallbackPresentationGraphicsInfo:
+        BeginCounted(Track::Subtitles, In<callbacks::PresentationGraphicsInfo>(callback).number,
+                     callback);
+        break;
+    case bdmv::CallbackAngleInfo:
+        BeginCounted(Track::Angle, In<callbacks::AngleInfo>(callback).number, callback);
+        break;
+    case bdmv::CallbackInteractiveGraphicsInfo:
+        BeginCounted(Track::InteractiveGraphics,
+                     In<callbacks::InteractiveGraphicsInfo>(callback).number, callback);
+        break;
+    case bdmv::CallbackSecondaryVideoInfo:
+        BeginCounted(Track::SecondaryVideo, In<callbacks::SecondaryVideoInfo>(callback).number,
+                     callback);
+        break;
+    case bdmv::CallbackSecondaryAudioInfo:
+        BeginCounted(Track::SecondaryAudio, In<callbacks::SecondaryAudioInfo>(callback).number,
+                     callback);
+        break;
+    case bdmv::CallbackPipPgTextStInfo:
+        BeginCounted(Track::PipSubtitles, In<callbacks::PipPgTextStInfo>(callback).number,
+                     callback);
+        break;
+
+    case bdmv::CallbackInteractiveGraphicsVisible:
         Begin(Track::Menu, "Visible", callback);
         break;
-    case CallbackId::InteractiveGraphicsInvisible:
+    case bdmv::CallbackInteractiveGraphicsInvisible:
         End(Track::Menu);
         break;
 
@@ -194,33 +202,30 @@ void TraceOutput::Follow(const Callback& callback)
     }
 }
 
-void TraceOutput::Write(const Callback& callback)
+void TraceOutput::Write(const bdmv::Callback& callback)
 {
-    const CallbackInfo& info = InfoOf(callback.id);
-    const auto track =
-        static_cast<std::size_t>(Track::FirstInterface) + static_cast<std::size_t>(info.interface);
+    const auto track = static_cast<std::size_t>(Track::FirstInterface) +
+                       static_cast<std::size_t>(InterfaceOf(callback.Id()));
     AppendEvent(static_cast<Track>(track), "i",
-                {{"s", "t"}, {"name", info.name}, {"args", ArgumentsJson(callback)}});
+                {{"s", "t"}, {"name", NameOf(callback.Id())}, {"args", ArgumentsJson(callback)}});
 }
 
-void TraceOutput::Begin(Track track, const std::string& name, const Callback& callback)
+void TraceOutput::Begin(Track track, const std::string& name, const bdmv::Callback& callback)
 {
     End(track);
-    StateOf(track).slice = Slice{name, callback};
+    StateOf(track).slice = std::make_unique<Slice>(Slice{name, ArgumentsJson(callback)});
     AppendSlice(track, "B", *StateOf(track).slice);
 }
 
-void TraceOutput::BeginNumbered(Track track, std::string_view number, const Callback& callback)
+void TraceOutput::BeginNumbered(Track track, bd::UInt32 number, const bdmv::Callback& callback)
 {
-    Begin(track,
-          StateOf(track).name + " " + std::to_string(ValueOf<std::uint64_t>(number, callback)),
-          callback);
+    Begin(track, StateOf(track).name + " " + std::to_string(number), callback);
 }
 
 /** Streams, angles and chapters are numbered from 1; 0 means none. */
-void TraceOutput::BeginCounted(Track track, std::string_view number, const Callback& callback)
+void TraceOutput::BeginCounted(Track track, bd::UInt32 number, const bdmv::Callback& callback)
 {
-    if (ValueOf<std::uint64_t>(number, callback) == 0) {
+    if (number == 0) {
         End(track);
     } else {
         BeginNumbered(track, number, callback);
@@ -229,7 +234,7 @@ void TraceOutput::BeginCounted(Track track, std::string_view number, const Callb
 
 void TraceOutput::End(Track track)
 {
-    if (const std::optional<Slice> slice = std::exchange(StateOf(track).slice, std::nullopt)) {
+    if (const std::unique_ptr<Slice> slice = std::move(StateOf(track).slice)) {
         AppendSlice(track, "E", *slice);
     }
 }
@@ -245,7 +250,7 @@ void TraceOutput::EndPlayback()
 /** Gives begin and end the same members, because some viewers match them by name and arguments. */
 void TraceOutput::AppendSlice(Track track, const char* phase, const Slice& slice)
 {
-    AppendEvent(track, phase, {{"name", slice.name}, {"args", ArgumentsJson(slice.callback)}});
+    AppendEvent(track, phase, {{"name", slice.name}, {"args", slice.arguments}});
 }
 
 void TraceOutput::AppendEvent(Track track, const char* phase, const ordered_json& members)

@@ -6,9 +6,8 @@
 #define DESKPLAYER_OUTPUT_TRACEOUTPUT_H
 
 #include <cstddef>
-#include <optional>
+#include <memory>
 #include <string>
-#include <string_view>
 #include <vector>
 
 #include <nlohmann/json_fwd.hpp>
@@ -41,23 +40,20 @@ public:
 private:
     enum class Track : std::size_t;
 
-    struct Slice {
-        std::string name;
-        Callback callback; ///< that began it
-    };
+    struct Slice;
 
     struct TrackState {
         std::string name;
-        bool named = false;         ///< whether the trace has named it
-        std::optional<Slice> slice; ///< the open one
+        bool named = false;           ///< whether the trace has named it
+        std::unique_ptr<Slice> slice; ///< the open one; null if there is none
     };
 
-    void Follow(const Callback& callback) override;
-    void Write(const Callback& callback) override;
+    void Follow(const bdmv::Callback& callback) override;
+    void Write(const bdmv::Callback& callback) override;
 
-    void Begin(Track track, const std::string& name, const Callback& callback);
-    void BeginNumbered(Track track, std::string_view number, const Callback& callback);
-    void BeginCounted(Track track, std::string_view number, const Callback& callback);
+    void Begin(Track track, const std::string& name, const bdmv::Callback& callback);
+    void BeginNumbered(Track track, bd::UInt32 number, const bdmv::Callback& callback);
+    void BeginCounted(Track track, bd::UInt32 number, const bdmv::Callback& callback);
     void End(Track track);
     void EndPlayback();
     void AppendSlice(Track track, const char* phase, const Slice& slice);

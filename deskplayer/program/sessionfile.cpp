@@ -7,9 +7,9 @@
 #include <array>
 #include <cstddef>
 
-#include "output/callbacks.h"
 #include "program/failure.h"
 #include "session/commands.h"
+#include "text/names.h"
 #include "text/printable.h"
 
 namespace deskplayer
@@ -75,12 +75,7 @@ std::string ReadSession(const std::string& fileName)
 
 std::vector<ScriptStep> ReadSessionFile(const std::string& fileName)
 {
-    std::vector<std::string_view> callbacks;
-    callbacks.reserve(AllCallbacks.size());
-    for (const CallbackInfo& info : AllCallbacks) {
-        callbacks.push_back(info.name);
-    }
-    return ParseScript(ReadSession(fileName), fileName, CommandSyntaxes(), callbacks);
+    return ParseScript(ReadSession(fileName), fileName, CommandSyntaxes(), CallbackNames());
 }
 
 } // namespace deskplayer

@@ -39,7 +39,7 @@ std::string PlaybackSummary(Desk& desk)
     PlaybackContext& context = navigator.Context();
     const bd::PlayMode mode = context.GetPlayMode();
     if (mode != bd::PlayMode()) {
-        line += "  " + NameOf(mode.Direction()) + " " + NameOf(mode.Speed());
+        line += "  " + NameOrNumber(mode.Direction()) + " " + NameOrNumber(mode.Speed());
     }
     const TimeLine& timeLine = navigator.LoadedList().timeLine;
     line += "  " + Seconds(Ticks(context.GetCurrentTimePosition())) + " of " +

@@ -77,6 +77,8 @@ Callback::Callback(const Callback& other) : m_Id(other.m_Id), m_Arguments()
 Callback& Callback::operator=(const Callback& other)
 {
     if (this != &other) {
+        // Releases a program last, because its destructor may destroy other.
+        const Callback former(*this);
         Destroy();
         m_Id = other.m_Id;
         Copy(other);

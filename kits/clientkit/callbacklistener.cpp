@@ -1,4 +1,4 @@
-#include "clientkit/callbacklistener.h"
+#include "clientkit/callback.h"
 
 namespace bdmv
 {

@@ -38,7 +38,7 @@
 #include <vector>
 
 #include "bd/threadmutex.h"
-#include "clientkit/callbacklistener.h"
+#include "clientkit/callback.h"
 #include "clientkit/playbackstatus.h"
 
 namespace bdmv

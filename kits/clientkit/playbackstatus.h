@@ -23,7 +23,7 @@
 #include <type_traits>
 
 #include "bd/threadmutex.h"
-#include "clientkit/callbacklistener.h"
+#include "clientkit/callback.h"
 
 namespace bdmv
 {

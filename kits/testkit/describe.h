@@ -1,14 +1,27 @@
 /**
  * @file
- * Values and calls as they appear in a journal.
+ * Values and calls as they appear in a journal and in failures of GoogleTest.
+ *
+ * @code
+ * bdmvtest::Describe(bd::PlaySpeedFast2);                   // "PlaySpeedFast2"
+ * bdmvtest::DescribeCall("TriggerSet", bd::TRIGGER_B, true); // "TriggerSet(TRIGGER_B, true)"
+ *
+ * EXPECT_EQ(mode.Speed(), bd::PlaySpeedFast2);              // a failure names both
+ * @endcode
+ *
+ * A program that lets GoogleTest print the library's types includes this header, or one that
+ * includes it, in every source that does; else GoogleTest may print numbers in all of them.
  */
 #ifndef TESTKIT_DESCRIBE_H
 #define TESTKIT_DESCRIBE_H
 
+#include <ostream>
 #include <string>
 #include <string_view>
 
 #include "bd/types.h"
+#include "bdmvnavigator/inavcontrollistener.h"
+#include "clientkit/names.h"
 #include "database/iprogramdata.h"
 #include "database/uomasktable.h"
 #include "testkit/enumerators.h"
@@ -47,12 +60,18 @@ inline std::string Describe(const bdmv::IProgramData::RefPtr& program);
 /** The bytes of a block and its size, in decimal. */
 inline std::string DescribeBytes(const void* data, bd::UInt32 size);
 
+/** Appends to a list that is separated by commas. */
+inline void AppendTo(std::string& list, const std::string& text)
+{
+    list += (list.empty() ? "" : ", ") + text;
+}
+
 /** The values, separated by commas. */
 template <typename... Values> std::string DescribeAll(const Values&... values)
 {
-    std::string text;
-    ((text += (text.empty() ? "" : ", ") + Describe(values)), ...);
-    return text;
+    std::string list;
+    (AppendTo(list, Describe(values)), ...);
+    return list;
 }
 
 /** A call: its name and its arguments. */
@@ -119,6 +138,108 @@ inline std::string Describe(const bdmv::IProgramData::RefPtr& program)
     return program ? "program shared by " + Describe(program.GetCount()) : "no program";
 }
 
+/** The operations that a mask forbids, as the mask is reported. */
+inline std::string DescribeOperations(const bdmv::UOMaskTable& mask)
+{
+    std::string operations;
+    for (const auto& operation : bdmv::NamesOf<bd::UserOperationMaskDef>()) {
+        if (mask.IsSet(operation.code)) {
+            AppendTo(operations, operation.name);
+        }
+    }
+    return "{" + operations + "}";
+}
+
 } // namespace bdmvtest
+
+// GoogleTest prints with these functions, which need nothing of it.
+
+namespace bdmv
+{
+
+inline void PrintTo(INavControlListener::FinishedReason reason, std::ostream* stream)
+{
+    *stream << bdmvtest::Describe(reason);
+}
+
+inline void PrintTo(const UOMaskTable& mask, std::ostream* stream)
+{
+    *stream << bdmvtest::DescribeOperations(mask);
+}
+
+} // namespace bdmv
+
+namespace bd
+{
+
+// Enumerators as a source writes them. These are no templates, because those would compete with the
+// one of GoogleTest.
+
+inline void PrintTo(PlayDirectionDef direction, std::ostream* stream)
+{
+    *stream << bdmvtest::Describe(direction);
+}
+
+inline void PrintTo(PlaySpeedDef speed, std::ostream* stream)
+{
+    *stream << bdmvtest::Describe(speed);
+}
+
+inline void PrintTo(TriggerType type, std::ostream* stream)
+{
+    *stream << bdmvtest::Describe(type);
+}
+
+inline void PrintTo(VideoFormatType format, std::ostream* stream)
+{
+    *stream << bdmvtest::Describe(format);
+}
+
+inline void PrintTo(VideoAspectRatioType aspectRatio, std::ostream* stream)
+{
+    *stream << bdmvtest::Describe(aspectRatio);
+}
+
+inline void PrintTo(AudioFormatType format, std::ostream* stream)
+{
+    *stream << bdmvtest::Describe(format);
+}
+
+inline void PrintTo(AudioSampleRateType sampleRate, std::ostream* stream)
+{
+    *stream << bdmvtest::Describe(sampleRate);
+}
+
+inline void PrintTo(AudioBitsPerSamplingType bitsPerSample, std::ostream* stream)
+{
+    *stream << bdmvtest::Describe(bitsPerSample);
+}
+
+inline void PrintTo(AudioChannelType channels, std::ostream* stream)
+{
+    *stream << bdmvtest::Describe(channels);
+}
+
+inline void PrintTo(UserOperationMaskDef operation, std::ostream* stream)
+{
+    *stream << bdmvtest::Describe(operation);
+}
+
+inline void PrintTo(const AudioInfoType& info, std::ostream* stream)
+{
+    *stream << bdmvtest::Describe(info);
+}
+
+inline void PrintTo(const PlayMode& mode, std::ostream* stream)
+{
+    *stream << bdmvtest::Describe(mode);
+}
+
+inline void PrintTo(const ZOOM_PARAM_Def& zoom, std::ostream* stream)
+{
+    *stream << bdmvtest::Describe(zoom);
+}
+
+} // namespace bd
 
 #endif

@@ -2,6 +2,13 @@
  * @file
  * A platform that records the calls it receives.
  *
+ * @code
+ * bdmvtest::Journal journal;
+ * bdmvtest::FakePlatform platform(&journal);
+ * event.Dispatch(listeners);
+ * EXPECT_EQ(journal.Take(), "log? 57 5 0 -> on\nlog 57 5 0: Sending Paused\n");
+ * @endcode
+ *
  * Entries in the journal:
  *
  *     log? 57 5 0 -> on                         KEVRO_Log_IsEnabled
@@ -25,6 +32,7 @@
 #include <cstdio>
 #include <cstdlib>
 #include <functional>
+#include <stdexcept>
 #include <string>
 #include <utility>
 
@@ -57,14 +65,14 @@ public:
      *
      * @param journal receives the entries; if null, lines are formatted and discarded without
      *                allocating
+     * @throw std::logic_error if there is a fake platform already
      */
     explicit FakePlatform(Journal* journal) : m_pJournal(journal)
     {
         SetLogSwitch([](KEVRO_UInt32, KEVRO_Int32, KEVRO_Bool) -> KEVRO_Bool { return 1; });
         FakePlatform* none = nullptr;
         if (!s_Installed.compare_exchange_strong(none, this)) {
-            std::fputs("bdmvtest::FakePlatform: already installed\n", stderr);
-            std::abort();
+            throw std::logic_error("bdmvtest::FakePlatform: already installed");
         }
     }
 

@@ -2,6 +2,14 @@
  * @file
  * A listener that writes every callback into the journal.
  *
+ * @code
+ * bdmvtest::Journal journal;
+ * bdmvtest::RecordingListener a(journal, "A");
+ * listeners.AddListener(&a);
+ * ...
+ * EXPECT_EQ(journal.Take(), "A.Paused()\nA.AngleInfo(2)\n");
+ * @endcode
+ *
  * Entries in the journal: the listener's name, the callback, and its arguments, enumerators by name
  * and numbers in decimal:
  *

@@ -2,6 +2,13 @@
  * @file
  * A playback context that answers with the values that a test has set.
  *
+ * @code
+ * bdmvtest::ScriptablePlaybackContext context;
+ * context.playListId = 800;
+ * context.onQuery = [](const std::string& operation) { ... };
+ * bdmv::PlaylistEvent event(context);
+ * @endcode
+ *
  * Entries in the journal: the operation, the values of its output parameters at the call, and its
  * answer:
  *

@@ -46,6 +46,13 @@ constexpr char LogSpdlog[] = "plain spdlog, null sink";
 constexpr char LogSpdlogQueue[] = "plain spdlog, queue, slow sink";
 constexpr char LogSpdlogQueueNull[] = "plain spdlog, queue, null sink";
 
+constexpr char QueueName[] = "bdmv::EventQueue";
+constexpr char DequeName[] = "std::deque, mutex, condition variable";
+constexpr char LockFreeName[] = "boost::lockfree::queue";
+constexpr char ConcurrentName[] = "moodycamel::ConcurrentQueue";
+constexpr int ProducerCounts[] = {0, 1, 2}; ///< 0: the delivering thread posts
+constexpr int EventsARound = 256;           ///< posted before the producers wait for the delivery
+
 constexpr char PlainName[] = "plain listener";
 constexpr char StatusName[] = "StatusListener";
 constexpr char RelayName[] = "ListenerRelay, one client";
@@ -58,6 +65,7 @@ void RegisterQtDelivery();
 void RegisterEvents();
 void RegisterThreads();
 void RegisterLogLines();
+void RegisterQueues();
 void RegisterClientKit();
 
 inline std::string DeliveryRow(const std::string& callback, const std::string& subject, int count)
@@ -73,6 +81,11 @@ inline std::string EventRow(const std::string& event, const std::string& what)
 inline std::string ThreadRow(const std::string& lists, const std::string& subject, int threads)
 {
     return "threads/" + lists + "/" + subject + "/" + std::to_string(threads);
+}
+
+inline std::string QueueRow(const std::string& queue, int producers)
+{
+    return "queue/" + queue + "/" + std::to_string(producers);
 }
 
 inline std::string LogRow(const std::string& what)

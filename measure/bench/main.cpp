@@ -1,5 +1,5 @@
-// Delivery, events, threads, log lines and the client kit in one run, so that their times are
-// comparable.
+// Delivery, events, threads, log lines, queues and the client kit in one run, so that their times
+// are comparable.
 
 #include "benchmarks.h"
 #include "kevro_linux.h"
@@ -15,6 +15,7 @@ int main(int argc, char** argv)
     bench::RegisterEvents();
     bench::RegisterThreads();
     bench::RegisterLogLines();
+    bench::RegisterQueues();
     bench::RegisterClientKit();
 
     bench::Report report;

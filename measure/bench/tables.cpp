@@ -155,6 +155,39 @@ void PrintLog(const Report& report, Goal& queued)
     }
 }
 
+/** Elapsed ns per event: posted, delivered to one listener and destroyed. */
+double QueueTime(const Report& report, const std::string& queue, int producers)
+{
+    const double wall = report[QueueRow(queue, producers)].wall;
+    return producers == 0 ? wall : wall * producers / EventsARound;
+}
+
+void PrintQueues(const Report& report, Goal& deque, Goal& fastest, Goal& allocations)
+{
+    std::printf("\nAn event posted, delivered to one listener and destroyed: elapsed ns, × deque\n"
+                "  %-40s%18s%18s%18s\n",
+                "", "one thread", "1 producer", "2 producers");
+    for (const char* const queue : {DequeName, LockFreeName, ConcurrentName, QueueName}) {
+        std::printf("  %-40s", queue);
+        for (const int producers : ProducerCounts) {
+            PrintTime(QueueTime(report, queue, producers), QueueTime(report, DequeName, producers));
+        }
+        std::printf("\n");
+    }
+    for (const int producers : ProducerCounts) {
+        const std::string where = std::to_string(producers) + " producers";
+        allocations.Judge(where,
+                          report.Largest(QueueRow(QueueName, producers), AllocationsCounter));
+        if (producers == 0) {
+            continue;
+        }
+        const double time = QueueTime(report, QueueName, producers);
+        deque.Judge(where, time / QueueTime(report, DequeName, producers));
+        fastest.Judge(where, time / std::min(QueueTime(report, LockFreeName, producers),
+                                             QueueTime(report, ConcurrentName, producers)));
+    }
+}
+
 /** A listener of the client kit, and the goal for it; without a goal null. */
 struct ClientKitSubject {
     const char* name;
@@ -192,16 +225,21 @@ void PrintTables(const Report& report)
     Goal allocations("allocations between Dispatch() and its return", 0);
     Goal lineOff("an event with its line off, × delivery alone plus one call of the switch", 1.15);
     Goal queued("a line into the queue, × vsnprintf alone", 1.5);
+    Goal deque("a queue's event, × deque", 0.6);
+    Goal fastest("a queue's event, × the faster of the lock-free queues", 1.1);
+    Goal queueAllocations("allocations from posting to the end of delivery", 0);
     Goal status("a delivery to StatusListener, × plain listener", 3);
 
     PrintDelivery(report, delivery);
     PrintEvents(report, allocations, lineOff);
     PrintThreads(report);
     PrintLog(report, queued);
+    PrintQueues(report, deque, fastest, queueAllocations);
     PrintClientKit(report, {{PlainName, nullptr}, {StatusName, &status}, {RelayName, nullptr}});
 
     std::printf("\nGoals\n");
-    for (const Goal* goal : {&delivery, &allocations, &lineOff, &queued, &status}) {
+    for (const Goal* goal : {&delivery, &allocations, &lineOff, &queued, &deque, &fastest,
+                             &queueAllocations, &status}) {
         goal->Print();
     }
 }

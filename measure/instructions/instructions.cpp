@@ -10,6 +10,7 @@
 #include "benchmarks.h"
 #include "context.h"
 #include "kevro_linux.h"
+#include "navigatorkit/eventqueue.h"
 #include "parkedthread.h"
 #include "subjects.h"
 
@@ -56,6 +57,26 @@ template <typename Event> void CountEvent(const char* name)
     });
 }
 
+/** An event through a queue, on one thread. */
+void CountQueue()
+{
+    bench::Context context;
+    bdmv::INavigatorEvent::Listeners listeners;
+    listeners.AddListener(&bench::Listeners()[0]);
+    bdmv::EventQueue queue(2 * Rounds);
+    const auto post = [&] { queue.Post<bdmv::PlayStartedEvent>(context); };
+    const auto dispatch = [&] { queue.DispatchNext(listeners); };
+    // A queue is busier than in its first minute: the counted events are not the most at once.
+    for (int i = 0; i < 2 * Rounds; ++i) {
+        post();
+    }
+    for (int i = 0; i < 2 * Rounds; ++i) {
+        dispatch();
+    }
+    Count("queue/post", post);
+    Count("queue/dispatch", dispatch);
+}
+
 } // namespace
 
 int main()
@@ -71,5 +92,6 @@ int main()
     CountEvent<bdmv::PlayStartedEvent>("PlayStartedEvent");
     CountEvent<bdmv::CurrentTimePositionEvent>("CurrentTimePositionEvent");
     CountEvent<bdmv::PlayItemEvent>("PlayItemEvent");
+    CountQueue();
     return 0;
 }

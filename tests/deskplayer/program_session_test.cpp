@@ -6,7 +6,7 @@
 #include <string>
 #include <thread>
 
-#include "output/callbacks.h"
+#include "clientkit/callbackid.h"
 #include "programtest.h"
 
 namespace
@@ -26,8 +26,8 @@ TEST_F(DeskPlayerSession, WithAllEventsCallsEveryCallbackAsExpected)
         called.insert(callback.substr(0, callback.find(' ')));
     }
     std::set<std::string> all;
-    for (const deskplayer::CallbackInfo& info : deskplayer::AllCallbacks) {
-        all.emplace(info.name);
+    for (int id = 0; id < bdmv::Callback__sizeof; ++id) {
+        all.emplace(NameOf(static_cast<bdmv::CallbackId>(id)));
     }
     EXPECT_EQ(all.size(), 56U);
     EXPECT_EQ(called, all);

@@ -151,7 +151,7 @@ INSTANTIATE_TEST_SUITE_P(Documents, NamedPaths,
 TEST(Architecture, NamesEveryFolderOfSources)
 {
     const std::set<std::string> named = PathsInCode("docs/architecture.md");
-    for (const char* const top : {"inc", "bdmv", "prv_inc", "bd", "ports", "deskplayer"}) {
+    for (const char* const top : {"inc", "bdmv", "prv_inc", "bd", "kits", "ports", "deskplayer"}) {
         for (const std::string& folder : FoldersOfSources(top)) {
             EXPECT_EQ(named.count(folder), 1U) << folder;
         }

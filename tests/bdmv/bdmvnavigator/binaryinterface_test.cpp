@@ -24,6 +24,7 @@
 #include "testkit/journal.h"
 #include "testkit/recordinglistener.h"
 #include "testkit/scriptableplaybackcontext.h"
+#include "virtualslot.h"
 
 #if defined(__clang__)
 // In machine code a virtual function is a plain function, and it is called as one.
@@ -35,38 +36,12 @@
 namespace
 {
 
+using bdmvtest::DestructorSlots;
+using bdmvtest::NotVirtual;
+using bdmvtest::SlotOf;
+
 constexpr long CompleteDestructorSlot = 0;
 constexpr long DeletingDestructorSlot = 1;
-constexpr long DestructorSlots = 2;
-constexpr long NotVirtual = -1;
-
-// Where the lowest bit of a function's address is in use, the adjustment of the object is doubled
-// and its lowest bit marks a virtual function.
-#if defined(__arm__) || defined(__aarch64__) || defined(__mips__)
-constexpr bool MarkIsInAdjustment = true;
-#else
-constexpr bool MarkIsInAdjustment = false;
-#endif
-
-/**
- * The slot of a virtual member function in the virtual table, from 0: the one that a call by name
- * uses.
- */
-template <typename Function> long SlotOf(Function function)
-{
-    struct {
-        std::intptr_t pointer; // to the function; for a virtual one its offset in the table
-        std::intptr_t adjustment;
-    } parts;
-    static_assert(sizeof(parts) == sizeof(function), "a pointer to member of the Itanium C++ ABI");
-    std::memcpy(&parts, &function, sizeof(parts));
-
-    const std::intptr_t size = sizeof(void*);
-    if (MarkIsInAdjustment) {
-        return (parts.adjustment & 1) != 0 ? parts.pointer / size : NotVirtual;
-    }
-    return (parts.pointer & 1) != 0 ? (parts.pointer - 1) / size : NotVirtual;
-}
 
 /** The function in a slot of an object's virtual table. */
 template <typename Function> Function TableEntry(const void* object, long slot)

@@ -25,30 +25,15 @@
 #include <utility>
 
 #include "bdmvnavigator/navigatorevent.h"
-#include "testkit/fakeplatform.h"
+#include "testkit/bench.h"
 #include "testkit/recordinglistener.h"
-#include "testkit/scriptableplaybackcontext.h"
 
 typedef bdmvtest::ScriptablePlaybackContext Context;
 typedef bd::EventListenerList<bdmv::INavigatorListener> Listeners;
 
-/** The entry of a call to the context. */
-inline std::string Queried(const std::string& query)
-{
-    return "context." + query + "\n";
-}
-
-/** The entries of a line that is written, and of the check of the log switch before it. */
-inline std::string Logged(const std::string& line, const std::string& tag = "57 5 0")
-{
-    return "log? " + tag + " -> on\nlog " + tag + ": " + line + "\n";
-}
-
-/** The entry of a line that is not written because the log switch is off. */
-inline std::string NotLogged(const std::string& tag = "57 5 0")
-{
-    return "log? " + tag + " -> off\n";
-}
+using bdmvtest::Logged;
+using bdmvtest::NotLogged;
+using bdmvtest::Queried;
 
 /** The entries of a callback that A, B and C receive, in this order. */
 inline std::string Fired(const std::string& callback)
@@ -56,8 +41,8 @@ inline std::string Fired(const std::string& callback)
     return "A." + callback + "\nB." + callback + "\nC." + callback + "\n";
 }
 
-/** A context, the listeners A, B and C in this order, and the journal of all calls. */
-class EventTest : public testing::Test
+/** The bench with the listeners A, B and C in this order. */
+class EventTest : public testing::Test, protected bdmvtest::Bench
 {
 protected:
     EventTest()
@@ -67,32 +52,9 @@ protected:
         listeners.AddListener(&c);
     }
 
-    /** Creates the event, dispatches it to A, B and C, and deletes it. Returns the whole journal.
-     */
-    template <typename Event> std::string Dispatch()
-    {
-        const std::unique_ptr<bdmv::INavigatorEvent> event(new Event(context));
-        event->Dispatch(listeners);
-        return journal.Take();
-    }
-
-    /** Runs an action of the test whenever the log switch is called. */
-    void WhenTheLogSwitchIsAsked(KEVRO_Bool answer, std::function<void()> action)
-    {
-        platform.SetLogSwitch(
-            [answer, action = std::move(action)](KEVRO_UInt32, KEVRO_Int32, KEVRO_Bool) {
-                action();
-                return answer;
-            });
-    }
-
-    bdmvtest::Journal journal;
-    bdmvtest::FakePlatform platform{&journal};
-    Context context{journal};
     bdmvtest::RecordingListener a{journal, "A"};
     bdmvtest::RecordingListener b{journal, "B"};
     bdmvtest::RecordingListener c{journal, "C"};
-    Listeners listeners;
 };
 
 /**

@@ -16,7 +16,7 @@ namespace
 class DeliveryThread : public testing::Test
 {
 protected:
-    template <typename Event> void Post() { delivery->Post(std::make_unique<Event>(context)); }
+    template <typename Event> void Post() { EXPECT_TRUE(delivery->Post<Event>(context)); }
 
     bdmvtest::Journal journal;
     bdmvtest::FakePlatform platform{&journal};

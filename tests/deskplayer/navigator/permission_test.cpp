@@ -50,7 +50,7 @@ TEST_F(PermissionWhilePlaying, NamesTheOverrideThatForbidsEveryOperation)
     for (const auto operation : {bd::UserOperationTimeSearch, bd::UserOperationPauseOn,
                                  bd::UserOperationStop, bd::UserOperationChapterSearch}) {
         EXPECT_EQ(permission.CheckMask(operation).Reason(),
-                  NameOf(operation) + " is forbidden by the debug override KEVRO_UOPMASK=2");
+                  NameOrNumber(operation) + " is forbidden by the debug override KEVRO_UOPMASK=2");
     }
     g_u1Bduopmask = 1;
     EXPECT_TRUE(permission.CheckMask(bd::UserOperationStop).IsDone());

@@ -6,7 +6,8 @@
 #include <fstream>
 #include <sstream>
 
-#include "everycallback.h"
+#include "kits/clientkit/everycallback.h"
+#include "output/arguments.h"
 #include "output/outputformat.h"
 
 namespace deskplayer
@@ -84,19 +85,15 @@ TEST(Documentation, ShowsTheActualOutput)
 TEST(Documentation, ListsEveryCallbackWithItsArguments)
 {
     const std::string documentation = Documentation();
-    CollectingListener listener;
-    CallEveryCallback(listener);
-
-    for (const Callback& callback : listener.callbacks) {
-        const CallbackInfo& info = InfoOf(callback.id);
+    for (const bdmv::Callback& callback : bdmvtest::EveryCallback()) {
         std::string row = "| `";
-        row.append(info.name).append("` | ").append(NameOf(info.interface)).append(" |");
+        row.append(NameOf(callback.Id())).append("` | ");
+        row.append(NameOf(InterfaceOf(callback.Id()))).append(" |");
         const char* separator = " ";
-        for (const Argument& argument : callback.arguments) {
-            row.append(separator).append("`").append(argument.name).append("` ");
-            row += std::visit([](const auto& value) { return KindOf(value); }, argument.value);
+        VisitShownArguments(callback, [&](const char* name, const auto& value) {
+            row.append(separator).append("`").append(name).append("` ").append(KindOf(value));
             separator = ", ";
-        }
+        });
         EXPECT_NE(documentation.find("\n" + row + " |\n"), std::string::npos) << row << " |";
     }
 }

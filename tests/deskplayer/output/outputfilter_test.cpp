@@ -5,6 +5,8 @@
 #include <stdexcept>
 #include <string>
 
+#include "text/names.h"
+
 namespace deskplayer
 {
 namespace
@@ -13,8 +15,8 @@ namespace
 std::size_t CountPassing(const OutputFilter& filter)
 {
     std::size_t count = 0;
-    for (std::size_t id = 0; id < AllCallbacks.size(); ++id) {
-        count += filter.Passes(static_cast<CallbackId>(id)) ? 1 : 0;
+    for (int id = 0; id < bdmv::Callback__sizeof; ++id) {
+        count += filter.Passes(static_cast<bdmv::CallbackId>(id)) ? 1 : 0;
     }
     return count;
 }
@@ -31,7 +33,7 @@ template <typename Operation> std::string MessageOf(Operation operation)
 
 TEST(OutputFilter, PassesEverythingAtFirst)
 {
-    EXPECT_EQ(CountPassing(OutputFilter()), AllCallbacks.size());
+    EXPECT_EQ(CountPassing(OutputFilter()), std::size_t{bdmv::Callback__sizeof});
 }
 
 TEST(OutputFilter, KeepsTheCallbacksOfInterfaces)
@@ -40,10 +42,10 @@ TEST(OutputFilter, KeepsTheCallbacksOfInterfaces)
     filter.KeepInterfaces("interactive,button");
 
     EXPECT_EQ(CountPassing(filter), 9U);
-    EXPECT_TRUE(filter.Passes(CallbackId::ExecuteButton));
-    EXPECT_TRUE(filter.Passes(CallbackId::InteractiveGraphicsInactive));
-    EXPECT_FALSE(filter.Passes(CallbackId::PlayStarted));
-    EXPECT_FALSE(filter.Passes(CallbackId::AudioInfo));
+    EXPECT_TRUE(filter.Passes(bdmv::CallbackExecuteButton));
+    EXPECT_TRUE(filter.Passes(bdmv::CallbackInteractiveGraphicsInactive));
+    EXPECT_FALSE(filter.Passes(bdmv::CallbackPlayStarted));
+    EXPECT_FALSE(filter.Passes(bdmv::CallbackAudioInfo));
 }
 
 TEST(OutputFilter, KeepsCallbacksByName)
@@ -52,8 +54,8 @@ TEST(OutputFilter, KeepsCallbacksByName)
     filter.KeepCallbacks("PlayItem,AudioInfo");
 
     EXPECT_EQ(CountPassing(filter), 2U);
-    EXPECT_TRUE(filter.Passes(CallbackId::PlayItem));
-    EXPECT_TRUE(filter.Passes(CallbackId::AudioInfo));
+    EXPECT_TRUE(filter.Passes(bdmv::CallbackPlayItem));
+    EXPECT_TRUE(filter.Passes(bdmv::CallbackAudioInfo));
 }
 
 TEST(OutputFilter, AcceptsANameTwice)
@@ -71,7 +73,7 @@ TEST(OutputFilter, NarrowsWithEveryOperation)
     filter.KeepCallbacks("Paused,PlayItem");
 
     EXPECT_EQ(CountPassing(filter), 1U);
-    EXPECT_TRUE(filter.Passes(CallbackId::Paused));
+    EXPECT_TRUE(filter.Passes(bdmv::CallbackPaused));
 
     filter.KeepInterfaces("settings");
     EXPECT_EQ(CountPassing(filter), 0U);
@@ -93,8 +95,8 @@ TEST(OutputFilter, NamesAnUnknownCallbackAndAllCallbacks)
 
     EXPECT_EQ(message.rfind("'Picture' is not a callback; expected PlayStarted, ", 0), 0U)
         << message;
-    for (const CallbackInfo& info : AllCallbacks) {
-        EXPECT_NE(message.find(' ' + std::string(info.name)), std::string::npos) << info.name;
+    for (const std::string_view name : CallbackNames()) {
+        EXPECT_NE(message.find(' ' + std::string(name)), std::string::npos) << name;
     }
 }
 
@@ -112,7 +114,7 @@ TEST(OutputFilter, IsUnchangedIfAWordIsInvalid)
     OutputFilter filter;
     EXPECT_THROW(filter.KeepCallbacks("Paused,?"), std::invalid_argument);
 
-    EXPECT_EQ(CountPassing(filter), AllCallbacks.size());
+    EXPECT_EQ(CountPassing(filter), std::size_t{bdmv::Callback__sizeof});
 }
 
 TEST(OutputFilter, MakesWordsInMessagesPrintable)

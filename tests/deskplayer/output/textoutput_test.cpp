@@ -8,7 +8,8 @@
 #include <sstream>
 
 #include "bd/constants.h"
-#include "everycallback.h"
+#include "kits/clientkit/everycallback.h"
+#include "text/names.h"
 
 namespace deskplayer
 {
@@ -96,16 +97,16 @@ TEST_F(TextLines, PrintsTheOperationsThatAMaskForbids)
 
 TEST_F(TextLines, WritesALineForEveryCallbackWithAlignedArguments)
 {
-    CallEveryCallback(listener);
+    bdmvtest::CallEveryCallback(listener);
 
     std::istringstream lines(stream.str());
     std::string line;
-    for (const CallbackInfo& info : AllCallbacks) {
-        ASSERT_TRUE(std::getline(lines, line)) << info.name;
+    for (const std::string_view name : CallbackNames()) {
+        ASSERT_TRUE(std::getline(lines, line)) << name;
         const std::string text = line.substr(std::string("00:00:00.000  ").size());
-        EXPECT_EQ(text.substr(0, text.find(' ')), info.name);
-        if (text != info.name) {
-            EXPECT_EQ(text.find_first_not_of(' ', info.name.size()), 28U) << line;
+        EXPECT_EQ(text.substr(0, text.find(' ')), name);
+        if (text != name) {
+            EXPECT_EQ(text.find_first_not_of(' ', name.size()), 28U) << line;
         }
     }
     EXPECT_FALSE(std::getline(lines, line)) << line;
@@ -119,7 +120,7 @@ TEST(TextOutputFilter, HidesCallbacks)
     filter.KeepInterfaces("button");
     TextOutput output(stream, clock, filter, false);
 
-    CallEveryCallback(output);
+    bdmvtest::CallEveryCallback(output);
 
     EXPECT_EQ(stream.str(),
               "00:00:00.000  ExecuteButton               ticket=25 buttonId=26 commands=3\n");

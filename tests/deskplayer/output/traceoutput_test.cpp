@@ -6,10 +6,12 @@
 #include <map>
 #include <optional>
 #include <sstream>
+#include <string>
+#include <vector>
 
 #include <nlohmann/json.hpp>
 
-#include "everycallback.h"
+#include "kits/clientkit/everycallback.h"
 
 namespace deskplayer
 {
@@ -108,7 +110,7 @@ std::vector<TimedEvent> EventsOfThreeRounds()
 {
     TracedSession session;
     for (int round = 0; round < 3; ++round) {
-        CallEveryCallback(*session.operator->());
+        bdmvtest::CallEveryCallback(*session.operator->());
         session.PassSecond();
     }
     return ReadTrace(session.Trace()).events;
@@ -125,18 +127,18 @@ TEST(TraceOutput, IsValidForAnEmptySession)
 TEST(TraceOutput, HasAnInstantForEveryCallbackOnTheTrackOfItsInterface)
 {
     TracedSession session;
-    CallEveryCallback(*session.operator->());
+    bdmvtest::CallEveryCallback(*session.operator->());
 
-    std::size_t instants = 0;
+    int instants = 0;
     for (const TimedEvent& event : ReadTrace(session.Trace()).events) {
         if (event.phase == "i") {
-            ASSERT_LT(instants, AllCallbacks.size());
-            const CallbackInfo& info = AllCallbacks[instants++];
-            EXPECT_EQ(event.name, info.name);
-            EXPECT_EQ(event.track, NameOf(info.interface)) << info.name;
+            const auto id = static_cast<bdmv::CallbackId>(instants++);
+            ASSERT_LT(id, bdmv::Callback__sizeof);
+            EXPECT_EQ(event.name, NameOf(id));
+            EXPECT_EQ(event.track, NameOf(InterfaceOf(id))) << NameOf(id);
         }
     }
-    EXPECT_EQ(instants, AllCallbacks.size());
+    EXPECT_EQ(instants, bdmv::Callback__sizeof);
 }
 
 TEST(TraceOutput, RestrictsInstantsToTheirTrack)
@@ -188,6 +190,23 @@ TEST(TraceOutput, GivesBothEndsOfASliceTheSameMembers)
     EXPECT_EQ(open.size(), 14U);
 }
 
+TEST(TraceOutput, GivesBothEndsOfStandbyTheBlockThatIsGoneByThen)
+{
+    TracedSession session;
+    std::vector<bd::UInt8> block = {0x00, 0xA5, 0xFF};
+    session->SystemSuspended(block.data(), 3);
+    block.assign(3, 0x11);
+    session->SystemResumed(true);
+
+    std::string data;
+    for (const TimedEvent& event : ReadTrace(session.Trace()).events) {
+        if (event.name == "Standby") {
+            data += event.phase + event.arguments.at("data").get<std::string>() + " ";
+        }
+    }
+    EXPECT_EQ(data, "B00a5ff E00a5ff ");
+}
+
 TEST(TraceOutput, HasTimesThatNeverDecrease)
 {
     std::uint64_t last = 0;
@@ -201,7 +220,7 @@ TEST(TraceOutput, HasTimesThatNeverDecrease)
 TEST(TraceOutput, NamesAndPlacesEveryTrack)
 {
     TracedSession session;
-    CallEveryCallback(*session.operator->());
+    bdmvtest::CallEveryCallback(*session.operator->());
 
     std::string tracks;
     for (const auto& [place, name] : ReadTrace(session.Trace()).tracks) {
@@ -349,7 +368,7 @@ TEST(TraceOutput, EndsTheSlicesOfPlaybackWithPlayback)
 {
     for (const char* track : {"playback", "play mode", "play list", "play item", "chapter"}) {
         TracedSession session;
-        CallEveryCallback(*session.operator->());
+        bdmvtest::CallEveryCallback(*session.operator->());
         session->PlayStarted();
         session.PassSecond();
         session->Stopped();
@@ -388,7 +407,7 @@ TEST(TraceOutput, ShowsEveryStateByItsNumberOrName)
         {"picture-in-picture subtitles", "picture-in-picture subtitles 18 0-1000"}};
     for (const auto& [track, slices] : expected) {
         TracedSession session;
-        CallEveryCallback(*session.operator->());
+        bdmvtest::CallEveryCallback(*session.operator->());
         session.PassSecond();
 
         EXPECT_EQ(session.Slices(track), slices);

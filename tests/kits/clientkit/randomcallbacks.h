@@ -10,7 +10,7 @@
 #include <type_traits>
 #include <vector>
 
-#include "clientkit/callbacklistener.h"
+#include "clientkit/callback.h"
 
 namespace bdmvtest
 {

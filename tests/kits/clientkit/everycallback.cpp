@@ -1,9 +1,9 @@
-#include "everycallback.h"
+#include "kits/clientkit/everycallback.h"
 
 #include "bd/constants.h"
 #include "testkit/fakeplatform.h"
 
-namespace deskplayer
+namespace bdmvtest
 {
 
 namespace
@@ -22,8 +22,6 @@ public:
 
 void CallControl(bdmv::INavControlListener& listener)
 {
-    const bd::UInt8 data[] = {0x00, 0xA5, 0xFF};
-
     listener.PlayStarted();
     listener.FirstPictureDelivered();
     listener.PlayFailed();
@@ -40,7 +38,7 @@ void CallControl(bdmv::INavControlListener& listener)
     listener.Suspended();
     listener.Resumed();
     listener.ResumeFailed();
-    listener.SystemSuspended(data, sizeof data);
+    listener.SystemSuspended(StandbyBlock, sizeof StandbyBlock);
     listener.SystemResumed(true);
     listener.SystemResumeFailed();
     listener.JumpOccurred();
@@ -85,13 +83,6 @@ void CallSettings(bdmv::INavSettingsListener& listener)
     listener.PipPgTextSelect(true);
 }
 
-void CallButton(bdmv::INavButtonListener& listener)
-{
-    bdmv::IProgramData::RefPtr program(new ProgramOfThreeCommands);
-
-    listener.ExecuteButton(25, 26, program);
-}
-
 void CallInteractive(bdmv::INavInteractiveListener& listener)
 {
     listener.InteractiveGraphicsVisible();
@@ -106,12 +97,30 @@ void CallInteractive(bdmv::INavInteractiveListener& listener)
 
 } // namespace
 
-void CallEveryCallback(bdmv::INavigatorListener& listener)
+bdmv::IProgramData::RefPtr MakeProgram()
+{
+    return new ProgramOfThreeCommands;
+}
+
+void CallEveryCallback(bdmv::INavigatorListener& listener, bdmv::IProgramData::RefPtr& program)
 {
     CallControl(listener);
     CallSettings(listener);
-    CallButton(listener);
+    listener.ExecuteButton(25, 26, program);
     CallInteractive(listener);
 }
 
-} // namespace deskplayer
+void CallEveryCallback(bdmv::INavigatorListener& listener)
+{
+    bdmv::IProgramData::RefPtr program = MakeProgram();
+    CallEveryCallback(listener, program);
+}
+
+std::vector<bdmv::Callback> EveryCallback()
+{
+    CollectingListener listener;
+    CallEveryCallback(listener);
+    return listener.callbacks;
+}
+
+} // namespace bdmvtest

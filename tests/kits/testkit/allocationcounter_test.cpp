@@ -1,0 +1,97 @@
+#include "testkit/allocationcounter.h"
+
+#include <gtest/gtest.h>
+
+#include <cstddef>
+#include <limits>
+#include <new>
+#include <thread>
+
+#include "testkit/operatornew.h"
+
+namespace
+{
+
+using bdmvtest::CountAllocations;
+using bdmvtest::CountLiveBlocks;
+using bdmvtest::FailAllocationAfter;
+
+// A sanitizer stops the program when an allocation is too large.
+#if defined(__SANITIZE_ADDRESS__) || defined(__SANITIZE_THREAD__)
+constexpr bool Sanitized = true;
+#elif !defined(__has_feature)
+constexpr bool Sanitized = false;
+#elif __has_feature(address_sanitizer) || __has_feature(thread_sanitizer)
+constexpr bool Sanitized = true;
+#else
+constexpr bool Sanitized = false;
+#endif
+
+TEST(AllocationCounter, CountsAllocationsAndLiveBlocks)
+{
+    const std::size_t allocations = CountAllocations();
+    const long blocks = CountLiveBlocks();
+    void* const one = ::operator new(1);
+    void* const several = ::operator new[](5);
+    EXPECT_EQ(CountAllocations(), allocations + 2);
+    EXPECT_EQ(CountLiveBlocks(), blocks + 2);
+    ::operator delete(one);
+    ::operator delete[](several);
+    EXPECT_EQ(CountAllocations(), allocations + 2);
+    EXPECT_EQ(CountLiveBlocks(), blocks);
+}
+
+TEST(AllocationCounter, CountsSizedDeletesAndIgnoresNull)
+{
+    const long blocks = CountLiveBlocks();
+    ::operator delete (::operator new(1), std::size_t{1});
+    ::operator delete[](::operator new[](1), std::size_t{1});
+    ::operator delete(nullptr);
+    EXPECT_EQ(CountLiveBlocks(), blocks);
+}
+
+TEST(AllocationCounter, AllocatesABlockOfNoBytes)
+{
+    void* const block = ::operator new(0);
+    EXPECT_NE(block, nullptr);
+    ::operator delete(block);
+}
+
+TEST(AllocationCounter, FailsTheChosenAllocationOnly)
+{
+    FailAllocationAfter(1);
+    void* const first = ::operator new(1);
+    EXPECT_THROW(::operator delete(::operator new(1)), std::bad_alloc);
+    void* const third = ::operator new(1);
+    ::operator delete(first);
+    ::operator delete(third);
+}
+
+TEST(AllocationCounter, ReportsThatTheHeapIsExhausted)
+{
+    if (Sanitized) {
+        GTEST_SKIP() << "a sanitizer stops the program instead";
+    }
+    const long blocks = CountLiveBlocks();
+    volatile std::size_t tooMuch = std::numeric_limits<std::size_t>::max() / 2;
+    EXPECT_THROW(::operator delete(::operator new(tooMuch)), std::bad_alloc);
+    EXPECT_EQ(CountLiveBlocks(), blocks);
+}
+
+TEST(AllocationCounter, CountsForEachThreadApart)
+{
+    std::size_t ofTheThread = 0;
+    const std::size_t before = CountAllocations();
+    std::thread thread([&ofTheThread] {
+        const std::size_t start = CountAllocations();
+        ::operator delete(::operator new(1));
+        ofTheThread = CountAllocations() - start;
+    });
+    const std::size_t afterStart = CountAllocations();
+    thread.join();
+    EXPECT_EQ(ofTheThread, 1u);
+    EXPECT_EQ(CountAllocations(), afterStart);
+    EXPECT_GE(afterStart, before);
+}
+
+} // namespace
