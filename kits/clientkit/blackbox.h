@@ -53,7 +53,6 @@
 
 #include "bd/threadmutex.h"
 #include "clientkit/callback.h"
-#include "clientkit/callback.h"
 
 namespace bdmv
 {
