@@ -7,11 +7,14 @@
 #include <vector>
 
 #include "bdmvnavigator/inavigatorevent.h"
+#include "bdmvnavigator/navigatorevent.h"
 #include "bdmvnavigator/navigatorlisteneradapter.h"
+#include "clientkit/blackbox.h"
 #include "clientkit/listenerrelay.h"
 #include "clientkit/playbackstatus.h"
 #include "clientkit/scopedlistener.h"
 #include "kits/clientkit/randomcallbacks.h"
+#include "testkit/bench.h"
 
 namespace
 {
@@ -149,6 +152,41 @@ TEST(ClientExamples, ListenerRelay)
     EXPECT_EQ(userInterface.callbacks,
               (std::vector<bdmv::Callback>{bdmv::callbacks::PlayStarted{},
                                            bdmv::callbacks::ChapterNumber{5}}));
+}
+
+void WriteToReport(void* report, const char* bytes, std::size_t size)
+{
+    static_cast<std::string*>(report)->append(bytes, size);
+}
+
+std::string FailureReport(const bdmv::BlackBox& box)
+{
+    std::string report;
+    box.Dump(WriteToReport, &report);
+    return report;
+}
+
+TEST(ClientExamples, BlackBox)
+{
+    const auto TicksSinceStart = []() -> std::uint64_t { return 90000; };
+    bdmv::BlackBox box(1000, TicksSinceStart);
+    box.ChapterNumber(3);
+
+    const std::string report = FailureReport(box);
+    EXPECT_NE(report.find("\"ticks\":90000,"), std::string::npos) << report;
+    EXPECT_NE(report.find("\"ChapterNumber\",\"arguments\":{\"chapter\":3}"), std::string::npos)
+        << report;
+}
+
+TEST(ClientExamples, Bench)
+{
+    bdmv::StatusListener follower;
+    bdmvtest::Bench bench{&follower};
+    bench.context.currentChapter = 3;
+    bench.Dispatch<bdmv::PlayStartedEvent>();
+    bench.Dispatch<bdmv::ChapterEvent>();
+
+    EXPECT_EQ(WhatIsPlaying(follower), "Playing, chapter 3");
 }
 
 } // namespace

@@ -4,6 +4,7 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
+#include <filesystem>
 #include <set>
 #include <sstream>
 
@@ -35,7 +36,8 @@ std::vector<TableRow> TableOf(const std::string& title)
 
 /** A row of the table of callbacks. */
 struct Rule {
-    std::string condition;
+    std::string condition;                ///< "", or as below with its words in code spans
+    std::vector<std::string> words;       ///< of the condition
     std::vector<std::string> assignments; ///< "part = value value"
 };
 
@@ -46,7 +48,7 @@ const std::map<std::string, std::vector<Rule>>& Rules()
         std::string name;
         for (const TableRow& row : TableOf("What each callback means for the status")) {
             name = row[0].empty() ? name : CodeSpans(row[0]).at(0);
-            rulesByName[name].push_back({row[1], CodeSpans(row[2])});
+            rulesByName[name].push_back({row[1], CodeSpans(row[1]), CodeSpans(row[2])});
         }
         return rulesByName;
     }();
@@ -62,16 +64,15 @@ std::string ValueOf(const std::string& word, const Texts& arguments, const Texts
     return before.count(word) != 0 ? before.at(word) : word;
 }
 
-/** "", "`name` is `value`", "`name` is not `value`" or "`name` is unknown". */
-bool Holds(const std::string& condition, const Texts& arguments, const Texts& before)
+/** Conditions are "`name` is `value`", "`name` is not `value`" and "`name` is unknown". */
+bool Holds(const Rule& rule, const Texts& arguments, const Texts& before)
 {
-    if (condition.empty()) {
+    if (rule.condition.empty()) {
         return true;
     }
-    const std::vector<std::string> words = CodeSpans(condition);
-    const std::string expected = words.size() == 2 ? words[1] : "unknown";
-    const bool isNegative = condition.find(" is not ") != std::string::npos;
-    return (ValueOf(words.at(0), arguments, before) == expected) != isNegative;
+    const std::string expected = rule.words.size() == 2 ? rule.words[1] : "unknown";
+    const bool isNegative = rule.condition.find(" is not ") != std::string::npos;
+    return (ValueOf(rule.words.at(0), arguments, before) == expected) != isNegative;
 }
 
 /** The parts after a callback as the table has it. */
@@ -81,7 +82,7 @@ Texts After(const bdmv::Callback& callback, const Texts& before)
     const Texts arguments = ArgumentsOf(callback);
     const std::vector<Rule>& rules = Rules().at(NameOf(callback.Id()));
     const auto rule = std::find_if(rules.begin(), rules.end(), [&](const Rule& candidate) {
-        return Holds(candidate.condition, arguments, before);
+        return Holds(candidate, arguments, before);
     });
     if (rule == rules.end()) {
         return after;
@@ -103,16 +104,21 @@ Texts After(const bdmv::Callback& callback, const Texts& before)
     return after;
 }
 
-/** An unknown status, and known ones in every state of playback. */
+/** Statuses with no, some and all parts known, in every state of playback. */
 std::vector<PlaybackStatus> StatusesBefore()
 {
     std::vector<PlaybackStatus> statuses(1);
     bdmvtest::RandomCallbacks random(1);
-    std::set<std::string> states;
-    for (PlaybackStatus status; states.size() < 6 || statuses.size() < 200;) {
-        Apply(random.Next(), status);
-        statuses.push_back(status);
-        states.insert(NameOf(status.state.value));
+    const auto apply = [&statuses](const bdmv::Callback& callback) {
+        statuses.push_back(statuses.back());
+        Apply(callback, statuses.back());
+    };
+    for (int id = 0; id < bdmv::Callback__sizeof; ++id) {
+        apply(random.Make(static_cast<bdmv::CallbackId>(id)));
+    }
+    for (std::set<std::string> states; states.size() < 6;) {
+        apply(random.Next());
+        states.insert(NameOf(statuses.back().state.value));
     }
     return statuses;
 }
@@ -162,21 +168,37 @@ std::vector<std::string> StateCallbacks(const Texts& parts, const std::vector<st
     return {callbacks.at(state)};
 }
 
+/** A row of the table of what a client that joins receives. */
+struct PartRow {
+    std::string part;
+    std::vector<std::string> callbacks;
+};
+
+const std::vector<PartRow>& PartRows()
+{
+    static const std::vector<PartRow> rows = [] {
+        std::vector<PartRow> read;
+        for (const TableRow& row : TableOf("What a client that joins receives")) {
+            read.push_back({CodeSpans(row[0]).at(0), CodeSpans(row[1])});
+        }
+        return read;
+    }();
+    return rows;
+}
+
 /** What a client that joins receives as the table has it. */
 std::vector<std::string> CallbacksOfJoining(const Texts& parts)
 {
     std::vector<std::string> callbacks;
     std::vector<std::string> atTheEnd;
-    for (const TableRow& row : TableOf("What a client that joins receives")) {
-        const std::string part = CodeSpans(row[0]).at(0);
-        const std::vector<std::string> names = CodeSpans(row[1]);
-        if (part == "state") {
-            const std::string& state = parts.at(part);
-            const bool isOver = state == "Stopped" || state == "Standby";
-            (isOver ? atTheEnd : callbacks) = StateCallbacks(parts, names);
-        } else if (parts.at(part) != "unknown") {
-            callbacks.push_back(names.size() == 1 || parts.at(part) == "true" ? names.at(0)
-                                                                              : names.at(1));
+    for (const PartRow& row : PartRows()) {
+        const std::string& value = parts.at(row.part);
+        if (row.part == "state") {
+            const bool isOver = value == "Stopped" || value == "Standby";
+            (isOver ? atTheEnd : callbacks) = StateCallbacks(parts, row.callbacks);
+        } else if (value != "unknown") {
+            const bool isFirst = row.callbacks.size() == 1 || value == "true";
+            callbacks.push_back(row.callbacks.at(isFirst ? 0 : 1));
         }
     }
     callbacks.insert(callbacks.end(), atTheEnd.begin(), atTheEnd.end());
@@ -227,7 +249,23 @@ TEST(ClientsGuide, ShowsExamplesThatAreCompiledAndRun)
             }
         }
     }
-    EXPECT_GE(count, 5U);
+    EXPECT_GE(count, 8U);
+}
+
+TEST(ClientsGuide, LinksToWhatExists)
+{
+    std::set<std::string> anchors;
+    for (const Chapter& chapter : Chapters()) {
+        anchors.insert("#" + chapter.Anchor());
+    }
+    const std::filesystem::path guide = BDMVNAVIGATOR_CLIENTS_GUIDE;
+    const std::vector<std::string> targets = LinkTargets(ReadFile(guide));
+    for (const std::string& target : targets) {
+        EXPECT_TRUE(anchors.count(target) != 0 ||
+                    std::filesystem::exists(guide.parent_path() / target))
+            << target;
+    }
+    EXPECT_GE(targets.size(), 9U);
 }
 
 } // namespace

@@ -142,6 +142,14 @@ TEST(DeliverStatus, SendsNothingOfAnUnknownStatus)
     EXPECT_TRUE(CallbacksOf(PlaybackStatus()).empty());
 }
 
+TEST(DeliverStatus, SendsNothingOfAStateThatDoesNotExist)
+{
+    PlaybackStatus status;
+    status.state.Set(static_cast<bdmv::PlaybackState>(6));
+
+    EXPECT_TRUE(CallbacksOf(status).empty());
+}
+
 TEST(DeliverStatus, SendsAnEndAsStopped)
 {
     EXPECT_EQ(CallbacksAfter({callbacks::Finished{bdmv::INavControlListener::DataStarvation}}),

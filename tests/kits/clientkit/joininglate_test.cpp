@@ -49,6 +49,12 @@ std::vector<bdmv::Callback> CallbacksWithPositions(std::size_t count)
     return sequence;
 }
 
+/** How many callbacks came before the status, at least; at most one more did. */
+std::size_t CallbacksBefore(const bdmv::PlaybackStatus& status)
+{
+    return status.position.known ? static_cast<std::size_t>(status.position.value) + 1 : 0;
+}
+
 /** A client that joins on one thread and receives callbacks on another. */
 class ConcurrentClient : public bdmvtest::JoiningClient
 {
@@ -87,8 +93,7 @@ struct Reference {
     /** Whether the client received what comes after one prefix, from there without a gap. */
     bool Continues(const ConcurrentClient& client) const
     {
-        const bdmv::Reported<bd::TimePosition>& position = client.statusAfterJoin.position;
-        const std::size_t prefix = position.known ? position.value + 1 : 0;
+        const std::size_t prefix = CallbacksBefore(client.statusAfterJoin);
         return ContinuesFrom(prefix, client) || ContinuesFrom(prefix + 1, client);
     }
 
@@ -203,7 +208,7 @@ TEST(JoiningLate, ReadsTheStatusWhileCallbacksAreDelivered)
     std::thread reader([&] {
         for (int round = 0; round < 100; ++round) {
             const bdmv::PlaybackStatus status = listener.Status();
-            const std::size_t prefix = status.position.known ? status.position.value + 1 : 0;
+            const std::size_t prefix = CallbacksBefore(status);
             EXPECT_TRUE(status == reference.statuses[prefix] ||
                         status == reference.statuses[prefix + 1]);
             std::this_thread::yield();

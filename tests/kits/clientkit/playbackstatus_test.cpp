@@ -244,6 +244,16 @@ TEST(PlaybackStatus, ComparesUnequalValuesOfUnknownPartsAsEqual)
     EXPECT_TRUE(left != right);
 }
 
+TEST(PlaybackStatus, ComparesPlayItems)
+{
+    const bdmv::PlayItemStatus item{1, 2, bd::VideoFormatType480i, bd::VideoAspectRatioType4x3};
+    bdmv::PlayItemStatus other = item;
+
+    EXPECT_FALSE(item != other);
+    other.playItemId = 3;
+    EXPECT_TRUE(item != other);
+}
+
 TEST(PlaybackStatus, NamesTheStates)
 {
     EXPECT_STREQ(NameOf(bdmv::PlaybackStopped), "Stopped");
