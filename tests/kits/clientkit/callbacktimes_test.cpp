@@ -149,6 +149,12 @@ TEST_F(CallbackTimesTest, OverTheBudgetAreReported)
     EXPECT_TRUE(Add(Budget + nanoseconds(1)));
 }
 
+TEST_F(CallbackTimesTest, AreReportedInTheFirstSecondOfTheClock)
+{
+    EXPECT_TRUE(
+        times.Add(bdmv::CallbackPaused, CallbackTimes::Time(), CallbackTimes::Time() + 2 * Budget));
+}
+
 TEST_F(CallbackTimesTest, AreNotReportedAgainWithinASecond)
 {
     EXPECT_TRUE(AddSlow(bdmv::CallbackPaused, seconds(1)));
