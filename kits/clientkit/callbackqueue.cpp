@@ -34,10 +34,10 @@ CallbackQueue::CallbackQueue(const QueuedListener::Options& options)
 void CallbackQueue::Put(const Callback& callback)
 {
     ++m_Counters.received;
-    Apply(callback, m_Status);
     if (!Merge(callback) && !Append(callback)) {
         Lose();
     }
+    Apply(callback, m_Status);
 }
 
 void CallbackQueue::Refuse()
@@ -71,10 +71,10 @@ CallbackQueue::Step CallbackQueue::Take(Callback& callback, PlaybackStatus& stat
         TakeOldest(callback);
         break;
     case StepResync:
+        status = m_AfterResync > 0 ? m_ResyncStatus : m_Status;
         m_Resync = false;
         m_Waiting = m_AfterResync;
         m_AfterResync = 0;
-        status = m_ResyncStatus;
         break;
     case StepNone:
         break;
@@ -148,6 +148,9 @@ bool CallbackQueue::Append(const Callback& callback)
     } else if (!AppendStandby(*standby, place)) {
         return false;
     }
+    if (m_Resync && m_AfterResync == 0) {
+        m_ResyncStatus = m_Status; // which does not include this callback yet
+    }
     ++NewestPart();
     return true;
 }
@@ -171,7 +174,6 @@ void CallbackQueue::Lose()
     m_LostLater += m_AfterResync;
     m_AfterResync = 0;
     m_Resync = true;
-    m_ResyncStatus = m_Status;
 }
 
 } // namespace bdmv

@@ -96,13 +96,14 @@ private:
     void Lose();
 
     std::vector<Callback> m_Places;
-    std::size_t m_First;           ///< place of the oldest callback
-    std::size_t m_Waiting;         ///< callbacks before the loss; all, if there is no resync
-    std::size_t m_LostLater;       ///< callbacks that are lost after all
-    bool m_Resync;                 ///< whether a resync is due, after these
-    std::size_t m_AfterResync;     ///< callbacks after the resync
-    PlaybackStatus m_Status;       ///< of everything received
-    PlaybackStatus m_ResyncStatus; ///< of everything up to the last loss
+    std::size_t m_First;       ///< place of the oldest callback
+    std::size_t m_Waiting;     ///< callbacks before the loss; all, if there is no resync
+    std::size_t m_LostLater;   ///< callbacks that are lost after all
+    bool m_Resync;             ///< whether a resync is due, after these
+    std::size_t m_AfterResync; ///< callbacks after the resync
+    PlaybackStatus m_Status;   ///< of everything received
+    PlaybackStatus
+        m_ResyncStatus; ///< of everything up to the last loss, if a callback waits after it
     BlockBuffer m_Blocks;
     Step m_Taken;
     callbacks::SystemSuspended m_TakenBlock; ///< what Finish() frees; null for nothing

@@ -199,7 +199,7 @@ TEST_F(QueuedListenerCloseTest, InsideTheDestructorOfAProgramThrows)
 {
     std::error_code code;
     bdmvtest::Gate destroyed;
-    ActingListener listener([](const bdmv::Callback&) {});
+    ActingListener listener([&](const bdmv::Callback&) { gate.Pass(); });
     QueuedListener queued(listener);
     {
         bdmv::IProgramData::RefPtr program(new bdmvtest::TestProgram([&] {
@@ -212,6 +212,7 @@ TEST_F(QueuedListenerCloseTest, InsideTheDestructorOfAProgramThrows)
         }));
         queued.ExecuteButton(1, 2, program);
     }
+    gate.Open(); // only now, so that the client's thread releases the program last
     destroyed.WaitForArrivals(1);
     destroyed.Open();
     queued.Close();

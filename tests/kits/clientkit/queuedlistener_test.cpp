@@ -256,7 +256,6 @@ TEST_F(QueuedListenerTest, CountsACallbackAsDeliveredWhenItHasReturned)
 
 TEST_F(QueuedListenerTest, ReleasesProgramsOnTheThreadOfTheClientWithoutALock)
 {
-    gate.Open();
     std::thread::id clientThread;
     std::thread::id destroyingThread;
     std::uint64_t received = 0;
@@ -274,6 +273,7 @@ TEST_F(QueuedListenerTest, ReleasesProgramsOnTheThreadOfTheClientWithoutALock)
         }));
         queued.ExecuteButton(1, 2, program);
     }
+    gate.Open(); // only now, so that the client's thread releases the program last
     destroyed.WaitForArrivals(1);
     destroyed.Open();
     queued.Close();
