@@ -24,8 +24,6 @@ std::pair<Ticks, std::size_t> MarkAt(Ticks position, std::size_t index)
 
 constexpr std::size_t LastMark = std::numeric_limits<std::size_t>::max();
 
-constexpr Ticks Second = std::chrono::seconds(1); ///< the interval of position reports
-
 } // namespace
 
 const PlayItem* Playhead::CurrentItem() const
@@ -137,7 +135,7 @@ Ticks Playhead::NextStop() const
 Ticks Playhead::NextStopForward() const
 {
     const Ticks position = m_rState.position;
-    Ticks stop = std::min(EndOfItem(m_rState.item), position - position % Second + Second);
+    Ticks stop = std::min(EndOfItem(m_rState.item), position - position % PositionInterval + PositionInterval);
     const auto consider = [&stop, position](std::optional<Ticks> candidate) {
         if (candidate && *candidate > position) {
             stop = std::min(stop, *candidate);
@@ -160,7 +158,7 @@ Ticks Playhead::NextStopBackward() const
         return position;
     }
     const Ticks last = position - Ticks(1);
-    Ticks stop = last - last % Second;
+    Ticks stop = last - last % PositionInterval;
     const auto consider = [&stop, position](std::optional<Ticks> candidate) {
         if (candidate && *candidate < position) {
             stop = std::max(stop, *candidate);

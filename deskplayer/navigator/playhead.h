@@ -16,6 +16,9 @@
 namespace deskplayer
 {
 
+/** The time between two reports of the position. */
+constexpr Ticks PositionInterval = std::chrono::seconds(1);
+
 /**
  * Arithmetic on the time line: reads the state of playback, and changes its position and play item.
  * Sends no events. Only JumpTo() and Enter() change the play item.

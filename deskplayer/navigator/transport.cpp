@@ -11,8 +11,6 @@ namespace deskplayer
 namespace
 {
 
-constexpr Ticks Second = std::chrono::seconds(1); ///< the interval of position reports
-
 /** The duration of a picture, rounded to the nearest tick. */
 Ticks PictureDuration(const std::vector<Stream>& videos)
 {
@@ -82,7 +80,7 @@ Ticks Transport::Advance(Ticks time)
 /** Sends the events of a position that playback has reached, and carries out a repeat there. */
 void Transport::ReachPosition()
 {
-    if (m_rState.position % Second == Ticks(0)) {
+    if (m_rState.position % PositionInterval == Ticks(0)) {
         m_rSender.Send<bdmv::CurrentTimePositionEvent>();
     }
     if (m_rState.position == m_rState.notifyAt) {

@@ -22,14 +22,14 @@ public:
 
     void operator()(const callbacks::StillOff&)
     {
-        if (Is(PlaybackStill)) {
+        if (m_rStatus.state.value == PlaybackStill) {
             SetState(PlaybackPlaying);
         }
     }
 
     void operator()(const callbacks::Suspended&)
     {
-        if (!Is(PlaybackSuspended)) {
+        if (m_rStatus.state.value != PlaybackSuspended) {
             const PlaybackState before =
                 m_rStatus.state.known ? m_rStatus.state.value : PlaybackPlaying;
             SetState(PlaybackSuspended);
@@ -210,11 +210,6 @@ public:
     void operator()(const callbacks::ExecuteButton&) {}
 
 private:
-    bool Is(PlaybackState state) const
-    {
-        return m_rStatus.state.known && m_rStatus.state.value == state;
-    }
-
     void SetState(PlaybackState state)
     {
         m_rStatus.state.Set(state);

@@ -23,7 +23,7 @@
 #include <type_traits>
 
 #include "bd/threadmutex.h"
-#include "clientkit/callback.h"
+#include "clientkit/callbacklistener.h"
 
 namespace bdmv
 {

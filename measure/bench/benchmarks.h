@@ -46,6 +46,10 @@ constexpr char LogSpdlog[] = "plain spdlog, null sink";
 constexpr char LogSpdlogQueue[] = "plain spdlog, queue, slow sink";
 constexpr char LogSpdlogQueueNull[] = "plain spdlog, queue, null sink";
 
+constexpr char PlainName[] = "plain listener";
+constexpr char StatusName[] = "StatusListener";
+constexpr char RelayName[] = "ListenerRelay, one client";
+
 constexpr char AllocationsCounter[] = "allocations";
 constexpr char WaitedCounter[] = "waited";
 
@@ -54,6 +58,7 @@ void RegisterQtDelivery();
 void RegisterEvents();
 void RegisterThreads();
 void RegisterLogLines();
+void RegisterClientKit();
 
 inline std::string DeliveryRow(const std::string& callback, const std::string& subject, int count)
 {
@@ -73,6 +78,11 @@ inline std::string ThreadRow(const std::string& lists, const std::string& subjec
 inline std::string LogRow(const std::string& what)
 {
     return "log/" + what;
+}
+
+inline std::string ClientKitRow(const std::string& callback, const std::string& listener)
+{
+    return "clientkit/" + callback + "/" + listener;
 }
 
 } // namespace bench

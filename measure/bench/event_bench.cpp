@@ -10,7 +10,8 @@
 #include "benchmarks.h"
 #include "context.h"
 #include "logging.h"
-#include "support/allocationcounter.h"
+#include "testkit/allocationcounter.h"
+#include "testkit/operatornew.h"
 
 namespace bench
 {

@@ -1,4 +1,5 @@
-// Delivery, events, threads and log lines in one run, so that their times are comparable.
+// Delivery, events, threads, log lines and the client kit in one run, so that their times are
+// comparable.
 
 #include "benchmarks.h"
 #include "kevro_linux.h"
@@ -14,6 +15,7 @@ int main(int argc, char** argv)
     bench::RegisterEvents();
     bench::RegisterThreads();
     bench::RegisterLogLines();
+    bench::RegisterClientKit();
 
     bench::Report report;
     if (!bench::RunBenchmarks(report, argc, argv)) {

@@ -155,6 +155,35 @@ void PrintLog(const Report& report, Goal& queued)
     }
 }
 
+/** A listener of the client kit, and the goal for it; without a goal null. */
+struct ClientKitSubject {
+    const char* name;
+    Goal* goal;
+};
+
+void PrintClientKit(const Report& report, const std::vector<ClientKitSubject>& subjects)
+{
+    constexpr const char* Callbacks[] = {NoArguments, ByReference, ByValue};
+    std::printf("\nDelivery to one listener: ns, × plain listener\n  %-28s", "");
+    for (const char* const callback : Callbacks) {
+        std::printf("%25s", callback);
+    }
+    std::printf("\n");
+    for (const ClientKitSubject& subject : subjects) {
+        std::printf("  %-28s       ", subject.name);
+        for (const char* const callback : Callbacks) {
+            const double plain = report[ClientKitRow(callback, PlainName)].cpu;
+            const double time = report[ClientKitRow(callback, subject.name)].cpu;
+            PrintTime(time, plain);
+            std::printf("%7s", "");
+            if (subject.goal != nullptr) {
+                subject.goal->Judge(std::string(subject.name) + ", " + callback, time / plain);
+            }
+        }
+        std::printf("\n");
+    }
+}
+
 } // namespace
 
 void PrintTables(const Report& report)
@@ -163,14 +192,16 @@ void PrintTables(const Report& report)
     Goal allocations("allocations between Dispatch() and its return", 0);
     Goal lineOff("an event with its line off, × delivery alone plus one call of the switch", 1.15);
     Goal queued("a line into the queue, × vsnprintf alone", 1.5);
+    Goal status("a delivery to StatusListener, × plain listener", 3);
 
     PrintDelivery(report, delivery);
     PrintEvents(report, allocations, lineOff);
     PrintThreads(report);
     PrintLog(report, queued);
+    PrintClientKit(report, {{PlainName, nullptr}, {StatusName, &status}, {RelayName, nullptr}});
 
     std::printf("\nGoals\n");
-    for (const Goal* goal : {&delivery, &allocations, &lineOff, &queued}) {
+    for (const Goal* goal : {&delivery, &allocations, &lineOff, &queued, &status}) {
         goal->Print();
     }
 }

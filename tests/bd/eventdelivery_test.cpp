@@ -13,8 +13,8 @@
 #include "bdmvnavigator/navigatorlisteneradapter.h"
 #include "mutexwatch.h"
 #include "probe.h"
-#include "support/allocationcounter.h"
-#include "support/fakeplatform.h"
+#include "testkit/allocationcounter.h"
+#include "testkit/fakeplatform.h"
 
 using bd::EventListenerList_FireInvoker;
 using bd::EventListenerList_FireParam0;

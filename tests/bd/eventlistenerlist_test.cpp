@@ -9,7 +9,8 @@
 #include "bd/eventlistenerlist.h"
 #include "mutexwatch.h"
 #include "probe.h"
-#include "support/allocationcounter.h"
+#include "testkit/allocationcounter.h"
+#include "testkit/operatornew.h"
 
 using bdmvtest::IProbe;
 using bdmvtest::Probe;

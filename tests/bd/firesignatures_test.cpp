@@ -7,7 +7,7 @@
 
 #include "bd/eventlistenerlist.h"
 #include "bdmvnavigator/inavigatorlistener.h"
-#include "support/recordinglistener.h"
+#include "testkit/recordinglistener.h"
 
 namespace
 {

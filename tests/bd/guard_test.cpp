@@ -8,7 +8,7 @@
 
 #include "bd/guard.h"
 #include "bd/threadmutex.h"
-#include "support/fakeplatform.h"
+#include "testkit/fakeplatform.h"
 
 namespace
 {

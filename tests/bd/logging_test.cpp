@@ -5,8 +5,9 @@
 #include <string>
 
 #include "bd/logging.h"
-#include "support/allocationcounter.h"
-#include "support/fakeplatform.h"
+#include "testkit/allocationcounter.h"
+#include "testkit/fakeplatform.h"
+#include "testkit/operatornew.h"
 
 extern "C" KEVRO_Bool IsEnabledFromC();
 extern "C" void WriteFromC(int ignored, ...);

@@ -10,8 +10,8 @@
 #include <utility>
 #include <vector>
 
-#include "support/describe.h"
-#include "support/journal.h"
+#include "testkit/describe.h"
+#include "testkit/journal.h"
 
 namespace bdmvtest
 {

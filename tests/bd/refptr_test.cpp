@@ -10,8 +10,9 @@
 #include <utility>
 
 #include "bd/refptr.h"
-#include "support/allocationcounter.h"
-#include "support/fakeplatform.h"
+#include "testkit/allocationcounter.h"
+#include "testkit/fakeplatform.h"
+#include "testkit/operatornew.h"
 
 namespace
 {

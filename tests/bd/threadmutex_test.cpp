@@ -10,7 +10,7 @@
 
 #include "bd/threadmutex.h"
 #include "mutexwatch.h"
-#include "support/fakeplatform.h"
+#include "testkit/fakeplatform.h"
 
 static_assert(!std::is_copy_constructible_v<bd::ThreadMutex>, "a mutex cannot be copied");
 static_assert(!std::is_copy_assignable_v<bd::ThreadMutex>, "a mutex cannot be assigned");

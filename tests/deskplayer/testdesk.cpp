@@ -6,7 +6,8 @@
 #include <stdexcept>
 #include <utility>
 
-#include "support/describe.h"
+#include "testkit/describe.h"
+#include "testkit/fakeplatform.h"
 
 namespace deskplayer
 {

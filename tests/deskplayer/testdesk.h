@@ -13,7 +13,7 @@
 
 #include "session/commands.h"
 #include "session/session.h"
-#include "support/recordinglistener.h"
+#include "testkit/recordinglistener.h"
 
 namespace deskplayer
 {

@@ -5,8 +5,8 @@
 #include <stdexcept>
 
 #include "docs/markdown.h"
-#include "support/fakeplatform.h"
-#include "support/recordinglistener.h"
+#include "testkit/fakeplatform.h"
+#include "testkit/recordinglistener.h"
 
 namespace
 {

@@ -10,7 +10,7 @@
 #include <vector>
 
 #include "bdmv/bdmvnavigator/allevents.h"
-#include "support/scriptableplaybackcontext.h"
+#include "testkit/scriptableplaybackcontext.h"
 
 typedef bdmvtest::ScriptablePlaybackContext Context;
 

@@ -12,7 +12,7 @@
 
 #include "docs/declarations.h"
 #include "docs/effects.h"
-#include "support/describe.h"
+#include "testkit/describe.h"
 
 namespace
 {

@@ -7,9 +7,9 @@
 #include <system_error>
 
 #include "bdmvnavigator/navigatorevent.h"
-#include "support/fakeplatform.h"
-#include "support/recordinglistener.h"
-#include "support/scriptableplaybackcontext.h"
+#include "testkit/fakeplatform.h"
+#include "testkit/recordinglistener.h"
+#include "testkit/scriptableplaybackcontext.h"
 
 #if defined(__cpp_rtti)
 #error "compile this with -fno-rtti"

@@ -20,9 +20,9 @@ namespace
 namespace fs = std::filesystem;
 
 const fs::path Root = BDMVNAVIGATOR_SOURCE_DIR;
-const std::vector<std::string> IncludeRoots = {
-    "inc",        "bdmv/inc",    "bdmv",          "prv_inc", "kits",
-    "deskplayer", "ports/linux", "measure/bench", "tests"};
+const std::vector<std::string> IncludeRoots = {"inc",         "bdmv/inc",      "bdmv",
+                                               "prv_inc",     "kits",          "deskplayer",
+                                               "ports/linux", "measure/bench", "tests"};
 
 /** An #include line of a file. */
 struct Include {
@@ -112,8 +112,8 @@ namespace
 {
 
 const std::vector<std::string> Library = {"inc", "bdmv", "prv_inc", "bd"};
-const std::vector<std::string> AllFolders = {"inc",        "bdmv",     "prv_inc", "bd",   "ports",
-                                             "deskplayer", "examples", "measure", "tests"};
+const std::vector<std::string> AllFolders = {"inc",  "bdmv",       "prv_inc",  "bd",      "ports",
+                                             "kits", "deskplayer", "examples", "measure", "tests"};
 
 std::vector<std::string> operator+(std::vector<std::string> left,
                                    const std::vector<std::string>& right)

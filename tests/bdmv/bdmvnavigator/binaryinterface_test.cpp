@@ -21,9 +21,9 @@
 #include "database/inavigationcommanddata.h"
 #include "database/iplaylistmark.h"
 #include "database/iprogramdata.h"
-#include "support/journal.h"
-#include "support/recordinglistener.h"
-#include "support/scriptableplaybackcontext.h"
+#include "testkit/journal.h"
+#include "testkit/recordinglistener.h"
+#include "testkit/scriptableplaybackcontext.h"
 
 #if defined(__clang__)
 // In machine code a virtual function is a plain function, and it is called as one.

@@ -2,9 +2,10 @@
 
 #include "allevents.h"
 #include "bdmvnavigator/navigatorlisteneradapter.h"
-#include "support/allocationcounter.h"
-#include "support/fakeplatform.h"
-#include "support/scriptableplaybackcontext.h"
+#include "testkit/allocationcounter.h"
+#include "testkit/fakeplatform.h"
+#include "testkit/operatornew.h"
+#include "testkit/scriptableplaybackcontext.h"
 
 namespace
 {

@@ -25,9 +25,9 @@
 #include <utility>
 
 #include "bdmvnavigator/navigatorevent.h"
-#include "support/fakeplatform.h"
-#include "support/recordinglistener.h"
-#include "support/scriptableplaybackcontext.h"
+#include "testkit/fakeplatform.h"
+#include "testkit/recordinglistener.h"
+#include "testkit/scriptableplaybackcontext.h"
 
 typedef bdmvtest::ScriptablePlaybackContext Context;
 typedef bd::EventListenerList<bdmv::INavigatorListener> Listeners;

@@ -4,7 +4,7 @@
 #include <type_traits>
 
 #include "bdmvnavigator/navigatorlisteneradapter.h"
-#include "support/fakeplatform.h"
+#include "testkit/fakeplatform.h"
 
 namespace
 {

@@ -1,7 +1,7 @@
 #include <vector>
 
 #include "eventtest.h"
-#include "support/describe.h"
+#include "testkit/describe.h"
 
 namespace
 {

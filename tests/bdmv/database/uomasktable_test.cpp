@@ -8,7 +8,7 @@
 #include <vector>
 
 #include "database/uomasktable.h"
-#include "support/fakeplatform.h"
+#include "testkit/fakeplatform.h"
 
 using bdmv::UOMaskTable;
 

@@ -6,9 +6,9 @@
 #include <thread>
 
 #include "bdmvnavigator/navigatorevent.h"
-#include "support/fakeplatform.h"
-#include "support/recordinglistener.h"
-#include "support/scriptableplaybackcontext.h"
+#include "testkit/fakeplatform.h"
+#include "testkit/recordinglistener.h"
+#include "testkit/scriptableplaybackcontext.h"
 
 namespace
 {

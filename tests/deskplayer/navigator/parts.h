@@ -12,7 +12,7 @@
 #include "navigator/eventsender.h"
 #include "navigator/playbackcontext.h"
 #include "navigator/playhead.h"
-#include "support/recordinglistener.h"
+#include "testkit/recordinglistener.h"
 
 namespace deskplayer
 {

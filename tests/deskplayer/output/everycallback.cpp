@@ -1,6 +1,7 @@
 #include "everycallback.h"
 
 #include "bd/constants.h"
+#include "testkit/fakeplatform.h"
 
 namespace deskplayer
 {

@@ -11,7 +11,7 @@
 #include <string>
 #include <vector>
 
-#include "support/allocationcounter.h"
+#include "testkit/allocationcounter.h"
 
 namespace
 {

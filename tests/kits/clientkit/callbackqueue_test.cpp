@@ -9,9 +9,9 @@
 #include <thread>
 #include <vector>
 
-#include "support/allocationcounter.h"
-#include "support/fakeplatform.h"
-#include "support/recordinglistener.h"
+#include "testkit/allocationcounter.h"
+#include "testkit/fakeplatform.h"
+#include "testkit/recordinglistener.h"
 #include "testprogram.h"
 
 namespace

@@ -13,9 +13,10 @@
 
 #include "bdmvnavigator/inavigatorevent.h"
 #include "database/iprogramdata.h"
-#include "support/allocationcounter.h"
-#include "support/fakeplatform.h"
-#include "support/recordinglistener.h"
+#include "testkit/allocationcounter.h"
+#include "testkit/fakeplatform.h"
+#include "testkit/operatornew.h"
+#include "testkit/recordinglistener.h"
 
 namespace
 {

@@ -188,6 +188,8 @@ TEST(PlaybackStatus, ChangesWithEveryCallbackButTheMomentaryOnes)
 /** Callbacks that differ in one argument only give statuses that differ. */
 TEST(PlaybackStatus, ComparesEveryArgument)
 {
+    bd::AudioInfoType audioInfo;
+    audioInfo.pid = 0x1100;
     const std::vector<std::pair<bdmv::Callback, bdmv::Callback>> pairs{
         {callbacks::PlayItem{1, 2, bd::VideoFormatType480i, bd::VideoAspectRatioType4x3},
          callbacks::PlayItem{9, 2, bd::VideoFormatType480i, bd::VideoAspectRatioType4x3}},
@@ -209,6 +211,10 @@ TEST(PlaybackStatus, ComparesEveryArgument)
         {callbacks::SecondaryAudioDisplay{1, true}, callbacks::SecondaryAudioDisplay{2, true}},
         {callbacks::AudioInfoChanged{true, bd::AudioInfoType()},
          callbacks::AudioInfoChanged{false, bd::AudioInfoType()}},
+        {callbacks::AudioInfoChanged{true, bd::AudioInfoType()},
+         callbacks::AudioInfoChanged{true, audioInfo}},
+        {callbacks::AudioInfoChanged{false, bd::AudioInfoType()},
+         callbacks::AudioInfoChanged{false, audioInfo}},
         {callbacks::UOMask{bdmv::UOMaskTable(1)}, callbacks::UOMask{bdmv::UOMaskTable(2)}},
         {callbacks::PictureInPictureAvailable{}, callbacks::PictureInPictureUnavailable{}},
         {callbacks::InteractiveGraphicsVisible{}, callbacks::InteractiveGraphicsInvisible{}},

@@ -12,7 +12,8 @@
 
 #include "bdmvnavigator/inavigatorevent.h"
 #include "queuedlistenertest.h"
-#include "support/allocationcounter.h"
+#include "testkit/allocationcounter.h"
+#include "testkit/operatornew.h"
 #include "testprogram.h"
 
 using bdmv::QueuedListener;

@@ -14,9 +14,9 @@
 
 #include "clientkit/queuedlistener.h"
 #include "gate.h"
-#include "support/fakeplatform.h"
-#include "support/journal.h"
-#include "support/recordinglistener.h"
+#include "testkit/fakeplatform.h"
+#include "testkit/journal.h"
+#include "testkit/recordinglistener.h"
 
 namespace bdmvtest
 {

@@ -10,7 +10,7 @@
 #include <type_traits>
 #include <vector>
 
-#include "clientkit/callback.h"
+#include "clientkit/callbacklistener.h"
 
 namespace bdmvtest
 {

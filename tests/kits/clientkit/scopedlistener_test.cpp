@@ -8,7 +8,7 @@
 #include <utility>
 
 #include "bdmvnavigator/navigatorlisteneradapter.h"
-#include "support/fakeplatform.h"
+#include "testkit/fakeplatform.h"
 
 namespace
 {

@@ -2,7 +2,8 @@
 #include <string>
 
 #include "porttesting.h"
-#include "support/allocationcounter.h"
+#include "testkit/allocationcounter.h"
+#include "testkit/operatornew.h"
 
 namespace
 {

@@ -20,11 +20,12 @@
  *     "A.Stepped(900000, PlayDirectionBackward)\n"
  * @endcode
  */
-#ifndef SUPPORT_JOURNAL_H
-#define SUPPORT_JOURNAL_H
+#ifndef TESTKIT_JOURNAL_H
+#define TESTKIT_JOURNAL_H
 
 #include <mutex>
 #include <string>
+#include <utility>
 
 namespace bdmvtest
 {
@@ -33,10 +34,19 @@ namespace bdmvtest
 class Journal
 {
 public:
-    void Add(const std::string& entry);
+    void Add(const std::string& entry)
+    {
+        const std::lock_guard<std::mutex> lock(m_Mutex);
+        m_Text += entry;
+        m_Text += '\n';
+    }
 
     /** Returns the entries since the last call, each followed by a line end. */
-    std::string Take();
+    std::string Take()
+    {
+        const std::lock_guard<std::mutex> lock(m_Mutex);
+        return std::exchange(m_Text, std::string());
+    }
 
 private:
     std::mutex m_Mutex;

@@ -1,6 +1,6 @@
 // Values as they appear in journals.
 
-#include "support/describe.h"
+#include "testkit/describe.h"
 
 #include <gtest/gtest.h>
 

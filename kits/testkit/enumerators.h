@@ -2,8 +2,8 @@
  * @file
  * Names of enumerators, supplied by the compiler, so that no table repeats the declarations.
  */
-#ifndef SUPPORT_ENUMERATORS_H
-#define SUPPORT_ENUMERATORS_H
+#ifndef TESTKIT_ENUMERATORS_H
+#define TESTKIT_ENUMERATORS_H
 
 #include <array>
 #include <cstddef>
