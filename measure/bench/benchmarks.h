@@ -49,6 +49,12 @@ constexpr char LogSpdlogQueueNull[] = "plain spdlog, queue, null sink";
 constexpr char PlainName[] = "plain listener";
 constexpr char StatusName[] = "StatusListener";
 constexpr char RelayName[] = "ListenerRelay, one client";
+constexpr char WatchName[] = "CallbackWatch";
+constexpr char QueueFreeName[] = "QueuedListener, places free";
+constexpr char QueueTakenName[] = "QueuedListener, places taken";
+constexpr char QueueSleepingName[] = "QueuedListener, client sleeps 100 ms";
+constexpr char QueueAtOnceName[] = "QueuedListener, client returns at once";
+constexpr char QueueWakingName[] = "QueuedListener, thread woken each time";
 
 constexpr char AllocationsCounter[] = "allocations";
 constexpr char WaitedCounter[] = "waited";
@@ -59,6 +65,7 @@ void RegisterEvents();
 void RegisterThreads();
 void RegisterLogLines();
 void RegisterClientKit();
+void RegisterQueuedListener();
 
 inline std::string DeliveryRow(const std::string& callback, const std::string& subject, int count)
 {

@@ -16,6 +16,7 @@ int main(int argc, char** argv)
     bench::RegisterThreads();
     bench::RegisterLogLines();
     bench::RegisterClientKit();
+    bench::RegisterQueuedListener();
 
     bench::Report report;
     if (!bench::RunBenchmarks(report, argc, argv)) {

@@ -1,48 +1,47 @@
-// What it costs the delivering thread when a client is behind a QueuedListener or a CallbackWatch,
-// compared with the client itself in the list.
-
-#include <benchmark/benchmark.h>
+// What a delivery costs through a QueuedListener, whatever its client does, and a CallbackWatch,
+// each registered alone in a list.
 
 #include <chrono>
 #include <condition_variable>
-#include <cstdio>
 #include <ctime>
 #include <mutex>
-#include <string>
 #include <thread>
 
-#include "bd/eventlistenerlist.h"
+#include <benchmark/benchmark.h>
+
+#include "bdmvnavigator/inavigatorevent.h"
+#include "benchmarks.h"
 #include "clientkit/callbackwatch.h"
 #include "clientkit/queuedlistener.h"
-#include "kevro_linux.h"
 #include "listener.h"
-#include "parkedthread.h"
-#include "report.h"
+
+namespace bench
+{
 
 namespace
 {
 
 using bdmv::INavigatorListener;
+typedef bdmv::INavigatorEvent::Listeners ListenerList;
 
 struct Shape {
-    const char* name;
-    void (*deliver)(bd::EventListenerList<INavigatorListener>& list);
+    const char* callback;
+    void (*deliver)(ListenerList& list);
 };
 
 constexpr Shape Shapes[] = {
-    {"no arguments",
-     [](bd::EventListenerList<INavigatorListener>& list) {
+    {NoArguments,
+     [](ListenerList& list) {
          bd::EventListenerList_FireParam0(list, &INavigatorListener::PlayStarted);
      }},
-    {"a position",
-     [](bd::EventListenerList<INavigatorListener>& list) {
-         bd::EventListenerList_FireParam1(list, &INavigatorListener::CurrentTimePosition,
-                                          bench::Position);
+    {ByReference,
+     [](ListenerList& list) {
+         bd::EventListenerList_FireParam1(list, &INavigatorListener::CurrentTimePosition, Position);
      }},
-    {"AudioInfoType",
-     [](bd::EventListenerList<INavigatorListener>& list) {
+    {ByValue,
+     [](ListenerList& list) {
          bd::EventListenerList_FireParam2(list, &INavigatorListener::AudioInfoChanged, true,
-                                          bench::AudioInfo);
+                                          AudioInfo);
      }},
 };
 
@@ -63,7 +62,7 @@ public:
     void Deliver(const Shape& shape) { shape.deliver(m_List); }
 
 private:
-    bd::EventListenerList<INavigatorListener> m_List;
+    ListenerList m_List;
     INavigatorListener& m_rListener;
 };
 
@@ -133,20 +132,15 @@ void DeliverToOne(benchmark::State& state, INavigatorListener& listener, const S
     }
 }
 
-void DeliverPlain(benchmark::State& state, const Shape& shape)
-{
-    DeliverToOne(state, bench::Listeners()[0], shape);
-}
-
 void DeliverWatched(benchmark::State& state, const Shape& shape)
 {
-    bdmv::CallbackWatch watch(bench::Listeners()[0], "client", std::chrono::hours(1));
+    bdmv::CallbackWatch watch(Listeners()[0], "client", std::chrono::hours(1));
     DeliverToOne(state, watch, shape);
 }
 
 void DeliverAtOnce(benchmark::State& state, const Shape& shape)
 {
-    bdmv::QueuedListener queued(bench::Listeners()[0]);
+    bdmv::QueuedListener queued(Listeners()[0]);
     DeliverToOne(state, queued, shape);
 }
 
@@ -157,7 +151,7 @@ void DeliverSleeping(benchmark::State& state, const Shape& shape)
     DeliverToOne(state, queued, shape);
 }
 
-void DeliverFull(benchmark::State& state, const Shape& shape)
+void DeliverTaken(benchmark::State& state, const Shape& shape)
 {
     HeldClient client;
     bdmv::QueuedListener queued(client);
@@ -180,7 +174,7 @@ double ThreadSeconds()
 }
 
 /** Fills the places, then waits until the client has emptied them, outside the measured time. */
-void DeliverRoom(benchmark::State& state, const Shape& shape)
+void DeliverFree(benchmark::State& state, const Shape& shape)
 {
     constexpr int Batch = 256;
     HeldClient client;
@@ -203,7 +197,7 @@ void DeliverRoom(benchmark::State& state, const Shape& shape)
 /** Delivers when the client's thread is blocked, as between most callbacks of a real session. */
 void DeliverWaking(benchmark::State& state, const Shape& shape)
 {
-    bdmv::QueuedListener queued(bench::Listeners()[0]);
+    bdmv::QueuedListener queued(Listeners()[0]);
     List list(queued);
     for (auto _ : state) {
         WaitUntilIdle(queued);
@@ -214,77 +208,37 @@ void DeliverWaking(benchmark::State& state, const Shape& shape)
     }
 }
 
-struct Subject {
-    const char* name;
-    void (*run)(benchmark::State& state, const Shape& shape);
-    bool measuresItself; ///< in processor time of the thread, as the benchmark does for the others
-};
+typedef void (*Run)(benchmark::State& state, const Shape& shape);
 
-constexpr Subject Plain = {"plain listener", DeliverPlain, false};
-constexpr Subject Subjects[] = {
-    Plain,
-    {"CallbackWatch", DeliverWatched, false},
-    {"QueuedListener, client busy, places free", DeliverRoom, true},
-    {"QueuedListener, client busy, all places taken", DeliverFull, false},
-    {"QueuedListener, client sleeps 100 ms each time", DeliverSleeping, false},
-    {"QueuedListener, client returns at once", DeliverAtOnce, false},
-    {"QueuedListener, thread blocked and woken", DeliverWaking, true},
-};
-
-std::string RowOf(const Subject& subject, const Shape& shape)
+/** A row for each shape. */
+void Register(const char* name, Run run)
 {
-    return std::string(subject.name) + "/" + shape.name;
-}
-
-void Register(const Subject& subject, const Shape& shape)
-{
-    benchmark::internal::Benchmark* const row = benchmark::RegisterBenchmark(
-        RowOf(subject, shape).c_str(),
-        [subject, shape](benchmark::State& state) { subject.run(state, shape); });
-    if (subject.measuresItself) {
-        row->UseManualTime();
-    }
-}
-
-double TimeOf(const bench::Report& report, const Subject& subject, const Shape& shape)
-{
-    const bench::Row row = report[RowOf(subject, shape)];
-    return subject.measuresItself ? row.wall : row.cpu;
-}
-
-void PrintTable(const bench::Report& report)
-{
-    std::printf("\nDelivery to one client: ns, × plain listener\n  %-48s", "");
     for (const Shape& shape : Shapes) {
-        std::printf("%20s", shape.name);
+        benchmark::RegisterBenchmark(ClientKitRow(shape.callback, name).c_str(),
+                                     [run, &shape](benchmark::State& state) { run(state, shape); });
     }
-    std::printf("\n");
-    for (const Subject& subject : Subjects) {
-        std::printf("  %-48s", subject.name);
-        for (const Shape& shape : Shapes) {
-            const double time = TimeOf(report, subject, shape);
-            bench::PrintNumber(12, 1, time);
-            bench::PrintNumber(8, 2, time / TimeOf(report, Plain, shape));
-        }
-        std::printf("\n");
+}
+
+/** The same for a benchmark that measures the processor time itself. */
+void RegisterManual(const char* name, Run run)
+{
+    for (const Shape& shape : Shapes) {
+        benchmark::RegisterBenchmark(ClientKitRow(shape.callback, name).c_str(),
+                                     [run, &shape](benchmark::State& state) { run(state, shape); })
+            ->UseManualTime();
     }
 }
 
 } // namespace
 
-int main(int argc, char** argv)
+void RegisterQueuedListener()
 {
-    const bench::ParkedThread parked;
-    KEVRO_Log_Configure("", nullptr, 0);
-    for (const Subject& subject : Subjects) {
-        for (const Shape& shape : Shapes) {
-            Register(subject, shape);
-        }
-    }
-    bench::Report report;
-    if (!bench::RunBenchmarks(report, argc, argv)) {
-        return 2;
-    }
-    PrintTable(report);
-    return 0;
+    Register(WatchName, DeliverWatched);
+    RegisterManual(QueueFreeName, DeliverFree);
+    Register(QueueTakenName, DeliverTaken);
+    Register(QueueSleepingName, DeliverSleeping);
+    Register(QueueAtOnceName, DeliverAtOnce);
+    RegisterManual(QueueWakingName, DeliverWaking);
 }
+
+} // namespace bench

@@ -155,25 +155,26 @@ void PrintLog(const Report& report, Goal& queued)
     }
 }
 
-/** A listener of the client kit, and the goal for it; without a goal null. */
+/** A listener of the client kit. */
 struct ClientKitSubject {
     const char* name;
-    Goal* goal;
+    Goal* goal;                    ///< for it; null for none
+    double Row::*time = &Row::cpu; ///< wall if the benchmark measures the thread's CPU time itself
 };
 
 void PrintClientKit(const Report& report, const std::vector<ClientKitSubject>& subjects)
 {
     constexpr const char* Callbacks[] = {NoArguments, ByReference, ByValue};
-    std::printf("\nDelivery to one listener: ns, × plain listener\n  %-28s", "");
+    std::printf("\nDelivery to one listener: ns, × plain listener\n  %-39s", "");
     for (const char* const callback : Callbacks) {
         std::printf("%25s", callback);
     }
     std::printf("\n");
     for (const ClientKitSubject& subject : subjects) {
-        std::printf("  %-28s       ", subject.name);
+        std::printf("  %-39s       ", subject.name);
         for (const char* const callback : Callbacks) {
             const double plain = report[ClientKitRow(callback, PlainName)].cpu;
-            const double time = report[ClientKitRow(callback, subject.name)].cpu;
+            const double time = report[ClientKitRow(callback, subject.name)].*subject.time;
             PrintTime(time, plain);
             std::printf("%7s", "");
             if (subject.goal != nullptr) {
@@ -193,15 +194,24 @@ void PrintTables(const Report& report)
     Goal lineOff("an event with its line off, × delivery alone plus one call of the switch", 1.15);
     Goal queued("a line into the queue, × vsnprintf alone", 1.5);
     Goal status("a delivery to StatusListener, × plain listener", 3);
+    Goal queue("a delivery to QueuedListener whose thread runs, × plain listener", 5);
 
     PrintDelivery(report, delivery);
     PrintEvents(report, allocations, lineOff);
     PrintThreads(report);
     PrintLog(report, queued);
-    PrintClientKit(report, {{PlainName, nullptr}, {StatusName, &status}, {RelayName, nullptr}});
+    PrintClientKit(report, {{PlainName, nullptr},
+                            {StatusName, &status},
+                            {RelayName, nullptr},
+                            {WatchName, nullptr},
+                            {QueueFreeName, &queue, &Row::wall},
+                            {QueueTakenName, &queue},
+                            {QueueSleepingName, &queue},
+                            {QueueAtOnceName, &queue},
+                            {QueueWakingName, nullptr, &Row::wall}});
 
     std::printf("\nGoals\n");
-    for (const Goal* goal : {&delivery, &allocations, &lineOff, &queued, &status}) {
+    for (const Goal* goal : {&delivery, &allocations, &lineOff, &queued, &status, &queue}) {
         goal->Print();
     }
 }
