@@ -61,23 +61,17 @@ void CallbackQueue::LoseAll()
 CallbackQueue::Step CallbackQueue::Take(Callback& callback, PlaybackStatus& status)
 {
     m_Taken = NextStep();
-    switch (m_Taken) {
-    case StepDeliver:
+    if (m_Taken == StepDeliver) {
         --m_Waiting;
         TakeOldest(callback);
-        break;
-    case StepDiscard:
+    } else if (m_Taken == StepDiscard) {
         --m_LostLater;
         TakeOldest(callback);
-        break;
-    case StepResync:
+    } else if (m_Taken == StepResync) {
         status = m_AfterResync > 0 ? m_ResyncStatus : m_Status;
         m_Resync = false;
         m_Waiting = m_AfterResync;
         m_AfterResync = 0;
-        break;
-    case StepNone:
-        break;
     }
     return m_Taken;
 }
@@ -86,7 +80,6 @@ void CallbackQueue::Finish()
 {
     m_Counters.delivered += m_Taken == StepDeliver ? 1 : 0;
     m_Counters.resyncs += m_Taken == StepResync ? 1 : 0;
-    m_Taken = StepNone;
     if (m_TakenBlock.data != nullptr) {
         m_Blocks.Remove(m_TakenBlock.data, m_TakenBlock.size);
         m_TakenBlock.data = nullptr;
