@@ -27,7 +27,8 @@ public:
 private:
     void OnCallback(const Callback& callback) override
     {
-        const Callback copy(callback);
+        Callback copy(m_Button);
+        copy = callback;
         Callback button(m_Button);
         Callback other(copy);
         other = button;
