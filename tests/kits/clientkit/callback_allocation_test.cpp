@@ -3,6 +3,7 @@
 #include "bdmvnavigator/navigatorlisteneradapter.h"
 #include "clientkit/names.h"
 #include "kits/clientkit/everycallback.h"
+#include "testkit/fakeplatform.h"
 #include "testkit/operatornew.h"
 
 namespace bdmv
