@@ -24,15 +24,22 @@ if(BDMVNAVIGATOR_BUILD_PORT)
   install(EXPORT bdmvnavigator-kevro-targets NAMESPACE bdmvnavigator:: DESTINATION ${package_dir})
 endif()
 
-# A component of the package: its target and its headers, "NAME/...".
-foreach(kit IN LISTS bdmvnavigator_kits)
-  install(DIRECTORY kits/${kit} DESTINATION ${header_dir} FILES_MATCHING PATTERN "*.h")
-  install(TARGETS bdmvnavigator_${kit} EXPORT bdmvnavigator-${kit}-targets
+# bdmvnavigator_install_component(NAME ROOT): a component of the package: its target and its headers,
+# which are in the folder ROOT/NAME.
+function(bdmvnavigator_install_component name root)
+  install(DIRECTORY ${root}/${name} DESTINATION ${header_dir} FILES_MATCHING PATTERN "*.h")
+  install(TARGETS bdmvnavigator_${name} EXPORT bdmvnavigator-${name}-targets
     ARCHIVE DESTINATION ${CMAKE_INSTALL_LIBDIR})
-  install(EXPORT bdmvnavigator-${kit}-targets NAMESPACE bdmvnavigator:: DESTINATION ${package_dir})
+  install(EXPORT bdmvnavigator-${name}-targets
+    NAMESPACE bdmvnavigator:: DESTINATION ${package_dir})
+endfunction()
+
+foreach(kit IN LISTS bdmvnavigator_kits)
+  bdmvnavigator_install_component(${kit} kits)
 endforeach()
 
 if(BDMVNAVIGATOR_BUILD_DESKPLAYER)
+  bdmvnavigator_install_component(deskplayer deskplayer/inc)
   install(TARGETS bdmv-deskplayer RUNTIME DESTINATION ${CMAKE_INSTALL_BINDIR})
   install(FILES deskplayer/bdmv-deskplayer.1 DESTINATION ${CMAKE_INSTALL_MANDIR}/man1)
   install(FILES deskplayer/completion/bdmv-deskplayer

@@ -8,34 +8,32 @@
 #include <chrono>
 #include <cstdlib>
 #include <iostream>
-#include <memory>
+#include <optional>
 #include <stdexcept>
 #include <string>
 #include <thread>
-#include <utility>
 #include <vector>
 
 #include "check/check.h"
 #include "check/faultoutput.h"
+#include "deskplayer/desk.h"
+#include "deskplayer/output.h"
+#include "deskplayer/session.h"
 #include "disc/disc.h"
+#include "facade/outputsettings.h"
+#include "facade/parts.h"
 #include "kevro_linux.h"
 #include "listing/description.h"
 #include "listing/listing.h"
 #include "listing/listingjson.h"
-#include "navigator/desk.h"
-#include "output/outputformat.h"
 #include "output/textoutput.h"
 #include "program/failure.h"
 #include "program/logclock.h"
 #include "program/options.h"
-#include "program/playbacktype.h"
 #include "program/progress.h"
 #include "program/remotescreen.h"
-#include "program/sessionchecks.h"
-#include "program/sessionfile.h"
 #include "program/target.h"
 #include "session/remote.h"
-#include "session/session.h"
 #include "text/printable.h"
 #include "text/timetext.h"
 
@@ -48,82 +46,71 @@ namespace
 OutputOptions OutputOptionsOf(const Options& options)
 {
     OutputOptions output;
-    try {
-        output.format = ParseOutputFormat(options.format);
-        if (!options.listen.empty()) {
-            output.filter.KeepInterfaces(options.listen);
-        }
-        if (!options.only.empty()) {
-            output.filter.KeepCallbacks(options.only);
-        }
-    } catch (const std::invalid_argument& error) {
-        throw UsageError(error.what());
-    }
-    if ((options.list || options.describe || options.check) &&
-        output.format == OutputFormat::Trace) {
-        throw UsageError(std::string(options.list       ? "--list"
-                                     : options.describe ? "--describe"
-                                                        : "--check") +
-                         " excludes --format trace");
-    }
+    output.format = options.format;
+    output.interfaces = options.listen;
+    output.callbacks = options.only;
     output.coloured = options.output.empty() &&
                       WantsColours(STDOUT_FILENO, std::getenv("NO_COLOR"), std::getenv("TERM"));
     return output;
 }
 
-LoadedPlayList Load(const Disc& disc, const Options& options)
+/** @throw UsageError the options name no format, interface or callback, or exclude each other */
+OutputFormat CheckOutput(const Options& options)
 {
-    if (options.playList) {
-        return LoadPlayList(disc, *options.playList, disc.ReadPlayList(*options.playList));
+    OutputFormat format = OutputFormat::Text;
+    try {
+        format = ReadOutputOptions(OutputOptionsOf(options)).format;
+    } catch (const std::invalid_argument& error) {
+        throw UsageError(error.what());
     }
-    LongestPlayList longest = disc.FindLongestPlayList();
-    for (const std::string& line : longest.skipped) {
-        PrintMessage("skipped: " + line);
+    if ((options.list || options.describe || options.check) && format == OutputFormat::Trace) {
+        throw UsageError(std::string(options.list       ? "--list"
+                                     : options.describe ? "--describe"
+                                                        : "--check") +
+                         " excludes --format trace");
     }
-    return LoadPlayList(disc, longest.number, std::move(longest.playList));
+    return format;
 }
 
 /** @return the exit status */
-int Play(LoadedPlayList playList, const std::vector<ScriptStep>& steps, const Options& options,
-         const OutputOptions& outputOptions, std::ostream& stream)
+int Play(Desk& desk, const std::optional<Session>& session, const Options& options,
+         std::ostream& stream)
 {
-    Desk desk(std::move(playList));
-    const LogClock logClock(desk.Clock());
-    const std::unique_ptr<Output> output = MakeOutput(outputOptions, stream, desk.Clock());
-    desk.Listeners().AddListener(output.get());
-
+    const LogClock logClock(PartsOf(desk).Clock());
+    const DeskOutput output(desk, stream, OutputOptionsOf(options));
     if (options.remote) {
-        RemoteScreen screen(desk, stream);
-        PlayByRemote(desk, STDIN_FILENO, screen.Hooks());
+        RemoteScreen screen(PartsOf(desk), stream);
+        PlayByRemote(PartsOf(desk), STDIN_FILENO, screen.Hooks());
         return ExitOk;
     }
 
     Progress progress(options);
-    SessionHooks hooks;
     const auto start = std::chrono::steady_clock::now();
-    hooks.beforeTimePasses = [&](Ticks time) {
-        progress.Update([&desk] { return TimeText(desk.Clock().Now()); });
+    const TimeHandler beforeTimePasses = [&](Ticks time) {
+        progress.Update([&desk] { return TimeText(desk.Now()); });
         if (options.realTime) {
             stream.flush();
             std::this_thread::sleep_until(
-                start +
-                std::chrono::duration_cast<std::chrono::nanoseconds>(desk.Clock().Now() + time));
+                start + std::chrono::duration_cast<std::chrono::nanoseconds>(desk.Now() + time));
         }
     };
-    SessionChecks checks(options, steps, desk);
-    checks.AddTo(hooks);
-    if (options.session.empty()) {
-        PlayFromStartToEnd(desk, hooks);
-    } else {
-        PlaySession(steps, desk, hooks);
+    if (!session) {
+        PlayFromStartToEnd(desk, beforeTimePasses);
+        return ExitOk;
     }
-    return checks.HaveFailed() ? ExitSession : ExitOk;
+    SessionOptions sessionOptions;
+    sessionOptions.beforeTimePasses = beforeTimePasses;
+    sessionOptions.onMessage = PrintMessage;
+    const SessionReport report = PlaySession(desk, *session, sessionOptions);
+    const bool failed = !report.unmet.empty() || (options.strict && !report.refused.empty());
+    return failed ? ExitSession : ExitOk;
 }
 
 /** @return the exit status */
-int Check(const Options& options, OutputFormat format, std::ostream& stream)
+int Check(const Options& options, OutputFormat format, Target& target)
 {
     const Disc disc(options.disc, BackupCopies::Ignore);
+    std::ostream& stream = target.Open();
     const auto write = format == OutputFormat::Json ? WriteFaultAsJson : WriteFault;
     Progress progress(options);
     const std::size_t faults = CheckDisc(
@@ -140,32 +127,31 @@ int Check(const Options& options, OutputFormat format, std::ostream& stream)
 /** @return the exit status */
 int Run(const Options& options)
 {
-    const OutputOptions outputOptions = OutputOptionsOf(options);
-    const Disc disc(options.disc, BackupCopies::Use, PrintMessage);
+    const OutputFormat format = CheckOutput(options);
+    const bool json = format == OutputFormat::Json;
     Target target(options.output);
     int status = ExitOk;
-    const bool json = outputOptions.format == OutputFormat::Json;
     if (options.check) {
-        status = Check(options, outputOptions.format, target.Open());
+        status = Check(options, format, target);
     } else if (options.list) {
+        const Disc disc(options.disc, BackupCopies::Use, PrintMessage);
         const std::vector<std::uint32_t> numbers = disc.PlayListNumbers();
         const auto list = json ? ListPlayListsAsJson : ListPlayLists;
         status = list(target.Open(), disc, numbers, PrintMessage) == 0 ? ExitOk : ExitDisc;
     } else if (options.describe) {
+        const Disc disc(options.disc, BackupCopies::Use, PrintMessage);
         const PlayList playList = disc.ReadPlayList(*options.describe);
         const auto describe = json ? DescribePlayListAsJson : DescribePlayList;
         const std::size_t faults =
             describe(target.Open(), disc, *options.describe, playList, PrintMessage);
         status = faults == 0 ? ExitOk : ExitDisc;
     } else {
-        LoadedPlayList playList = Load(disc, options);
-        ReportPlaybackType(playList);
-        for (const std::string& note : playList.notes) {
-            PrintMessage(note);
+        Desk desk(options.disc, options.playList, PrintMessage);
+        std::optional<Session> session;
+        if (!options.session.empty()) {
+            session = ReadSessionFile(options.session);
         }
-        const std::vector<ScriptStep> steps =
-            options.session.empty() ? std::vector<ScriptStep>() : ReadSessionFile(options.session);
-        status = Play(std::move(playList), steps, options, outputOptions, target.Open());
+        status = Play(desk, session, options, target.Open());
     }
     target.Finish();
     return status;
@@ -217,7 +203,7 @@ int main(int argc, char** argv)
     } catch (const deskplayer::DiscError& error) {
         deskplayer::PrintMessage(error.what());
         return deskplayer::ExitDisc;
-    } catch (const deskplayer::ScriptError& error) {
+    } catch (const deskplayer::SessionError& error) {
         deskplayer::PrintMessage(error.what());
         return deskplayer::ExitUsage;
     } catch (const deskplayer::UsageError& error) {

@@ -1,16 +1,12 @@
 // A client's listener on the desk player: a front panel that shows the state of playback, driven by
 // a disc's play list and a session. Link it with bdmvnavigator::deskplayer.
 
-#include <fstream>
 #include <iostream>
-#include <iterator>
 #include <string>
-#include <utility>
 
 #include "bdmvnavigator/navigatorlisteneradapter.h"
-#include "disc/disc.h"
-#include "navigator/desk.h"
-#include "session/session.h"
+#include "deskplayer/desk.h"
+#include "deskplayer/session.h"
 
 namespace
 {
@@ -38,12 +34,6 @@ const char* const Evening = "play\n"
                             "after 10s chapter next\n"
                             "at 05:00 still off\n";
 
-std::string ReadFile(const char* fileName)
-{
-    std::ifstream file(fileName, std::ios::binary);
-    return {std::istreambuf_iterator<char>(file), std::istreambuf_iterator<char>()};
-}
-
 } // namespace
 
 int main(int argc, char** argv)
@@ -53,23 +43,23 @@ int main(int argc, char** argv)
         return 2;
     }
     try {
-        const std::string session = argc == 3 ? ReadFile(argv[2]) : Evening;
-        const deskplayer::Disc disc(argv[1]);
-        deskplayer::LongestPlayList longest = disc.FindLongestPlayList();
-        deskplayer::Desk desk(
-            deskplayer::LoadPlayList(disc, longest.number, std::move(longest.playList)));
+        deskplayer::Desk desk(argv[1]);
+        const auto session =
+            argc == 3 ? deskplayer::ReadSessionFile(argv[2]) : deskplayer::Session(Evening);
 
         FrontPanel frontPanel;
         desk.Listeners().AddListener(&frontPanel);
-        deskplayer::PlaySession(
-            deskplayer::ParseScript(session, "session", deskplayer::CommandSyntaxes()), desk, {});
+        const deskplayer::SessionReport report = deskplayer::PlaySession(desk, session);
         desk.Listeners().RemoveListener(&frontPanel);
+        for (const std::string& line : report.unmet) {
+            std::cerr << "own_listener: " << line << '\n';
+        }
+        return report.unmet.empty() ? 0 : 4;
     } catch (const deskplayer::DiscError& error) {
         std::cerr << "own_listener: " << error.what() << '\n';
         return 3;
-    } catch (const deskplayer::ScriptError& error) {
+    } catch (const deskplayer::SessionError& error) {
         std::cerr << "own_listener: " << error.what() << '\n';
         return 2;
     }
-    return 0;
 }

@@ -10,9 +10,9 @@
 #include <utility>
 #include <vector>
 
+#include "deskplayer/ticks.h"
 #include "disc/bytereader.h"
 #include "disc/streamattributes.h"
-#include "text/ticks.h"
 
 namespace deskplayer
 {

@@ -6,22 +6,12 @@
 #define DESKPLAYER_DISC_ERRORS_H
 
 #include <cstddef>
-#include <functional>
-#include <stdexcept>
 #include <string>
+
+#include "deskplayer/errors.h"
 
 namespace deskplayer
 {
-
-/** A disc cannot be read. what() is one line without control characters. */
-class DiscError : public std::runtime_error
-{
-public:
-    using std::runtime_error::runtime_error;
-};
-
-/** Receives a message of one line. */
-using MessageHandler = std::function<void(const std::string& message)>;
 
 /** A file or folder is missing or cannot be read. */
 class FileError : public DiscError

@@ -10,8 +10,8 @@
 #include <optional>
 #include <vector>
 
+#include "deskplayer/ticks.h"
 #include "disc/playlist.h"
-#include "text/ticks.h"
 
 namespace deskplayer
 {

@@ -11,9 +11,9 @@
 
 #include <nlohmann/json.hpp>
 
+#include "deskplayer/ticks.h"
 #include "disc/aspectratios.h"
 #include "disc/playlist.h"
-#include "text/ticks.h"
 
 namespace deskplayer
 {

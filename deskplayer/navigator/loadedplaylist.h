@@ -12,10 +12,10 @@
 #include <utility>
 #include <vector>
 
+#include "deskplayer/ticks.h"
 #include "disc/disc.h"
 #include "disc/playlist.h"
 #include "disc/timeline.h"
-#include "text/ticks.h"
 
 namespace deskplayer
 {

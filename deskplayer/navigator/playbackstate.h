@@ -12,7 +12,7 @@
 #include "bd/types.h"
 #include "bdstreaming/types.h"
 #include "database/iprogramdata.h"
-#include "text/ticks.h"
+#include "deskplayer/ticks.h"
 
 namespace deskplayer
 {

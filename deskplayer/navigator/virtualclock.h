@@ -7,7 +7,7 @@
 
 #include <atomic>
 
-#include "text/ticks.h"
+#include "deskplayer/ticks.h"
 
 namespace deskplayer
 {

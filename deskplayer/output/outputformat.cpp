@@ -14,18 +14,18 @@ OutputFormat ParseOutputFormat(std::string_view name)
         FindChoice(name, "an output format", {OutputFormatNames.begin(), OutputFormatNames.end()}));
 }
 
-std::unique_ptr<Output> MakeOutput(const OutputOptions& options, std::ostream& stream,
+std::unique_ptr<Output> MakeOutput(const OutputSettings& settings, std::ostream& stream,
                                    const VirtualClock& clock)
 {
-    switch (options.format) {
+    switch (settings.format) {
     case OutputFormat::Json:
-        return std::make_unique<JsonOutput>(stream, clock, options.filter);
+        return std::make_unique<JsonOutput>(stream, clock, settings.filter);
     case OutputFormat::Trace:
-        return std::make_unique<TraceOutput>(stream, clock, options.filter);
+        return std::make_unique<TraceOutput>(stream, clock, settings.filter);
     case OutputFormat::Text:
         break;
     }
-    return std::make_unique<TextOutput>(stream, clock, options.filter, options.coloured);
+    return std::make_unique<TextOutput>(stream, clock, settings.filter, settings.coloured);
 }
 
 } // namespace deskplayer

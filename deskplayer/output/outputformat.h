@@ -31,14 +31,14 @@ inline constexpr std::array<std::string_view, 3> OutputFormatNames{"text", "json
 OutputFormat ParseOutputFormat(std::string_view name);
 
 /** What to write, and how. */
-struct OutputOptions {
+struct OutputSettings {
     OutputFormat format = OutputFormat::Text;
     OutputFilter filter;
     bool coloured = false; ///< for text only
 };
 
 /** @param stream does not throw; it and @p clock must outlive the output */
-std::unique_ptr<Output> MakeOutput(const OutputOptions& options, std::ostream& stream,
+std::unique_ptr<Output> MakeOutput(const OutputSettings& settings, std::ostream& stream,
                                    const VirtualClock& clock);
 
 } // namespace deskplayer

@@ -5,9 +5,9 @@
 #ifndef DESKPLAYER_PROGRAM_LOGCLOCK_H
 #define DESKPLAYER_PROGRAM_LOGCLOCK_H
 
+#include "deskplayer/ticks.h"
 #include "kevro_linux.h"
 #include "navigator/virtualclock.h"
-#include "text/ticks.h"
 
 namespace deskplayer
 {

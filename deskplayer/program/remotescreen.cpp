@@ -26,7 +26,7 @@ std::size_t WidthOfTerminal()
 
 } // namespace
 
-RemoteScreen::RemoteScreen(Desk& desk, std::ostream& output)
+RemoteScreen::RemoteScreen(DeskParts& desk, std::ostream& output)
     : m_rDesk(desk), m_rOutput(output), m_OnTerminal(isatty(STDERR_FILENO) != 0)
 {
     std::cerr << RemoteHelp();

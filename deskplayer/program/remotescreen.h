@@ -25,7 +25,7 @@ class RemoteScreen
 {
 public:
     /** Lists the keys. @param output is flushed before every wait; it and @p desk outlive this */
-    RemoteScreen(Desk& desk, std::ostream& output);
+    RemoteScreen(DeskParts& desk, std::ostream& output);
 
     RemoteScreen(const RemoteScreen&) = delete;
     RemoteScreen& operator=(const RemoteScreen&) = delete;
@@ -39,7 +39,7 @@ private:
     void TakeKey(char key);
     void ShowRefusal(const std::string& reason);
 
-    Desk& m_rDesk;
+    DeskParts& m_rDesk;
     std::ostream& m_rOutput;
     const bool m_OnTerminal;
     std::string m_Refusal;

@@ -21,7 +21,7 @@ bd::PlayMode ModeOf(bd::PlayDirectionDef direction, std::int64_t steps)
                         static_cast<bd::PlaySpeedDef>(std::int64_t{bd::PlaySpeedNormal} + steps));
 }
 
-Outcome PlayFast(Desk& desk, bd::PlayDirectionDef direction, std::uint64_t steps)
+Outcome PlayFast(DeskParts& desk, bd::PlayDirectionDef direction, std::uint64_t steps)
 {
     if (steps == 0 || steps > FastSteps) {
         return Outcome::Refused("fast speeds are numbered 1 to " + std::to_string(FastSteps));
@@ -29,7 +29,7 @@ Outcome PlayFast(Desk& desk, bd::PlayDirectionDef direction, std::uint64_t steps
     return desk.Navigator().SetPlayMode(ModeOf(direction, static_cast<std::int64_t>(steps)));
 }
 
-Outcome PlaySlowly(Desk& desk, bd::PlayDirectionDef direction, std::uint64_t steps)
+Outcome PlaySlowly(DeskParts& desk, bd::PlayDirectionDef direction, std::uint64_t steps)
 {
     if (steps == 0 || steps > SlowSteps) {
         return Outcome::Refused("slow speeds are numbered 1 to " + std::to_string(SlowSteps));
@@ -45,7 +45,7 @@ bd::ZoomRectangleDef RectangleOf(Values values, std::size_t first)
 
 /** The number after the selected one, or 1 after the last. */
 template <typename Number>
-std::uint64_t NextOf(Desk& desk, void (PlaybackContext::*get)(Number*, bd::UInt8*))
+std::uint64_t NextOf(DeskParts& desk, void (PlaybackContext::*get)(Number*, bd::UInt8*))
 {
     Number number = 0;
     bd::UInt8 count = 0;
@@ -60,153 +60,154 @@ const std::vector<Command>& Commands()
     static const std::vector<Command> commands = {
         // Playback
         {{"play", "start at the beginning of the play list"},
-         [](Desk& d, Values) { return d.Navigator().Play(); }},
-        {{"stop", "end playback"}, [](Desk& d, Values) { return d.Navigator().Stop(); }},
-        {{"pause", "pause playback"}, [](Desk& d, Values) { return d.Navigator().Pause(); }},
+         [](DeskParts& d, Values) { return d.Navigator().Play(); }},
+        {{"stop", "end playback"}, [](DeskParts& d, Values) { return d.Navigator().Stop(); }},
+        {{"pause", "pause playback"}, [](DeskParts& d, Values) { return d.Navigator().Pause(); }},
         {{"continue", "continue after a pause"},
-         [](Desk& d, Values) { return d.Navigator().Continue(); }},
+         [](DeskParts& d, Values) { return d.Navigator().Continue(); }},
         {{"step", "show the next picture while paused"},
-         [](Desk& d, Values) { return d.Navigator().Step(); }},
+         [](DeskParts& d, Values) { return d.Navigator().Step(); }},
         {{"forward", "play forward at normal speed"},
-         [](Desk& d, Values) {
+         [](DeskParts& d, Values) {
              return d.Navigator().SetPlayMode(ModeOf(bd::PlayDirectionForward, 0));
          }},
         {{"forward fast NUMBER", "play fast, at speed 1 to 12"},
-         [](Desk& d, Values v) { return PlayFast(d, bd::PlayDirectionForward, v[0]); }},
+         [](DeskParts& d, Values v) { return PlayFast(d, bd::PlayDirectionForward, v[0]); }},
         {{"forward slow NUMBER", "play in slow motion, at speed 1 to 5"},
-         [](Desk& d, Values v) { return PlaySlowly(d, bd::PlayDirectionForward, v[0]); }},
+         [](DeskParts& d, Values v) { return PlaySlowly(d, bd::PlayDirectionForward, v[0]); }},
         {{"backward", "play backward at normal speed"},
-         [](Desk& d, Values) {
+         [](DeskParts& d, Values) {
              return d.Navigator().SetPlayMode(ModeOf(bd::PlayDirectionBackward, 0));
          }},
         {{"backward fast NUMBER", "play backward fast, at speed 1 to 12"},
-         [](Desk& d, Values v) { return PlayFast(d, bd::PlayDirectionBackward, v[0]); }},
+         [](DeskParts& d, Values v) { return PlayFast(d, bd::PlayDirectionBackward, v[0]); }},
         {{"backward slow NUMBER", "play backward in slow motion, at speed 1 to 5"},
-         [](Desk& d, Values v) { return PlaySlowly(d, bd::PlayDirectionBackward, v[0]); }},
-        {{"still off", "leave a still"}, [](Desk& d, Values) { return d.Navigator().EndStill(); }},
+         [](DeskParts& d, Values v) { return PlaySlowly(d, bd::PlayDirectionBackward, v[0]); }},
+        {{"still off", "leave a still"},
+         [](DeskParts& d, Values) { return d.Navigator().EndStill(); }},
         {{"suspend", "suspend playback, as a title does when it calls a menu"},
-         [](Desk& d, Values) { return d.Navigator().Suspend(); }},
+         [](DeskParts& d, Values) { return d.Navigator().Suspend(); }},
         {{"resume", "resume suspended playback"},
-         [](Desk& d, Values) { return d.Navigator().Resume(); }},
+         [](DeskParts& d, Values) { return d.Navigator().Resume(); }},
 
         // Position
         {{"seek TIME", "go to a time of the play list"},
-         [](Desk& d, Values v) { return d.Navigator().SearchTime(Ticks(v[0])); }},
+         [](DeskParts& d, Values v) { return d.Navigator().SearchTime(Ticks(v[0])); }},
         {{"chapter next", "go to the next chapter"},
-         [](Desk& d, Values) { return d.Navigator().SkipToNextChapter(); }},
+         [](DeskParts& d, Values) { return d.Navigator().SkipToNextChapter(); }},
         {{"chapter previous", "go to the start of this chapter or of the previous one"},
-         [](Desk& d, Values) { return d.Navigator().SkipToPreviousChapter(); }},
+         [](DeskParts& d, Values) { return d.Navigator().SkipToPreviousChapter(); }},
         {{"chapter NUMBER", "go to a chapter"},
-         [](Desk& d, Values v) { return d.Navigator().SearchChapter(v[0]); }},
+         [](DeskParts& d, Values v) { return d.Navigator().SearchChapter(v[0]); }},
 
         // Repeat and triggers
         {{"repeat a", "set the start of an A-B repeat"},
-         [](Desk& d, Values) { return d.Navigator().SetPointA(); }},
+         [](DeskParts& d, Values) { return d.Navigator().SetPointA(); }},
         {{"repeat b", "set the end of an A-B repeat, and repeat from A to B"},
-         [](Desk& d, Values) { return d.Navigator().SetPointB(); }},
+         [](DeskParts& d, Values) { return d.Navigator().SetPointB(); }},
         {{"repeat ab off", "end the A-B repeat"},
-         [](Desk& d, Values) { return d.Navigator().EndABRepeat(); }},
+         [](DeskParts& d, Values) { return d.Navigator().EndABRepeat(); }},
         {{"repeat chapter", "repeat this chapter"},
-         [](Desk& d, Values) { return d.Navigator().RepeatChapter(); }},
+         [](DeskParts& d, Values) { return d.Navigator().RepeatChapter(); }},
         {{"repeat title", "repeat the play list"},
-         [](Desk& d, Values) { return d.Navigator().RepeatTitle(); }},
+         [](DeskParts& d, Values) { return d.Navigator().RepeatTitle(); }},
         {{"repeat off", "end the repeat of the chapter or play list"},
-         [](Desk& d, Values) { return d.Navigator().EndChapterTitleRepeat(); }},
+         [](DeskParts& d, Values) { return d.Navigator().EndChapterTitleRepeat(); }},
         {{"trigger TIME", "notify listeners when playback reaches a time of the play list"},
-         [](Desk& d, Values v) { return d.Navigator().SetTrigger(Ticks(v[0])); }},
+         [](DeskParts& d, Values v) { return d.Navigator().SetTrigger(Ticks(v[0])); }},
 
         // Streams
         {{"audio NUMBER", "select an audio stream"},
-         [](Desk& d, Values v) { return d.Navigator().SelectAudio(v[0]); }},
+         [](DeskParts& d, Values v) { return d.Navigator().SelectAudio(v[0]); }},
         {{"audio next", "select the next audio stream"},
-         [](Desk& d, Values) {
+         [](DeskParts& d, Values) {
              return d.Navigator().SelectAudio(NextOf(d, &PlaybackContext::GetAudioInfo));
          }},
         {{"subtitle on", "show subtitles"},
-         [](Desk& d, Values) { return d.Navigator().ShowSubtitles(true); }},
+         [](DeskParts& d, Values) { return d.Navigator().ShowSubtitles(true); }},
         {{"subtitle off", "hide subtitles"},
-         [](Desk& d, Values) { return d.Navigator().ShowSubtitles(false); }},
+         [](DeskParts& d, Values) { return d.Navigator().ShowSubtitles(false); }},
         {{"subtitle next", "select the next subtitle stream"},
-         [](Desk& d, Values) {
+         [](DeskParts& d, Values) {
              return d.Navigator().SelectSubtitle(NextOf(d, &PlaybackContext::GetPgTextStInfo));
          }},
         {{"subtitle style NUMBER", "select the style of text subtitles"},
-         [](Desk& d, Values v) { return d.Navigator().SelectStyle(v[0]); }},
+         [](DeskParts& d, Values v) { return d.Navigator().SelectStyle(v[0]); }},
         {{"subtitle NUMBER", "select a subtitle stream"},
-         [](Desk& d, Values v) { return d.Navigator().SelectSubtitle(v[0]); }},
+         [](DeskParts& d, Values v) { return d.Navigator().SelectSubtitle(v[0]); }},
         {{"angle NUMBER", "select an angle"},
-         [](Desk& d, Values v) { return d.Navigator().SelectAngle(v[0]); }},
+         [](DeskParts& d, Values v) { return d.Navigator().SelectAngle(v[0]); }},
         {{"angle next", "select the next angle"},
-         [](Desk& d, Values) {
+         [](DeskParts& d, Values) {
              return d.Navigator().SelectAngle(NextOf(d, &PlaybackContext::GetAngleInfo));
          }},
         {{"pip on", "show the secondary video"},
-         [](Desk& d, Values) { return d.Navigator().ShowSecondaryVideo(true); }},
+         [](DeskParts& d, Values) { return d.Navigator().ShowSecondaryVideo(true); }},
         {{"pip off", "hide the secondary video"},
-         [](Desk& d, Values) { return d.Navigator().ShowSecondaryVideo(false); }},
+         [](DeskParts& d, Values) { return d.Navigator().ShowSecondaryVideo(false); }},
         {{"pip audio on", "turn the secondary audio on"},
-         [](Desk& d, Values) { return d.Navigator().ShowSecondaryAudio(true); }},
+         [](DeskParts& d, Values) { return d.Navigator().ShowSecondaryAudio(true); }},
         {{"pip audio off", "turn the secondary audio off"},
-         [](Desk& d, Values) { return d.Navigator().ShowSecondaryAudio(false); }},
+         [](DeskParts& d, Values) { return d.Navigator().ShowSecondaryAudio(false); }},
         {{"pip audio NUMBER", "select a secondary audio stream"},
-         [](Desk& d, Values v) { return d.Navigator().SelectSecondaryAudio(v[0]); }},
+         [](DeskParts& d, Values v) { return d.Navigator().SelectSecondaryAudio(v[0]); }},
         {{"pip subtitle on", "use the subtitles of the picture-in-picture"},
-         [](Desk& d, Values) { return d.Navigator().PickPipSubtitle(true); }},
+         [](DeskParts& d, Values) { return d.Navigator().PickPipSubtitle(true); }},
         {{"pip subtitle off", "use the subtitles of the primary video"},
-         [](Desk& d, Values) { return d.Navigator().PickPipSubtitle(false); }},
+         [](DeskParts& d, Values) { return d.Navigator().PickPipSubtitle(false); }},
         {{"pip subtitle NUMBER", "select a subtitle stream of the picture-in-picture"},
-         [](Desk& d, Values v) { return d.Navigator().SelectPipSubtitle(v[0]); }},
+         [](DeskParts& d, Values v) { return d.Navigator().SelectPipSubtitle(v[0]); }},
         {{"pip NUMBER", "select a secondary video stream"},
-         [](Desk& d, Values v) { return d.Navigator().SelectSecondaryVideo(v[0]); }},
+         [](DeskParts& d, Values v) { return d.Navigator().SelectSecondaryVideo(v[0]); }},
         {{"zoom off", "show the whole picture"},
-         [](Desk& d, Values) {
+         [](DeskParts& d, Values) {
              return d.Navigator().Zoom({WholePicture, WholePicture, 0});
          }},
         {{"zoom NUMBER NUMBER NUMBER NUMBER",
           "enlarge a part of the picture of 1920 x 1080: left, top, width, height"},
-         [](Desk& d, Values v) {
+         [](DeskParts& d, Values v) {
              return d.Navigator().Zoom({RectangleOf(v, 0), WholePicture, 0});
          }},
 
         // The menu
         {{"menu on", "open the pop-up menu"},
-         [](Desk& d, Values) { return d.Navigator().OpenPopUpMenu(); }},
+         [](DeskParts& d, Values) { return d.Navigator().OpenPopUpMenu(); }},
         {{"menu off", "close the pop-up menu"},
-         [](Desk& d, Values) { return d.Navigator().ClosePopUpMenu(); }},
+         [](DeskParts& d, Values) { return d.Navigator().ClosePopUpMenu(); }},
         {{"button previous", "select the button above"},
-         [](Desk& d, Values) { return d.Navigator().SelectPreviousButton(); }},
+         [](DeskParts& d, Values) { return d.Navigator().SelectPreviousButton(); }},
         {{"button next", "select the button below"},
-         [](Desk& d, Values) { return d.Navigator().SelectNextButton(); }},
+         [](DeskParts& d, Values) { return d.Navigator().SelectNextButton(); }},
         {{"button activate", "activate the selected button"},
-         [](Desk& d, Values) { return d.Navigator().ActivateButton(); }},
+         [](DeskParts& d, Values) { return d.Navigator().ActivateButton(); }},
         {{"button activate NUMBER", "select a button and activate it"},
-         [](Desk& d, Values v) { return d.Navigator().SelectAndActivateButton(v[0]); }},
+         [](DeskParts& d, Values v) { return d.Navigator().SelectAndActivateButton(v[0]); }},
         {{"button NUMBER", "select a button"},
-         [](Desk& d, Values v) { return d.Navigator().SelectButton(v[0]); }},
+         [](DeskParts& d, Values v) { return d.Navigator().SelectButton(v[0]); }},
 
         // The system
         {{"standby", "send the system to standby"},
-         [](Desk& d, Values) { return d.Navigator().GoToStandby(); }},
+         [](DeskParts& d, Values) { return d.Navigator().GoToStandby(); }},
         {{"wake", "wake up with the stored resume data"},
-         [](Desk& d, Values) { return d.Navigator().WakeUp(d.ResumeData()); }},
+         [](DeskParts& d, Values) { return d.Navigator().WakeUp(d.ResumeData()); }},
         {{"wake without data", "wake up without resume data"},
-         [](Desk& d, Values) { return d.Navigator().WakeUp({}); }},
+         [](DeskParts& d, Values) { return d.Navigator().WakeUp({}); }},
 
         // Failures
         {{"fail play", "make the next play fail"},
-         [](Desk& d, Values) {
+         [](DeskParts& d, Values) {
              d.Navigator().FailNextPlay();
              return Outcome::Done();
          }},
         {{"fail resume", "make the next resume fail"},
-         [](Desk& d, Values) {
+         [](DeskParts& d, Values) {
              d.Navigator().FailNextResume();
              return Outcome::Done();
          }},
         {{"fail preload", "make preloading fail"},
-         [](Desk& d, Values) { return d.Navigator().FailPreload(); }},
+         [](DeskParts& d, Values) { return d.Navigator().FailPreload(); }},
         {{"fail stream", "make the stream run out of data"},
-         [](Desk& d, Values) { return d.Navigator().Starve(); }},
+         [](DeskParts& d, Values) { return d.Navigator().Starve(); }},
     };
     return commands;
 }

@@ -8,7 +8,7 @@
 #include <cstdint>
 #include <vector>
 
-#include "navigator/desk.h"
+#include "navigator/deskparts.h"
 #include "navigator/outcome.h"
 #include "session/script.h"
 
@@ -18,7 +18,7 @@ namespace deskplayer
 /** A command: its syntax, and a function that performs it with the values of the placeholders. */
 struct Command {
     CommandSyntax syntax;
-    Outcome (*perform)(Desk& desk, const std::vector<std::uint64_t>& values);
+    Outcome (*perform)(DeskParts& desk, const std::vector<std::uint64_t>& values);
 };
 
 /** All commands, in the order of the help. */

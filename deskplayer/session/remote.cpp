@@ -24,27 +24,27 @@ typedef std::chrono::steady_clock Clock;
 constexpr char QuitKey = 'q';
 constexpr char ControlC = '\x03'; ///< a key, not a signal, so that the terminal is restored
 
-Outcome PauseOrContinue(Desk& desk)
+Outcome PauseOrContinue(DeskParts& desk)
 {
     return desk.Navigator().CurrentStatus() == Status::Playing ? desk.Navigator().Pause()
                                                                : desk.Navigator().Continue();
 }
 
-Outcome PlayOrStop(Desk& desk)
+Outcome PlayOrStop(DeskParts& desk)
 {
     const Status status = desk.Navigator().CurrentStatus();
     return status == Status::Stopped || status == Status::Finished ? desk.Navigator().Play()
                                                                    : desk.Navigator().Stop();
 }
 
-Outcome SetSpeed(Desk& desk, bd::PlayDirectionDef direction, int speed)
+Outcome SetSpeed(DeskParts& desk, bd::PlayDirectionDef direction, int speed)
 {
     return desk.Navigator().SetPlayMode(
         bd::PlayMode(direction, static_cast<bd::PlaySpeedDef>(speed)));
 }
 
 /** One step faster in a direction; from another direction or slow motion, the first fast step. */
-Outcome Faster(Desk& desk, bd::PlayDirectionDef direction)
+Outcome Faster(DeskParts& desk, bd::PlayDirectionDef direction)
 {
     const bd::PlayMode& mode = desk.Navigator().Context().GetPlayMode();
     const bool accelerates = mode.Direction() == direction && mode.Speed() >= bd::PlaySpeedNormal;
@@ -54,7 +54,7 @@ Outcome Faster(Desk& desk, bd::PlayDirectionDef direction)
 }
 
 /** One step slower in a direction; from another direction or fast play, the first slow step. */
-Outcome Slower(Desk& desk, bd::PlayDirectionDef direction)
+Outcome Slower(DeskParts& desk, bd::PlayDirectionDef direction)
 {
     const bd::PlayMode& mode = desk.Navigator().Context().GetPlayMode();
     const bool slowsDown = mode.Direction() == direction && mode.Speed() <= bd::PlaySpeedNormal;
@@ -65,20 +65,20 @@ Outcome Slower(Desk& desk, bd::PlayDirectionDef direction)
 
 constexpr Ticks SeekDistance = std::chrono::seconds(10);
 
-Outcome SeekBackward(Desk& desk)
+Outcome SeekBackward(DeskParts& desk)
 {
     const Ticks position(desk.Navigator().Context().GetCurrentTimePosition());
     return desk.Navigator().SearchTime(position - std::min(position, SeekDistance));
 }
 
-Outcome SeekForward(Desk& desk)
+Outcome SeekForward(DeskParts& desk)
 {
     const Ticks position(desk.Navigator().Context().GetCurrentTimePosition());
     return desk.Navigator().SearchTime(position + SeekDistance);
 }
 
 /** Sets A, then B, and then ends the repeat. */
-Outcome NextStepOfABRepeat(Desk& desk)
+Outcome NextStepOfABRepeat(DeskParts& desk)
 {
     switch (desk.Navigator().Context().GetCurrentABRepeatState()) {
     case bd::TRIGGER_A:
@@ -90,18 +90,18 @@ Outcome NextStepOfABRepeat(Desk& desk)
     }
 }
 
-Outcome ShowOrHideSubtitles(Desk& desk)
+Outcome ShowOrHideSubtitles(DeskParts& desk)
 {
     return desk.Navigator().ShowSubtitles(!desk.Navigator().Context().GetPgTextStDisplay());
 }
 
-Outcome ShowOrHidePictureInPicture(Desk& desk)
+Outcome ShowOrHidePictureInPicture(DeskParts& desk)
 {
     return desk.Navigator().ShowSecondaryVideo(
         !desk.Navigator().Context().GetSecondaryVideoDisplay());
 }
 
-Outcome PerformCommand(Desk& desk, std::string_view pattern)
+Outcome PerformCommand(DeskParts& desk, std::string_view pattern)
 {
     const auto found =
         std::find_if(Commands().begin(), Commands().end(), [pattern](const Command& command) {
@@ -189,7 +189,7 @@ Ticks TimeSince(Clock::time_point start)
     return std::chrono::duration_cast<Ticks>(Clock::now() - start);
 }
 
-Outcome Perform(Desk& desk, char key)
+Outcome Perform(DeskParts& desk, char key)
 {
     const auto found =
         std::find_if(RemoteKeys().begin(), RemoteKeys().end(),
@@ -209,30 +209,31 @@ const std::vector<RemoteKey>& RemoteKeys()
     static const std::vector<RemoteKey> keys = {
         {' ', "pause/continue", PauseOrContinue},
         {'x', "stop/play", PlayOrStop},
-        {'.', "step", [](Desk& d) { return PerformCommand(d, "step"); }},
-        {'f', "faster", [](Desk& d) { return Faster(d, bd::PlayDirectionForward); }},
-        {'r', "faster backward", [](Desk& d) { return Faster(d, bd::PlayDirectionBackward); }},
-        {'d', "slower", [](Desk& d) { return Slower(d, bd::PlayDirectionForward); }},
-        {'v', "slower backward", [](Desk& d) { return Slower(d, bd::PlayDirectionBackward); }},
-        {'w', "normal speed", [](Desk& d) { return PerformCommand(d, "forward"); }},
-        {'n', "next chapter", [](Desk& d) { return PerformCommand(d, "chapter next"); }},
-        {'p', "previous chapter", [](Desk& d) { return PerformCommand(d, "chapter previous"); }},
+        {'.', "step", [](DeskParts& d) { return PerformCommand(d, "step"); }},
+        {'f', "faster", [](DeskParts& d) { return Faster(d, bd::PlayDirectionForward); }},
+        {'r', "faster backward", [](DeskParts& d) { return Faster(d, bd::PlayDirectionBackward); }},
+        {'d', "slower", [](DeskParts& d) { return Slower(d, bd::PlayDirectionForward); }},
+        {'v', "slower backward", [](DeskParts& d) { return Slower(d, bd::PlayDirectionBackward); }},
+        {'w', "normal speed", [](DeskParts& d) { return PerformCommand(d, "forward"); }},
+        {'n', "next chapter", [](DeskParts& d) { return PerformCommand(d, "chapter next"); }},
+        {'p', "previous chapter",
+         [](DeskParts& d) { return PerformCommand(d, "chapter previous"); }},
         {'h', "back 10 s", SeekBackward},
         {'l', "ahead 10 s", SeekForward},
         {'b', "A-B repeat", NextStepOfABRepeat},
-        {'o', "leave a still", [](Desk& d) { return PerformCommand(d, "still off"); }},
-        {'a', "next audio", [](Desk& d) { return PerformCommand(d, "audio next"); }},
-        {'s', "next subtitle", [](Desk& d) { return PerformCommand(d, "subtitle next"); }},
+        {'o', "leave a still", [](DeskParts& d) { return PerformCommand(d, "still off"); }},
+        {'a', "next audio", [](DeskParts& d) { return PerformCommand(d, "audio next"); }},
+        {'s', "next subtitle", [](DeskParts& d) { return PerformCommand(d, "subtitle next"); }},
         {'u', "subtitles on/off", ShowOrHideSubtitles},
         {'i', "pip on/off", ShowOrHidePictureInPicture},
-        {'g', "next angle", [](Desk& d) { return PerformCommand(d, "angle next"); }},
-        {'m', "open menu", [](Desk& d) { return PerformCommand(d, "menu on"); }},
-        {'c', "close menu", [](Desk& d) { return PerformCommand(d, "menu off"); }},
-        {'k', "button above", [](Desk& d) { return PerformCommand(d, "button previous"); }},
-        {'j', "button below", [](Desk& d) { return PerformCommand(d, "button next"); }},
-        {'e', "activate button", [](Desk& d) { return PerformCommand(d, "button activate"); }},
-        {'z', "standby", [](Desk& d) { return PerformCommand(d, "standby"); }},
-        {'Z', "wake up", [](Desk& d) { return PerformCommand(d, "wake"); }},
+        {'g', "next angle", [](DeskParts& d) { return PerformCommand(d, "angle next"); }},
+        {'m', "open menu", [](DeskParts& d) { return PerformCommand(d, "menu on"); }},
+        {'c', "close menu", [](DeskParts& d) { return PerformCommand(d, "menu off"); }},
+        {'k', "button above", [](DeskParts& d) { return PerformCommand(d, "button previous"); }},
+        {'j', "button below", [](DeskParts& d) { return PerformCommand(d, "button next"); }},
+        {'e', "activate button", [](DeskParts& d) { return PerformCommand(d, "button activate"); }},
+        {'z', "standby", [](DeskParts& d) { return PerformCommand(d, "standby"); }},
+        {'Z', "wake up", [](DeskParts& d) { return PerformCommand(d, "wake"); }},
     };
     return keys;
 }
@@ -258,7 +259,7 @@ std::string RemoteHelp()
     return help.str();
 }
 
-void PlayByRemote(Desk& desk, int keys, const RemoteHooks& hooks)
+void PlayByRemote(DeskParts& desk, int keys, const RemoteHooks& hooks)
 {
     const SingleKeys singleKeys(keys);
     const Clock::time_point start = Clock::now();

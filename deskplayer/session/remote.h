@@ -19,7 +19,7 @@ namespace deskplayer
 struct RemoteKey {
     char key;
     const char* help;
-    Outcome (*perform)(Desk& desk);
+    Outcome (*perform)(DeskParts& desk);
 };
 
 /** The key whose only operation is RemoteHooks::onKey(), where a program lists the keys. */
@@ -58,7 +58,7 @@ struct RemoteHooks {
  * @param keys file descriptor to read single characters from
  * @throw any exception thrown by a listener
  */
-void PlayByRemote(Desk& desk, int keys, const RemoteHooks& hooks);
+void PlayByRemote(DeskParts& desk, int keys, const RemoteHooks& hooks);
 
 } // namespace deskplayer
 

@@ -29,7 +29,7 @@ std::string NumberOf(std::size_t number, std::size_t count)
 
 } // namespace
 
-std::string PlaybackSummary(Desk& desk)
+std::string PlaybackSummary(DeskParts& desk)
 {
     SimulatedNavigator& navigator = desk.Navigator();
     std::string line = StatusName(navigator.CurrentStatus());
@@ -50,7 +50,7 @@ std::string PlaybackSummary(Desk& desk)
     return line;
 }
 
-std::string SelectionSummary(Desk& desk)
+std::string SelectionSummary(DeskParts& desk)
 {
     SimulatedNavigator& navigator = desk.Navigator();
     if (!HasPosition(navigator.CurrentStatus())) {

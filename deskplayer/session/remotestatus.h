@@ -7,7 +7,7 @@
 
 #include <string>
 
-#include "navigator/desk.h"
+#include "navigator/deskparts.h"
 
 namespace deskplayer
 {
@@ -17,7 +17,7 @@ namespace deskplayer
  *
  *     playing  00:01:30 of 00:03:02  chapter 2 of 7
  */
-std::string PlaybackSummary(Desk& desk);
+std::string PlaybackSummary(DeskParts& desk);
 
 /**
  * The selected streams, the angle and the A-B repeat, as far as there are any; empty while nothing
@@ -25,7 +25,7 @@ std::string PlaybackSummary(Desk& desk);
  *
  *     audio 1 of 3  subtitle off  pip 1 of 2  repeat A-B
  */
-std::string SelectionSummary(Desk& desk);
+std::string SelectionSummary(DeskParts& desk);
 
 } // namespace deskplayer
 

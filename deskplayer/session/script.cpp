@@ -245,8 +245,8 @@ ScriptStep ReadStep(const Line& line, const Words& words, const Form& form,
 
 ScriptError::ScriptError(const std::string& fileName, std::size_t line, std::size_t column,
                          const std::string& problem)
-    : std::runtime_error(Printable(fileName) + ":" + std::to_string(line) + ":" +
-                         std::to_string(column) + ": " + problem)
+    : SessionError(Printable(fileName) + ":" + std::to_string(line) + ":" + std::to_string(column) +
+                   ": " + problem)
 {
 }
 

@@ -20,12 +20,12 @@
 
 #include <cstddef>
 #include <cstdint>
-#include <stdexcept>
 #include <string>
 #include <string_view>
 #include <vector>
 
-#include "text/ticks.h"
+#include "deskplayer/errors.h"
+#include "deskplayer/ticks.h"
 
 namespace deskplayer
 {
@@ -71,7 +71,7 @@ struct ScriptStep {
  *
  *     evening.session:3:9: unexpected 'nxt'; expected next, previous or a NUMBER
  */
-class ScriptError : public std::runtime_error
+class ScriptError : public SessionError
 {
 public:
     /**

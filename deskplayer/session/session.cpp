@@ -11,7 +11,7 @@ namespace
 constexpr Ticks EndlessStillDuration = std::chrono::seconds(3);
 
 /** Advances time change by change, so that a session in real time shows each when it happens. */
-void Pass(Ticks time, Desk& desk, const SessionHooks& hooks)
+void Pass(Ticks time, DeskParts& desk, const SessionHooks& hooks)
 {
     while (time > Ticks(0)) {
         const Ticks next = std::min(time, desk.Navigator().TimeToNextChange().value_or(time));
@@ -24,7 +24,7 @@ void Pass(Ticks time, Desk& desk, const SessionHooks& hooks)
     }
 }
 
-void PassUntilNothingChanges(Desk& desk, const SessionHooks& hooks)
+void PassUntilNothingChanges(DeskParts& desk, const SessionHooks& hooks)
 {
     while (!desk.Navigator().IsRepeating()) {
         const std::optional<Ticks> next = desk.Navigator().TimeToNextChange();
@@ -38,10 +38,12 @@ void PassUntilNothingChanges(Desk& desk, const SessionHooks& hooks)
 
 } // namespace
 
-void PlaySession(const std::vector<ScriptStep>& steps, Desk& desk, const SessionHooks& hooks)
+void PlaySession(const std::vector<ScriptStep>& steps, DeskParts& desk, const SessionHooks& hooks,
+                 SessionEnd end)
 {
+    const Ticks start = desk.Clock().Now();
     for (const ScriptStep& step : steps) {
-        Pass(step.time - desk.Clock().Now(), desk, hooks);
+        Pass(start + step.time - desk.Clock().Now(), desk, hooks);
         if (IsExpectation(step)) {
             if (hooks.onExpectation) {
                 hooks.onExpectation(step);
@@ -56,10 +58,12 @@ void PlaySession(const std::vector<ScriptStep>& steps, Desk& desk, const Session
             hooks.onRefused(step.line, outcome.Reason());
         }
     }
-    PassUntilNothingChanges(desk, hooks);
+    if (end == SessionEnd::PlayOn) {
+        PassUntilNothingChanges(desk, hooks);
+    }
 }
 
-void PlayFromStartToEnd(Desk& desk, const SessionHooks& hooks)
+void PlayFromStartToEnd(DeskParts& desk, const SessionHooks& hooks)
 {
     desk.Navigator().Play();
     for (;;) {

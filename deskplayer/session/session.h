@@ -34,20 +34,26 @@ struct SessionHooks {
     std::function<void(std::size_t line, const std::string& reason)> onRefused;
 };
 
+/** What happens after the last step. */
+enum class SessionEnd {
+    PlayOn, ///< playback continues until it ends, waits for an operation, or would repeat forever
+    Stay    ///< nothing: time stands still
+};
+
 /**
- * Carries out a script, each step at its time. Afterwards playback continues until it ends, waits
- * for an operation, or would repeat forever.
+ * Carries out a script, each step at its time, which counts from the moment of the call.
  *
  * @throw any exception thrown by a listener
  */
-void PlaySession(const std::vector<ScriptStep>& steps, Desk& desk, const SessionHooks& hooks);
+void PlaySession(const std::vector<ScriptStep>& steps, DeskParts& desk, const SessionHooks& hooks,
+                 SessionEnd end = SessionEnd::PlayOn);
 
 /**
  * Plays from start to end without a viewer: an endless still is left after three seconds.
  *
  * @throw any exception thrown by a listener
  */
-void PlayFromStartToEnd(Desk& desk, const SessionHooks& hooks);
+void PlayFromStartToEnd(DeskParts& desk, const SessionHooks& hooks);
 
 } // namespace deskplayer
 

@@ -7,7 +7,7 @@
 
 #include <string>
 
-#include "text/ticks.h"
+#include "deskplayer/ticks.h"
 
 namespace deskplayer
 {

@@ -100,7 +100,7 @@ EventQueue::EventQueue(std::size_t places)
 {
     const Position lapBeforeTheFirst = (0 - (m_NumberMask + 1)) & PositionBits;
     for (PlaceNumber number = 0; number < m_NumberOfPlaces; ++number) {
-        Place* const place = ::new (static_cast<void*>(m_pPlaces + number)) Place;
+        auto* const place = ::new (static_cast<void*>(m_pPlaces + number)) Place;
         place->entry.store(lapBeforeTheFirst | number, std::memory_order_relaxed);
     }
 }

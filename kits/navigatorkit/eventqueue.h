@@ -57,6 +57,7 @@ namespace bdmv
 class EventQueue
 {
 public:
+    /** The most places that a queue can have. */
     static const std::size_t MostPlaces = std::size_t(1) << 24;
 
     /** The size of a place in bytes; every event of the library fits. */
@@ -127,7 +128,9 @@ public:
     bool DispatchNext(INavigatorEvent::Listeners& listeners);
 
     /**
-     * Delivers events, and waits for more, until the queue is closed and empty.
+     * Delivers events, and waits for more, until the queue is closed and empty. It yields the
+     * processor a hundred times before it blocks on the operating system's condition variable. An
+     * event whose Post() began before Close() is still delivered.
      *
      * @throw as DispatchNext(); call it again to continue
      */

@@ -14,7 +14,7 @@
 
 #include "bdmvnavigator/navigatorlisteneradapter.h"
 #include "kevro_linux.h"
-#include "navigator/desk.h"
+#include "navigator/deskparts.h"
 #include "report.h"
 #include "session/session.h"
 
@@ -58,7 +58,7 @@ void PlaySession(benchmark::State& state, int minutes, int listeners)
     std::uint64_t events = 0;
     for (auto _ : state) {
         std::vector<CountingListener> counting(static_cast<std::size_t>(listeners));
-        deskplayer::Desk desk(PlayListOf(static_cast<std::uint32_t>(minutes)));
+        deskplayer::DeskParts desk(PlayListOf(static_cast<std::uint32_t>(minutes)));
         for (CountingListener& listener : counting) {
             desk.Listeners().AddListener(&listener);
         }

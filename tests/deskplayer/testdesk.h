@@ -97,7 +97,7 @@ public:
     /** All answers of the navigator that an operation can change, as text. */
     std::string Snapshot();
 
-    Desk desk;
+    DeskParts desk;
     SimulatedNavigator& navigator = desk.Navigator();
     const VirtualClock& clock = desk.Clock();
 

@@ -20,9 +20,9 @@ namespace
 namespace fs = std::filesystem;
 
 const fs::path Root = BDMVNAVIGATOR_SOURCE_DIR;
-const std::vector<std::string> IncludeRoots = {"inc",         "bdmv/inc",      "bdmv",
-                                               "prv_inc",     "kits",          "deskplayer",
-                                               "ports/linux", "measure/bench", "tests"};
+const std::vector<std::string> IncludeRoots = {
+    "inc",        "bdmv/inc",    "bdmv",          "prv_inc", "kits", "deskplayer/inc",
+    "deskplayer", "ports/linux", "measure/bench", "tests"};
 
 /** An #include line of a file. */
 struct Include {
@@ -133,18 +133,24 @@ const std::map<std::string, std::vector<std::string>> Allowed = {
     {"kits/navigatorkit", Library},
     {"kits/clientkit", Library},
     {"kits/testkit", Library + std::vector<std::string>{"kits/clientkit"}},
-    {"deskplayer/text", Library + std::vector<std::string>{"kits/clientkit"}},
-    {"deskplayer/disc", {"deskplayer/text"}},
+    {"deskplayer/inc", Library},
+    {"deskplayer/text", Library + std::vector<std::string>{"kits/clientkit", "deskplayer/inc"}},
+    {"deskplayer/disc", {"deskplayer/inc", "deskplayer/text"}},
     {"deskplayer/navigator",
-     Library + std::vector<std::string>{"kits/navigatorkit", "deskplayer/disc", "deskplayer/text"}},
-    {"deskplayer/session", {"deskplayer/navigator", "deskplayer/text"}},
+     Library + std::vector<std::string>{"kits/navigatorkit", "deskplayer/inc", "deskplayer/disc",
+                                        "deskplayer/text"}},
+    {"deskplayer/session", {"deskplayer/inc", "deskplayer/navigator", "deskplayer/text"}},
     {"deskplayer/check", {"deskplayer/disc", "deskplayer/text"}},
-    {"deskplayer/listing", {"deskplayer/disc", "deskplayer/text"}},
+    {"deskplayer/listing", {"deskplayer/inc", "deskplayer/disc", "deskplayer/text"}},
     {"deskplayer/output",
      Library +
          std::vector<std::string>{"kits/clientkit", "deskplayer/navigator", "deskplayer/text"}},
+    {"deskplayer/facade",
+     Library + std::vector<std::string>{"deskplayer/inc", "deskplayer/disc", "deskplayer/navigator",
+                                        "deskplayer/output", "deskplayer/session",
+                                        "deskplayer/text"}},
     {"deskplayer", Library + std::vector<std::string>{"ports"}},
-    {"examples", Library + std::vector<std::string>{"deskplayer"}},
+    {"examples", Library + std::vector<std::string>{"deskplayer/inc", "kits"}},
     {"measure", AllFolders},
     {"tests", AllFolders}};
 

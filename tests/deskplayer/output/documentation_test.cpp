@@ -25,7 +25,7 @@ std::string Documentation()
 /** The session of the documentation's examples. */
 std::string Example(OutputFormat format)
 {
-    OutputOptions options;
+    OutputSettings options;
     options.format = format;
     std::ostringstream stream;
     VirtualClock clock;

@@ -11,7 +11,7 @@ namespace
 {
 
 /** The beginning of a session that is paused. */
-std::string Written(const OutputOptions& options)
+std::string Written(const OutputSettings& options)
 {
     std::ostringstream stream;
     VirtualClock clock;
@@ -39,7 +39,7 @@ TEST(OutputFormat, NamesAnUnknownFormatAndAllFormats)
 
 TEST(OutputFormat, DeterminesTheOutput)
 {
-    OutputOptions options;
+    OutputSettings options;
     EXPECT_EQ(Written(options).substr(0, 12), "00:00:00.000");
 
     options.format = OutputFormat::Json;
@@ -51,7 +51,7 @@ TEST(OutputFormat, DeterminesTheOutput)
 
 TEST(OutputFormat, IsCombinedWithTheOtherOptions)
 {
-    OutputOptions options;
+    OutputSettings options;
     options.coloured = true;
     EXPECT_NE(Written(options).find('\033'), std::string::npos);
 

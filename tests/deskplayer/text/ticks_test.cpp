@@ -1,4 +1,4 @@
-#include "text/ticks.h"
+#include "deskplayer/ticks.h"
 
 #include <gtest/gtest.h>
 

@@ -13,7 +13,7 @@
 
 #include "bd/constants.h"
 #include "boxtest.h"
-#include "navigator/desk.h"
+#include "navigator/deskparts.h"
 #include "output/outputformat.h"
 #include "samplecallbacks.h"
 #include "session/session.h"
@@ -50,7 +50,7 @@ public:
 private:
     std::unique_ptr<deskplayer::Output> MakeOutput(const deskplayer::VirtualClock& clock)
     {
-        deskplayer::OutputOptions options;
+        deskplayer::OutputSettings options;
         options.format = deskplayer::OutputFormat::Json;
         return deskplayer::MakeOutput(options, m_Stream, clock);
     }
@@ -63,7 +63,7 @@ private:
 /** Expects a dump that equals the output, after @p play has been carried out on a desk. */
 template <typename Play> void ExpectEqualAfter(deskplayer::LoadedPlayList playList, Play play)
 {
-    deskplayer::Desk desk(std::move(playList));
+    deskplayer::DeskParts desk(std::move(playList));
     Recording recording(desk.Clock());
     desk.Listeners().AddListener(&recording.Output());
     desk.Listeners().AddListener(&recording.Box());
@@ -102,7 +102,7 @@ TEST(BlackBoxOnTheDesk, DumpsTheSampleSessions)
 {
     for (const fs::path& file : EntriesOf(BDMVNAVIGATOR_SESSIONS)) {
         SCOPED_TRACE(file);
-        ExpectEqualAfter(LongestOf(BDMVNAVIGATOR_SAMPLE_DISC), [&](deskplayer::Desk& desk) {
+        ExpectEqualAfter(LongestOf(BDMVNAVIGATOR_SAMPLE_DISC), [&](deskplayer::DeskParts& desk) {
             const auto steps = deskplayer::ParseScript(ContentsOf(file), file.string(),
                                                        deskplayer::CommandSyntaxes());
             deskplayer::PlaySession(steps, desk, {});
@@ -115,7 +115,7 @@ TEST(BlackBoxOnTheDesk, DumpsTheTestDiscs)
     for (const fs::path& folder : EntriesOf(BDMVNAVIGATOR_TEST_DISCS)) {
         if (fs::is_directory(folder)) {
             SCOPED_TRACE(folder);
-            ExpectEqualAfter(LongestOf(folder), [](deskplayer::Desk& desk) {
+            ExpectEqualAfter(LongestOf(folder), [](deskplayer::DeskParts& desk) {
                 deskplayer::PlayFromStartToEnd(desk, {});
             });
         }

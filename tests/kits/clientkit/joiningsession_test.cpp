@@ -12,7 +12,7 @@
 
 #include "disc/disc.h"
 #include "joiningclient.h"
-#include "navigator/desk.h"
+#include "navigator/deskparts.h"
 #include "session/commands.h"
 #include "session/session.h"
 #include "testkit/fakeplatform.h"
@@ -46,7 +46,7 @@ const deskplayer::LoadedPlayList& SamplePlayList()
 /** @return the number of callbacks */
 std::size_t PlayAndJoin(const std::string& session)
 {
-    deskplayer::Desk desk(SamplePlayList());
+    deskplayer::DeskParts desk(SamplePlayList());
     bdmv::ListenerRelay relay;
     bdmvtest::ClientsOfEveryPrefix clients(relay);
     Usher usher(clients);

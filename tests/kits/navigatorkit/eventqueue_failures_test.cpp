@@ -13,18 +13,20 @@
 namespace
 {
 
-/** Its constructor throws. */
-class ThrowingEvent : public bdmv::INavigatorEvent
+/** Its constructor may throw. */
+class UnreliableEvent : public bdmv::INavigatorEvent
 {
 public:
-    explicit ThrowingEvent(const ProbeEvent::Action& before = nullptr)
+    UnreliableEvent(bool throws, const ProbeEvent::Action& before)
     {
         if (before) {
             before();
         }
-        throw std::runtime_error("constructor");
+        if (throws) {
+            throw std::runtime_error("constructor");
+        }
     }
-    void Dispatch(Listeners& /*listeners*/) override { ADD_FAILURE(); }
+    void Dispatch(Listeners& /*listeners*/) override {}
 };
 
 class EventQueueFailures : public testing::Test
@@ -39,9 +41,14 @@ protected:
         return queue.Post<ProbeEvent>(history, number, std::move(whileDispatched));
     }
 
+    bool PostUnreliable(bool throws, const ProbeEvent::Action& before = nullptr)
+    {
+        return queue.Post<UnreliableEvent>(throws, before);
+    }
+
     void PostThrowing(const ProbeEvent::Action& before = nullptr)
     {
-        EXPECT_THROW(queue.Post<ThrowingEvent>(before), std::runtime_error);
+        EXPECT_THROW(PostUnreliable(true, before), std::runtime_error);
     }
 
     void DispatchAll()
@@ -76,6 +83,18 @@ TEST_F(EventQueueFailures, OfConstructorsLeaveAllPlaces)
 
     EXPECT_FALSE(Post(4));
     EXPECT_EQ(queue.GetCounters().mostAtOnce, 3U);
+}
+
+TEST_F(EventQueueFailures, OfAConstructorDoNotAffectLaterEventsOfItsClass)
+{
+    PostThrowing();
+    for (int i = 1; i <= 3; ++i) {
+        EXPECT_TRUE(PostUnreliable(false));
+    }
+
+    EXPECT_FALSE(PostUnreliable(false));
+    DispatchAll();
+    EXPECT_EQ(queue.GetCounters().dispatched, 3U);
 }
 
 TEST_F(EventQueueFailures, OfNestedConstructorsLeaveAllPlaces)
@@ -122,7 +141,7 @@ TEST_F(EventQueueFailures, OfAConstructorAreRefusalsInAFullQueue)
         Post(i);
     }
 
-    EXPECT_FALSE(queue.Post<ThrowingEvent>());
+    EXPECT_FALSE(PostUnreliable(true));
 }
 
 TEST_F(EventQueueFailures, OfAConstructorLeaveAClosedQueueClosed)

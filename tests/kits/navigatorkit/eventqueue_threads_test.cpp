@@ -94,9 +94,9 @@ protected:
     void Run() { queue.Run(listeners); }
 
     /** Posts, and tries again while the queue is full. @return the number of refusals */
-    std::uint64_t PostUntilTaken(Delivered event)
+    unsigned PostUntilTaken(Delivered event)
     {
-        std::uint64_t refusals = 0;
+        unsigned refusals = 0;
         while (!queue.Post<NumberedEvent>(delivered, event)) {
             ++refusals;
             std::this_thread::yield();
@@ -121,7 +121,7 @@ protected:
 TEST_F(EventQueueThreads, DeliversEveryEventOnceInTheOrderOfItsProducer)
 {
     std::thread deliverer([this] { Run(); });
-    std::atomic<std::uint64_t> refusals{0};
+    std::atomic<unsigned> refusals{0};
     std::vector<std::thread> producers;
     for (int producer = 0; producer < Producers; ++producer) {
         producers.emplace_back([this, producer, &refusals] {
@@ -143,6 +143,34 @@ TEST_F(EventQueueThreads, DeliversEveryEventOnceInTheOrderOfItsProducer)
     EXPECT_EQ(counters.refused, refusals);
     EXPECT_GE(counters.mostAtOnce, 1U);
     EXPECT_LE(counters.mostAtOnce, 7U);
+}
+
+TEST_F(EventQueueThreads, LoseNothingWhenProducersPostAtTheSameInstant)
+{
+    for (int round = 0; round < 60; ++round) {
+        bdmv::EventQueue large(std::size_t(Producers) * EventsEach);
+        std::atomic<int> waiting{Producers};
+        std::vector<std::thread> producers;
+        for (int producer = 0; producer < Producers; ++producer) {
+            producers.emplace_back([this, producer, &large, &waiting] {
+                --waiting;
+                while (waiting != 0) {
+                    std::this_thread::yield();
+                }
+                for (int number = 0; number < EventsEach; ++number) {
+                    large.Post<NumberedEvent>(delivered, Delivered{producer, number});
+                }
+            });
+        }
+        for (std::thread& producer : producers) {
+            producer.join();
+        }
+        delivered.clear();
+        while (large.DispatchNext(listeners)) {
+        }
+        ExpectAllDelivered();
+        EXPECT_EQ(large.GetCounters().posted, std::uint64_t(Producers) * EventsEach);
+    }
 }
 
 TEST_F(EventQueueThreads, KeepTheOrderOfPostsThatFollowEachOther)

@@ -127,7 +127,6 @@ void FailAnAssertionAndExit()
 
 TEST(FakePlatformDeathTest, IsNeededToSurviveAFailedAssertion)
 {
-    testing::FLAGS_gtest_death_test_style = "threadsafe";
     EXPECT_EXIT(FailAnAssertionAndExit(), testing::ExitedWithCode(7),
                 "file.cpp:7: assertion failed: expression");
 }

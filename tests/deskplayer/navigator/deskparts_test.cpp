@@ -1,4 +1,4 @@
-#include "navigator/desk.h"
+#include "navigator/deskparts.h"
 
 #include <gtest/gtest.h>
 
@@ -13,7 +13,7 @@ namespace
 class ResumeCounter : public bdmv::NavigatorListenerAdapter
 {
 public:
-    explicit ResumeCounter(const Desk& desk) : m_rDesk(desk) {}
+    explicit ResumeCounter(const DeskParts& desk) : m_rDesk(desk) {}
 
     void SystemSuspended(const void* /*data*/, bd::UInt32 size) override
     {
@@ -27,12 +27,12 @@ public:
     int failed = 0;
 
 private:
-    const Desk& m_rDesk;
+    const DeskParts& m_rDesk;
 };
 
-TEST(Desk, WakesUpWithTheResumeDataThatItStored)
+TEST(DeskParts, WakesUpWithTheResumeDataThatItStored)
 {
-    Desk desk(LayOut(7, ListOf({Item(10)})));
+    DeskParts desk(LayOut(7, ListOf({Item(10)})));
     ResumeCounter counter(desk);
     desk.Listeners().AddListener(&counter);
     desk.Navigator().Play();
@@ -45,9 +45,9 @@ TEST(Desk, WakesUpWithTheResumeDataThatItStored)
     desk.Listeners().RemoveListener(&counter);
 }
 
-TEST(Desk, StoresTheResumeDataBeforeOtherListenersAreNotified)
+TEST(DeskParts, StoresTheResumeDataBeforeOtherListenersAreNotified)
 {
-    Desk desk(LayOut(7, ListOf({Item(10)})));
+    DeskParts desk(LayOut(7, ListOf({Item(10)})));
     ResumeCounter counter(desk);
     desk.Listeners().AddListener(&counter);
     desk.Navigator().Play();
@@ -58,9 +58,9 @@ TEST(Desk, StoresTheResumeDataBeforeOtherListenersAreNotified)
     desk.Listeners().RemoveListener(&counter);
 }
 
-TEST(Desk, HasNoResumeDataBeforeTheFirstStandby)
+TEST(DeskParts, HasNoResumeDataBeforeTheFirstStandby)
 {
-    const Desk desk(LayOut(7, ListOf({Item(10)})));
+    const DeskParts desk(LayOut(7, ListOf({Item(10)})));
     EXPECT_TRUE(desk.ResumeData().empty());
 }
 

@@ -2,8 +2,8 @@
  * @file
  * The unit of time of a disc.
  */
-#ifndef DESKPLAYER_TEXT_TICKS_H
-#define DESKPLAYER_TEXT_TICKS_H
+#ifndef DESKPLAYER_INC_DESKPLAYER_TICKS_H
+#define DESKPLAYER_INC_DESKPLAYER_TICKS_H
 
 #include <chrono>
 #include <cstdint>

@@ -1,15 +1,9 @@
 /**
  * @file
- * A navigator with everything it needs: the first object a program creates.
- *
- * @code
- * Desk desk(LoadPlayList(disc, 800, disc.ReadPlayList(800)));
- * desk.Listeners().AddListener(&listener);
- * PlayFromStartToEnd(desk, {});
- * @endcode
+ * What a desk consists of: a navigator with everything it needs.
  */
-#ifndef DESKPLAYER_NAVIGATOR_DESK_H
-#define DESKPLAYER_NAVIGATOR_DESK_H
+#ifndef DESKPLAYER_NAVIGATOR_DESKPARTS_H
+#define DESKPLAYER_NAVIGATOR_DESKPARTS_H
 
 #include <utility>
 #include <vector>
@@ -30,17 +24,18 @@ namespace deskplayer
  * operation of the navigator returns, so a listener may be destroyed before the desk once it has
  * been removed, or once no more operations follow.
  */
-class Desk
+class DeskParts
 {
 public:
     /** Starts the delivering thread. */
-    explicit Desk(LoadedPlayList playList) : m_Navigator(std::move(playList), m_Clock, m_Delivery)
+    explicit DeskParts(LoadedPlayList playList)
+        : m_Navigator(std::move(playList), m_Clock, m_Delivery)
     {
         Listeners().AddListener(&m_Keeper);
     }
 
-    Desk(const Desk&) = delete;
-    Desk& operator=(const Desk&) = delete;
+    DeskParts(const DeskParts&) = delete;
+    DeskParts& operator=(const DeskParts&) = delete;
 
     /** The list in which clients register. Any thread. */
     bdmv::INavigatorEvent::Listeners& Listeners() { return m_Delivery.Listeners(); }

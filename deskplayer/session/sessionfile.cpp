@@ -1,4 +1,4 @@
-#include "program/sessionfile.h"
+#include "session/sessionfile.h"
 
 #include <fcntl.h>
 #include <poll.h>
@@ -7,9 +7,8 @@
 #include <array>
 #include <cstddef>
 
-#include "program/failure.h"
-#include "session/commands.h"
-#include "text/names.h"
+#include "deskplayer/errors.h"
+#include "session/script.h"
 #include "text/printable.h"
 
 namespace deskplayer
@@ -47,8 +46,9 @@ private:
     int m_Descriptor;
 };
 
-/** Stops reading once the session is known to be too long. */
-std::string ReadSession(const std::string& fileName)
+} // namespace
+
+std::string ReadSessionText(const std::string& fileName)
 {
     const File file(fileName);
     std::string text;
@@ -56,26 +56,19 @@ std::string ReadSession(const std::string& fileName)
     ssize_t size = 1;
     while (size > 0 && text.size() <= LongestScript) {
         if (!file.WaitForInput()) {
-            throw UsageError(Printable(fileName) + ": timed out waiting for input");
+            throw SessionError(Printable(fileName) + ": timed out waiting for input");
         }
         size = file.Read(buffer.data(), buffer.size());
         if (size < 0) {
-            throw UsageError(Printable(fileName) + ": cannot read session, expected a text file");
+            throw SessionError(Printable(fileName) + ": cannot read session, expected a text file");
         }
         text.append(buffer.data(), static_cast<std::size_t>(size));
     }
     if (text.size() > LongestScript) {
-        throw UsageError(Printable(fileName) + ": session too long, expected at most " +
-                         std::to_string(LongestScript) + " bytes");
+        throw SessionError(Printable(fileName) + ": session too long, expected at most " +
+                           std::to_string(LongestScript) + " bytes");
     }
     return text;
-}
-
-} // namespace
-
-std::vector<ScriptStep> ReadSessionFile(const std::string& fileName)
-{
-    return ParseScript(ReadSession(fileName), fileName, CommandSyntaxes(), CallbackNames());
 }
 
 } // namespace deskplayer

@@ -1,0 +1,35 @@
+#include "deskplayer/output.h"
+
+#include "facade/outputsettings.h"
+#include "facade/parts.h"
+
+namespace deskplayer
+{
+
+OutputSettings ReadOutputOptions(const OutputOptions& options)
+{
+    OutputSettings settings;
+    settings.format = ParseOutputFormat(options.format);
+    if (!options.interfaces.empty()) {
+        settings.filter.KeepInterfaces(options.interfaces);
+    }
+    if (!options.callbacks.empty()) {
+        settings.filter.KeepCallbacks(options.callbacks);
+    }
+    settings.coloured = options.coloured;
+    return settings;
+}
+
+DeskOutput::DeskOutput(Desk& desk, std::ostream& stream, const OutputOptions& options)
+    : m_rDesk(desk),
+      m_pOutput(MakeOutput(ReadOutputOptions(options), stream, PartsOf(desk).Clock()))
+{
+    m_rDesk.Listeners().AddListener(m_pOutput.get());
+}
+
+DeskOutput::~DeskOutput()
+{
+    m_rDesk.Listeners().RemoveListener(m_pOutput.get());
+}
+
+} // namespace deskplayer

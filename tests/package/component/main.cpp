@@ -1,0 +1,5 @@
+// A program that links the component without using it.
+int main()
+{
+    return 0;
+}
