@@ -21,8 +21,8 @@
  * the listener and everything that the listener uses: callbacks may run until it is destroyed.
  *
  * Re-entrancy. A registration can be neither made nor removed inside a callback of its list. A
- * registration that is destroyed there is reported through Assert(), and its listener stays in the
- * list: the next callback would reach it after its end.
+ * registration that is destroyed or replaced there is reported through Assert(), and its listener
+ * stays in the list; it must not be destroyed before it has been removed in another way.
  *
  * Threads. One thread at a time may use a registration.
  */
@@ -30,6 +30,7 @@
 #define CLIENTKIT_SCOPEDLISTENER_H
 
 #include <system_error>
+#include <utility>
 
 #include "bd/eventlistenerlist.h"
 #include "kevro/kevro_osa.h"
@@ -65,15 +66,13 @@ public:
     }
 
     /**
-     * Removes its own listener, then takes over the registration of @p other. Moving a registration
-     * to itself changes nothing.
-     *
-     * @throw what Remove() throws; both registrations are then unchanged
+     * Takes over the registration of @p other; the one before ends as if it were destroyed. Moving
+     * a registration to itself changes nothing.
      */
-    ScopedListener& operator=(ScopedListener&& other)
+    ScopedListener& operator=(ScopedListener&& other) noexcept
     {
         if (this != &other) {
-            Remove();
+            const ScopedListener before(std::move(*this));
             m_pList = other.m_pList;
             m_pListener = other.m_pListener;
             other.m_pList = nullptr;

@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 
 #include <atomic>
+#include <chrono>
 #include <string>
 #include <vector>
 
@@ -10,11 +11,14 @@
 #include "bdmvnavigator/navigatorevent.h"
 #include "bdmvnavigator/navigatorlisteneradapter.h"
 #include "clientkit/blackbox.h"
+#include "clientkit/callbackwatch.h"
 #include "clientkit/listenerrelay.h"
 #include "clientkit/playbackstatus.h"
+#include "clientkit/queuedlistener.h"
 #include "clientkit/scopedlistener.h"
 #include "kits/clientkit/randomcallbacks.h"
 #include "testkit/bench.h"
+#include "testkit/spylistener.h"
 
 namespace
 {
@@ -152,6 +156,40 @@ TEST(ClientExamples, ListenerRelay)
     EXPECT_EQ(userInterface.callbacks,
               (std::vector<bdmv::Callback>{bdmv::callbacks::PlayStarted{},
                                            bdmv::callbacks::ChapterNumber{5}}));
+}
+
+TEST(ClientExamples, QueuedListener)
+{
+    Listeners listeners;
+    bdmvtest::SpyListener userInterface;
+
+    bdmv::QueuedListener queued(userInterface); // starts the thread
+    listeners.AddListener(&queued);             // instead of the user interface itself
+
+    Fire(listeners, &bdmv::INavigatorListener::Paused);
+    EXPECT_TRUE(userInterface.WaitFor(bdmv::CallbackPaused, std::chrono::minutes(1)));
+
+    listeners.RemoveListener(&queued);
+    queued.Close(); // no callback of userInterface runs from here on
+
+    const bdmv::QueuedListener::Counters counters = queued.GetCounters();
+    EXPECT_EQ(counters.delivered, 1U);
+    EXPECT_EQ(counters.lost, 0U);
+}
+
+TEST(ClientExamples, CallbackWatch)
+{
+    Listeners listeners;
+    bdmvtest::SpyListener userInterface;
+
+    bdmv::CallbackWatch watch(userInterface, "user interface", std::chrono::milliseconds(5));
+    listeners.AddListener(&watch); // instead of the user interface itself
+
+    Fire(listeners, &bdmv::INavigatorListener::Paused);
+
+    const bdmv::CallbackWatch::Statistics pauses = watch.Get(bdmv::CallbackPaused);
+    EXPECT_EQ(pauses.count, 1U);
+    EXPECT_EQ(userInterface.Count(bdmv::CallbackPaused), 1U);
 }
 
 void WriteToReport(void* report, const char* bytes, std::size_t size)
