@@ -11,6 +11,7 @@ namespace deskplayer
 void OutputFilter::KeepInterfaces(std::string_view interfaces)
 {
     std::vector<std::string_view> names;
+    names.reserve(bdmv::ListenerInterface__sizeof);
     for (int interface = 0; interface < bdmv::ListenerInterface__sizeof; ++interface) {
         names.emplace_back(NameOf(static_cast<bdmv::ListenerInterface>(interface)));
     }

@@ -20,24 +20,17 @@ public:
     void Paused() override { m_Text = "PAUSE"; }
     void Continued(bd::PlayDirectionDef, bd::PlaySpeedDef) override { m_Text = "PLAY"; }
     void StillOn() override { m_Text = "STILL"; }
-#ifndef SEED_BUG
+
     void StillOff() override
     {
-        m_Text = "PLAY";
+        if (!SEED_BUG) {
+            m_Text = "PLAY";
+        }
     }
-#endif
-    void Stopped() override
-    {
-        m_Text = "STOP";
-    }
-    void Finished(FinishedReason) override
-    {
-        m_Text = "STOP";
-    }
-    void PlayFailed() override
-    {
-        m_Text = "STOP";
-    }
+
+    void Stopped() override { m_Text = "STOP"; }
+    void Finished(FinishedReason) override { m_Text = "STOP"; }
+    void PlayFailed() override { m_Text = "STOP"; }
 
 private:
     std::atomic<const char*> m_Text{"STOP"};

@@ -20,7 +20,7 @@ public:
 
     void GoToChapter(bd::ChapterNumberDef chapter)
     {
-#ifdef SEED_BUG
+#if SEED_BUG
         // An event reports what the context answers when it is delivered: here the old chapter.
         Send<bdmv::ChapterEvent>();
         m_Context.chapter = chapter;

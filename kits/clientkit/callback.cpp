@@ -95,7 +95,7 @@ Callback::~Callback()
 
 void Callback::Copy(const Callback& other)
 {
-    if (const callbacks::ExecuteButton* const button = other.As<callbacks::ExecuteButton>()) {
+    if (const auto* const button = other.As<callbacks::ExecuteButton>()) {
         new (m_Arguments) callbacks::ExecuteButton(*button);
     } else {
         std::memcpy(m_Arguments, other.m_Arguments, sizeof m_Arguments);

@@ -56,6 +56,14 @@ constexpr int EventsARound = 256;           ///< posted before the producers wai
 constexpr char PlainName[] = "plain listener";
 constexpr char StatusName[] = "StatusListener";
 constexpr char RelayName[] = "ListenerRelay, one client";
+constexpr char BoxName[] = "BlackBox, clock that answers at once";
+constexpr char BoxWithClockName[] = "BlackBox, clock of the system";
+constexpr char WatchName[] = "CallbackWatch";
+constexpr char QueueFreeName[] = "QueuedListener, places free";
+constexpr char QueueTakenName[] = "QueuedListener, places taken";
+constexpr char QueueSleepingName[] = "QueuedListener, client sleeps 100 ms";
+constexpr char QueueAtOnceName[] = "QueuedListener, client returns at once";
+constexpr char QueueWakingName[] = "QueuedListener, thread woken each time";
 
 constexpr char AllocationsCounter[] = "allocations";
 constexpr char WaitedCounter[] = "waited";
@@ -67,6 +75,7 @@ void RegisterThreads();
 void RegisterLogLines();
 void RegisterQueues();
 void RegisterClientKit();
+void RegisterQueuedListener();
 
 inline std::string DeliveryRow(const std::string& callback, const std::string& subject, int count)
 {

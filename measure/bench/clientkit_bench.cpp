@@ -1,11 +1,14 @@
 // What a delivery costs through the listeners of the client kit, each registered alone in a list.
 
+#include <chrono>
+#include <cstdint>
 #include <memory>
 
 #include <benchmark/benchmark.h>
 
 #include "bdmvnavigator/inavigatorevent.h"
 #include "benchmarks.h"
+#include "clientkit/blackbox.h"
 #include "clientkit/listenerrelay.h"
 #include "clientkit/playbackstatus.h"
 #include "listener.h"
@@ -53,6 +56,18 @@ void RegisterListener(const char* name, std::shared_ptr<bdmv::INavigatorListener
     });
 }
 
+std::uint64_t TicksAtOnce()
+{
+    static std::uint64_t ticks = 0;
+    return ++ticks;
+}
+
+std::uint64_t TicksOfTheSystem()
+{
+    const std::chrono::nanoseconds now = std::chrono::steady_clock::now().time_since_epoch();
+    return static_cast<std::uint64_t>(now.count()) * 9 / 200000;
+}
+
 } // namespace
 
 void RegisterClientKit()
@@ -64,6 +79,8 @@ void RegisterClientKit()
     RegisterListener(PlainName, {std::shared_ptr<void>(), &client});
     RegisterListener(StatusName, std::make_shared<bdmv::StatusListener>());
     RegisterListener(RelayName, relay);
+    RegisterListener(BoxName, std::make_shared<bdmv::BlackBox>(1000, TicksAtOnce));
+    RegisterListener(BoxWithClockName, std::make_shared<bdmv::BlackBox>(1000, TicksOfTheSystem));
 }
 
 } // namespace bench

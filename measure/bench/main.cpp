@@ -17,6 +17,7 @@ int main(int argc, char** argv)
     bench::RegisterLogLines();
     bench::RegisterQueues();
     bench::RegisterClientKit();
+    bench::RegisterQueuedListener();
 
     bench::Report report;
     if (!bench::RunBenchmarks(report, argc, argv)) {

@@ -188,25 +188,26 @@ void PrintQueues(const Report& report, Goal& deque, Goal& fastest, Goal& allocat
     }
 }
 
-/** A listener of the client kit, and the goal for it; without a goal null. */
+/** A listener of the client kit. */
 struct ClientKitSubject {
     const char* name;
-    Goal* goal;
+    Goal* goal;                    ///< for it; null for none
+    double Row::*time = &Row::cpu; ///< wall if the benchmark measures the thread's CPU time itself
 };
 
 void PrintClientKit(const Report& report, const std::vector<ClientKitSubject>& subjects)
 {
     constexpr const char* Callbacks[] = {NoArguments, ByReference, ByValue};
-    std::printf("\nDelivery to one listener: ns, × plain listener\n  %-28s", "");
+    std::printf("\nDelivery to one listener: ns, × plain listener\n  %-39s", "");
     for (const char* const callback : Callbacks) {
         std::printf("%25s", callback);
     }
     std::printf("\n");
     for (const ClientKitSubject& subject : subjects) {
-        std::printf("  %-28s       ", subject.name);
+        std::printf("  %-39s       ", subject.name);
         for (const char* const callback : Callbacks) {
             const double plain = report[ClientKitRow(callback, PlainName)].cpu;
-            const double time = report[ClientKitRow(callback, subject.name)].cpu;
+            const double time = report[ClientKitRow(callback, subject.name)].*subject.time;
             PrintTime(time, plain);
             std::printf("%7s", "");
             if (subject.goal != nullptr) {
@@ -229,17 +230,29 @@ void PrintTables(const Report& report)
     Goal fastest("a queue's event, × the faster of the lock-free queues", 1.1);
     Goal queueAllocations("allocations from posting to the end of delivery", 0);
     Goal status("a delivery to StatusListener, × plain listener", 3);
+    Goal box("a delivery to BlackBox, × plain listener", 5);
+    Goal queue("a delivery to QueuedListener whose thread runs, × plain listener", 5);
 
     PrintDelivery(report, delivery);
     PrintEvents(report, allocations, lineOff);
     PrintThreads(report);
     PrintLog(report, queued);
     PrintQueues(report, deque, fastest, queueAllocations);
-    PrintClientKit(report, {{PlainName, nullptr}, {StatusName, &status}, {RelayName, nullptr}});
+    PrintClientKit(report, {{PlainName, nullptr},
+                            {StatusName, &status},
+                            {RelayName, nullptr},
+                            {BoxName, &box},
+                            {BoxWithClockName, &box},
+                            {WatchName, nullptr},
+                            {QueueFreeName, &queue, &Row::wall},
+                            {QueueTakenName, &queue},
+                            {QueueSleepingName, &queue},
+                            {QueueAtOnceName, &queue},
+                            {QueueWakingName, nullptr, &Row::wall}});
 
     std::printf("\nGoals\n");
     for (const Goal* goal : {&delivery, &allocations, &lineOff, &queued, &deque, &fastest,
-                             &queueAllocations, &status}) {
+                             &queueAllocations, &status, &queue, &box}) {
         goal->Print();
     }
 }

@@ -3,6 +3,7 @@
 #include "bdmvnavigator/navigatorlisteneradapter.h"
 #include "clientkit/names.h"
 #include "kits/clientkit/everycallback.h"
+#include "testkit/fakeplatform.h"
 #include "testkit/operatornew.h"
 
 namespace bdmv
@@ -27,7 +28,8 @@ public:
 private:
     void OnCallback(const Callback& callback) override
     {
-        const Callback copy(callback);
+        Callback copy(m_Button);
+        copy = callback;
         Callback button(m_Button);
         Callback other(copy);
         other = button;

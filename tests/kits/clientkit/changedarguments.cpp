@@ -62,7 +62,7 @@ public:
     {
         auto address = reinterpret_cast<std::uintptr_t>(arguments.data);
         (*this)("data", address);
-        arguments.data = reinterpret_cast<const void*>(address);
+        std::memcpy(&arguments.data, &address, sizeof address);
     }
 
 private:

@@ -5,6 +5,7 @@
 #include "bdmvnavigator/navigatorevent.h"
 #include "bdmvnavigator/navigatorlisteneradapter.h"
 #include "navigatorkit/eventqueue.h"
+#include "testkit/fakeplatform.h"
 #include "testkit/operatornew.h"
 #include "testkit/scriptableplaybackcontext.h"
 
