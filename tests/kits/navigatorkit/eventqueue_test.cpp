@@ -121,7 +121,7 @@ public:
 
 private:
     const void*& m_rAddress;
-    unsigned char m_Bytes[bdmv::EventQueue::LargestEvent - 2 * sizeof(void*)] = {};
+    [[maybe_unused]] unsigned char m_Bytes[bdmv::EventQueue::LargestEvent - 2 * sizeof(void*)] = {};
 };
 static_assert(sizeof(LargestEvent) == bdmv::EventQueue::LargestEvent, "it fills a place");
 
