@@ -105,6 +105,29 @@ TEST(QueuedListenerRandom, StreamsEndWithTheStatusOfADirectListener)
     EXPECT_GT(delivered, 1000U);
 }
 
+TEST(QueuedListenerRandom, StreamToAClientThatStaysInItsFirstCallbackLosesWhatFindsNoPlace)
+{
+    Gate gate;
+    SlowClient client(gate);
+    bdmv::StatusListener direct;
+    QueuedListener queued(client, OptionsOf(10));
+    queued.Paused();
+    direct.Paused();
+    gate.WaitForArrivals(1);
+    for (bd::ChapterNumberDef i = 1; i <= 1000; ++i) {
+        queued.ChapterNumber(i);
+        direct.ChapterNumber(i);
+    }
+    gate.Open();
+    client.WaitForTheEnd(queued);
+    queued.Close();
+    EXPECT_EQ(client.Status(), direct.Status());
+    EXPECT_EQ(client.Status().chapter.value, 1000U);
+    const QueuedListener::Counters counters = queued.GetCounters();
+    EXPECT_EQ(counters.lost, 990U);
+    EXPECT_EQ(counters.resyncs, 1U);
+}
+
 TEST(QueuedListenerRandom, ThreadsThatDeliverAtOnceAreAllCounted)
 {
     constexpr unsigned Each = 300;
