@@ -11,7 +11,9 @@
 #include <functional>
 #include <string>
 #include <thread>
+#include <utility>
 
+#include "callbackqueuebench.h"
 #include "clientkit/queuedlistener.h"
 #include "gate.h"
 #include "testkit/fakeplatform.h"
@@ -20,14 +22,6 @@
 
 namespace bdmvtest
 {
-
-inline bdmv::QueuedListener::Options OptionsOf(std::size_t places, std::size_t largestBlock = 16)
-{
-    bdmv::QueuedListener::Options options;
-    options.places = places;
-    options.largestBlock = largestBlock;
-    return options;
-}
 
 /** Runs an action of the test in every callback. */
 class ActingListener : public bdmv::CallbackListener
