@@ -38,14 +38,16 @@ private:
     std::function<void(const bdmv::Callback&)> m_Action;
 };
 
-/** Waits, without sleeping, until no callback waits or runs; a resync may. */
+/** Whether no callback waits or runs; a resync may. */
+inline bool IsIdle(const bdmv::QueuedListener& queued)
+{
+    const bdmv::QueuedListener::Counters counters = queued.GetCounters();
+    return counters.received == counters.delivered + counters.merged + counters.lost;
+}
+
 inline void WaitUntilIdle(const bdmv::QueuedListener& queued)
 {
-    for (;;) {
-        const bdmv::QueuedListener::Counters counters = queued.GetCounters();
-        if (counters.received == counters.delivered + counters.merged + counters.lost) {
-            return;
-        }
+    while (!IsIdle(queued)) {
         std::this_thread::yield();
     }
 }
