@@ -44,7 +44,7 @@ const void* BlockBuffer::Add(const void* data, std::size_t size)
 
 void BlockBuffer::Remove(const void* block, std::size_t size)
 {
-    const unsigned char* const bytes = static_cast<const unsigned char*>(block);
+    const auto* const bytes = static_cast<const unsigned char*>(block);
     m_Begin = static_cast<std::size_t>(bytes - m_Bytes.data()) + RoundUp(size);
     --m_Blocks;
     if (m_Blocks == 0) {

@@ -26,8 +26,8 @@ std::size_t Checked(std::size_t places)
 
 CallbackQueue::CallbackQueue(const QueuedListener::Options& options)
     : m_Places(Checked(options.places), Unused), m_First(0), m_Waiting(0), m_LostLater(0),
-      m_Resync(false), m_AfterResync(0), m_Status(), m_ResyncStatus(),
-      m_Blocks(LargestBlocks, options.largestBlock), m_Taken(StepNone), m_TakenBlock(), m_Counters()
+      m_Resync(false), m_AfterResync(0), m_Blocks(LargestBlocks, options.largestBlock),
+      m_Taken(StepNone), m_TakenBlock(), m_Counters()
 {
 }
 
@@ -103,8 +103,7 @@ void CallbackQueue::TakeOldest(Callback& callback)
     callback = oldest;
     oldest = Unused; // not the last to share a program
     m_First = PlaceAt(1);
-    if (const callbacks::SystemSuspended* const standby =
-            callback.As<callbacks::SystemSuspended>()) {
+    if (const auto* const standby = callback.As<callbacks::SystemSuspended>()) {
         m_TakenBlock = *standby;
     }
 }
@@ -135,7 +134,7 @@ bool CallbackQueue::Append(const Callback& callback)
         return false;
     }
     Callback& place = m_Places[PlaceAt(Used())];
-    const callbacks::SystemSuspended* const standby = callback.As<callbacks::SystemSuspended>();
+    const auto* const standby = callback.As<callbacks::SystemSuspended>();
     if (standby == nullptr) {
         place = callback;
     } else if (!AppendStandby(*standby, place)) {

@@ -27,7 +27,7 @@ std::size_t PlaceOf(CallbackTimes::Duration time)
 CallbackTimes::CallbackTimes(std::chrono::microseconds budget)
     : m_Budget(
           std::min(budget, std::chrono::duration_cast<std::chrono::microseconds>(Duration::max()))),
-      m_Mutex(), m_Entries()
+      m_Entries()
 {
 }
 

@@ -4,12 +4,14 @@
  *
  * @code
  * bdmv::CallbackWatch watch(userInterface, "user interface", std::chrono::milliseconds(5));
- * listeners.AddListener(&watch);                       // instead of the user interface itself
+ * listeners.AddListener(&watch); // instead of the user interface itself
  * ...
- * // Slow callback - listener: user interface, callback: PlayItem, time: 7210 us
+ * // In the log: Slow callback - listener: user interface, callback: PlayItem, time: 7210 us
  *
  * const bdmv::CallbackWatch::Statistics statistics = watch.Get(bdmv::CallbackPlayItem);
- * Show(statistics.count, statistics.longest, statistics.total / statistics.count);
+ * if (statistics.count > 0) {
+ *     Show(statistics.longest, statistics.total / statistics.count);
+ * }
  * @endcode
  *
  * Lifetime. The client outlives the watch. Remove the watch from every list before destroying it.

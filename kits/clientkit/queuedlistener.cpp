@@ -14,8 +14,7 @@ class QueuedListener::Delivery : private CallbackListener
 {
 public:
     Delivery(INavigatorListener& client, const Options& options)
-        : m_rClient(client), m_Mutex(), m_Changed(), m_Queue(options), m_Closed(false),
-          m_Sleeping(false), m_ClientThread()
+        : m_rClient(client), m_Queue(options), m_Closed(false), m_Sleeping(false)
     {
     }
 
@@ -129,7 +128,7 @@ private:
 };
 
 QueuedListener::QueuedListener(INavigatorListener& client, Options options)
-    : m_pDelivery(std::make_shared<Delivery>(client, options)), m_Joining(), m_Thread()
+    : m_pDelivery(std::make_shared<Delivery>(client, options))
 {
     const std::shared_ptr<Delivery> delivery = m_pDelivery;
     m_Thread = std::thread([delivery] { delivery->Run(); });

@@ -4,15 +4,15 @@
  * delays neither playback nor other clients.
  *
  * @code
- * bdmv::QueuedListener queued(userInterface);          // starts the thread
- * listeners.AddListener(&queued);                      // instead of the user interface itself
+ * bdmv::QueuedListener queued(userInterface); // starts the thread
+ * listeners.AddListener(&queued);             // instead of the user interface itself
  * ...
  * listeners.RemoveListener(&queued);
- * queued.Close();                                      // no callback runs from here on
+ * queued.Close(); // no callback of the user interface runs from here on
  *
  * const bdmv::QueuedListener::Counters counters = queued.GetCounters();
  * if (counters.lost > 0) {
- *     Report(counters.lost, counters.received);        // the client is too slow for its places
+ *     Report(counters.lost, counters.received);
  * }
  * @endcode
  *

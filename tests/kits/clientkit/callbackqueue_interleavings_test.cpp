@@ -59,8 +59,7 @@ public:
         m_Queue.Put(callback);
         const bdmv::QueuedListener::Counters after = m_Queue.GetCounters();
         if (after.lost > before.lost) {
-            const callbacks::SystemSuspended* const standby =
-                callback.As<callbacks::SystemSuspended>();
+            const auto* const standby = callback.As<callbacks::SystemSuspended>();
             EXPECT_TRUE(m_Used == m_Places || (standby != nullptr && standby->size > LargestBlock))
                 << "lost although there was room";
             m_LastLost = m_Sent;

@@ -245,6 +245,29 @@ TEST_F(CallbackWatchTest, CountsCallbacksOfConcurrentThreads)
     EXPECT_EQ(watch.Get(bdmv::CallbackPaused).count, 2U * Each);
 }
 
+TEST(CallbackWatchExample, OfItsHeaderWorks)
+{
+    const bdmvtest::FakePlatform platform(nullptr);
+    Client userInterface;
+    bdmv::INavigatorEvent::Listeners listeners;
+    microseconds shown(-1);
+    const auto Show = [&](microseconds longest, microseconds mean) { shown = longest + mean; };
+
+    bdmv::CallbackWatch watch(userInterface, "user interface", std::chrono::milliseconds(5));
+    listeners.AddListener(&watch); // instead of the user interface itself
+
+    bd::EventListenerList_FireParam4(listeners, &bdmv::INavigatorListener::PlayItem,
+                                     bd::PlayListIdDef(800), bd::PlayItemIdDef(0),
+                                     bd::VideoFormatType1080p, bd::VideoAspectRatioType16x9);
+
+    const bdmv::CallbackWatch::Statistics statistics = watch.Get(bdmv::CallbackPlayItem);
+    if (statistics.count > 0) {
+        Show(statistics.longest, statistics.total / statistics.count);
+    }
+
+    EXPECT_EQ(shown, statistics.longest + statistics.total);
+}
+
 TEST(CallbackWatchAllocations, AreNoneAfterConstruction)
 {
     bdmvtest::FakePlatform platform(nullptr);

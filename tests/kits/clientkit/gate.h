@@ -33,6 +33,13 @@ public:
         m_Changed.wait(lock, [&] { return m_Arrived >= count; });
     }
 
+    /** Whether more have arrived than may pass. */
+    bool IsWaiting()
+    {
+        const std::lock_guard<std::mutex> lock(m_Mutex);
+        return !m_Open && m_Arrived > m_Allowed;
+    }
+
     /** Lets one more pass. */
     void AllowOne()
     {

@@ -9,6 +9,7 @@
 #include <system_error>
 #include <thread>
 
+#include "bdmvnavigator/inavigatorevent.h"
 #include "clientkit/queuedlistener.h"
 #include "queuedlistenertest.h"
 #include "testprogram.h"
@@ -146,6 +147,18 @@ TEST_F(QueuedListenerCloseTest, MayBeRepeated)
     queued.Close();
 }
 
+TEST_F(QueuedListenerCloseTest, IsAllowedOnAThreadThatHasTheIdOfTheEndedOne)
+{
+    gate.Open();
+    QueuedListener queued(client);
+    queued.Paused();
+    gate.WaitForArrivals(1);
+    queued.Close();
+    for (int i = 0; i < 20; ++i) { // the system uses the id again, mostly at once
+        std::thread([&] { EXPECT_NO_THROW(queued.Close()); }).join();
+    }
+}
+
 TEST_F(QueuedListenerCloseTest, WaitsOnEveryThreadThatCloses)
 {
     QueuedListener* self = nullptr;
@@ -277,4 +290,31 @@ TEST_F(QueuedListenerCloseTest, ByTheDestructorInsideACallbackIsReportedAndThatC
                         "client, kits/clientkit/queuedlistener.cpp:"),
               0U)
         << text;
+}
+
+TEST_F(QueuedListenerCloseTest, LetsTheClientBeDestroyedFirst)
+{
+    gate.Open();
+    auto listener =
+        std::make_unique<ActingListener>([this](const bdmv::Callback&) { gate.Pass(); });
+    QueuedListener queued(*listener);
+    queued.Paused();
+    queued.Close();
+    listener.reset();
+    queued.Stopped();
+    EXPECT_EQ(queued.GetCounters().received, 2U);
+}
+
+TEST_F(QueuedListenerCloseTest, IsIndependentOfTheLifeOfTheList)
+{
+    gate.Open();
+    QueuedListener queued(client);
+    {
+        bdmv::INavigatorEvent::Listeners listeners;
+        listeners.AddListener(&queued);
+        bd::EventListenerList_FireParam0(listeners, &bdmv::INavigatorListener::Paused);
+    }
+    gate.WaitForArrivals(1);
+    queued.Close();
+    EXPECT_EQ(journal.Take(), "client.Paused()\n");
 }

@@ -310,6 +310,33 @@ TEST_F(QueuedListenerTest, ReleasesLostProgramsOnTheThreadOfTheClientToo)
     EXPECT_EQ(destroyingThread, clientThread);
 }
 
+TEST_F(QueuedListenerTest, WorksAsTheExampleOfItsHeader)
+{
+    bdmvtest::RecordingListener& userInterface = client;
+    bdmv::INavigatorEvent::Listeners listeners;
+    std::uint64_t reported = 0;
+    const auto Report = [&](std::uint64_t lost, std::uint64_t) { reported = lost; };
+
+    bdmv::QueuedListener queued(userInterface); // starts the thread
+    listeners.AddListener(&queued);             // instead of the user interface itself
+
+    for (int i = 0; i < 300; ++i) {
+        bd::EventListenerList_FireParam0(listeners, &bdmv::INavigatorListener::JumpOccurred);
+    }
+    gate.Open();
+
+    listeners.RemoveListener(&queued);
+    queued.Close(); // no callback of the user interface runs from here on
+
+    const bdmv::QueuedListener::Counters counters = queued.GetCounters();
+    if (counters.lost > 0) {
+        Report(counters.lost, counters.received);
+    }
+
+    EXPECT_GE(reported, 300U - 257U); // one running, 256 waiting
+    EXPECT_EQ(counters.received, 300U);
+}
+
 TEST(QueuedListenerAllocations, AreNoneOnEitherThreadAfterConstruction)
 {
     bdmvtest::FakePlatform platform(nullptr);

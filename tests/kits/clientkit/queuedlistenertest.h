@@ -11,7 +11,9 @@
 #include <functional>
 #include <string>
 #include <thread>
+#include <utility>
 
+#include "callbackqueuebench.h"
 #include "clientkit/queuedlistener.h"
 #include "gate.h"
 #include "testkit/fakeplatform.h"
@@ -20,14 +22,6 @@
 
 namespace bdmvtest
 {
-
-inline bdmv::QueuedListener::Options OptionsOf(std::size_t places, std::size_t largestBlock = 16)
-{
-    bdmv::QueuedListener::Options options;
-    options.places = places;
-    options.largestBlock = largestBlock;
-    return options;
-}
 
 /** Runs an action of the test in every callback. */
 class ActingListener : public bdmv::CallbackListener
@@ -44,14 +38,16 @@ private:
     std::function<void(const bdmv::Callback&)> m_Action;
 };
 
-/** Waits, without sleeping, until no callback waits or runs; a resync may. */
+/** Whether no callback waits or runs; a resync may. */
+inline bool IsIdle(const bdmv::QueuedListener& queued)
+{
+    const bdmv::QueuedListener::Counters counters = queued.GetCounters();
+    return counters.received == counters.delivered + counters.merged + counters.lost;
+}
+
 inline void WaitUntilIdle(const bdmv::QueuedListener& queued)
 {
-    for (;;) {
-        const bdmv::QueuedListener::Counters counters = queued.GetCounters();
-        if (counters.received == counters.delivered + counters.merged + counters.lost) {
-            return;
-        }
+    while (!IsIdle(queued)) {
         std::this_thread::yield();
     }
 }
