@@ -73,7 +73,7 @@ TEST(AllocationCounter, ReportsThatTheHeapIsExhausted)
         GTEST_SKIP() << "a sanitizer stops the program instead";
     }
     const long blocks = CountLiveBlocks();
-    volatile std::size_t tooMuch = std::numeric_limits<std::size_t>::max() / 2;
+    volatile std::size_t tooMuch = std::numeric_limits<std::size_t>::max() - 4096;
     EXPECT_THROW(::operator delete(::operator new(tooMuch)), std::bad_alloc);
     EXPECT_EQ(CountLiveBlocks(), blocks);
 }
