@@ -34,7 +34,8 @@ function(bdmvnavigator_install_component name root)
     NAMESPACE bdmvnavigator:: DESTINATION ${package_dir})
 endfunction()
 
-foreach(kit IN LISTS bdmvnavigator_kits)
+get_property(kits GLOBAL PROPERTY bdmvnavigator_kits)
+foreach(kit IN LISTS kits)
   bdmvnavigator_install_component(${kit} kits)
 endforeach()
 

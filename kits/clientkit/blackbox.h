@@ -19,21 +19,21 @@
  *     }
  * }
  *
- * // In the player. The box is the first listener, so that it has the callback in which another
- * // listener ends in Assert().
- * bdmv::BlackBox box(1000, TicksSinceStart);
- * navigatorListeners.AddListener(&box);
- * g_pBlackBox = &box;
+ * // In the player. The box is never destroyed: a thread may be in Assert() until the process ends.
+ * // It is the first listener, so that it has the callback in which another one ends in Assert().
+ * bdmv::BlackBox* const box = new bdmv::BlackBox(1000, TicksSinceStart);
+ * g_pBlackBox = box;
+ * navigatorListeners.AddListener(box);
  * ...
- * g_pBlackBox = nullptr;
- * navigatorListeners.RemoveListener(&box);
+ * navigatorListeners.RemoveListener(box);
  * @endcode
  *
  * Memory. All of it is allocated by the constructor: for each callback less than 64 bytes and
  * those kept of a block.
  *
- * Lifetime. Remove the box from its list, and from wherever Assert() finds it, before destroying
- * it.
+ * Lifetime. Remove the box from its list before destroying it, and destroy it only when no Dump()
+ * can be running: after g_pBlackBox is cleared, a thread in Assert() may still use the pointer that
+ * it has read.
  *
  * Re-entrancy. Dump() works inside a callback, inside the function that gives the time and inside
  * the one that writes. A function that writes must not end in Assert() if Assert() dumps: that
@@ -41,8 +41,8 @@
  * the lock of the box.
  *
  * Threads. Several threads may deliver to the box and dump it at once. The lock is held while one
- * record is copied, and never while code of the client runs. A dumping thread that is preempted in
- * this moment delays the delivering thread until it continues.
+ * record is copied, and never while code of the client runs. A dumping thread that is preempted at
+ * that moment delays the delivering thread until it continues.
  */
 #ifndef CLIENTKIT_BLACKBOX_H
 #define CLIENTKIT_BLACKBOX_H

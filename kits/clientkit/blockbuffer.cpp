@@ -1,6 +1,9 @@
 #include "clientkit/blockbuffer.h"
 
+#include <algorithm>
 #include <cstring>
+#include <limits>
+#include <stdexcept>
 
 namespace bdmv
 {
@@ -8,17 +11,28 @@ namespace bdmv
 namespace
 {
 
+constexpr std::size_t Alignment = alignof(std::max_align_t);
+
 /** The bytes that a block takes up, so that the next one is aligned. */
 std::size_t RoundUp(std::size_t size)
 {
-    constexpr std::size_t Alignment = alignof(std::max_align_t);
     return (size + Alignment - 1) / Alignment * Alignment;
+}
+
+std::size_t SizeOf(std::size_t blocks, std::size_t largest)
+{
+    const std::size_t most =
+        std::numeric_limits<std::size_t>::max() / std::max<std::size_t>(blocks, 1);
+    if (largest > most - most % Alignment) {
+        throw std::length_error("bdmv::BlockBuffer: too many bytes");
+    }
+    return blocks * RoundUp(largest);
 }
 
 } // namespace
 
 BlockBuffer::BlockBuffer(std::size_t blocks, std::size_t largest)
-    : m_Largest(largest), m_Bytes(blocks * RoundUp(largest)), m_Begin(0), m_End(0), m_Blocks(0)
+    : m_Largest(largest), m_Bytes(SizeOf(blocks, largest)), m_Begin(0), m_End(0), m_Blocks(0)
 {
 }
 

@@ -26,6 +26,8 @@ public:
      * @param blocks  how many blocks of the largest size fit, if nothing else has been added; the
      *                second one always fits
      * @param largest the largest size of a block, in bytes
+     * @throw std::length_error more memory than can be addressed
+     * @throw std::bad_alloc    not enough memory
      */
     BlockBuffer(std::size_t blocks, std::size_t largest);
 
@@ -53,9 +55,10 @@ public:
 private:
     const std::size_t m_Largest;
     std::vector<unsigned char> m_Bytes;
-    std::size_t m_Begin;  ///< the first byte of the oldest block
-    std::size_t m_End;    ///< where the newest block ends, rounded up
-    std::size_t m_Blocks; ///< tells a full ring from an empty one when both positions are equal
+    std::size_t m_Begin; ///< the first byte of the oldest block
+    std::size_t m_End;   ///< where the newest block ends, rounded up
+    std::size_t
+        m_Blocks; ///< distinguishes a full ring from an empty one if both positions are equal
 };
 
 } // namespace bdmv

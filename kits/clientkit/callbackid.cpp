@@ -19,16 +19,21 @@ const CallbackRow g_Callbacks[] = {
 
 const char* const g_Interfaces[] = {"control", "settings", "button", "interactive"};
 
+bool IsCallback(CallbackId id)
+{
+    return id >= 0 && id < Callback__sizeof;
+}
+
 } // namespace
 
 const char* NameOf(CallbackId id)
 {
-    return id >= 0 && id < Callback__sizeof ? g_Callbacks[id].name : "unknown";
+    return IsCallback(id) ? g_Callbacks[id].name : "unknown";
 }
 
 ListenerInterface InterfaceOf(CallbackId id)
 {
-    return g_Callbacks[id].interface;
+    return IsCallback(id) ? g_Callbacks[id].interface : ListenerInterface__sizeof;
 }
 
 const char* NameOf(ListenerInterface interface)

@@ -90,7 +90,7 @@ enum ListenerInterface : KEVRO_Int32 {
 /** "PlayStarted" for CallbackPlayStarted; "unknown" for a value that is no callback. Any thread. */
 const char* NameOf(CallbackId id);
 
-/** @param id a callback, not Callback__sizeof */
+/** The interface that declares a callback; ListenerInterface__sizeof for any other value. */
 ListenerInterface InterfaceOf(CallbackId id);
 
 /** "control", "settings", "button" or "interactive"; "unknown" for any other value. */

@@ -44,7 +44,7 @@
 namespace bdmv
 {
 
-/** A listener with clients of its own. */
+/** A listener that passes callbacks on to its clients. */
 class ListenerRelay : public CallbackListener
 {
 public:

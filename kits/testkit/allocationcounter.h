@@ -22,14 +22,15 @@
 namespace bdmvtest
 {
 
-/** The number of calls of the global operator new by the calling thread so far. */
+/** The number of calls of the global operator new, in any form, by the calling thread so far. */
 std::size_t CountAllocations();
 
 /** The blocks that the calling thread has allocated, less those that it has freed. */
 long CountLiveBlocks();
 
 /**
- * Makes an allocation of the calling thread fail with std::bad_alloc.
+ * Makes an allocation of the calling thread fail: with std::bad_alloc, or with a null pointer if it
+ * is one with std::nothrow.
  *
  * @param countdown the number of allocations that still succeed first; negative for no failure
  */

@@ -9,8 +9,8 @@
  * EXPECT_EQ(mode.Speed(), bd::PlaySpeedFast2);              // a failure names both
  * @endcode
  *
- * A program that lets GoogleTest print the library's types includes this header, or one that
- * includes it, in every source that does; else GoogleTest may print numbers in all of them.
+ * A program that prints the library's types in GoogleTest's messages includes this header, or one
+ * that includes it, in every source that does; else GoogleTest may print numbers in all of them.
  */
 #ifndef TESTKIT_DESCRIBE_H
 #define TESTKIT_DESCRIBE_H

@@ -9,9 +9,9 @@
  * EXPECT_EQ(spy.Callbacks().back(), expected); // GoogleTest prints both like this
  * @endcode
  *
- * GoogleTest finds the functions PrintTo(), but nothing here needs it. A program that lets
- * GoogleTest print callbacks includes this header, or testkit/spylistener.h, in every source that
- * does; else it may print the bytes of a callback in all of them.
+ * GoogleTest finds the functions PrintTo(), but nothing here needs it. A program that prints
+ * callbacks in GoogleTest's messages includes this header, or testkit/spylistener.h, in every source
+ * that does; else GoogleTest may print the bytes of a callback in all of them.
  */
 #ifndef TESTKIT_DESCRIBECALLBACK_H
 #define TESTKIT_DESCRIBECALLBACK_H

@@ -1,7 +1,7 @@
 /**
  * @file
- * Replaces the global operator new and operator delete of the whole program, for the functions of
- * testkit/allocationcounter.h.
+ * Replaces all forms of the global operator new and operator delete in the whole program, for the
+ * functions of testkit/allocationcounter.h.
  *
  * Include it in exactly one source of a program: its definitions are neither inline nor weak,
  * because the operators of a sanitizer's run-time library would take precedence over weak ones, and
@@ -10,6 +10,7 @@
 #ifndef TESTKIT_OPERATORNEW_H
 #define TESTKIT_OPERATORNEW_H
 
+#include <algorithm>
 #include <cstdlib>
 #include <new>
 
@@ -24,26 +25,50 @@ struct ThreadHeap {
     static inline thread_local long liveBlocks = 0;
     static inline thread_local long failureCountdown = -1;
 
-    static void* Allocate(std::size_t size)
+    /** A block for any type of fundamental alignment; null if the allocation fails. */
+    static void* TryAllocate(std::size_t size)
     {
-        ++allocations;
-        if (failureCountdown >= 0 && failureCountdown-- == 0) {
-            throw std::bad_alloc();
-        }
-        void* const block = std::malloc(size == 0 ? 1 : size);
+        return IsToFail() ? nullptr : Counted(std::malloc(size == 0 ? 1 : size));
+    }
+
+    /** A block with an alignment; null if the allocation fails. */
+    static void* TryAllocate(std::size_t size, std::align_val_t alignment)
+    {
+        void* block = nullptr;
+        const bool allocated =
+            !IsToFail() &&
+            posix_memalign(&block, std::max(static_cast<std::size_t>(alignment), sizeof(void*)),
+                           size == 0 ? 1 : size) == 0;
+        return allocated ? Counted(block) : nullptr;
+    }
+
+    /** TryAllocate() with the same arguments, but a failure throws std::bad_alloc. */
+    template <typename... Arguments> static void* Allocate(Arguments... arguments)
+    {
+        void* const block = TryAllocate(arguments...);
         if (block == nullptr) {
             throw std::bad_alloc();
         }
-        ++liveBlocks;
         return block;
     }
 
     static void Free(void* block)
     {
-        if (block != nullptr) {
-            --liveBlocks;
-            std::free(block);
-        }
+        liveBlocks -= block != nullptr ? 1 : 0;
+        std::free(block);
+    }
+
+private:
+    static bool IsToFail()
+    {
+        ++allocations;
+        return failureCountdown >= 0 && failureCountdown-- == 0;
+    }
+
+    static void* Counted(void* block)
+    {
+        liveBlocks += block != nullptr ? 1 : 0;
+        return block;
     }
 };
 
@@ -64,9 +89,28 @@ void FailAllocationAfter(long countdown)
 
 } // namespace bdmvtest
 
+// Every form is replaced: a sanitizer's run-time library has all of them, and its memory must not
+// reach the operator delete of this file, nor the reverse.
+
 void* operator new(std::size_t size)
 {
     return bdmvtest::ThreadHeap::Allocate(size);
+}
+
+void* operator new(std::size_t size, const std::nothrow_t& /*tag*/) noexcept
+{
+    return bdmvtest::ThreadHeap::TryAllocate(size);
+}
+
+void* operator new(std::size_t size, std::align_val_t alignment)
+{
+    return bdmvtest::ThreadHeap::Allocate(size, alignment);
+}
+
+void* operator new(std::size_t size, std::align_val_t alignment,
+                   const std::nothrow_t& /*tag*/) noexcept
+{
+    return bdmvtest::ThreadHeap::TryAllocate(size, alignment);
 }
 
 void* operator new[](std::size_t size)
@@ -74,7 +118,49 @@ void* operator new[](std::size_t size)
     return bdmvtest::ThreadHeap::Allocate(size);
 }
 
+void* operator new[](std::size_t size, const std::nothrow_t& /*tag*/) noexcept
+{
+    return bdmvtest::ThreadHeap::TryAllocate(size);
+}
+
+void* operator new[](std::size_t size, std::align_val_t alignment)
+{
+    return bdmvtest::ThreadHeap::Allocate(size, alignment);
+}
+
+void* operator new[](std::size_t size, std::align_val_t alignment,
+                     const std::nothrow_t& /*tag*/) noexcept
+{
+    return bdmvtest::ThreadHeap::TryAllocate(size, alignment);
+}
+
 void operator delete(void* block) noexcept
+{
+    bdmvtest::ThreadHeap::Free(block);
+}
+
+void operator delete(void* block, std::size_t /*size*/) noexcept
+{
+    bdmvtest::ThreadHeap::Free(block);
+}
+
+void operator delete(void* block, const std::nothrow_t& /*tag*/) noexcept
+{
+    bdmvtest::ThreadHeap::Free(block);
+}
+
+void operator delete(void* block, std::align_val_t /*alignment*/) noexcept
+{
+    bdmvtest::ThreadHeap::Free(block);
+}
+
+void operator delete(void* block, std::size_t /*size*/, std::align_val_t /*alignment*/) noexcept
+{
+    bdmvtest::ThreadHeap::Free(block);
+}
+
+void operator delete(void* block, std::align_val_t /*alignment*/,
+                     const std::nothrow_t& /*tag*/) noexcept
 {
     bdmvtest::ThreadHeap::Free(block);
 }
@@ -84,12 +170,28 @@ void operator delete[](void* block) noexcept
     bdmvtest::ThreadHeap::Free(block);
 }
 
-void operator delete(void* block, std::size_t) noexcept
+void operator delete[](void* block, std::size_t /*size*/) noexcept
 {
     bdmvtest::ThreadHeap::Free(block);
 }
 
-void operator delete[](void* block, std::size_t) noexcept
+void operator delete[](void* block, const std::nothrow_t& /*tag*/) noexcept
+{
+    bdmvtest::ThreadHeap::Free(block);
+}
+
+void operator delete[](void* block, std::align_val_t /*alignment*/) noexcept
+{
+    bdmvtest::ThreadHeap::Free(block);
+}
+
+void operator delete[](void* block, std::size_t /*size*/, std::align_val_t /*alignment*/) noexcept
+{
+    bdmvtest::ThreadHeap::Free(block);
+}
+
+void operator delete[](void* block, std::align_val_t /*alignment*/,
+                       const std::nothrow_t& /*tag*/) noexcept
 {
     bdmvtest::ThreadHeap::Free(block);
 }

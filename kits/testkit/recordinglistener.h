@@ -15,6 +15,9 @@
  *
  *     A.PlayItem(800, 0, VideoFormatType1080p, VideoAspectRatioType16x9)
  *     B.SystemSuspended(bytes 1 2 3, 3)
+ *
+ * It overrides every callback itself instead of deriving from bdmv::CallbackListener: it must be
+ * an independent witness of which slot was called, and must not add a reference to a program.
  */
 #ifndef TESTKIT_RECORDINGLISTENER_H
 #define TESTKIT_RECORDINGLISTENER_H

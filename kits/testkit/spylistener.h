@@ -66,11 +66,11 @@ public:
         return m_Callbacks.size();
     }
 
-    /** The number of callbacks of one kind in Callbacks(). */
+    /** The number of callbacks of one kind in Callbacks(); 0 for a value that is no callback. */
     std::size_t Count(bdmv::CallbackId id) const
     {
         const std::lock_guard<std::mutex> lock(m_Mutex);
-        return m_Tallies[static_cast<std::size_t>(id)].received;
+        return m_Tallies[PlaceOf(id)].received;
     }
 
     /**
@@ -94,7 +94,7 @@ public:
      * second call with the same @p id therefore waits for a second callback. Kinds are independent:
      * the order of calls for different kinds says nothing about the order of their callbacks, which
      * Callbacks() shows. A call that times out leaves everything as it was. Clear() and Take()
-     * forget what was received; calls that wait meanwhile go on waiting.
+     * forget what was received; calls that wait meanwhile continue to wait.
      *
      * When it returns true, the callback is in Callbacks(), unless they have been cleared since.
      * Other listeners of the same delivery may not have received it yet.
@@ -102,6 +102,7 @@ public:
      * Any thread, and several at once. On a thread that delivers to the spy itself, inside a
      * callback, only callbacks that were received before can satisfy it.
      *
+     * @param id      a value that is no callback is never received
      * @param timeout at most a day; a longer one counts as a day
      * @return false if no callback of this kind was received in time
      */
@@ -109,7 +110,7 @@ public:
     {
         const std::chrono::milliseconds day = std::chrono::hours(24);
         std::unique_lock<std::mutex> lock(m_Mutex);
-        Tally& tally = m_Tallies[static_cast<std::size_t>(id)];
+        Tally& tally = m_Tallies[PlaceOf(id)];
         const bool received = m_HasReceived.wait_for(
             lock, std::min(timeout, day), [&tally] { return tally.received > tally.awaited; });
         tally.awaited += received ? 1 : 0;
@@ -123,6 +124,12 @@ private:
         std::size_t awaited = 0; ///< those that satisfied a call of WaitFor()
     };
 
+    /** The last place is for values that are no callback. */
+    static std::size_t PlaceOf(bdmv::CallbackId id)
+    {
+        return std::min(static_cast<std::size_t>(id), std::size_t{bdmv::Callback__sizeof});
+    }
+
     void OnCallback(const bdmv::Callback& callback) override
     {
         Keep(callback);
@@ -135,7 +142,7 @@ private:
     {
         const std::lock_guard<std::mutex> lock(m_Mutex);
         m_Callbacks.push_back(WithOwnBytes(callback));
-        ++m_Tallies[static_cast<std::size_t>(callback.Id())].received;
+        ++m_Tallies[PlaceOf(callback.Id())].received;
         m_HasReceived.notify_all();
     }
 
@@ -154,7 +161,7 @@ private:
     mutable std::mutex m_Mutex;
     std::condition_variable m_HasReceived;
     std::vector<bdmv::Callback> m_Callbacks;
-    std::array<Tally, bdmv::Callback__sizeof> m_Tallies = {};
+    std::array<Tally, bdmv::Callback__sizeof + 1> m_Tallies = {};
     std::deque<std::vector<unsigned char>> m_Blocks;
 };
 

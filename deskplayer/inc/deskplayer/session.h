@@ -50,6 +50,11 @@ public:
      */
     explicit Session(std::string_view text, const std::string& name = "session");
 
+    // Declared, so that moving copies: a session that was moved from can be played as before.
+    ~Session() = default;
+    Session(const Session&) = default;
+    Session& operator=(const Session&) = default;
+
 private:
     struct Script;
     friend SessionReport PlaySession(Desk& desk, const Session& session,

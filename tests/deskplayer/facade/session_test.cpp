@@ -5,6 +5,7 @@
 #include <stdexcept>
 #include <string>
 #include <thread>
+#include <utility>
 #include <vector>
 
 #include "bdmvnavigator/navigatorlisteneradapter.h"
@@ -33,6 +34,19 @@ TEST_F(SessionOnADesk, ReportsNothingIfItGoesAsDemanded)
 
     EXPECT_EQ(report.unmet, Lines());
     EXPECT_EQ(report.refused, Lines());
+}
+
+TEST_F(SessionOnADesk, PlaysASessionThatWasMovedFrom)
+{
+    Session session("play\nat 5 continue\n");
+    Session constructed(std::move(session));
+    constructed = std::move(session); // NOLINT(bugprone-use-after-move): it is copied
+
+    // NOLINTNEXTLINE(bugprone-use-after-move): it was copied
+    const SessionReport report = PlaySession(desk, session);
+
+    EXPECT_EQ(report.refused,
+              Lines({"session:2: refused at 00:00:05.000: not paused, but playing"}));
 }
 
 TEST_F(SessionOnADesk, ReportsExpectationsThatWereNotMet)

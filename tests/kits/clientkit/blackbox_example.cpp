@@ -81,9 +81,9 @@ int main()
     bd::EventListenerList<bdmv::INavigatorListener> navigatorListeners;
     FrontPanel frontPanel;
 
-    bdmv::BlackBox box(1000, TicksSinceStart);
-    navigatorListeners.AddListener(&box);
-    g_pBlackBox = &box;
+    bdmv::BlackBox* const box = new bdmv::BlackBox(1000, TicksSinceStart);
+    g_pBlackBox = box;
+    navigatorListeners.AddListener(box);
 
     navigatorListeners.AddListener(&frontPanel);
     for (const bd::ChapterNumberDef chapter : {bd::ChapterNumberDef(2), bd::ChapterNumberDef(3)}) {
@@ -92,6 +92,5 @@ int main()
     }
     navigatorListeners.RemoveListener(&frontPanel);
 
-    g_pBlackBox = nullptr;
-    navigatorListeners.RemoveListener(&box);
+    navigatorListeners.RemoveListener(box);
 }

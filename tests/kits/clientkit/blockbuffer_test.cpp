@@ -6,8 +6,10 @@
 
 #include <cstdint>
 #include <deque>
+#include <limits>
 #include <numeric>
 #include <random>
+#include <stdexcept>
 #include <string>
 #include <vector>
 
@@ -87,6 +89,16 @@ TEST(BlockBuffer, OfSizeZeroRefusesEveryBlock)
 {
     BlockBuffer buffer(4, 0);
     EXPECT_EQ(buffer.Add("a", 1), nullptr);
+}
+
+TEST(BlockBuffer, RefusesMoreBytesThanCanBeAddressed)
+{
+    constexpr std::size_t Most = std::numeric_limits<std::size_t>::max();
+    EXPECT_THROW(BlockBuffer(1, Most), std::length_error);
+    EXPECT_THROW(BlockBuffer(2, Most / 2), std::length_error); // more only when rounded up
+    EXPECT_THROW(BlockBuffer(4, Most / 4 + 1), std::length_error);
+    EXPECT_THROW(BlockBuffer(Most, 2), std::length_error);
+    EXPECT_NO_THROW(BlockBuffer(0, Most - Most % alignof(std::max_align_t)));
 }
 
 TEST(BlockBuffer, HasRoomForItsNumberOfLargestBlocks)

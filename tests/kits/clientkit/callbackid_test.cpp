@@ -87,6 +87,12 @@ TEST(CallbackId, BelongsToTheInterfaceThatDeclaresIt)
               counts);
 }
 
+TEST(CallbackId, OutsideTheCallbacksBelongsToNoInterface)
+{
+    EXPECT_EQ(InterfaceOf(Callback__sizeof), ListenerInterface__sizeof);
+    EXPECT_EQ(InterfaceOf(static_cast<CallbackId>(-1)), ListenerInterface__sizeof);
+}
+
 TEST(ListenerInterface, HasAName)
 {
     EXPECT_STREQ("control", NameOf(ListenerInterfaceControl));

@@ -4,6 +4,8 @@
 
 #include <gtest/gtest.h>
 
+#include <cstddef>
+#include <limits>
 #include <set>
 #include <stdexcept>
 #include <string>
@@ -59,6 +61,13 @@ TEST_F(QueuedListenerTest, DeliversOnOneThreadOfItsOwn)
 TEST_F(QueuedListenerTest, WithoutPlacesIsRefused)
 {
     EXPECT_THROW(QueuedListener(client, OptionsOf(0)), std::invalid_argument);
+}
+
+TEST_F(QueuedListenerTest, WithBlocksThatCannotBeAddressedIsRefused)
+{
+    QueuedListener::Options options;
+    options.largestBlock = std::numeric_limits<std::size_t>::max() / 4 + 1;
+    EXPECT_THROW(QueuedListener(client, options), std::length_error);
 }
 
 TEST_F(QueuedListenerTest, DoesNotMakeItsCallerWaitForTheClient)

@@ -43,6 +43,14 @@ TEST(SpyListener, CountsCallbacksByKind)
     EXPECT_EQ(spy.Count(bdmv::CallbackStopped), 0u);
 }
 
+TEST(SpyListener, CountsNoneForAValueThatIsNoCallback)
+{
+    SpyListener spy;
+    spy.InteractiveGraphicsInactive(); // the last one
+    EXPECT_EQ(spy.Count(bdmv::Callback__sizeof), 0u);
+    EXPECT_EQ(spy.Count(static_cast<bdmv::CallbackId>(-1)), 0u);
+}
+
 TEST(SpyListener, ForgetsWhatIsTaken)
 {
     SpyListener spy;
@@ -111,6 +119,14 @@ TEST(WaitFor, TimesOutWithoutACallbackOfTheKind)
     SpyListener spy;
     spy.Stopped();
     EXPECT_FALSE(spy.WaitFor(bdmv::CallbackPaused, milliseconds(1)));
+}
+
+TEST(WaitFor, TimesOutForAValueThatIsNoCallback)
+{
+    SpyListener spy;
+    spy.InteractiveGraphicsInactive(); // the last one
+    EXPECT_FALSE(spy.WaitFor(bdmv::Callback__sizeof, None));
+    EXPECT_FALSE(spy.WaitFor(static_cast<bdmv::CallbackId>(-1), None));
 }
 
 TEST(WaitFor, IsSatisfiedOnceByEachCallback)
