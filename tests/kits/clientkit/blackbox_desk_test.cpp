@@ -13,6 +13,7 @@
 
 #include "bd/constants.h"
 #include "boxtest.h"
+#include "kits/clientkit/everycallback.h"
 #include "navigator/deskparts.h"
 #include "output/outputformat.h"
 #include "samplecallbacks.h"

@@ -10,6 +10,7 @@
 #include <vector>
 
 #include "boxtest.h"
+#include "kits/clientkit/everycallback.h"
 #include "samplecallbacks.h"
 #include "testkit/allocationcounter.h"
 #include "testkit/fakeplatform.h"

@@ -9,17 +9,6 @@ namespace bdmvtest
 namespace
 {
 
-class ProgramOfThreeCommands : public bdmv::IProgramData
-{
-public:
-    bd::UInt16 GetNumberOfNavigationCommands() const override { return 3; }
-    const bdmv::INavigationCommandData*
-    GetNavigationCommandData(CommandIdDef /*commandId*/) const override
-    {
-        return nullptr;
-    }
-};
-
 void CallControl(bdmv::INavControlListener& listener)
 {
     listener.PlayStarted();
@@ -99,7 +88,7 @@ void CallInteractive(bdmv::INavInteractiveListener& listener)
 
 bdmv::IProgramData::RefPtr MakeProgram()
 {
-    return new ProgramOfThreeCommands;
+    return new ProgramOfCommands(3);
 }
 
 void CallEveryCallback(bdmv::INavigatorListener& listener, bdmv::IProgramData::RefPtr& program)

@@ -15,6 +15,23 @@ namespace bdmvtest
 /** The block of the call of SystemSuspended(). */
 inline constexpr bd::UInt8 StandbyBlock[] = {0x00, 0xA5, 0xFF};
 
+/** A program of as many commands as asked for. */
+class ProgramOfCommands : public bdmv::IProgramData
+{
+public:
+    explicit ProgramOfCommands(bd::UInt16 commands) : m_Commands(commands) {}
+
+    bd::UInt16 GetNumberOfNavigationCommands() const override { return m_Commands; }
+    const bdmv::INavigationCommandData*
+    GetNavigationCommandData(CommandIdDef /*commandId*/) const override
+    {
+        return nullptr;
+    }
+
+private:
+    bd::UInt16 m_Commands;
+};
+
 /** A program of three commands. */
 bdmv::IProgramData::RefPtr MakeProgram();
 

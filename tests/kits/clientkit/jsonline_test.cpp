@@ -7,6 +7,7 @@
 #include <vector>
 
 #include "bd/constants.h"
+#include "kits/clientkit/everycallback.h"
 #include "samplecallbacks.h"
 #include "testkit/allocationcounter.h"
 #include "testkit/fakeplatform.h"

@@ -1,6 +1,7 @@
 #include "samplecallbacks.h"
 
 #include "bd/constants.h"
+#include "kits/clientkit/everycallback.h"
 
 namespace bdmvtest
 {
@@ -9,20 +10,6 @@ namespace
 {
 
 using namespace bdmv::callbacks;
-
-const bd::UInt8 g_Block[] = {0x00, 0xA5, 0xFF};
-
-bd::AudioInfoType AudioDetails()
-{
-    bd::AudioInfoType info;
-    info.format = bd::AudioFormatDtsHd_Es_Discrete_6_1_Chan;
-    info.sampleRate = bd::AudioSampleRate_192000;
-    info.bitsPerSampling = bd::AudioBitsPerSamplingType24;
-    info.channels = bd::AudioChannelTypeStereoDolbySurround;
-    info.pid = 0x1100;
-    info.u4AudChannelLayout = 0xFFFFFFFF;
-    return info;
-}
 
 bd::AudioInfoType AudioDetailsWithoutNames()
 {
@@ -39,64 +26,8 @@ bd::AudioInfoType AudioDetailsWithoutNames()
 
 std::vector<bdmv::Callback> SampleCallbacks()
 {
-    return {
-        PlayStarted{},
-        FirstPictureDelivered{},
-        PlayFailed{},
-        Paused{},
-        Continued{bd::PlayDirectionBackward, bd::PlaySpeedFast2},
-        Stepped{900001, bd::PlayDirectionForward},
-        TriggerTimeReached{bd::TRIGGER_NOTIFY_FROM_CURPOS, 900002},
-        TriggerSet{bd::TRIGGER_A, true},
-        ZoomModeSet{{{1, 2, 3, 4}, {5, 6, 7, 8}, 9}},
-        Stopped{},
-        Finished{bdmv::INavControlListener::DataStarvation},
-        StillOn{},
-        StillOff{},
-        Suspended{},
-        Resumed{},
-        ResumeFailed{},
-        SystemSuspended{g_Block, sizeof g_Block},
-        SystemResumed{true},
-        SystemResumeFailed{},
-        JumpOccurred{},
-        PreloadFailed{},
-        Playlist{800},
-        PlayItem{801, 2, bd::VideoFormatType1080p, bd::VideoAspectRatioType2_21x1},
-        PlayMode{bd::PlayDirectionForward, bd::PlaySpeedSlow1},
-        AudioInfo{11},
-        VideoInfo{12},
-        AngleInfo{13},
-        InteractiveGraphicsInfo{14},
-        PresentationGraphicsInfo{15, true},
-        SecondaryAudioInfo{16},
-        SecondaryVideoInfo{17},
-        PipPgTextStInfo{18, false},
-        AudioInfoChanged{true, AudioDetails()},
-        TextSubtitleStyleInfo{19},
-        TextSubtitleStylesAvailable{20},
-        UOMask{bdmv::UOMaskTable(0x2100000000000000ULL)},
-        ChapterNumber{21},
-        MarkInfo{802, 22, 27000},
-        CurrentTimePosition{900003},
-        PictureInPictureAvailable{},
-        PictureInPictureUnavailable{},
-        SecondaryAudioAvailable{},
-        SecondaryAudioUnavailable{},
-        PresentationGraphicsDisplay{true},
-        SecondaryVideoDisplay{23, true},
-        SecondaryAudioDisplay{24, false},
-        PipPgTextSelect{true},
-        ExecuteButton{25, 26, bdmv::IProgramData::RefPtr(new ProgramOfCommands(3))},
-        InteractiveGraphicsVisible{},
-        InteractiveGraphicsInvisible{},
-        PopUpMenuAvailable{},
-        PopUpMenuUnavailable{},
-        ButtonActivationBusy{},
-        ButtonActivationDone{},
-        InteractiveGraphicsActive{},
-        InteractiveGraphicsInactive{},
-
+    std::vector<bdmv::Callback> callbacks = EveryCallback();
+    const std::vector<bdmv::Callback> extremes = {
         Continued{static_cast<bd::PlayDirectionDef>(-1), static_cast<bd::PlaySpeedDef>(99)},
         ZoomModeSet{{{65535, 0, 65535, 0}, {0, 65535, 0, 65535}, 0xFFFFFFFF}},
         Finished{static_cast<bdmv::INavControlListener::FinishedReason>(7)},
@@ -113,6 +44,8 @@ std::vector<bdmv::Callback> SampleCallbacks()
         ExecuteButton{0xFFFFFFFF, 0xFFFF, bdmv::IProgramData::RefPtr()},
         ExecuteButton{0, 0, bdmv::IProgramData::RefPtr(new ProgramOfCommands(65535))},
     };
+    callbacks.insert(callbacks.end(), extremes.begin(), extremes.end());
+    return callbacks;
 }
 
 } // namespace bdmvtest

@@ -12,26 +12,9 @@
 namespace bdmvtest
 {
 
-/** A program of as many commands as asked for. */
-class ProgramOfCommands : public bdmv::IProgramData
-{
-public:
-    explicit ProgramOfCommands(bd::UInt16 commands) : m_Commands(commands) {}
-
-    bd::UInt16 GetNumberOfNavigationCommands() const override { return m_Commands; }
-    const bdmv::INavigationCommandData*
-    GetNavigationCommandData(CommandIdDef /*commandId*/) const override
-    {
-        return nullptr;
-    }
-
-private:
-    bd::UInt16 m_Commands;
-};
-
 /**
- * Every callback with distinct arguments, then those whose arguments are extreme: the greatest
- * numbers, values without a name, no position, no program, no block.
+ * EveryCallback(), then callbacks whose arguments are extreme: the greatest numbers, values without
+ * a name, no position, no program, no block.
  */
 std::vector<bdmv::Callback> SampleCallbacks();
 
