@@ -25,9 +25,16 @@ if(BDMVNAVIGATOR_BUILD_PORT)
 endif()
 
 # bdmvnavigator_install_component(NAME ROOT): a component of the package: its target and its headers,
-# which are in the folder ROOT/NAME.
+# which are in the folder ROOT/NAME, except the private ones.
 function(bdmvnavigator_install_component name root)
-  install(DIRECTORY ${root}/${name} DESTINATION ${header_dir} FILES_MATCHING PATTERN "*.h")
+  get_property(private_headers
+    TARGET bdmvnavigator_${name} PROPERTY bdmvnavigator_private_headers)
+  set(excluded)
+  foreach(header IN LISTS private_headers)
+    list(APPEND excluded PATTERN ${header} EXCLUDE)
+  endforeach()
+  install(DIRECTORY ${root}/${name} DESTINATION ${header_dir}
+    FILES_MATCHING PATTERN "*.h" ${excluded})
   install(TARGETS bdmvnavigator_${name} EXPORT bdmvnavigator-${name}-targets
     ARCHIVE DESTINATION ${CMAKE_INSTALL_LIBDIR})
   install(EXPORT bdmvnavigator-${name}-targets

@@ -16,7 +16,7 @@ namespace
 std::size_t Checked(std::size_t callbacks)
 {
     if (callbacks == 0) {
-        throw std::invalid_argument("a black box for no callbacks");
+        throw std::invalid_argument("bdmv::BlackBox: no callbacks");
     }
     return callbacks;
 }
@@ -26,7 +26,7 @@ typedef std::uint64_t (*TicksFunction)();
 TicksFunction Checked(TicksFunction ticks)
 {
     if (ticks == nullptr) {
-        throw std::invalid_argument("a black box without a clock");
+        throw std::invalid_argument("bdmv::BlackBox: no clock");
     }
     return ticks;
 }
@@ -34,7 +34,7 @@ TicksFunction Checked(TicksFunction ticks)
 std::size_t SizeOfBlocks(std::size_t callbacks, std::size_t bytesOfBlock)
 {
     if (bytesOfBlock > std::numeric_limits<std::size_t>::max() / callbacks) {
-        throw std::length_error("a black box for too many bytes");
+        throw std::length_error("bdmv::BlackBox: too many bytes");
     }
     return callbacks * bytesOfBlock;
 }

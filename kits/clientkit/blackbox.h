@@ -78,7 +78,6 @@ public:
      */
     BlackBox(std::size_t callbacks, std::uint64_t (*ticks)(), std::size_t bytesOfBlock = 0);
 
-    ~BlackBox() override = default;
     BlackBox(const BlackBox&) = delete;
     BlackBox& operator=(const BlackBox&) = delete;
 

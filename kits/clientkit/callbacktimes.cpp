@@ -2,6 +2,8 @@
 
 #include <algorithm>
 
+#include "bd/guard.h"
+
 namespace bdmv
 {
 
@@ -35,7 +37,7 @@ bool CallbackTimes::Add(CallbackId id, Time begin, Time end)
 {
     const Duration time = end - begin;
     const std::size_t place = PlaceOf(time);
-    const std::lock_guard<std::mutex> lock(m_Mutex);
+    const bd::Guard<bd::ThreadMutex> guard(m_Mutex);
     Entry& entry = m_Entries[id];
     ++entry.record.count;
     entry.record.longest = std::max(entry.record.longest, time);
@@ -54,7 +56,7 @@ CallbackTimes::Record CallbackTimes::Get(CallbackId id) const
     if (id < 0 || id >= Callback__sizeof) {
         return Record();
     }
-    const std::lock_guard<std::mutex> lock(m_Mutex);
+    const bd::Guard<bd::ThreadMutex> guard(m_Mutex);
     return m_Entries[id].record;
 }
 

@@ -8,8 +8,8 @@
 
 #include <chrono>
 #include <cstddef>
-#include <mutex>
 
+#include "bd/threadmutex.h"
 #include "bd/types.h"
 #include "clientkit/callbackid.h"
 
@@ -61,7 +61,7 @@ private:
     };
 
     const Duration m_Budget;
-    mutable std::mutex m_Mutex;
+    bd::ThreadMutex m_Mutex; ///< guards m_Entries
     Entry m_Entries[Callback__sizeof];
 };
 

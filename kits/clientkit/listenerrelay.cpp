@@ -7,9 +7,6 @@
 namespace bdmv
 {
 
-ListenerRelay::ListenerRelay() = default;
-ListenerRelay::~ListenerRelay() = default;
-
 bool ListenerRelay::Join(INavigatorListener& client)
 {
     const bd::Guard<bd::ThreadMutex> guard(m_ClientsLock);
@@ -18,7 +15,7 @@ bool ListenerRelay::Join(INavigatorListener& client)
     }
     // Whatever can fail comes before the client belongs to the relay.
     m_Clients.reserve(m_Clients.size() + 1);
-    Deliver(m_Status.Status(), client);
+    Deliver(Status(), client);
     m_Clients.push_back(&client);
     return true;
 }
@@ -34,13 +31,25 @@ bool ListenerRelay::Leave(INavigatorListener& client)
     return true;
 }
 
+PlaybackStatus ListenerRelay::Status() const
+{
+    const bd::Guard<bd::ThreadMutex> guard(m_StatusLock);
+    return m_Status;
+}
+
 void ListenerRelay::OnCallback(const Callback& callback)
 {
     const bd::Guard<bd::ThreadMutex> guard(m_ClientsLock);
-    m_Status.OnCallback(callback);
+    Include(callback);
     for (INavigatorListener* const client : m_Clients) {
         Deliver(callback, *client);
     }
+}
+
+void ListenerRelay::Include(const Callback& callback)
+{
+    const bd::Guard<bd::ThreadMutex> guard(m_StatusLock);
+    Apply(callback, m_Status);
 }
 
 ListenerRelay::Clients::iterator ListenerRelay::Find(INavigatorListener& client)

@@ -48,8 +48,7 @@ namespace bdmv
 class ListenerRelay : public CallbackListener
 {
 public:
-    ListenerRelay();
-    ~ListenerRelay() override;
+    ListenerRelay() = default;
 
     ListenerRelay(const ListenerRelay&) = delete;
     ListenerRelay& operator=(const ListenerRelay&) = delete;
@@ -76,17 +75,17 @@ public:
 
     /** The status including the callback that is being passed on. Any thread, without waiting for
      * a client. */
-    PlaybackStatus Status() const { return m_Status.Status(); }
-
-protected:
-    void OnCallback(const Callback& callback) override;
+    PlaybackStatus Status() const;
 
 private:
     typedef std::vector<INavigatorListener*> Clients;
 
+    void OnCallback(const Callback& callback) override;
+    void Include(const Callback& callback);
     Clients::iterator Find(INavigatorListener& client);
 
-    StatusListener m_Status;       ///< changes with m_ClientsLock held
+    bd::ThreadMutex m_StatusLock;  ///< guards m_Status; no client is called under it
+    PlaybackStatus m_Status;       ///< changes with m_ClientsLock held as well
     bd::ThreadMutex m_ClientsLock; ///< guards m_Clients, held while clients are called
     Clients m_Clients;             ///< in the order in which they joined
 };

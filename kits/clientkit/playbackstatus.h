@@ -162,16 +162,20 @@ void Deliver(const PlaybackStatus& status, INavigatorListener& listener);
 class StatusListener : public CallbackListener
 {
 public:
+    StatusListener() = default;
+
+    StatusListener(const StatusListener&) = delete;
+    StatusListener& operator=(const StatusListener&) = delete;
+
     /**
      * The status including the latest callback. Any thread, also inside a callback. Waits at most
      * until another thread has copied or updated the status.
      */
     PlaybackStatus Status() const;
 
-    /** Includes a callback, as if it had come from the navigator. Any thread. */
+private:
     void OnCallback(const Callback& callback) override;
 
-private:
     bd::ThreadMutex m_StatusLock; ///< guards m_Status; no listener is called under it
     PlaybackStatus m_Status;
 };

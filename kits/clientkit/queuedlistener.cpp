@@ -1,8 +1,10 @@
 #include "clientkit/queuedlistener.h"
 
 #include <condition_variable>
+#include <mutex>
 #include <system_error>
 
+#include "bd/guard.h"
 #include "clientkit/callbackqueue.h"
 #include "kevro/kevro_osa.h"
 
@@ -114,11 +116,12 @@ private:
         try {
             Deliver(callback, m_rClient);
         } catch (...) {
-            Assert("a client of bdmv::QueuedListener does not throw", __FILE__, __LINE__);
+            Assert("bdmv::QueuedListener: the client does not throw", __FILE__, __LINE__);
         }
     }
 
     INavigatorListener& m_rClient;
+    // The kit's other locks are of type bd::ThreadMutex; a condition variable needs std::mutex.
     mutable std::mutex m_Mutex; ///< guards the following; the client is called without it
     std::condition_variable m_Changed;
     CallbackQueue m_Queue;
@@ -137,7 +140,7 @@ QueuedListener::QueuedListener(INavigatorListener& client, Options options)
 QueuedListener::~QueuedListener()
 {
     if (m_pDelivery->IsClientThread()) {
-        Assert("a bdmv::QueuedListener is not destroyed inside a callback of its client", __FILE__,
+        Assert("bdmv::QueuedListener: not destroyed inside a callback of its client", __FILE__,
                __LINE__);
         m_pDelivery->Close();
         m_Thread.detach();
@@ -153,7 +156,7 @@ void QueuedListener::Close()
                                 "bdmv::QueuedListener: closed inside a callback of its client");
     }
     m_pDelivery->Close();
-    const std::lock_guard<std::mutex> lock(m_Joining);
+    const bd::Guard<bd::ThreadMutex> guard(m_Joining);
     if (m_Thread.joinable()) {
         m_Thread.join();
     }

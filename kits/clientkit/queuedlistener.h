@@ -55,9 +55,9 @@
 #include <cstddef>
 #include <cstdint>
 #include <memory>
-#include <mutex>
 #include <thread>
 
+#include "bd/threadmutex.h"
 #include "clientkit/callback.h"
 
 namespace bdmv
@@ -134,7 +134,7 @@ private:
     void OnCallback(const Callback& callback) override;
 
     const std::shared_ptr<Delivery> m_pDelivery; ///< shared with the thread, which may outlive this
-    std::mutex m_Joining;                        ///< held to wait for the end of the thread
+    bd::ThreadMutex m_Joining;                   ///< held to wait for the end of the thread
     std::thread m_Thread;
 };
 

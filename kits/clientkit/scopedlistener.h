@@ -86,7 +86,7 @@ public:
         try {
             Remove();
         } catch (const std::system_error&) {
-            Assert("a registration is not destroyed inside a callback of its list", __FILE__,
+            Assert("bdmv::ScopedListener: not destroyed inside a callback of its list", __FILE__,
                    __LINE__);
         }
     }

@@ -46,6 +46,9 @@ public:
     {
     }
 
+    RecordingListener(const RecordingListener&) = delete;
+    RecordingListener& operator=(const RecordingListener&) = delete;
+
     /** Called after a callback has been recorded, with its entry without the listener's name. */
     std::function<void(const std::string& callback)> onCallback;
 

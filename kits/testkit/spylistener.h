@@ -46,6 +46,11 @@ namespace bdmvtest
 class SpyListener : public bdmv::CallbackListener
 {
 public:
+    SpyListener() = default;
+
+    SpyListener(const SpyListener&) = delete;
+    SpyListener& operator=(const SpyListener&) = delete;
+
     /** Called with each callback after it has been kept; may throw. */
     std::function<void(const bdmv::Callback& callback)> onCallback;
 

@@ -40,7 +40,7 @@ class Recorder : public bdmv::CallbackListener
 public:
     const std::vector<bdmv::Callback>& Callbacks() const { return m_Callbacks; }
 
-protected:
+private:
     void OnCallback(const bdmv::Callback& callback) override
     {
         if (callback.Id() != bdmv::CallbackCurrentTimePosition) {
@@ -48,7 +48,6 @@ protected:
         }
     }
 
-private:
     std::vector<bdmv::Callback> m_Callbacks;
 };
 

@@ -12,3 +12,10 @@ file(GLOB roots RELATIVE ${PREFIX}/include ${PREFIX}/include/*)
 if(NOT roots STREQUAL "bdmvnavigator")
   message(FATAL_ERROR "include/ contains ${roots} instead of bdmvnavigator alone")
 endif()
+
+# The others of their kit are installed, see the tests of the components.
+foreach(header IN LISTS PRIVATE_HEADERS)
+  if(EXISTS ${PREFIX}/include/bdmvnavigator/${header})
+    message(FATAL_ERROR "${header} is installed")
+  endif()
+endforeach()

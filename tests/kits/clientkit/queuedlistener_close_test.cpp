@@ -286,7 +286,7 @@ TEST_F(QueuedListenerCloseTest, ByTheDestructorInsideACallbackIsReportedAndThatC
     destroyed->get_future().wait();
     EXPECT_EQ(calls, 1);
     const std::string text = journal.Take();
-    EXPECT_EQ(text.find("assert: a bdmv::QueuedListener is not destroyed inside a callback of its "
+    EXPECT_EQ(text.find("assert: bdmv::QueuedListener: not destroyed inside a callback of its "
                         "client, kits/clientkit/queuedlistener.cpp:"),
               0U)
         << text;

@@ -51,7 +51,7 @@ private:
     void OnCallback(const bdmv::Callback& callback) override
     {
         m_rGate.Pass();
-        m_Status.OnCallback(callback);
+        Deliver(callback, m_Status);
         const auto* const button = callback.As<bdmv::callbacks::ExecuteButton>();
         if (button != nullptr && button->ticket == LastTicket) {
             m_Last = true;

@@ -204,7 +204,7 @@ TEST_F(QueuedListenerTest, ReportsAnExceptionAndContinues)
     gate.WaitForArrivals(2);
     queued.Close();
     const std::string text = journal.Take();
-    EXPECT_EQ(text.find("client.Paused()\nassert: a client of bdmv::QueuedListener does not throw, "
+    EXPECT_EQ(text.find("client.Paused()\nassert: bdmv::QueuedListener: the client does not throw, "
                         "kits/clientkit/queuedlistener.cpp:"),
               0U)
         << text;

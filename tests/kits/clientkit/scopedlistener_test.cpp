@@ -161,7 +161,7 @@ TEST_F(ScopedListener, ReportsThatItIsDestroyedInsideACallback)
     InsideACallback([&] { registration.reset(); });
 
     EXPECT_EQ(journal.Take().find(
-                  "assert: a registration is not destroyed inside a callback of its list, "),
+                  "assert: bdmv::ScopedListener: not destroyed inside a callback of its list, "),
               0U);
     EXPECT_TRUE(Contains(listener));
 }
