@@ -10,10 +10,9 @@
 //
 //   1. Post() takes the place that the entry of position `taken` names, and advances `taken`.
 //   2. It constructs the event there.
-//   3. It writes the lap and the place into the first entry that still has the lap before: only now
-//   is
-//      the event in the queue. A constructor that is slow or throws holds up no other event, and no
-//      event waits for a producer that was interrupted halfway.
+//   3. It writes the lap and the place into the first entry that still has the lap before. Only now
+//      is the event in the queue: a constructor that is slow or throws holds up no other event, and
+//      no event waits for a producer that was interrupted halfway.
 //   4. The deliverer reads the entry of position `dispatched`, delivers, and advances `dispatched`.
 //
 // Steps 1 and 3 are an atomic instruction each and step 4 needs none; a lock would take two and one
@@ -170,10 +169,12 @@ EventQueue::PlaceNumber EventQueue::TakePlace()
             return TakeSparePlace();
         }
         // What a producer saw before is enough as long as it leaves a place: looking at what the
-        // deliverer writes with every event would slow both down.
+        // deliverer writes with every event would slow both down. A full queue is exactly its
+        // number of places ahead. Any other distance means that a place is free, or that `taken`
+        // has changed since it was read: then the exchange fails, even if `dispatched` is past it.
         const Position seen = m_Posting.seenDispatched.load(std::memory_order_acquire);
         if (Distance(seen, taken) >= m_NumberOfPlaces &&
-            Distance(SeeDispatched(), taken) >= m_NumberOfPlaces) {
+            Distance(SeeDispatched(), taken) == m_NumberOfPlaces) {
             return TakeSparePlace();
         }
         const Position entry = EntryAt(taken).load(std::memory_order_relaxed);
@@ -252,7 +253,7 @@ std::size_t EventQueue::CountBefore(Position end)
     return Distance(SeeDispatched(), end);
 }
 
-/** Reads what the deliverer writes, and lets the other producers see it. */
+/** Reads what the deliverer writes, and publishes it to the other producers. */
 EventQueue::Position EventQueue::SeeDispatched()
 {
     const Position dispatched = m_Delivering.dispatched.load(std::memory_order_acquire);
