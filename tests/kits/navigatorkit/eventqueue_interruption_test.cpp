@@ -7,6 +7,8 @@
 
 #include <atomic>
 #include <csignal>
+#include <cstdint>
+#include <ctime>
 #include <sys/time.h>
 
 namespace
@@ -91,6 +93,31 @@ TEST_F(EventQueueInterruption, OfAProducerRefusesNoEventWhilePlacesAreFree)
     }
 
     EXPECT_EQ(refused, 0);
+}
+
+// The position that a producer stores last, where the next one starts to look for its entry. Only a
+// producer that was interrupted right before it stores an old one, so the test stores it instead:
+// an explicit instantiation may name a private member.
+std::atomic<std::uint32_t>& EndOf(bdmv::EventQueue& queue);
+template <auto Member> struct Access {
+    friend std::atomic<std::uint32_t>& EndOf(bdmv::EventQueue& queue)
+    {
+        return (queue.*Member).end;
+    }
+};
+template struct Access<&bdmv::EventQueue::m_Posting>;
+
+TEST_F(EventQueueInterruption, OfAProducerForMillionsOfEventsDoesNotSlowDownTheNextOne)
+{
+    const std::uint32_t positions = std::uint32_t(1) << 31;
+    const std::uint32_t manyLaps = std::uint32_t(1) << 26;
+    EndOf(queue) = (EndOf(queue) + positions - manyLaps) % positions;
+
+    const std::clock_t before = std::clock();
+    Post();
+
+    EXPECT_LT(std::clock() - before, CLOCKS_PER_SEC / 10);
+    EXPECT_TRUE(queue.DispatchNext(listeners));
 }
 
 } // namespace
