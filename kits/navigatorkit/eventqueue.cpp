@@ -22,8 +22,11 @@
 // A place whose event was not constructed cannot go back to the entries, which are in the order of
 // dispatch. It becomes a spare, used when no entry offers a place. `taken` is ahead by the spares.
 //
-// Laps wrap around after about two billion events. A thread would have to be suspended between two
-// instructions for exactly that many to confuse laps.
+// Positions repeat after 2^31 events if the number of places is a power of two, with other numbers
+// earlier, but never before 2^30. A producer that is suspended between two instructions while the
+// others post that many events or a multiple, give or take a lap, can mistake an old position for a
+// new one, and then the queue is corrupt. At a million events a second that takes more than 17
+// minutes; nothing guards against it. A producer that is suspended for any other time does no harm.
 
 #include "navigatorkit/eventqueue.h"
 
@@ -233,6 +236,7 @@ void EventQueue::Append(PlaceNumber place, INavigatorEvent* event)
 
     // The deliverer says that it waits and then looks at the entry; here the order is the reverse.
     // So one of the two sees what the other wrote, and no event is left while the deliverer waits.
+    // What was dispatched since `before` was read makes the new maximum too high, never too low.
     if (m_Posting.isDelivererWaiting.load() ||
         before >= m_Posting.mostAtOnce.load(std::memory_order_relaxed)) {
         const std::lock_guard<std::mutex> lock(m_Mutex);
