@@ -220,15 +220,13 @@ void EventQueue::Append(PlaceNumber place, INavigatorEvent* event)
     Position end = m_Posting.end.load(std::memory_order_acquire);
     std::size_t before = 0;
     for (;;) {
+        before = CountBefore(end);
         Position entry = EntryAt(end).load(std::memory_order_acquire);
         if (!IsUnposted(end, entry)) {
             // A producer that was interrupted before it stored `end` moves it back, perhaps by many
             // laps. The entry has the last one, so the search takes no more than a lap.
             end = Next((entry & ~m_NumberMask) | (end & m_NumberMask));
-            continue;
-        }
-        before = CountBefore(end);
-        if (EntryAt(end).compare_exchange_strong(entry, (end & ~m_NumberMask) | place)) {
+        } else if (EntryAt(end).compare_exchange_strong(entry, (end & ~m_NumberMask) | place)) {
             break;
         }
     }
