@@ -14,7 +14,8 @@
 namespace
 {
 
-/** Without optimisation, one in sixty interrupts the producer between two reads that it compares.
+/** Without optimisation, about one in fifty interrupts the producer between two reads that it
+ * compares.
  */
 const int Interruptions = 1000;
 
