@@ -14,9 +14,7 @@
 namespace
 {
 
-/** Without optimisation, about one in fifty interrupts the producer between two reads that it
- * compares.
- */
+/** About one in fifty, in code not optimised, is between two reads that the producer compares. */
 const int Interruptions = 1000;
 
 class EmptyEvent : public bdmv::INavigatorEvent
