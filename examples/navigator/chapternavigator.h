@@ -5,11 +5,16 @@
 #ifndef EXAMPLES_NAVIGATOR_CHAPTERNAVIGATOR_H
 #define EXAMPLES_NAVIGATOR_CHAPTERNAVIGATOR_H
 
+#include <stdexcept>
+
 #include "bdmvnavigator/navigatorevent.h"
 #include "chaptercontext.h"
 #include "navigatorkit/eventqueue.h"
 
-/** Call all operations from one thread, which delivers the events before they return. */
+/**
+ * Call all operations from one thread, which delivers the events before they return, and not inside
+ * a callback, where the queue cannot deliver.
+ */
 class ChapterNavigator
 {
 public:
@@ -20,14 +25,14 @@ public:
 
     void GoToChapter(bd::ChapterNumberDef chapter)
     {
-#if SEED_BUG
-        // An event reports what the context answers when it is delivered: here the old chapter.
-        Send<bdmv::ChapterEvent>();
-        m_Context.chapter = chapter;
-#else
-        m_Context.chapter = chapter;
-        Send<bdmv::ChapterEvent>();
-#endif
+        if (!SEED_BUG) {
+            m_Context.chapter = chapter;
+            Send<bdmv::ChapterEvent>();
+        } else {
+            // An event reports what the context answers when it is delivered: here the old chapter.
+            Send<bdmv::ChapterEvent>();
+            m_Context.chapter = chapter;
+        }
     }
 
     void SelectAudio(bd::StreamNumberDef number)
@@ -39,7 +44,9 @@ public:
 private:
     template <typename Event> void Send()
     {
-        m_Queue.Post<Event>(m_Context);
+        if (!m_Queue.Post<Event>(m_Context)) {
+            throw std::runtime_error("the event queue is full");
+        }
         while (m_Queue.DispatchNext(m_Listeners)) {
         }
     }

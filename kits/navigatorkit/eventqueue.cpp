@@ -10,10 +10,9 @@
 //
 //   1. Post() takes the place that the entry of position `taken` names, and advances `taken`.
 //   2. It constructs the event there.
-//   3. It writes the lap and the place into the first entry that still has the lap before: only now
-//   is
-//      the event in the queue. A constructor that is slow or throws holds up no other event, and no
-//      event waits for a producer that was interrupted halfway.
+//   3. It writes the lap and the place into the first entry that still has the lap before. Only now
+//      is the event in the queue: a constructor that is slow or throws holds up no other event, and
+//      no event waits for a producer that was interrupted halfway.
 //   4. The deliverer reads the entry of position `dispatched`, delivers, and advances `dispatched`.
 //
 // Steps 1 and 3 are an atomic instruction each and step 4 needs none; a lock would take two and one
@@ -23,8 +22,11 @@
 // A place whose event was not constructed cannot go back to the entries, which are in the order of
 // dispatch. It becomes a spare, used when no entry offers a place. `taken` is ahead by the spares.
 //
-// Laps wrap around after about two billion events. A thread would have to be suspended between two
-// instructions for exactly that many to confuse laps.
+// Positions repeat after 2^31 events if the number of places is a power of two, with other numbers
+// earlier, but never before 2^30. A producer that is suspended between two instructions while the
+// others post that many events or a multiple, give or take a lap, can mistake an old position for a
+// new one, and then the queue is corrupt. At a million events a second that takes more than 17
+// minutes; nothing guards against it. A producer that is suspended for any other time does no harm.
 
 #include "navigatorkit/eventqueue.h"
 
@@ -170,10 +172,12 @@ EventQueue::PlaceNumber EventQueue::TakePlace()
             return TakeSparePlace();
         }
         // What a producer saw before is enough as long as it leaves a place: looking at what the
-        // deliverer writes with every event would slow both down.
+        // deliverer writes with every event would slow both down. A full queue is exactly its
+        // number of places ahead. Any other distance means that a place is free, or that `taken`
+        // has changed since it was read: then the exchange fails, even if `dispatched` is past it.
         const Position seen = m_Posting.seenDispatched.load(std::memory_order_acquire);
         if (Distance(seen, taken) >= m_NumberOfPlaces &&
-            Distance(SeeDispatched(), taken) >= m_NumberOfPlaces) {
+            Distance(SeeDispatched(), taken) == m_NumberOfPlaces) {
             return TakeSparePlace();
         }
         const Position entry = EntryAt(taken).load(std::memory_order_relaxed);
@@ -219,7 +223,9 @@ void EventQueue::Append(PlaceNumber place, INavigatorEvent* event)
         before = CountBefore(end);
         Position entry = EntryAt(end).load(std::memory_order_acquire);
         if (!IsUnposted(end, entry)) {
-            end = Next(end);
+            // A producer that was interrupted before it stored `end` moves it back, perhaps by many
+            // laps. The entry has the last one, so the search takes no more than a lap.
+            end = Next((entry & ~m_NumberMask) | (end & m_NumberMask));
         } else if (EntryAt(end).compare_exchange_strong(entry, (end & ~m_NumberMask) | place)) {
             break;
         }
@@ -228,6 +234,7 @@ void EventQueue::Append(PlaceNumber place, INavigatorEvent* event)
 
     // The deliverer says that it waits and then looks at the entry; here the order is the reverse.
     // So one of the two sees what the other wrote, and no event is left while the deliverer waits.
+    // What was dispatched since `before` was read makes the new maximum too high, never too low.
     if (m_Posting.isDelivererWaiting.load() ||
         before >= m_Posting.mostAtOnce.load(std::memory_order_relaxed)) {
         const std::lock_guard<std::mutex> lock(m_Mutex);
@@ -252,7 +259,7 @@ std::size_t EventQueue::CountBefore(Position end)
     return Distance(SeeDispatched(), end);
 }
 
-/** Reads what the deliverer writes, and lets the other producers see it. */
+/** Reads what the deliverer writes, and publishes it to the other producers. */
 EventQueue::Position EventQueue::SeeDispatched()
 {
     const Position dispatched = m_Delivering.dispatched.load(std::memory_order_acquire);

@@ -6,7 +6,9 @@
  * bdmv::EventQueue queue(256);
  *
  * // where playback pauses, on any thread
- * queue.Post<bdmv::PausedEvent>(context);
+ * if (!queue.Post<bdmv::PausedEvent>(context)) {
+ *     ReportLostEvent(); // the queue is full or closed
+ * }
  *
  * // the delivering thread
  * queue.Run(listeners);
@@ -17,7 +19,8 @@
  *
  * Memory. The constructor allocates all places at once. Post() constructs an event in a free place,
  * and the event stays there until it has been dispatched, so nothing else allocates. A full queue
- * refuses: choose the number of places for the longest burst, and watch Counters::refused.
+ * refuses, and the event is lost unless the caller of Post() acts: choose the number of places for
+ * the longest burst, check the result, and watch Counters::refused.
  *
  * Order. First in, first out over all producers. An event is posted at the end of its Post(), after
  * its constructor: of two that overlap, either may be first.
@@ -30,6 +33,12 @@
  * Post() is visible to the callbacks of its event. No lock is held while a constructor, a callback
  * or a destructor runs, so each of them may call Post(), Close() and GetCounters(). They must not
  * dispatch: DispatchNext() and Run() throw there.
+ *
+ * Locking. Most calls of Post() and DispatchNext() take no lock. The queue's mutex is taken by a
+ * Post() that wakes Run(), raises Counters::mostAtOnce or is refused, by one whose constructor
+ * throws and by one that uses the place this leaves; by the deliverer before it blocks, and each
+ * time it has dispatched as many events as there are places; by Close(); and by GetCounters(). All
+ * hold it for a few instructions, except GetCounters(), which counts the queued events under it.
  *
  * Exceptions. What a callback throws leaves DispatchNext() and Run() after the event has been
  * destroyed; the next call continues with the next event. What a constructor throws leaves Post(),
@@ -68,7 +77,12 @@ public:
         std::uint64_t posted;     ///< calls of Post() that returned true
         std::uint64_t dispatched; ///< events delivered, including those whose callback threw
         std::uint64_t refused;    ///< calls of Post() that returned false
-        std::size_t mostAtOnce;   ///< the most events in the queue, including one being dispatched
+        /**
+         * The most events in the queue, including the one being dispatched. Exact with one thread;
+         * otherwise never too low and never above the number of places, but events that were
+         * dispatched during a Post() may be included.
+         */
+        std::size_t mostAtOnce;
     };
 
     /**
@@ -88,11 +102,12 @@ public:
 
     /**
      * Constructs an event at the end of the queue. Any thread, also inside a callback. Allocates
-     * nothing and waits for no other thread; a thread blocked in Run() is woken.
+     * nothing and never waits for a place; when it takes the lock, see above. A thread blocked in
+     * Run() is woken.
      *
      * @tparam Event a class derived from INavigatorEvent that fits in a place
      * @param arguments those of the event's constructor
-     * @return false, and nothing is constructed, if the queue is full or closed
+     * @return false, and nothing is constructed, if the queue is full or closed: the event is lost
      * @throw whatever the constructor throws; the queue is as before
      */
     template <typename Event, typename... Arguments> bool Post(Arguments&&... arguments)
@@ -140,7 +155,8 @@ public:
     void Close();
 
     /**
-     * Any thread. Allocates nothing. While other threads use the queue, the counts may be of
+     * Any thread. Allocates nothing. Takes time proportional to the number of events in the queue,
+     * and holds the lock meanwhile. While other threads use the queue, the counts may be of
      * slightly different moments, but `dispatched` is never more than `posted`.
      */
     Counters GetCounters() const;

@@ -6,6 +6,7 @@
 #include <deque>
 #include <memory>
 #include <mutex>
+#include <stdexcept>
 #include <string>
 #include <thread>
 #include <utility>
@@ -39,7 +40,12 @@ constexpr std::size_t Places = 1024;
 class KitQueue
 {
 public:
-    void Post(Context& context) { m_Queue.Post<Event>(context); }
+    void Post(Context& context)
+    {
+        if (!m_Queue.Post<Event>(context)) {
+            throw std::runtime_error("bdmv::EventQueue refused an event");
+        }
+    }
     bool DispatchNext(List& listeners) { return m_Queue.DispatchNext(listeners); }
     void Run(List& listeners) { m_Queue.Run(listeners); }
     void Close() { m_Queue.Close(); }
