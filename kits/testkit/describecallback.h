@@ -10,8 +10,8 @@
  * @endcode
  *
  * GoogleTest finds the functions PrintTo(), but nothing here needs it. A program that prints
- * callbacks in GoogleTest's messages includes this header, or testkit/spylistener.h, in every source
- * that does; else GoogleTest may print the bytes of a callback in all of them.
+ * callbacks in GoogleTest's messages includes this header, or testkit/spylistener.h, in every
+ * source that does; else GoogleTest may print the bytes of a callback in all of them.
  */
 #ifndef TESTKIT_DESCRIBECALLBACK_H
 #define TESTKIT_DESCRIBECALLBACK_H
