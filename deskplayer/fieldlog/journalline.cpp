@@ -1,7 +1,7 @@
 #include "fieldlog/journalline.h"
 
+#include <cstddef>
 #include <cstdint>
-#include <ctime>
 
 #include <nlohmann/json.hpp>
 
@@ -38,16 +38,41 @@ std::optional<std::string> TextOf(const json& object, const char* name)
     return text;
 }
 
+/** @param number from 0 to 99 */
+std::string TwoDigits(std::int64_t number)
+{
+    return std::to_string(100 + number).substr(1);
+}
+
+bool IsLeapYear(std::int64_t year)
+{
+    return year % 4 == 0 && (year % 100 != 0 || year % 400 == 0);
+}
+
+/** "2024-05-31". Not by the system's calendar, which may end in 2038. */
+std::string DateText(std::int64_t daysFrom1970)
+{
+    std::int64_t rest = daysFrom1970;
+    std::int64_t year = 1970;
+    for (; rest >= (IsLeapYear(year) ? 366 : 365); ++year) {
+        rest -= IsLeapYear(year) ? 366 : 365;
+    }
+    const int days[] = {31, IsLeapYear(year) ? 29 : 28, 31, 30, 31, 30, 31, 31, 30, 31, 30, 31};
+    std::size_t month = 0;
+    for (; rest >= days[month]; ++month) {
+        rest -= days[month];
+    }
+    return std::to_string(year) + "-" + TwoDigits(static_cast<std::int64_t>(month) + 1) + "-" +
+           TwoDigits(rest + 1);
+}
+
 /** "2024-05-31T18:15:00.123456Z" */
 std::string UniversalTimeText(std::int64_t microseconds)
 {
-    const auto seconds = static_cast<std::time_t>(microseconds / 1000000);
-    std::tm parts{};
-    gmtime_r(&seconds, &parts);
-    char text[64];
-    const std::size_t length = std::strftime(text, sizeof(text), "%Y-%m-%dT%H:%M:%S", &parts);
+    const std::int64_t seconds = microseconds / 1000000;
     const std::string fraction = std::to_string(1000000 + microseconds % 1000000).substr(1);
-    return std::string(text, length) + "." + fraction + "Z";
+    return DateText(seconds / 86400) + "T" + TwoDigits(seconds / 3600 % 24) + ":" +
+           TwoDigits(seconds / 60 % 60) + ":" + TwoDigits(seconds % 60) + "." + fraction + "Z";
 }
 
 } // namespace

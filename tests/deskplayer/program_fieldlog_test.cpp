@@ -128,6 +128,20 @@ TEST_F(FieldLog, MayHaveLinesOfAnotherKind)
               "00:00:00.000  Paused\n");
 }
 
+TEST_F(FieldLog, OfAnySizeIsReadInConstantMemory)
+{
+    const std::string log = WriteFile("log", Paused + "x");
+    ResizeSparsely(log, std::uintmax_t{100} << 20);
+
+    const ProgramResult result =
+        RunDeskPlayerWithLimitedMemory({"--field-log", log, "--only", "Paused"}, 64 * 1024);
+
+    EXPECT_EQ(result.status, 0) << result.errors;
+    EXPECT_EQ(result.output, "00:00:00.000  (start) at 2024-05-31 20:15:00.123456\n"
+                             "00:00:00.000  Paused\n"
+                             "00:00:00.000  (gap)                       cause=truncated\n");
+}
+
 TEST_F(FieldLog, ThatCannotBeReadIsRefused)
 {
     ExpectUsageError({"--field-log", (folder / "none").string()},

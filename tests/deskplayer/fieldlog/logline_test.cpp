@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 
 #include <string>
+#include <utility>
 
 #include "fieldlog/journalline.h"
 
@@ -94,6 +95,22 @@ TEST(JournalLine, IsTakenApart)
     EXPECT_EQ(line->process, "ab 42");
     EXPECT_EQ(line->component, "BdmvNavigator");
     EXPECT_EQ(line->text, "Sending Paused");
+}
+
+TEST(JournalLine, HasItsTimeAsText)
+{
+    JournalLineReader reader;
+    for (const auto& [microseconds, text] : {std::pair("0", "1970-01-01T00:00:00.000000Z"),
+                                             {"951782399999999", "2000-02-28T23:59:59.999999Z"},
+                                             {"951782400000000", "2000-02-29T00:00:00.000000Z"},
+                                             {"978307199000000", "2000-12-31T23:59:59.000000Z"},
+                                             {"4107542400000000", "2100-03-01T00:00:00.000000Z"},
+                                             {"9999999999999999", "2286-11-20T17:46:39.999999Z"}}) {
+        const auto line = reader.Read("{\"__REALTIME_TIMESTAMP\":\"" + std::string(microseconds) +
+                                      "\",\"MESSAGE\":\"A B: c\"}");
+        ASSERT_TRUE(line) << text;
+        EXPECT_EQ(line->time.text, text);
+    }
 }
 
 TEST(JournalLine, MayHaveItsTextAsBytes)
