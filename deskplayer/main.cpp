@@ -28,6 +28,7 @@
 #include "listing/listingjson.h"
 #include "output/textoutput.h"
 #include "program/failure.h"
+#include "program/fieldlogs.h"
 #include "program/logclock.h"
 #include "program/options.h"
 #include "program/progress.h"
@@ -55,21 +56,22 @@ OutputOptions OutputOptionsOf(const Options& options)
 }
 
 /** @throw UsageError the options name no format, interface or callback, or exclude each other */
-OutputFormat CheckOutput(const Options& options)
+OutputSettings CheckOutput(const Options& options)
 {
-    OutputFormat format = OutputFormat::Text;
+    OutputSettings settings;
     try {
-        format = ReadOutputOptions(OutputOptionsOf(options)).format;
+        settings = ReadOutputOptions(OutputOptionsOf(options));
     } catch (const std::invalid_argument& error) {
         throw UsageError(error.what());
     }
-    if ((options.list || options.describe || options.check) && format == OutputFormat::Trace) {
+    if ((options.list || options.describe || options.check) &&
+        settings.format == OutputFormat::Trace) {
         throw UsageError(std::string(options.list       ? "--list"
                                      : options.describe ? "--describe"
                                                         : "--check") +
                          " excludes --format trace");
     }
-    return format;
+    return settings;
 }
 
 /** @return the exit status */
@@ -127,11 +129,14 @@ int Check(const Options& options, OutputFormat format, Target& target)
 /** @return the exit status */
 int Run(const Options& options)
 {
-    const OutputFormat format = CheckOutput(options);
+    const OutputSettings settings = CheckOutput(options);
+    const OutputFormat format = settings.format;
     const bool json = format == OutputFormat::Json;
     Target target(options.output);
     int status = ExitOk;
-    if (options.check) {
+    if (!options.fieldLogs.empty()) {
+        ConvertFieldLogs(options, settings, target);
+    } else if (options.check) {
         status = Check(options, format, target);
     } else if (options.list) {
         const Disc disc(options.disc, BackupCopies::Use, PrintMessage);

@@ -31,10 +31,10 @@ ordered_json ToJson(const bd::ZoomRectangleDef& rectangle)
 
 } // namespace
 
-ordered_json ArgumentsJson(const bdmv::Callback& callback)
+ordered_json ArgumentsJson(const CallbackRecord& record)
 {
     ordered_json arguments = ordered_json::object();
-    VisitShownArguments(callback, [&arguments](const char* name, const auto& value) {
+    VisitShownArguments(record, [&arguments](const char* name, const auto& value) {
         arguments[name] = ToJson(value);
     });
     return arguments;

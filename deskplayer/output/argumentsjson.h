@@ -7,16 +7,16 @@
 
 #include <nlohmann/json.hpp>
 
-#include "clientkit/callback.h"
+#include "output/record.h"
 
 namespace deskplayer
 {
 
 /**
- * An object with a member for every argument, in order. Positions are in 45 kHz ticks, or null;
- * rectangles are objects.
+ * An object with a member for every argument that is not absent, in order. Positions are in 45 kHz
+ * ticks, or null; rectangles are objects.
  */
-nlohmann::ordered_json ArgumentsJson(const bdmv::Callback& callback);
+nlohmann::ordered_json ArgumentsJson(const CallbackRecord& record);
 
 } // namespace deskplayer
 

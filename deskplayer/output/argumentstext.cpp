@@ -47,10 +47,10 @@ std::string ValueText(const bd::ZoomRectangleDef& rectangle)
 
 } // namespace
 
-std::vector<ArgumentText> ArgumentTexts(const bdmv::Callback& callback)
+std::vector<ArgumentText> ArgumentTexts(const CallbackRecord& record)
 {
     std::vector<ArgumentText> texts;
-    VisitShownArguments(callback, [&texts](const char* name, const auto& value) {
+    VisitShownArguments(record, [&texts](const char* name, const auto& value) {
         texts.push_back({name, ValueText(value)});
     });
     return texts;

@@ -8,7 +8,7 @@
 #include <string>
 #include <vector>
 
-#include "clientkit/callback.h"
+#include "output/record.h"
 
 namespace deskplayer
 {
@@ -19,8 +19,8 @@ struct ArgumentText {
     std::string value; ///< without blanks: "true", "00:01:30.500", "1080p", "1920x1080+0+0"
 };
 
-/** The arguments of a callback, in order. */
-std::vector<ArgumentText> ArgumentTexts(const bdmv::Callback& callback);
+/** The arguments that are not absent, in order. */
+std::vector<ArgumentText> ArgumentTexts(const CallbackRecord& record);
 
 } // namespace deskplayer
 

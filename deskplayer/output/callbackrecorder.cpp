@@ -12,7 +12,7 @@ namespace deskplayer
 void CallbackRecorder::OnCallback(const bdmv::Callback& callback)
 {
     Recorded recorded = {NameOf(callback.Id()), {}};
-    for (const ArgumentText& argument : ArgumentTexts(callback)) {
+    for (const ArgumentText& argument : ArgumentTexts({Ticks(), callback, {}})) {
         recorded.arguments.push_back(std::string(argument.name) + "=" + argument.value);
     }
     m_Callbacks.push_back(std::move(recorded));

@@ -1,20 +1,39 @@
 #include "output/jsonoutput.h"
 
-#include "output/argumentsjson.h"
-#include "text/timetext.h"
+#include <cstddef>
+
+#include "clientkit/jsonline.h"
+#include "output/arguments.h"
 
 namespace deskplayer
 {
 
-void JsonOutput::Write(const bdmv::Callback& callback)
+namespace
 {
-    const Ticks now = Now();
-    const nlohmann::ordered_json line = {{"ticks", now.count()},
-                                         {"time", TimeText(now)},
-                                         {"interface", NameOf(InterfaceOf(callback.Id()))},
-                                         {"callback", NameOf(callback.Id())},
-                                         {"arguments", ArgumentsJson(callback)}};
-    Stream() << line.dump() << '\n';
+
+void WriteTo(void* stream, const char* bytes, std::size_t size)
+{
+    static_cast<std::ostream*>(stream)->write(bytes, static_cast<std::streamsize>(size));
+}
+
+} // namespace
+
+void JsonOutput::Write(const CallbackRecord& record)
+{
+    bdmv::JsonLine line(WriteTo, &Stream());
+    line.Begin(record.time.count(), record.callback.Id());
+    VisitPresentArguments(record, line);
+    line.End();
+}
+
+void JsonOutput::Write(const GapRecord& gap)
+{
+    bdmv::JsonLine line(WriteTo, &Stream());
+    if (gap.lost) {
+        line.Gap(gap.time.count(), *gap.lost, gap.cause.c_str());
+    } else {
+        line.Gap(gap.time.count(), gap.cause.c_str());
+    }
 }
 
 } // namespace deskplayer

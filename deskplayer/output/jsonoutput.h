@@ -11,7 +11,8 @@ namespace deskplayer
 {
 
 /**
- * Writes one JSON object per callback, each on its own line. docs/outputs.md describes the members.
+ * Writes one JSON object per callback or gap, each on its own line. docs/outputs.md describes the
+ * members.
  *
  *     {"ticks":900000,"time":"00:00:20.000","interface":"control","callback":"Paused","arguments":{}}
  */
@@ -21,7 +22,8 @@ public:
     using Output::Output;
 
 private:
-    void Write(const bdmv::Callback& callback) override;
+    void Write(const CallbackRecord& record) override;
+    void Write(const GapRecord& gap) override;
 };
 
 } // namespace deskplayer

@@ -10,17 +10,19 @@
 #include "clientkit/callback.h"
 #include "navigator/virtualclock.h"
 #include "output/outputfilter.h"
+#include "output/record.h"
 
 namespace deskplayer
 {
 
 /**
- * Writes the callbacks that pass a filter, with the time of the session.
+ * Writes the callbacks that pass a filter: those of a session, with its time, or those of a
+ * recording, with their own. Gaps of a recording always pass.
  *
  * Writes on the delivering thread and never flushes. The output is complete once this object is
  * destroyed; the state of the stream shows whether writing succeeded.
  */
-class Output : public bdmv::CallbackListener
+class Output : public bdmv::CallbackListener, public RecordListener
 {
 public:
     /** @param stream does not throw; it and @p clock must outlive the output */
@@ -41,18 +43,24 @@ protected:
 
 private:
     /** Called for every callback, for outputs that also need those the filter hides. */
-    virtual void Follow(const bdmv::Callback& /*callback*/) {}
+    virtual void Follow(const CallbackRecord& /*record*/) {}
 
     /** Called for every callback that passes the filter, after Follow(). */
-    virtual void Write(const bdmv::Callback& callback) = 0;
+    virtual void Write(const CallbackRecord& record) = 0;
 
-    void OnCallback(const bdmv::Callback& callback) final
+    virtual void Write(const GapRecord& gap) = 0;
+
+    void OnCallback(const bdmv::Callback& callback) final { OnRecord({Now(), callback, {}}); }
+
+    void OnRecord(const CallbackRecord& record) final
     {
-        Follow(callback);
-        if (m_Filter.Passes(callback.Id())) {
-            Write(callback);
+        Follow(record);
+        if (m_Filter.Passes(record.callback.Id())) {
+            Write(record);
         }
     }
+
+    void OnGap(const GapRecord& gap) final { Write(gap); }
 
     std::ostream& m_rStream;
     const VirtualClock& m_rClock;

@@ -2,7 +2,6 @@
 
 #include <unistd.h>
 
-#include "output/argumentstext.h"
 #include "text/timetext.h"
 
 namespace deskplayer
@@ -17,6 +16,7 @@ constexpr std::size_t NameWidth = 27;
 // Control sequences of a terminal.
 constexpr const char* Reset = "\033[0m";
 constexpr const char* Dim = "\033[2m";
+constexpr const char* Red = "\033[31m";
 constexpr const char* Green = "\033[32m";
 constexpr const char* Yellow = "\033[33m";
 constexpr const char* Magenta = "\033[35m";
@@ -33,14 +33,28 @@ TextOutput::TextOutput(std::ostream& stream, const VirtualClock& clock, const Ou
 {
 }
 
-void TextOutput::Write(const bdmv::Callback& callback)
+void TextOutput::Write(const CallbackRecord& record)
 {
-    const std::string_view name = NameOf(callback.Id());
-    const std::vector<ArgumentText> arguments = ArgumentTexts(callback);
+    const bdmv::CallbackId id = record.callback.Id();
+    WriteLine(record.time, NameOf(id), Colours[InterfaceOf(id)], ArgumentTexts(record));
+}
 
-    Paint(TimeText(Now()), Dim);
+void TextOutput::Write(const GapRecord& gap)
+{
+    std::vector<ArgumentText> arguments;
+    if (gap.lost) {
+        arguments.push_back({"lost", std::to_string(*gap.lost)});
+    }
+    arguments.push_back({"cause", gap.cause});
+    WriteLine(gap.time, "(gap)", Red, arguments);
+}
+
+void TextOutput::WriteLine(Ticks time, std::string_view name, const char* colour,
+                           const std::vector<ArgumentText>& arguments)
+{
+    Paint(TimeText(time), Dim);
     Stream() << "  ";
-    Paint(name, Colours[InterfaceOf(callback.Id())]);
+    Paint(name, colour);
     if (!arguments.empty()) {
         Stream() << std::string(NameWidth - name.size(), ' ');
     }

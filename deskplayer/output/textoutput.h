@@ -6,7 +6,9 @@
 #define DESKPLAYER_OUTPUT_TEXTOUTPUT_H
 
 #include <string_view>
+#include <vector>
 
+#include "output/argumentstext.h"
 #include "output/output.h"
 
 namespace deskplayer
@@ -16,6 +18,10 @@ namespace deskplayer
  * Writes one line per callback: the time of the session, the callback, and its arguments by name.
  *
  *     00:00:20.000  Stepped                     position=00:00:20.041 direction=Forward
+ *
+ * A gap is written like a callback, with its name in parentheses:
+ *
+ *     00:00:58.000  (gap)                       lost=2 cause=capacity
  *
  * The callback has the colour of its interface; times and names of arguments are dim.
  */
@@ -30,7 +36,10 @@ public:
                bool coloured);
 
 private:
-    void Write(const bdmv::Callback& callback) override;
+    void Write(const CallbackRecord& record) override;
+    void Write(const GapRecord& gap) override;
+    void WriteLine(Ticks time, std::string_view name, const char* colour,
+                   const std::vector<ArgumentText>& arguments);
     void Paint(std::string_view text, const char* colour);
 
     bool m_Coloured;

@@ -1,5 +1,6 @@
 #include "output/traceoutput.h"
 
+#include <algorithm>
 #include <utility>
 
 #include "output/argumentsjson.h"
@@ -27,7 +28,8 @@ enum class TraceOutput::Track : std::size_t {
     SecondaryAudio,
     PipSubtitles,
     Menu,
-    FirstInterface ///< followed by one track for every other bdmv::ListenerInterface
+    FirstInterface, ///< followed by one track for every other bdmv::ListenerInterface
+    Gaps = FirstInterface + bdmv::ListenerInterface__sizeof
 };
 
 /** Keeps its arguments as they were when it began: a callback's bytes do not last. */
@@ -89,49 +91,51 @@ TraceOutput::TraceOutput(std::ostream& stream, const VirtualClock& clock,
         m_Tracks.push_back(
             {NameOf(static_cast<bdmv::ListenerInterface>(interface)), false, nullptr});
     }
+    m_Tracks.push_back({"gaps", false, nullptr});
     Append(Metadata("process_name", 0, "name", "session"));
 }
 
 TraceOutput::~TraceOutput()
 {
-    for (std::size_t track = 0; track < m_Tracks.size(); ++track) {
-        End(static_cast<Track>(track));
-    }
+    m_Time = std::max(m_Time, Now());
+    EndAll();
     Stream() << "\n]\n";
 }
 
-void TraceOutput::Follow(const bdmv::Callback& callback)
+void TraceOutput::Follow(const CallbackRecord& record)
 {
+    m_Time = record.time;
+    const bdmv::Callback& callback = record.callback;
     switch (callback.Id()) {
     case bdmv::CallbackPlayStarted:
     case bdmv::CallbackContinued:
-        Begin(Track::Playback, Playing, callback);
+        Begin(Track::Playback, Playing, record);
         break;
     case bdmv::CallbackPaused:
-        Begin(Track::Playback, "Paused", callback);
+        Begin(Track::Playback, "Paused", record);
         break;
     case bdmv::CallbackStillOn:
-        Begin(Track::Playback, "Still", callback);
+        Begin(Track::Playback, "Still", record);
         break;
     case bdmv::CallbackStillOff:
         if (StateOf(Track::Playback).slice && StateOf(Track::Playback).slice->name == "Still") {
-            Begin(Track::Playback, Playing, callback);
+            Begin(Track::Playback, Playing, record);
         }
         break;
     case bdmv::CallbackSuspended:
         m_BeforeSuspension = StateOf(Track::Playback).slice ? StateOf(Track::Playback).slice->name
                                                             : std::string(Playing);
-        Begin(Track::Playback, "Suspended", callback);
+        Begin(Track::Playback, "Suspended", record);
         break;
     case bdmv::CallbackResumed:
-        Begin(Track::Playback, m_BeforeSuspension, callback);
+        Begin(Track::Playback, m_BeforeSuspension, record);
         break;
     case bdmv::CallbackSystemSuspended:
-        Begin(Track::Playback, "Standby", callback);
+        Begin(Track::Playback, "Standby", record);
         break;
     case bdmv::CallbackSystemResumed:
         if (In<callbacks::SystemResumed>(callback).playing) {
-            Begin(Track::Playback, Playing, callback);
+            Begin(Track::Playback, Playing, record);
         } else {
             EndPlayback();
         }
@@ -145,53 +149,52 @@ void TraceOutput::Follow(const bdmv::Callback& callback)
         break;
 
     case bdmv::CallbackPlayMode:
-        Begin(Track::PlayMode,
-              NameOrNumber(In<callbacks::PlayMode>(callback).direction) + " " +
-                  NameOrNumber(In<callbacks::PlayMode>(callback).speed),
-              callback);
+        BeginNamed(Track::PlayMode,
+                   NameOrNumber(In<callbacks::PlayMode>(callback).direction) + " " +
+                       NameOrNumber(In<callbacks::PlayMode>(callback).speed),
+                   record);
         break;
     case bdmv::CallbackPlaylist:
-        BeginNumbered(Track::PlayList, In<callbacks::Playlist>(callback).playListId, callback);
+        BeginNumbered(Track::PlayList, In<callbacks::Playlist>(callback).playListId, record);
         break;
     case bdmv::CallbackPlayItem:
-        BeginNumbered(Track::PlayItem, In<callbacks::PlayItem>(callback).playItemId, callback);
+        BeginNumbered(Track::PlayItem, In<callbacks::PlayItem>(callback).playItemId, record);
         break;
     case bdmv::CallbackChapterNumber:
-        BeginCounted(Track::Chapter, In<callbacks::ChapterNumber>(callback).chapter, callback);
+        BeginCounted(Track::Chapter, In<callbacks::ChapterNumber>(callback).chapter, record);
         break;
 
     case bdmv::CallbackVideoInfo:
-        BeginCounted(Track::Video, In<callbacks::VideoInfo>(callback).number, callback);
+        BeginCounted(Track::Video, In<callbacks::VideoInfo>(callback).number, record);
         break;
     case bdmv::CallbackAudioInfo:
-        BeginCounted(Track::Audio, In<callbacks::AudioInfo>(callback).number, callback);
+        BeginCounted(Track::Audio, In<callbacks::AudioInfo>(callback).number, record);
         break;
     case bdmv::CallbackPresentationGraphicsInfo:
         BeginCounted(Track::Subtitles, In<callbacks::PresentationGraphicsInfo>(callback).number,
-                     callback);
+                     record);
         break;
     case bdmv::CallbackAngleInfo:
-        BeginCounted(Track::Angle, In<callbacks::AngleInfo>(callback).number, callback);
+        BeginCounted(Track::Angle, In<callbacks::AngleInfo>(callback).number, record);
         break;
     case bdmv::CallbackInteractiveGraphicsInfo:
         BeginCounted(Track::InteractiveGraphics,
-                     In<callbacks::InteractiveGraphicsInfo>(callback).number, callback);
+                     In<callbacks::InteractiveGraphicsInfo>(callback).number, record);
         break;
     case bdmv::CallbackSecondaryVideoInfo:
         BeginCounted(Track::SecondaryVideo, In<callbacks::SecondaryVideoInfo>(callback).number,
-                     callback);
+                     record);
         break;
     case bdmv::CallbackSecondaryAudioInfo:
         BeginCounted(Track::SecondaryAudio, In<callbacks::SecondaryAudioInfo>(callback).number,
-                     callback);
+                     record);
         break;
     case bdmv::CallbackPipPgTextStInfo:
-        BeginCounted(Track::PipSubtitles, In<callbacks::PipPgTextStInfo>(callback).number,
-                     callback);
+        BeginCounted(Track::PipSubtitles, In<callbacks::PipPgTextStInfo>(callback).number, record);
         break;
 
     case bdmv::CallbackInteractiveGraphicsVisible:
-        Begin(Track::Menu, "Visible", callback);
+        Begin(Track::Menu, "Visible", record);
         break;
     case bdmv::CallbackInteractiveGraphicsInvisible:
         End(Track::Menu);
@@ -202,33 +205,57 @@ void TraceOutput::Follow(const bdmv::Callback& callback)
     }
 }
 
-void TraceOutput::Write(const bdmv::Callback& callback)
+void TraceOutput::Write(const CallbackRecord& record)
 {
-    const auto track = static_cast<std::size_t>(Track::FirstInterface) +
-                       static_cast<std::size_t>(InterfaceOf(callback.Id()));
+    const bdmv::CallbackId id = record.callback.Id();
+    const auto track =
+        static_cast<std::size_t>(Track::FirstInterface) + static_cast<std::size_t>(InterfaceOf(id));
     AppendEvent(static_cast<Track>(track), "i",
-                {{"s", "t"}, {"name", NameOf(callback.Id())}, {"args", ArgumentsJson(callback)}});
+                {{"s", "t"}, {"name", NameOf(id)}, {"args", ArgumentsJson(record)}});
 }
 
-void TraceOutput::Begin(Track track, const std::string& name, const bdmv::Callback& callback)
+/** Ends all slices: any state may have changed in the gap. */
+void TraceOutput::Write(const GapRecord& gap)
+{
+    m_Time = gap.time;
+    EndAll();
+    ordered_json arguments = ordered_json::object();
+    if (gap.lost) {
+        arguments["lost"] = *gap.lost;
+    }
+    arguments["cause"] = gap.cause;
+    AppendEvent(Track::Gaps, "i", {{"s", "t"}, {"name", "gap"}, {"args", arguments}});
+}
+
+void TraceOutput::Begin(Track track, const std::string& name, const CallbackRecord& record)
 {
     End(track);
-    StateOf(track).slice = std::make_unique<Slice>(Slice{name, ArgumentsJson(callback)});
+    StateOf(track).slice = std::make_unique<Slice>(Slice{name, ArgumentsJson(record)});
     AppendSlice(track, "B", *StateOf(track).slice);
 }
 
-void TraceOutput::BeginNumbered(Track track, bd::UInt32 number, const bdmv::Callback& callback)
+/** Begins a slice that the arguments name, so only if all are known. */
+void TraceOutput::BeginNamed(Track track, const std::string& name, const CallbackRecord& record)
 {
-    Begin(track, StateOf(track).name + " " + std::to_string(number), callback);
+    if (record.absent.any()) {
+        End(track);
+    } else {
+        Begin(track, name, record);
+    }
+}
+
+void TraceOutput::BeginNumbered(Track track, bd::UInt32 number, const CallbackRecord& record)
+{
+    BeginNamed(track, StateOf(track).name + " " + std::to_string(number), record);
 }
 
 /** Streams, angles and chapters are numbered from 1; 0 means none. */
-void TraceOutput::BeginCounted(Track track, bd::UInt32 number, const bdmv::Callback& callback)
+void TraceOutput::BeginCounted(Track track, bd::UInt32 number, const CallbackRecord& record)
 {
     if (number == 0) {
         End(track);
     } else {
-        BeginNumbered(track, number, callback);
+        BeginNumbered(track, number, record);
     }
 }
 
@@ -247,6 +274,13 @@ void TraceOutput::EndPlayback()
     }
 }
 
+void TraceOutput::EndAll()
+{
+    for (std::size_t track = 0; track < m_Tracks.size(); ++track) {
+        End(static_cast<Track>(track));
+    }
+}
+
 /** Gives begin and end the same members, because some viewers match them by name and arguments. */
 void TraceOutput::AppendSlice(Track track, const char* phase, const Slice& slice)
 {
@@ -262,7 +296,7 @@ void TraceOutput::AppendEvent(Track track, const char* phase, const ordered_json
         StateOf(track).named = true;
     }
     ordered_json event = {
-        {"ph", phase}, {"ts", Microseconds(Now())}, {"pid", Process}, {"tid", thread}};
+        {"ph", phase}, {"ts", Microseconds(m_Time)}, {"pid", Process}, {"tid", thread}};
     event.update(members);
     Append(event);
 }

@@ -25,8 +25,8 @@ namespace deskplayer
  * The filter does not apply to slices: a state whose end is hidden would seem to last.
  *
  * A slice lasts from the callback that begins it until the next one on its track; those of playback
- * itself also end when playback ends. Open slices end when the output is destroyed, which completes
- * the trace. Memory does not grow with the length of the session.
+ * itself also end when playback ends, and all end at a gap. Open slices end when the output is
+ * destroyed, which completes the trace. Memory does not grow with the length of the session.
  */
 class TraceOutput : public Output
 {
@@ -34,7 +34,7 @@ public:
     /** @copydoc Output::Output */
     TraceOutput(std::ostream& stream, const VirtualClock& clock, const OutputFilter& filter);
 
-    /** Completes the trace at the current time of the clock. */
+    /** Completes the trace at the current time of the clock, or at that of the last record. */
     ~TraceOutput() override;
 
 private:
@@ -48,14 +48,17 @@ private:
         std::unique_ptr<Slice> slice; ///< the open one; null if there is none
     };
 
-    void Follow(const bdmv::Callback& callback) override;
-    void Write(const bdmv::Callback& callback) override;
+    void Follow(const CallbackRecord& record) override;
+    void Write(const CallbackRecord& record) override;
+    void Write(const GapRecord& gap) override;
 
-    void Begin(Track track, const std::string& name, const bdmv::Callback& callback);
-    void BeginNumbered(Track track, bd::UInt32 number, const bdmv::Callback& callback);
-    void BeginCounted(Track track, bd::UInt32 number, const bdmv::Callback& callback);
+    void Begin(Track track, const std::string& name, const CallbackRecord& record);
+    void BeginNamed(Track track, const std::string& name, const CallbackRecord& record);
+    void BeginNumbered(Track track, bd::UInt32 number, const CallbackRecord& record);
+    void BeginCounted(Track track, bd::UInt32 number, const CallbackRecord& record);
     void End(Track track);
     void EndPlayback();
+    void EndAll();
     void AppendSlice(Track track, const char* phase, const Slice& slice);
     void AppendEvent(Track track, const char* phase, const nlohmann::ordered_json& members);
     void Append(const nlohmann::ordered_json& event);
@@ -63,6 +66,7 @@ private:
 
     std::vector<TrackState> m_Tracks;           ///< indexed by Track
     std::string m_BeforeSuspension = "Playing"; ///< the slice of playback that Resumed() begins
+    Ticks m_Time{0};                            ///< of the events that are being written
     const char* m_Separator = "[\n";            ///< before the next event
 };
 

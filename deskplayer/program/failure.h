@@ -19,7 +19,7 @@ constexpr int ExitUsage = 2;
 constexpr int ExitDisc = 3;
 constexpr int ExitSession = 4;
 
-/** The command line or the session is invalid. */
+/** The command line, the session or a log is invalid. */
 class UsageError : public std::runtime_error
 {
 public:

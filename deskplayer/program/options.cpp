@@ -57,7 +57,8 @@ void AddOptions(CLI::App& app, Options& options)
             throw CLI::CallForVersion(CommandTable(), CLI::ExitCodes::Success);
         },
         "Print the commands of sessions and exit");
-    app.add_option("DISC", options.disc, "A BDMV folder or its parent")->required()->type_name("");
+    auto* const disc =
+        app.add_option("DISC", options.disc, "A BDMV folder or its parent")->type_name("");
 
     auto* const playList =
         app.add_option("--playlist", options.playList, "Play list to play; the longest by default")
@@ -108,10 +109,30 @@ void AddOptions(CLI::App& app, Options& options)
                        "Log lines to write to standard error, such as BdmvNavigator=Event for "
                        "those of events")
             ->type_name("TEXT");
+    auto* const fieldLog =
+        app.add_option("--field-log", options.fieldLogs,
+                       "Instead of a disc, log files to read back into callbacks, the oldest "
+                       "first; - is standard input")
+            ->check(NotEmpty("the name of a file"))
+            ->type_name("FILE ...");
+    auto* const logPrefix =
+        app.add_option("--log-prefix", options.logPrefix,
+                       "What precedes the text of a log line, such as "
+                       "\"[{time}] {component} {level}: {text}\"; known forms are recognised")
+            ->needs(fieldLog)
+            ->type_name("PATTERN");
     for (CLI::Option* const playing :
-         {playList, session, strict, realTime, remote, listen, only, log}) {
+         {playList, session, strict, realTime, remote, listen, only, log, fieldLog, logPrefix}) {
         playing->excludes(list)->excludes(describe)->excludes(check);
     }
+    for (CLI::Option* const ofDisc : {disc, playList, session, strict, realTime, remote, log}) {
+        ofDisc->excludes(fieldLog);
+    }
+    app.callback([disc, fieldLog] {
+        if (disc->count() == 0 && fieldLog->count() == 0) {
+            throw CLI::RequiredError("DISC");
+        }
+    });
 
     app.footer(
         "A session file has one command per line, which may begin with a time:\n"
@@ -121,10 +142,11 @@ void AddOptions(CLI::App& app, Options& options)
         "  bdmv-deskplayer --check disc\n"
         "  bdmv-deskplayer disc --session evening.session\n"
         "  bdmv-deskplayer disc --only PlayItem,ChapterNumber --format json\n"
-        "  bdmv-deskplayer disc --remote\n\n"
-        "Exit status: 0 success, 1 the output could not be written, 2 incorrect usage or a\n"
-        "session that cannot be read, 3 the disc cannot be read or has faults, 4 the session\n"
-        "failed: an expectation was not met or, with --strict, a command was refused.");
+        "  bdmv-deskplayer disc --remote\n"
+        "  bdmv-deskplayer --field-log player.1.log player.log --format json\n\n"
+        "Exit status: 0 success, 1 the output could not be written, 2 incorrect usage, or a\n"
+        "session or log that cannot be read, 3 the disc cannot be read or has faults, 4 the\n"
+        "session failed: an expectation was not met or, with --strict, a command was refused.");
 }
 
 } // namespace deskplayer

@@ -10,6 +10,7 @@
 #include <cstdint>
 #include <optional>
 #include <string>
+#include <vector>
 
 namespace deskplayer
 {
@@ -30,6 +31,8 @@ struct Options {
     std::string listen;
     std::string only;
     std::optional<std::string> log;
+    std::vector<std::string> fieldLogs;
+    std::optional<std::string> logPrefix;
 };
 
 /** Declares every option, its help and its conflicts. @param options receives the values */

@@ -51,11 +51,29 @@ void JsonLine::End()
 
 void JsonLine::Gap(bd::UInt64 ticks, bd::UInt64 lost, const char* cause)
 {
+    BeginGap(ticks);
+    AddText(R"("lost":)");
+    AddNumber(lost);
+    AddByte(',');
+    EndGap(cause);
+}
+
+void JsonLine::Gap(bd::UInt64 ticks, const char* cause)
+{
+    BeginGap(ticks);
+    EndGap(cause);
+}
+
+void JsonLine::BeginGap(bd::UInt64 ticks)
+{
     AddText(R"({"ticks":)");
     AddNumber(ticks);
-    AddText(R"(,"gap":{"lost":)");
-    AddNumber(lost);
-    AddText(R"(,"cause":")");
+    AddText(R"(,"gap":{)");
+}
+
+void JsonLine::EndGap(const char* cause)
+{
+    AddText(R"("cause":")");
     AddText(cause);
     AddText("\"}}\n");
     Flush();

@@ -86,7 +86,12 @@ public:
      */
     void Gap(bd::UInt64 ticks, bd::UInt64 lost, const char* cause);
 
+    /** The same without a number, which is unknown. */
+    void Gap(bd::UInt64 ticks, const char* cause);
+
 private:
+    void BeginGap(bd::UInt64 ticks);
+    void EndGap(const char* cause);
     void AddName(const char* name);
 
     void Add(bool value);

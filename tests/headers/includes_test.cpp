@@ -143,8 +143,11 @@ const std::map<std::string, std::vector<std::string>> Allowed = {
     {"deskplayer/check", {"deskplayer/disc", "deskplayer/text"}},
     {"deskplayer/listing", {"deskplayer/inc", "deskplayer/disc", "deskplayer/text"}},
     {"deskplayer/output",
-     Library +
-         std::vector<std::string>{"kits/clientkit", "deskplayer/navigator", "deskplayer/text"}},
+     Library + std::vector<std::string>{"kits/clientkit", "deskplayer/inc", "deskplayer/navigator",
+                                        "deskplayer/text"}},
+    {"deskplayer/fieldlog",
+     Library + std::vector<std::string>{"kits/clientkit", "deskplayer/inc", "deskplayer/output",
+                                        "deskplayer/text"}},
     {"deskplayer/facade",
      Library + std::vector<std::string>{"deskplayer/inc", "deskplayer/disc", "deskplayer/navigator",
                                         "deskplayer/output", "deskplayer/session",

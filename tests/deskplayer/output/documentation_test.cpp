@@ -90,7 +90,7 @@ TEST(Documentation, ListsEveryCallbackWithItsArguments)
         row.append(NameOf(callback.Id())).append("` | ");
         row.append(NameOf(InterfaceOf(callback.Id()))).append(" |");
         const char* separator = " ";
-        VisitShownArguments(callback, [&](const char* name, const auto& value) {
+        VisitShownArguments({Ticks(), callback, {}}, [&](const char* name, const auto& value) {
             row.append(separator).append("`").append(name).append("` ").append(KindOf(value));
             separator = ", ";
         });

@@ -185,6 +185,15 @@ TEST(JsonLine, WritesGapsAsObjectsOfAnotherKind)
                           "\n"});
 }
 
+TEST(JsonLine, WritesGapsWithoutANumberThatIsUnknown)
+{
+    std::vector<std::string> pieces;
+    bdmv::JsonLine(AppendPiece, &pieces).Gap(45000, "reason");
+
+    EXPECT_EQ(pieces, std::vector<std::string>{R"({"ticks":45000,"gap":{"cause":"reason"}})"
+                                               "\n"});
+}
+
 TEST(JsonLine, IsOnePieceUpTo512Bytes)
 {
     const std::vector<bd::UInt8> block(512);

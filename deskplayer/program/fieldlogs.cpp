@@ -1,0 +1,159 @@
+#include "program/fieldlogs.h"
+
+#include <fcntl.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include <array>
+#include <cerrno>
+#include <memory>
+#include <stdexcept>
+#include <system_error>
+#include <vector>
+
+#include "fieldlog/fieldlogoutput.h"
+#include "program/failure.h"
+#include "program/progress.h"
+#include "text/printable.h"
+
+namespace deskplayer
+{
+
+namespace
+{
+
+/** A log that is open. */
+class LogFile
+{
+public:
+    /** @param name of a file, or `-` for standard input */
+    explicit LogFile(const std::string& name)
+        : m_Name(name == "-" ? "standard input" : Printable(name)),
+          m_Descriptor(name == "-" ? STDIN_FILENO : open(name.c_str(), O_RDONLY | O_CLOEXEC))
+    {
+        if (m_Descriptor < 0 || fstat(m_Descriptor, &m_Status) != 0) {
+            Fail(errno);
+        }
+    }
+
+    ~LogFile()
+    {
+        if (m_Descriptor != STDIN_FILENO) {
+            close(m_Descriptor);
+        }
+    }
+
+    LogFile(const LogFile&) = delete;
+    LogFile& operator=(const LogFile&) = delete;
+
+    const std::string& Name() const { return m_Name; }
+
+    /** Whether it may still grow while it is read. */
+    bool IsLive() const { return !S_ISREG(m_Status.st_mode); }
+
+    bool IsFile(const struct stat& other) const
+    {
+        return S_ISREG(other.st_mode) && other.st_dev == m_Status.st_dev &&
+               other.st_ino == m_Status.st_ino;
+    }
+
+    /** What follows; empty at the end. */
+    std::string_view Read()
+    {
+        ssize_t size = 0;
+        do {
+            size = read(m_Descriptor, m_Buffer.data(), m_Buffer.size());
+        } while (size < 0 && errno == EINTR);
+        if (size < 0) {
+            Fail(errno);
+        }
+        return {m_Buffer.data(), static_cast<std::size_t>(size)};
+    }
+
+private:
+    [[noreturn]] void Fail(int error) const
+    {
+        throw UsageError(m_Name + ": cannot be read: " + std::generic_category().message(error));
+    }
+
+    const std::string m_Name;
+    const int m_Descriptor;
+    struct stat m_Status = {};
+    std::array<char, std::size_t{64} * 1024> m_Buffer;
+};
+
+using LogFiles = std::vector<std::unique_ptr<LogFile>>;
+
+/** Opens all, so that a misspelt name is noticed before anything is written. */
+LogFiles OpenLogs(const Options& options)
+{
+    LogFiles logs;
+    for (const std::string& name : options.fieldLogs) {
+        logs.push_back(std::make_unique<LogFile>(name));
+    }
+    struct stat output = {};
+    if (!options.output.empty() && stat(options.output.c_str(), &output) == 0) {
+        for (const auto& log : logs) {
+            if (log->IsFile(output)) {
+                throw UsageError("--output: " + log->Name() + " is being read");
+            }
+        }
+    }
+    return logs;
+}
+
+std::optional<PrefixPattern> PatternOf(const Options& options)
+{
+    if (!options.logPrefix) {
+        return std::nullopt;
+    }
+    try {
+        return PrefixPattern(*options.logPrefix);
+    } catch (const std::invalid_argument& error) {
+        throw UsageError(std::string("--log-prefix: ") + error.what());
+    }
+}
+
+std::string CountText(std::uint64_t count, const std::string& kind)
+{
+    return std::to_string(count) + " " + kind + (count == 1 ? " line" : " lines");
+}
+
+} // namespace
+
+void ConvertFieldLogs(const Options& options, const OutputSettings& settings, Target& target)
+{
+    std::optional<PrefixPattern> pattern = PatternOf(options);
+    const LogFiles logs = OpenLogs(options);
+    std::ostream& stream = target.Open();
+    Progress progress(options);
+    std::uint64_t bytes = 0;
+    FieldLogCounts counts;
+    {
+        FieldLogOutput output(settings, stream);
+        FieldLogReader reader(output, std::move(pattern));
+        for (const auto& log : logs) {
+            for (std::string_view part = log->Read(); !part.empty(); part = log->Read()) {
+                reader.Read(part);
+                bytes += part.size();
+                progress.Update([bytes] { return std::to_string(bytes >> 20) + " MiB read"; });
+                if (log->IsLive()) {
+                    stream.flush();
+                }
+            }
+            reader.EndFile();
+        }
+        reader.Finish();
+        counts = reader.Counts();
+    }
+    progress.Clear();
+    if (counts.foreignLines > 0 || counts.damagedLines > 0) {
+        PrintMessage("skipped " + CountText(counts.foreignLines, "foreign") + " and " +
+                     CountText(counts.damagedLines, "damaged"));
+    }
+    if (counts.callbacks == 0) {
+        PrintMessage("no line announces a callback");
+    }
+}
+
+} // namespace deskplayer

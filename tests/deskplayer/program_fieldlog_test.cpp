@@ -1,0 +1,172 @@
+#include <gtest/gtest.h>
+
+#include <filesystem>
+#include <map>
+#include <nlohmann/json.hpp>
+#include <regex>
+#include <string>
+#include <vector>
+
+#include "programtest.h"
+
+namespace
+{
+
+using nlohmann::ordered_json;
+
+/** The arguments that no line shows, by callback. */
+const std::map<std::string, std::vector<std::string>> Absent = {
+    {"AudioInfoChanged",
+     {"isPrimary", "format", "sampleRate", "bitsPerSample", "channels", "pid", "channelLayout"}},
+    {"ExecuteButton", {"commands"}},
+    {"MarkInfo", {"playListId"}},
+    {"SystemSuspended", {"data"}},
+    {"TriggerSet", {"type", "result"}},
+    {"ZoomModeSet", {"clip", "destination", "delay"}},
+};
+
+/** JSON lines of a session without the arguments that its log does not show. */
+std::string WithoutAbsent(const std::string& output)
+{
+    std::string result;
+    for (const std::string& line : LinesOf(output)) {
+        ordered_json object = ordered_json::parse(line);
+        const auto absent = Absent.find(object["callback"]);
+        if (absent != Absent.end()) {
+            for (const std::string& name : absent->second) {
+                EXPECT_EQ(object["arguments"].erase(name), 1U) << line;
+            }
+        }
+        result += object.dump() + "\n";
+    }
+    return result;
+}
+
+class FieldLogOfASession : public ScratchFolder, public testing::WithParamInterface<std::string>
+{
+};
+
+TEST_P(FieldLogOfASession, GivesTheSessionExceptWhatLinesDoNotShow)
+{
+    const ProgramResult session =
+        RunDeskPlayer({SampleDisc, "--session", GetParam(), "--format", "json", "--log",
+                       "BdmvNavigator=Event+hifreq|Warning"});
+    ASSERT_EQ(session.status, 0) << session.errors;
+    const ProgramResult back =
+        RunDeskPlayer({"--field-log", WriteFile("log", session.errors), "--format", "json"});
+
+    EXPECT_EQ(back.status, 0) << back.errors;
+    EXPECT_EQ(back.output, WithoutAbsent(session.output));
+}
+
+INSTANTIATE_TEST_SUITE_P(OfTheExamples, FieldLogOfASession, testing::Values(AllEvents, Evening));
+
+using FieldLog = ScratchFolder;
+
+const std::string Paused = "2024-05-31 20:15:00.123456 BdmvNavigator Event: Sending Paused\n";
+const std::string Stopped = "2024-05-31 20:15:01.123456 BdmvNavigator Event: Sending Stopped\n";
+
+TEST_F(FieldLog, OfSeveralFilesIsOneLog)
+{
+    const std::string first = WriteFile("player.1.log", Paused);
+    const std::string second = WriteFile("player.log", Stopped);
+    const ProgramResult together = RunDeskPlayer({"--field-log", first, second});
+
+    EXPECT_EQ(together.output, "00:00:00.000  (start) at 2024-05-31 20:15:00.123456\n"
+                               "00:00:00.000  Paused\n"
+                               "00:00:01.000  Stopped\n");
+    EXPECT_EQ(together.errors, "");
+    EXPECT_EQ(RunDeskPlayer({"--field-log", first, "--field-log", second}).output, together.output);
+}
+
+TEST_F(FieldLog, IsWrittenInEveryFormatAndFiltered)
+{
+    const std::string log = WriteFile("log", Paused + Stopped);
+
+    EXPECT_EQ(RunDeskPlayer({"--field-log", log, "--format", "json", "--only", "Paused"}).output,
+              "{\"ticks\":0,\"start\":{\"wallClock\":\"2024-05-31 20:15:00.123456\"}}\n"
+              "{\"ticks\":0,\"time\":\"00:00:00.000\",\"interface\":\"control\","
+              "\"callback\":\"Paused\",\"arguments\":{}}\n");
+    EXPECT_EQ(RunDeskPlayer({"--field-log", log, "--listen", "settings"}).output,
+              "00:00:00.000  (start) at 2024-05-31 20:15:00.123456\n");
+    const auto trace =
+        nlohmann::json::parse(RunDeskPlayer({"--field-log", log, "--format", "trace"}).output);
+    EXPECT_EQ(trace.back().at("name"), "Stopped");
+    EXPECT_EQ(trace.back().at("ts"), 1000000);
+}
+
+TEST_F(FieldLog, CountsTheLinesThatItSkips)
+{
+    const std::string damaged =
+        std::regex_replace(Paused, std::regex("Paused"), "AngleInfo - angleNr: 256");
+    const ProgramResult result =
+        RunDeskPlayer({"--field-log", WriteFile("log", "one\ntwo\n" + damaged)});
+
+    EXPECT_EQ(result.status, 0);
+    EXPECT_EQ(result.errors, "bdmv-deskplayer: skipped 2 foreign lines and 1 damaged line\n"
+                             "bdmv-deskplayer: no line announces a callback\n");
+}
+
+TEST_F(FieldLog, FromStandardInputShowsEachCallbackAsItComes)
+{
+    TerminalProgram program({"--field-log", "-", "--format", "json"});
+    program.Press(Paused);
+    EXPECT_TRUE(program.WaitFor("\"callback\":\"Paused\""));
+    program.Press(Stopped);
+    EXPECT_TRUE(program.WaitFor("\"callback\":\"Stopped\""));
+    program.Press("\004");
+    EXPECT_EQ(program.Finish().status, 0);
+}
+
+TEST_F(FieldLog, MayHaveLinesOfAnotherKind)
+{
+    const std::string log = WriteFile("log", "[   90.5] player: BdmvNavigator/5: Sending Paused\n");
+
+    EXPECT_EQ(RunDeskPlayer({"--field-log", log, "--log-prefix",
+                             "[{time}] {any} {component}/{level}: {text}"})
+                  .output,
+              "00:00:00.000  Paused\n");
+}
+
+TEST_F(FieldLog, OfAnySizeIsReadInConstantMemory)
+{
+    const std::string log = WriteFile("log", Paused + "x");
+    ResizeSparsely(log, std::uintmax_t{100} << 20);
+
+    const ProgramResult result =
+        RunDeskPlayerWithLimitedMemory({"--field-log", log, "--only", "Paused"}, 64 * 1024);
+
+    EXPECT_EQ(result.status, 0) << result.errors;
+    EXPECT_EQ(result.output, "00:00:00.000  (start) at 2024-05-31 20:15:00.123456\n"
+                             "00:00:00.000  Paused\n"
+                             "00:00:00.000  (gap)                       cause=truncated\n");
+}
+
+TEST_F(FieldLog, ThatCannotBeReadIsRefused)
+{
+    ExpectUsageError({"--field-log", (folder / "none").string()},
+                     (folder / "none").string() + ": cannot be read: No such file or directory");
+    ExpectUsageError({"--field-log", folder.string()},
+                     folder.string() + ": cannot be read: Is a directory");
+}
+
+TEST_F(FieldLog, IsNotOverwritten)
+{
+    const std::string log = WriteFile("log", Paused);
+
+    ExpectUsageError({"--field-log", log, "--output", log}, "--output: " + log + " is being read");
+    EXPECT_EQ(ReadContents(log), Paused);
+}
+
+TEST_F(FieldLog, ExcludesADiscAndNeedsAValidPattern)
+{
+    const std::string log = WriteFile("log", Paused);
+
+    ExpectUsageError({"--field-log", log, "--log-prefix", "{time}"},
+                     "--log-prefix: '{text}' must be at the end");
+    EXPECT_EQ(RunDeskPlayer({SampleDisc, "--field-log", log}).status, 2);
+    EXPECT_EQ(RunDeskPlayer({"--list", "--field-log", log}).status, 2);
+    EXPECT_EQ(RunDeskPlayer({SampleDisc, "--log-prefix", "{time} {text}"}).status, 2);
+}
+
+} // namespace
