@@ -32,6 +32,7 @@
 #include "program/options.h"
 #include "program/progress.h"
 #include "program/remotescreen.h"
+#include "program/replay.h"
 #include "program/target.h"
 #include "session/remote.h"
 #include "text/printable.h"
@@ -55,21 +56,22 @@ OutputOptions OutputOptionsOf(const Options& options)
 }
 
 /** @throw UsageError the options name no format, interface or callback, or exclude each other */
-OutputFormat CheckOutput(const Options& options)
+OutputSettings CheckOutput(const Options& options)
 {
-    OutputFormat format = OutputFormat::Text;
+    OutputSettings settings;
     try {
-        format = ReadOutputOptions(OutputOptionsOf(options)).format;
+        settings = ReadOutputOptions(OutputOptionsOf(options));
     } catch (const std::invalid_argument& error) {
         throw UsageError(error.what());
     }
-    if ((options.list || options.describe || options.check) && format == OutputFormat::Trace) {
+    if ((options.list || options.describe || options.check) &&
+        settings.format == OutputFormat::Trace) {
         throw UsageError(std::string(options.list       ? "--list"
                                      : options.describe ? "--describe"
                                                         : "--check") +
                          " excludes --format trace");
     }
-    return format;
+    return settings;
 }
 
 /** @return the exit status */
@@ -127,12 +129,14 @@ int Check(const Options& options, OutputFormat format, Target& target)
 /** @return the exit status */
 int Run(const Options& options)
 {
-    const OutputFormat format = CheckOutput(options);
-    const bool json = format == OutputFormat::Json;
+    const OutputSettings settings = CheckOutput(options);
+    const bool json = settings.format == OutputFormat::Json;
     Target target(options.output);
     int status = ExitOk;
     if (options.check) {
-        status = Check(options, format, target);
+        status = Check(options, settings.format, target);
+    } else if (!options.replay.empty()) {
+        ReplayRecording(options, settings, target);
     } else if (options.list) {
         const Disc disc(options.disc, BackupCopies::Use, PrintMessage);
         const std::vector<std::uint32_t> numbers = disc.PlayListNumbers();
@@ -204,6 +208,9 @@ int main(int argc, char** argv)
         deskplayer::PrintMessage(error.what());
         return deskplayer::ExitDisc;
     } catch (const deskplayer::SessionError& error) {
+        deskplayer::PrintMessage(error.what());
+        return deskplayer::ExitUsage;
+    } catch (const deskplayer::RecordingError& error) {
         deskplayer::PrintMessage(error.what());
         return deskplayer::ExitUsage;
     } catch (const deskplayer::UsageError& error) {

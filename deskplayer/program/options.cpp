@@ -57,7 +57,8 @@ void AddOptions(CLI::App& app, Options& options)
             throw CLI::CallForVersion(CommandTable(), CLI::ExitCodes::Success);
         },
         "Print the commands of sessions and exit");
-    app.add_option("DISC", options.disc, "A BDMV folder or its parent")->required()->type_name("");
+    auto* const disc =
+        app.add_option("DISC", options.disc, "A BDMV folder or its parent")->type_name("");
 
     auto* const playList =
         app.add_option("--playlist", options.playList, "Play list to play; the longest by default")
@@ -87,6 +88,14 @@ void AddOptions(CLI::App& app, Options& options)
     auto* const remote =
         app.add_flag("--remote", options.remote, "Play in real time, controlled by single keys")
             ->excludes(session);
+    auto* const replay =
+        app.add_option("--replay", options.replay,
+                       "Recording to replay instead of a disc: JSON lines, - for standard input")
+            ->check(NotEmpty("the name of a file"))
+            ->type_name("FILE");
+    app.add_flag("--fill", options.fill,
+                 "Replace arguments that the recording lacks by neutral values")
+        ->needs(replay);
     app.add_option("--format", options.format,
                    "Output format: text, json (one object per line) or trace (for trace viewers)")
         ->type_name("FORMAT");
@@ -112,6 +121,15 @@ void AddOptions(CLI::App& app, Options& options)
          {playList, session, strict, realTime, remote, listen, only, log}) {
         playing->excludes(list)->excludes(describe)->excludes(check);
     }
+    for (CLI::Option* const ofDisc :
+         {disc, playList, list, describe, check, session, strict, remote, log}) {
+        replay->excludes(ofDisc);
+    }
+    app.final_callback([disc, replay] {
+        if (disc->count() == 0 && replay->count() == 0) {
+            throw CLI::RequiredError("DISC");
+        }
+    });
 
     app.footer(
         "A session file has one command per line, which may begin with a time:\n"
@@ -121,9 +139,11 @@ void AddOptions(CLI::App& app, Options& options)
         "  bdmv-deskplayer --check disc\n"
         "  bdmv-deskplayer disc --session evening.session\n"
         "  bdmv-deskplayer disc --only PlayItem,ChapterNumber --format json\n"
-        "  bdmv-deskplayer disc --remote\n\n"
-        "Exit status: 0 success, 1 the output could not be written, 2 incorrect usage or a\n"
-        "session that cannot be read, 3 the disc cannot be read or has faults, 4 the session\n"
+        "  bdmv-deskplayer disc --remote\n"
+        "  bdmv-deskplayer --replay evening.jsonl --format trace\n\n"
+        "Exit status: 0 success, 1 the output could not be written, 2 incorrect usage, or a\n"
+        "session or recording that cannot be read, 3 the disc cannot be read or has faults, 4 the "
+        "session\n"
         "failed: an expectation was not met or, with --strict, a command was refused.");
 }
 
