@@ -82,7 +82,9 @@ void ArgumentReader::Read(const Element& element, bdmv::UOMaskTable& value) cons
 
 void ArgumentReader::Read(const Element& element, bdmv::IProgramData::RefPtr& value) const
 {
-    value = UnknownProgram(element.Number(std::numeric_limits<bd::UInt16>::max()));
+    bd::UInt16 commands = 0;
+    Read(element, commands);
+    value = UnknownProgram(commands);
 }
 
 void ArgumentReader::ReadBlock(const Element& element)

@@ -1,5 +1,9 @@
 #include "recording/recordingreader.h"
 
+#include <array>
+#include <cstddef>
+#include <optional>
+
 #include "recording/linejson.h"
 #include "recording/recordline.h"
 #include "text/printable.h"
@@ -21,35 +25,50 @@ struct PassOn {
 } // namespace
 
 RecordingReader::RecordingReader(std::istream& stream, const std::string& name)
-    : m_Name(Printable(name)), m_rStream(stream), m_Line(LongestRecordLine + 1)
+    : m_Name(Printable(name)), m_rStream(stream)
 {
 }
 
 bool RecordingReader::Next(RecordListener& listener)
 {
-    m_rStream.getline(m_Line.data(), static_cast<std::streamsize>(m_Line.size()));
-    if (m_rStream.bad()) {
-        throw RecordingError(m_Name + ": cannot read recording");
-    }
-    const auto extracted = static_cast<std::size_t>(m_rStream.gcount());
-    if (extracted == 0) {
+    if (!ReadLine()) {
         return false;
     }
-    ++m_Number;
-    if (m_rStream.fail()) {
-        throw RecordingError(Place() + ": line too long; expected at most " +
-                             std::to_string(LongestRecordLine) + " bytes");
-    }
-    const std::size_t size = m_rStream.eof() ? extracted : extracted - 1;
     std::optional<Record> record;
     try {
-        record = ReadRecordLine({m_Line.data(), size}, m_Block);
+        record = ReadRecordLine(m_Line, m_Block);
     } catch (const LineError& error) {
         throw RecordingError(Place() + ":" + std::to_string(error.column) + ": " +
                              Printable(error.message));
     }
     std::visit(PassOn{listener}, *record);
     return true;
+}
+
+/** @return false at the end of the recording */
+bool RecordingReader::ReadLine()
+{
+    m_Line.clear();
+    ++m_Number;
+    std::array<char, 4096> part{};
+    while (m_Line.size() <= LongestRecordLine) {
+        m_rStream.getline(part.data(), part.size());
+        const auto extracted = static_cast<std::size_t>(m_rStream.gcount());
+        if (m_rStream.bad() || (extracted == 0 && !m_rStream.eof())) {
+            throw RecordingError(m_Name + ": cannot read recording");
+        }
+        const bool reachedLineEnd = m_rStream.good();
+        m_Line.append(part.data(), reachedLineEnd ? extracted - 1 : extracted);
+        if (reachedLineEnd || m_rStream.eof()) {
+            break;
+        }
+        m_rStream.clear(); // the line is longer than the part
+    }
+    if (m_Line.size() > LongestRecordLine) {
+        throw RecordingError(Place() + ": line too long; expected at most " +
+                             std::to_string(LongestRecordLine) + " bytes");
+    }
+    return m_rStream.good() || !m_Line.empty();
 }
 
 std::string RecordingReader::Place() const

@@ -49,9 +49,11 @@ public:
     std::string Place() const;
 
 private:
+    bool ReadLine();
+
     const std::string m_Name; ///< printable
     std::istream& m_rStream;
-    std::vector<char> m_Line;
+    std::string m_Line;
     std::uint64_t m_Number = 0; ///< of the last line
     std::vector<bd::UInt8> m_Block;
 };

@@ -163,7 +163,7 @@ TEST(MalformedRecording, IsNestedTooDeeply)
 
 TEST(MalformedRecording, HasALineThatIsTooLong)
 {
-    EXPECT_EQ(MessageOf(std::string(LongestRecordLine + 1, ' ')),
+    EXPECT_EQ(MessageOf(std::string(LongestRecordLine + 1, ' ') + "\n"),
               "test:1: line too long; expected at most 1048576 bytes");
 }
 
@@ -178,16 +178,18 @@ TEST(MalformedRecording, ShowsOnlyTheBeginningOfLongValues)
 
 TEST(MalformedRecording, CannotBeReadAtAll)
 {
-    std::istringstream stream;
-    stream.setstate(std::ios::badbit);
-    RecordingReader reader(stream, "test");
-    KeptRecords records;
+    for (const std::ios::iostate state : {std::ios::badbit, std::ios::failbit}) {
+        std::istringstream stream;
+        stream.setstate(state);
+        RecordingReader reader(stream, "test");
+        KeptRecords records;
 
-    try {
-        reader.Next(records);
-        FAIL();
-    } catch (const RecordingError& error) {
-        EXPECT_STREQ(error.what(), "test: cannot read recording");
+        try {
+            reader.Next(records);
+            ADD_FAILURE();
+        } catch (const RecordingError& error) {
+            EXPECT_STREQ(error.what(), "test: cannot read recording");
+        }
     }
 }
 

@@ -204,6 +204,17 @@ TEST(RecordingReader, NeedsNoEndOfTheLastLine)
               2U);
 }
 
+TEST(RecordingReader, ReadsLinesOfAnyLength)
+{
+    const std::string line = R"({"ticks":1,"callback":"Paused","arguments":{}})";
+    std::string text;
+    for (std::size_t size = 4080; size < 4110; ++size) {
+        text += line + std::string(size - line.size(), ' ') + "\n";
+    }
+
+    EXPECT_EQ(RecordsOf(text).callbacks.size(), 30U);
+}
+
 TEST(RecordingReader, ReadsTheLongestLine)
 {
     std::string line = R"({"ticks":1,"callback":"Paused","arguments":{}})";
