@@ -124,6 +124,15 @@ TEST_F(DeskPlayerReplay, RefusesMalformedRecordingsAfterTheLinesBefore)
               "/recording:3:1: missing member 'callback'\n");
 }
 
+TEST_F(DeskPlayerReplay, CompletesTheTraceOfAMalformedRecording)
+{
+    const ProgramResult result = RunDeskPlayer(
+        {"--replay", WriteFile("recording", TwoCallbacks + "x"), "--format", "trace"});
+
+    EXPECT_EQ(result.status, 2);
+    EXPECT_EQ(LastLine(result.output), "]");
+}
+
 TEST_F(DeskPlayerReplay, RefusesWhatItCannotRead)
 {
     const std::string missing = (folder / "missing").string();

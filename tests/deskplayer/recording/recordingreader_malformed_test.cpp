@@ -70,6 +70,9 @@ TEST(MalformedRecording, HasAWrongType)
               "test:1:44: unexpected array; expected an object");
     EXPECT_EQ(MessageOfArguments("SystemResumed", R"({"playing":0})"),
               "test:1:35: unexpected 0; expected true or false");
+    EXPECT_EQ(MessageOfArguments("ZoomModeSet",
+                                 R"({"clip":{"x":1,"y":2,"width":3,"height":4},"delay":true})"),
+              "test:1:75: unexpected true; expected an integer from 0 to 4294967295");
     EXPECT_EQ(MessageOfArguments("UOMask", R"({"forbidden":"Stop"})"),
               "test:1:37: unexpected \"Stop\"; expected an array of strings");
     EXPECT_EQ(MessageOfArguments("UOMask", R"({"forbidden":["Stop",1]})"),
