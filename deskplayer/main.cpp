@@ -33,6 +33,7 @@
 #include "program/options.h"
 #include "program/progress.h"
 #include "program/remotescreen.h"
+#include "program/replay.h"
 #include "program/target.h"
 #include "session/remote.h"
 #include "text/printable.h"
@@ -136,6 +137,8 @@ int Run(const Options& options)
     int status = ExitOk;
     if (!options.fieldLogs.empty()) {
         ConvertFieldLogs(options, settings, target);
+    } else if (!options.replay.empty()) {
+        ReplayRecording(options, settings, target);
     } else if (options.check) {
         status = Check(options, format, target);
     } else if (options.list) {
@@ -209,6 +212,9 @@ int main(int argc, char** argv)
         deskplayer::PrintMessage(error.what());
         return deskplayer::ExitDisc;
     } catch (const deskplayer::SessionError& error) {
+        deskplayer::PrintMessage(error.what());
+        return deskplayer::ExitUsage;
+    } catch (const deskplayer::RecordingError& error) {
         deskplayer::PrintMessage(error.what());
         return deskplayer::ExitUsage;
     } catch (const deskplayer::UsageError& error) {

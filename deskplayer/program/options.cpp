@@ -88,6 +88,14 @@ void AddOptions(CLI::App& app, Options& options)
     auto* const remote =
         app.add_flag("--remote", options.remote, "Play in real time, controlled by single keys")
             ->excludes(session);
+    auto* const replay =
+        app.add_option("--replay", options.replay,
+                       "Recording to replay instead of a disc: JSON lines, - for standard input")
+            ->check(NotEmpty("the name of a file"))
+            ->type_name("FILE");
+    app.add_flag("--fill", options.fill,
+                 "Replace arguments that the recording lacks by neutral values")
+        ->needs(replay);
     app.add_option("--format", options.format,
                    "Output format: text, json (one object per line) or trace (for trace viewers)")
         ->type_name("FORMAT");
@@ -125,11 +133,14 @@ void AddOptions(CLI::App& app, Options& options)
          {playList, session, strict, realTime, remote, listen, only, log, fieldLog, logPrefix}) {
         playing->excludes(list)->excludes(describe)->excludes(check);
     }
-    for (CLI::Option* const ofDisc : {disc, playList, session, strict, realTime, remote, log}) {
-        ofDisc->excludes(fieldLog);
+    for (CLI::Option* const ofDisc :
+         {disc, playList, list, describe, check, session, strict, remote, log}) {
+        ofDisc->excludes(fieldLog)->excludes(replay);
     }
-    app.callback([disc, fieldLog] {
-        if (disc->count() == 0 && fieldLog->count() == 0) {
+    realTime->excludes(fieldLog);
+    fieldLog->excludes(replay);
+    app.final_callback([disc, fieldLog, replay] {
+        if (disc->count() == 0 && fieldLog->count() == 0 && replay->count() == 0) {
             throw CLI::RequiredError("DISC");
         }
     });
@@ -143,10 +154,12 @@ void AddOptions(CLI::App& app, Options& options)
         "  bdmv-deskplayer disc --session evening.session\n"
         "  bdmv-deskplayer disc --only PlayItem,ChapterNumber --format json\n"
         "  bdmv-deskplayer disc --remote\n"
-        "  bdmv-deskplayer --field-log player.1.log player.log --format json\n\n"
+        "  bdmv-deskplayer --field-log player.1.log player.log --format json\n"
+        "  bdmv-deskplayer --replay evening.jsonl --format trace\n\n"
         "Exit status: 0 success, 1 the output could not be written, 2 incorrect usage, or a\n"
-        "session or log that cannot be read, 3 the disc cannot be read or has faults, 4 the\n"
-        "session failed: an expectation was not met or, with --strict, a command was refused.");
+        "session, recording or log that cannot be read, 3 the disc cannot be read or has faults,\n"
+        "4 the session failed: an expectation was not met or, with --strict, a command was\n"
+        "refused.");
 }
 
 } // namespace deskplayer

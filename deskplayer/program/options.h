@@ -26,6 +26,8 @@ struct Options {
     bool strict = false;
     bool realTime = false;
     bool remote = false;
+    std::string replay;
+    bool fill = false;
     std::string format = "text";
     std::string output;
     std::string listen;

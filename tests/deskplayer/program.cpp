@@ -55,7 +55,7 @@ ProgramResult ResultOf(int status, std::string output, std::string errors)
 
 /** @param preparation a shell command to run first */
 ProgramResult Run(const std::string& preparation, const std::vector<std::string>& arguments,
-                  const std::string& output)
+                  const std::string& output, const std::string& input = {})
 {
     const std::filesystem::path folder =
         std::filesystem::temp_directory_path() / ("deskplayer-" + std::to_string(getpid()));
@@ -65,7 +65,8 @@ ProgramResult Run(const std::string& preparation, const std::vector<std::string>
     for (const std::string& argument : arguments) {
         command += ' ' + Quoted(argument);
     }
-    command += " <&- >" + Quoted(output.empty() ? (folder / "output").string() : output) + " 2>" +
+    command += input.empty() ? " <&-" : " <" + Quoted(input);
+    command += " >" + Quoted(output.empty() ? (folder / "output").string() : output) + " 2>" +
                Quoted(folder / "errors");
     const int status = std::system(command.c_str());
 
@@ -80,6 +81,12 @@ ProgramResult Run(const std::string& preparation, const std::vector<std::string>
 ProgramResult RunDeskPlayer(const std::vector<std::string>& arguments, const std::string& output)
 {
     return Run("", arguments, output);
+}
+
+ProgramResult RunDeskPlayerWithInput(const std::vector<std::string>& arguments,
+                                     const std::string& input)
+{
+    return Run("", arguments, {}, input);
 }
 
 ProgramResult RunDeskPlayerOnTerminal(const std::vector<std::string>& arguments)

@@ -26,6 +26,10 @@ struct ProgramResult {
 ProgramResult RunDeskPlayer(const std::vector<std::string>& arguments,
                             const std::string& output = {});
 
+/** The same with a file for its standard input. */
+ProgramResult RunDeskPlayerWithInput(const std::vector<std::string>& arguments,
+                                     const std::string& input);
+
 /** The same with a terminal for input and all output; the result contains the screen's text. */
 ProgramResult RunDeskPlayerOnTerminal(const std::vector<std::string>& arguments);
 

@@ -32,6 +32,17 @@ public:
     using std::runtime_error::runtime_error;
 };
 
+/**
+ * A recording cannot be read. what() is one line without control characters: the recording, the
+ * line and, if its text is malformed, the column in bytes, what was found there, and what was
+ * expected.
+ */
+class RecordingError : public std::runtime_error
+{
+public:
+    using std::runtime_error::runtime_error;
+};
+
 /** Receives a message of one line. */
 using MessageHandler = std::function<void(const std::string& message)>;
 

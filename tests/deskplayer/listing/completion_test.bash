@@ -96,7 +96,7 @@ OffersNoPlayListsWithoutADisc() {
 
 ExecutesNothingFromTheCommandLine() {
     for word in '$(touch run)' '`touch run`' '"$(touch run)"' 'a[$(touch run)]'; do
-        for option in --playlist --describe --session --format --output --listen --only --log --l; do
+        for option in --playlist --describe --session --replay --format --output --listen --only --log --l; do
             complete_words "$word" $option ''
             complete_words $option "$word"
             complete_words $option "PlayItem,$word"
@@ -142,6 +142,11 @@ OffersSessionsAndFolders() {
     expect 'a disc disc documents evening.session' --session ''
     expect 'evening.session' disc --session e
     [[ ${readline_options[*]} == filenames ]]
+}
+
+OffersAnyFileForARecording() {
+    expect 'evening.json evening.session' --replay e
+    expect '0 12345 8 80 800' --replay evening.json disc --describe ''
 }
 
 OffersAnyFileForTheOutput() {

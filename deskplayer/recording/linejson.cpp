@@ -1,0 +1,114 @@
+#include "recording/linejson.h"
+
+#include <algorithm>
+#include <iterator>
+
+#include "text/printable.h"
+
+namespace deskplayer
+{
+
+namespace
+{
+
+using nlohmann::json;
+
+/** Counts the characters that the parser has consumed. */
+class CountingIterator
+{
+public:
+    using iterator_category = std::input_iterator_tag;
+    using value_type = char;
+    using difference_type = std::ptrdiff_t;
+    using pointer = const char*;
+    using reference = const char&;
+
+    CountingIterator(const char* position, std::size_t& consumed)
+        : m_pPosition(position), m_pConsumed(&consumed)
+    {
+    }
+
+    reference operator*() const { return *m_pPosition; }
+
+    CountingIterator& operator++()
+    {
+        ++m_pPosition;
+        ++*m_pConsumed;
+        return *this;
+    }
+
+    bool operator==(const CountingIterator& other) const
+    {
+        return m_pPosition == other.m_pPosition;
+    }
+    bool operator!=(const CountingIterator& other) const { return !(*this == other); }
+
+private:
+    const char* m_pPosition;
+    std::size_t* m_pConsumed;
+};
+
+/** The library's message without its prefixes: "unexpected end of input; expected '}'". */
+std::string MessageOf(const json::exception& error)
+{
+    constexpr std::size_t longest = 160;
+    const std::string_view message = error.what();
+    const std::size_t prefix = message.find(" - ");
+    const std::size_t start =
+        prefix == std::string_view::npos ? message.find("] ") + 2 : prefix + 3;
+    return "not JSON: " + std::string(FirstCharacters(message.substr(start), longest));
+}
+
+/** @param onEvent called as a json::parser_callback_t; returns nothing */
+template <typename Callback>
+json Parse(std::string_view line, std::size_t& consumed, const Callback& onEvent)
+{
+    const CountingIterator first(line.data(), consumed);
+    const CountingIterator last(line.data() + line.size(), consumed);
+    return json::parse(first, last, [&onEvent](int depth, json::parse_event_t event, json& value) {
+        onEvent(depth, event, value);
+        return true;
+    });
+}
+
+} // namespace
+
+json ParseLine(std::string_view line)
+{
+    std::size_t consumed = 0;
+    try {
+        return Parse(line, consumed, [&](int depth, json::parse_event_t /*event*/, json&) {
+            if (depth > DeepestNesting) {
+                throw LineError{consumed, "nested too deeply; expected at most " +
+                                              std::to_string(DeepestNesting) + " levels"};
+            }
+        });
+    } catch (const json::exception& error) {
+        throw LineError{std::max<std::size_t>(consumed, 1), MessageOf(error)};
+    }
+}
+
+std::size_t ColumnOf(std::string_view line, const std::vector<std::string>& path)
+{
+    std::size_t consumed = 0;
+    std::size_t tokenEnd = 0;
+    std::size_t column = 1;
+    std::vector<std::string> names;
+    Parse(line, consumed, [&](int depth, json::parse_event_t event, const json& value) {
+        // A number has ended one character before the parser knows it: a character to skip.
+        const std::size_t begin = line.find_first_not_of(" \t\r,:}]", tokenEnd);
+        tokenEnd = consumed;
+        const auto level = static_cast<std::size_t>(depth);
+        if (event == json::parse_event_t::key) {
+            names.resize(level);
+            names.back() = value.get<std::string>();
+        } else if (event != json::parse_event_t::object_end &&
+                   event != json::parse_event_t::array_end && level == path.size() &&
+                   names.size() >= level && std::equal(path.begin(), path.end(), names.begin())) {
+            column = begin + 1;
+        }
+    });
+    return column;
+}
+
+} // namespace deskplayer

@@ -1,0 +1,124 @@
+#include "recording/recordline.h"
+
+#include <algorithm>
+#include <limits>
+#include <string>
+
+#include "recording/argumentreader.h"
+#include "recording/element.h"
+#include "recording/linejson.h"
+#include "text/timetext.h"
+
+namespace deskplayer
+{
+
+namespace
+{
+
+namespace callbacks = bdmv::callbacks;
+
+bdmv::CallbackId ReadCallbackId(const Element& element)
+{
+    for (int id = 0; id < bdmv::Callback__sizeof; ++id) {
+        if (element.Text() == NameOf(static_cast<bdmv::CallbackId>(id))) {
+            return static_cast<bdmv::CallbackId>(id);
+        }
+    }
+    element.Refuse("the name of a callback");
+}
+
+/** Reads a member that repeats another one, and may be missing. */
+void ExpectIfPresent(const Element& line, const char* name, const std::string& expected)
+{
+    if (line.Has(name) && line.Member(name).Text() != expected) {
+        line.Member(name).Refuse('"' + expected + '"');
+    }
+}
+
+template <typename Arguments> bdmv::Callback ReadAs(ArgumentReader& reader)
+{
+    Arguments arguments{};
+    Arguments::VisitArguments(arguments, reader);
+    return arguments;
+}
+
+bdmv::Callback ReadCallback(bdmv::CallbackId id, ArgumentReader& reader)
+{
+    static bdmv::Callback (*const functions[])(ArgumentReader&) = {
+#define DESKPLAYER_READ(interface, name) &ReadAs<callbacks::name>,
+        BDMV_CALLBACKS(DESKPLAYER_READ)
+#undef DESKPLAYER_READ
+    };
+    return functions[id](reader);
+}
+
+/** Makes the callback refer to the block, which may be shorter than the callback's size. */
+void AttachBlock(CallbackRecord& record, const std::vector<bd::UInt8>& block,
+                 const Element& arguments)
+{
+    const auto* const suspended = record.callback.As<callbacks::SystemSuspended>();
+    if (suspended == nullptr) {
+        return;
+    }
+    const auto known = static_cast<bd::UInt32>(block.size());
+    const bd::UInt32 size = arguments.Has("size") ? suspended->size : known;
+    if (known > size) {
+        arguments.Member("size").Refuse("at least " + std::to_string(known) +
+                                        ", the bytes in 'data'");
+    }
+    if (known < size) {
+        record.knownBytes = known;
+    }
+    record.callback = callbacks::SystemSuspended{known == 0 ? nullptr : block.data(), size};
+}
+
+CallbackRecord ReadCallbackRecord(const Element& line, Ticks time, std::vector<bd::UInt8>& block)
+{
+    const bdmv::CallbackId id = ReadCallbackId(line.Member("callback"));
+    ExpectIfPresent(line, "time", TimeText(time));
+    ExpectIfPresent(line, "interface", NameOf(InterfaceOf(id)));
+
+    const Element arguments = line.Member("arguments");
+    ArgumentReader reader(arguments);
+    const bdmv::Callback callback = ReadCallback(id, reader);
+    reader.ExpectNoOthers(NameOf(id));
+    block = reader.TakeBlock();
+    CallbackRecord record = {time, callback, reader.Absent()};
+    AttachBlock(record, block, arguments);
+    return record;
+}
+
+/** The cause is restricted to what every output can write as it is. */
+GapRecord ReadGap(const Element& element, Ticks time)
+{
+    GapRecord gap = {time, element.Member("cause").Text(), std::nullopt};
+    const bool writable = std::all_of(gap.cause.begin(), gap.cause.end(), [](char character) {
+        return character >= ' ' && character <= '~' && character != '"' && character != '\\';
+    });
+    if (!writable) {
+        element.Member("cause").Refuse("printable ASCII without quotes and backslashes");
+    }
+    if (element.Has("lost")) {
+        gap.lost = element.Member("lost").Number(std::numeric_limits<std::uint64_t>::max());
+    }
+    return gap;
+}
+
+} // namespace
+
+Record ReadRecordLine(std::string_view line, std::vector<bd::UInt8>& block)
+{
+    const nlohmann::json json = ParseLine(line);
+    try {
+        const Element root(json);
+        const Ticks time(root.Member("ticks").Number(std::numeric_limits<std::uint64_t>::max()));
+        if (root.Has("gap")) {
+            return ReadGap(root.Member("gap"), time);
+        }
+        return ReadCallbackRecord(root, time, block);
+    } catch (const Unreadable& error) {
+        throw LineError{ColumnOf(line, error.path), error.message};
+    }
+}
+
+} // namespace deskplayer
