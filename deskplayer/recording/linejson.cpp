@@ -48,6 +48,12 @@ private:
     std::size_t* m_pConsumed;
 };
 
+/**
+ * More names, values, begins and ends than any line has that is written. The library's time grows
+ * with the square of the number of objects in an array.
+ */
+constexpr int MostEvents = 2000;
+
 /** The library's message without its prefixes: "unexpected end of input; expected '}'". */
 std::string MessageOf(const json::exception& error)
 {
@@ -76,11 +82,15 @@ json Parse(std::string_view line, std::size_t& consumed, const Callback& onEvent
 json ParseLine(std::string_view line)
 {
     std::size_t consumed = 0;
+    int events = 0;
     try {
         return Parse(line, consumed, [&](int depth, json::parse_event_t /*event*/, json&) {
             if (depth > DeepestNesting) {
                 throw LineError{consumed, "nested too deeply; expected at most " +
                                               std::to_string(DeepestNesting) + " levels"};
+            }
+            if (++events > MostEvents) {
+                throw LineError{consumed, "too many values; expected at most a few hundred"};
             }
         });
     } catch (const json::exception& error) {

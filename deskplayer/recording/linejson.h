@@ -31,7 +31,7 @@ struct LineError {
 /** How deep objects and arrays may be nested: more than in any line that is written. */
 constexpr int DeepestNesting = 8;
 
-/** @throw LineError the line is not JSON, or nested too deeply */
+/** @throw LineError the line is not JSON, nested too deeply, or has thousands of values */
 nlohmann::json ParseLine(std::string_view line);
 
 /**

@@ -164,6 +164,17 @@ TEST(MalformedRecording, IsNestedTooDeeply)
               "test:1:10: nested too deeply; expected at most 8 levels");
 }
 
+TEST(MalformedRecording, HasTooManyValues)
+{
+    std::string values = "0";
+    for (int i = 0; i < 100000; ++i) {
+        values += ",{}";
+    }
+
+    EXPECT_EQ(MessageOf("[" + values + "]"),
+              "test:1:3001: too many values; expected at most a few hundred");
+}
+
 TEST(MalformedRecording, HasALineThatIsTooLong)
 {
     EXPECT_EQ(MessageOf(std::string(LongestRecordLine + 1, ' ') + "\n"),
