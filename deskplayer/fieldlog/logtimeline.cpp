@@ -38,7 +38,7 @@ TimeStep LogTimeLine::Advance(const LineTime& time)
         const std::int64_t passed = next.microseconds - m_Last->microseconds;
         const bool isWall =
             time.clock == LineClock::Wall || time.clock == LineClock::WallWithoutYear;
-        if (m_Last->clock != time.clock) {
+        if (m_Last->clock != time.clock || (isWall && passed > LongestSilence)) {
             step = TimeStep::ClockJump;
             BeginAt(next.microseconds);
         } else if (time.clock == LineClock::WallWithoutYear && IsNewYear(passed)) {
@@ -48,9 +48,6 @@ TimeStep LogTimeLine::Advance(const LineTime& time)
             BeginAt(isWall ? next.microseconds : 0);
         } else if (passed < 0) {
             next = *m_Last;
-        } else if (isWall && passed > LongestSilence) {
-            step = TimeStep::ClockJump;
-            BeginAt(next.microseconds);
         }
     }
     m_Last = next;

@@ -83,8 +83,8 @@ void AddOptions(CLI::App& app, Options& options)
     auto* const strict = app.add_flag("--strict", options.strict,
                                       "Exit with status 4 if a command of the session was refused")
                              ->needs(session);
-    auto* const realTime =
-        app.add_flag("--realtime", options.realTime, "Play in real time instead of at once");
+    auto* const realTime = app.add_flag("--realtime", options.realTime,
+                                        "Play or replay in real time instead of at once");
     auto* const remote =
         app.add_flag("--remote", options.remote, "Play in real time, controlled by single keys")
             ->excludes(session);

@@ -56,7 +56,7 @@ same() {
 sorted() { tr -s ' \n' '\n' | LC_ALL=C sort; }
 
 OffersOptions() {
-    expect '--list --listen --log' --l
+    expect '--list --listen --log --log-prefix' --l
     expect '--session --strict' disc --s
     expect '--remote' --playlist 1 disc --rem
 }
@@ -96,7 +96,8 @@ OffersNoPlayListsWithoutADisc() {
 
 ExecutesNothingFromTheCommandLine() {
     for word in '$(touch run)' '`touch run`' '"$(touch run)"' 'a[$(touch run)]'; do
-        for option in --playlist --describe --session --replay --format --output --listen --only --log --l; do
+        for option in --playlist --describe --session --replay --field-log --format --output \
+            --listen --only --log --log-prefix --l; do
             complete_words "$word" $option ''
             complete_words $option "$word"
             complete_words $option "PlayItem,$word"
@@ -168,6 +169,7 @@ OffersNothingAfterTheDisc() {
 OffersNothingForTheLog() {
     expect '' --log ''
     expect '' --log e
+    expect '' --field-log player.log --log-prefix ''
 }
 
 KeepsCompletingTheSameWordInAList() {
@@ -177,7 +179,7 @@ KeepsCompletingTheSameWordInAList() {
     [[ ${readline_options[*]} == nospace ]]
 }
 
-options_of_help() { "$program" --help | sed -n 's/^  \(-.,\)*--\([a-z]*\) .*/--\2/p' | sorted; }
+options_of_help() { "$program" --help | sed -n 's/^  \(-.,\)*--\([a-z-]*\) .*/--\2/p' | sorted; }
 
 CompletesTheOptionsOfTheProgram() {
     same 'options of completion and program' \
@@ -186,7 +188,7 @@ CompletesTheOptionsOfTheProgram() {
 
 PageHasTheOptionsOfTheProgram() {
     same 'options of page and program' \
-        "$(sed -n 's/^\.It Fl -\([a-z]*\).*/--\1/p' "$page" | sorted)" "$(options_of_help)"
+        "$(sed -n 's/^\.It Fl -\([a-z-]*\).*/--\1/p' "$page" | sorted)" "$(options_of_help)"
 }
 
 PageHasTheCommandsOfTheProgram() {
