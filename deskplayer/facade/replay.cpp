@@ -53,6 +53,12 @@ public:
         ++m_Report.gaps;
     }
 
+    void OnStart(const StartRecord& start) override
+    {
+        PassTime(start.time);
+        ++m_Report.starts;
+    }
+
 private:
     void PassTime(Ticks time) const
     {

@@ -51,7 +51,7 @@ bool IsBootLine(std::string_view text)
 
 } // namespace
 
-FieldLogReader::FieldLogReader(FieldLogListener& listener, std::optional<PrefixPattern> pattern)
+FieldLogReader::FieldLogReader(RecordListener& listener, std::optional<PrefixPattern> pattern)
     : m_rListener(listener), m_Pattern(std::move(pattern))
 {
 }

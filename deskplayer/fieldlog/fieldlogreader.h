@@ -33,20 +33,6 @@
 namespace deskplayer
 {
 
-/** Where a session starts, or its clock begins anew. */
-struct StartRecord {
-    Ticks time;
-    std::string wallClock; ///< as the line shows it: "2024-05-31 20:15:00.123456"
-};
-
-/** Receives what a log contains. */
-class FieldLogListener : public RecordListener
-{
-public:
-    /** Called before the first record, and after a gap that moves the wall clock. */
-    virtual void OnStart(const StartRecord& start) = 0;
-};
-
 /** What a log consisted of. */
 struct FieldLogCounts {
     std::uint64_t callbacks = 0;
@@ -57,7 +43,8 @@ struct FieldLogCounts {
 /**
  * Reads a log from its beginning. Memory does not grow with the log, nor with the length of lines.
  *
- * docs/outputs.md lists the causes of gaps.
+ * docs/outputs.md lists the causes of gaps and says where starts are. The wall clock of a start is
+ * as the line shows it.
  */
 class FieldLogReader
 {
@@ -70,7 +57,7 @@ public:
      * @param pattern  of the lines; without it, every line is read in whichever of the known forms
      *                 it has
      */
-    explicit FieldLogReader(FieldLogListener& listener,
+    explicit FieldLogReader(RecordListener& listener,
                             std::optional<PrefixPattern> pattern = std::nullopt);
 
     /** Reads the next part of the log, which may end anywhere. */
@@ -101,7 +88,7 @@ private:
     void Gap(const char* cause, std::optional<std::uint64_t> lost);
     Ticks Now() const { return m_TimeLine.Now(); }
 
-    FieldLogListener& m_rListener;
+    RecordListener& m_rListener;
     const std::optional<PrefixPattern> m_Pattern;
     JournalLineReader m_JournalLines;
     LogTimeLine m_TimeLine;

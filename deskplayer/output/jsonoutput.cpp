@@ -2,6 +2,8 @@
 
 #include <cstddef>
 
+#include <nlohmann/json.hpp>
+
 #include "clientkit/jsonline.h"
 #include "output/arguments.h"
 
@@ -34,6 +36,13 @@ void JsonOutput::Write(const GapRecord& gap)
     } else {
         line.Gap(gap.time.count(), gap.cause.c_str());
     }
+}
+
+void JsonOutput::Write(const StartRecord& start)
+{
+    const nlohmann::ordered_json line = {{"ticks", start.time.count()},
+                                         {"start", {{"wallClock", start.wallClock}}}};
+    Stream() << line.dump() << '\n';
 }
 
 } // namespace deskplayer

@@ -11,8 +11,8 @@ namespace deskplayer
 {
 
 /**
- * Writes one JSON object per callback or gap, each on its own line. docs/outputs.md describes the
- * members.
+ * Writes one JSON object per callback, gap or start, each on its own line. docs/outputs.md
+ * describes the members.
  *
  *     {"ticks":900000,"time":"00:00:20.000","interface":"control","callback":"Paused","arguments":{}}
  */
@@ -24,6 +24,7 @@ public:
 private:
     void Write(const CallbackRecord& record) override;
     void Write(const GapRecord& gap) override;
+    void Write(const StartRecord& start) override;
 };
 
 } // namespace deskplayer

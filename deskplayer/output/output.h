@@ -17,7 +17,7 @@ namespace deskplayer
 
 /**
  * Writes the callbacks that pass a filter: those of a session, with its time, or those of a
- * recording, with their own. Gaps of a recording always pass.
+ * recording, with their own. Gaps and starts of a recording always pass.
  *
  * Writes on the delivering thread and never flushes. The output is complete once this object is
  * destroyed; the state of the stream shows whether writing succeeded.
@@ -50,6 +50,8 @@ private:
 
     virtual void Write(const GapRecord& gap) = 0;
 
+    virtual void Write(const StartRecord& start) = 0;
+
     void OnCallback(const bdmv::Callback& callback) final { OnRecord({Now(), callback, {}}); }
 
     void OnRecord(const CallbackRecord& record) final
@@ -61,6 +63,8 @@ private:
     }
 
     void OnGap(const GapRecord& gap) final { Write(gap); }
+
+    void OnStart(const StartRecord& start) final { Write(start); }
 
     std::ostream& m_rStream;
     const VirtualClock& m_rClock;

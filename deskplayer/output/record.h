@@ -1,12 +1,14 @@
 /**
  * @file
- * What a recording consists of: callbacks, some arguments of which may be unknown, and gaps.
+ * What a recording consists of: callbacks, some arguments of which may be unknown, gaps, and
+ * starts.
  *
  * @code
  * class Counter : public deskplayer::RecordListener
  * {
  *     void OnRecord(const deskplayer::CallbackRecord&) override { ++m_Callbacks; }
  *     void OnGap(const deskplayer::GapRecord& gap) override { m_Lost += gap.lost.value_or(0); }
+ *     void OnStart(const deskplayer::StartRecord&) override {}
  *     ...
  * };
  * @endcode
@@ -46,9 +48,17 @@ struct CallbackRecord {
 
 /** Where a recording lost something. */
 struct GapRecord {
-    Ticks time;        ///< of the first record after the gap
+    /** Of the first record after the gap; in a log, of the line that reveals it. */
+    Ticks time;
+
     std::string cause; ///< printable ASCII without quotes and backslashes: "capacity", "restart"
     std::optional<std::uint64_t> lost; ///< how many callbacks or lines, if that is known
+};
+
+/** Where a recording starts, or its clock begins anew after a gap. */
+struct StartRecord {
+    Ticks time;
+    std::string wallClock; ///< printable ASCII without quotes and backslashes: "May 31 20:15:00"
 };
 
 /** Receives a recording in its order. */
@@ -58,6 +68,7 @@ public:
     virtual ~RecordListener() = default;
     virtual void OnRecord(const CallbackRecord& record) = 0;
     virtual void OnGap(const GapRecord& gap) = 0;
+    virtual void OnStart(const StartRecord& start) = 0;
 
 protected:
     RecordListener() = default;

@@ -49,6 +49,12 @@ void TextOutput::Write(const GapRecord& gap)
     WriteLine(gap.time, "(gap)", Red, arguments);
 }
 
+void TextOutput::Write(const StartRecord& start)
+{
+    Paint(TimeText(start.time), Dim);
+    Stream() << "  (start) at " << start.wallClock << '\n';
+}
+
 void TextOutput::WriteLine(Ticks time, std::string_view name, const char* colour,
                            const std::vector<ArgumentText>& arguments)
 {

@@ -23,6 +23,10 @@ namespace deskplayer
  *
  *     00:00:58.000  (gap)                       lost=2 cause=capacity
  *
+ * So is the name of a start:
+ *
+ *     00:00:00.000  (start) at 2024-05-31 20:15:00.123456
+ *
  * The callback has the colour of its interface; times and names of arguments are dim.
  */
 class TextOutput : public Output
@@ -38,6 +42,7 @@ public:
 private:
     void Write(const CallbackRecord& record) override;
     void Write(const GapRecord& gap) override;
+    void Write(const StartRecord& start) override;
     void WriteLine(Ticks time, std::string_view name, const char* colour,
                    const std::vector<ArgumentText>& arguments);
     void Paint(std::string_view text, const char* colour);

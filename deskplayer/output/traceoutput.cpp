@@ -29,7 +29,8 @@ enum class TraceOutput::Track : std::size_t {
     PipSubtitles,
     Menu,
     FirstInterface, ///< followed by one track for every other bdmv::ListenerInterface
-    Gaps = FirstInterface + bdmv::ListenerInterface__sizeof
+    Gaps = FirstInterface + bdmv::ListenerInterface__sizeof,
+    Starts
 };
 
 /** Keeps its arguments as they were when it began: a callback's bytes do not last. */
@@ -92,6 +93,7 @@ TraceOutput::TraceOutput(std::ostream& stream, const VirtualClock& clock,
             {NameOf(static_cast<bdmv::ListenerInterface>(interface)), false, nullptr});
     }
     m_Tracks.push_back({"gaps", false, nullptr});
+    m_Tracks.push_back({"starts", false, nullptr});
     Append(Metadata("process_name", 0, "name", "session"));
 }
 
@@ -225,6 +227,13 @@ void TraceOutput::Write(const GapRecord& gap)
     }
     arguments["cause"] = gap.cause;
     AppendEvent(Track::Gaps, "i", {{"s", "t"}, {"name", "gap"}, {"args", arguments}});
+}
+
+void TraceOutput::Write(const StartRecord& start)
+{
+    m_Time = start.time;
+    AppendEvent(Track::Starts, "i",
+                {{"s", "t"}, {"name", "start"}, {"args", {{"wallClock", start.wallClock}}}});
 }
 
 void TraceOutput::Begin(Track track, const std::string& name, const CallbackRecord& record)

@@ -51,6 +51,7 @@ private:
     void Follow(const CallbackRecord& record) override;
     void Write(const CallbackRecord& record) override;
     void Write(const GapRecord& gap) override;
+    void Write(const StartRecord& start) override;
 
     void Begin(Track track, const std::string& name, const CallbackRecord& record);
     void BeginNamed(Track track, const std::string& name, const CallbackRecord& record);

@@ -11,7 +11,8 @@
 #include <system_error>
 #include <vector>
 
-#include "fieldlog/fieldlogoutput.h"
+#include "fieldlog/fieldlogreader.h"
+#include "navigator/virtualclock.h"
 #include "program/failure.h"
 #include "program/progress.h"
 #include "text/printable.h"
@@ -130,8 +131,9 @@ void ConvertFieldLogs(const Options& options, const OutputSettings& settings, Ta
     std::uint64_t bytes = 0;
     FieldLogCounts counts;
     {
-        FieldLogOutput output(settings, stream);
-        FieldLogReader reader(output, std::move(pattern));
+        const VirtualClock unused; // records have times of their own
+        const std::unique_ptr<Output> output = MakeOutput(settings, stream, unused);
+        FieldLogReader reader(*output, std::move(pattern));
         for (const auto& log : logs) {
             for (std::string_view part = log->Read(); !part.empty(); part = log->Read()) {
                 reader.Read(part);

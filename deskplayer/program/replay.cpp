@@ -81,6 +81,12 @@ public:
         m_rOutput.OnGap(gap);
     }
 
+    void OnStart(const StartRecord& start) override
+    {
+        PassTime(start.time);
+        m_rOutput.OnStart(start);
+    }
+
 private:
     void PassTime(Ticks time)
     {

@@ -20,6 +20,7 @@ struct PassOn {
 
     void operator()(const CallbackRecord& record) const { listener.OnRecord(record); }
     void operator()(const GapRecord& gap) const { listener.OnGap(gap); }
+    void operator()(const StartRecord& start) const { listener.OnStart(start); }
 };
 
 } // namespace

@@ -1,6 +1,6 @@
 /**
  * @file
- * Reads recordings: JSON lines with callbacks and gaps.
+ * Reads recordings: JSON lines with callbacks, gaps and starts.
  *
  * @code
  * RecordingReader reader(stream, "evening.jsonl");

@@ -88,20 +88,31 @@ CallbackRecord ReadCallbackRecord(const Element& line, Ticks time, std::vector<b
     return record;
 }
 
-/** The cause is restricted to what every output can write as it is. */
-GapRecord ReadGap(const Element& element, Ticks time)
+/** Text is restricted to what every output can write as it is. */
+const std::string& ReadWritableText(const Element& element)
 {
-    GapRecord gap = {time, element.Member("cause").Text(), std::nullopt};
-    const bool writable = std::all_of(gap.cause.begin(), gap.cause.end(), [](char character) {
+    const std::string& text = element.Text();
+    const bool writable = std::all_of(text.begin(), text.end(), [](char character) {
         return character >= ' ' && character <= '~' && character != '"' && character != '\\';
     });
     if (!writable) {
-        element.Member("cause").Refuse("printable ASCII without quotes and backslashes");
+        element.Refuse("printable ASCII without quotes and backslashes");
     }
+    return text;
+}
+
+GapRecord ReadGap(const Element& element, Ticks time)
+{
+    GapRecord gap = {time, ReadWritableText(element.Member("cause")), std::nullopt};
     if (element.Has("lost")) {
         gap.lost = element.Member("lost").Number(std::numeric_limits<std::uint64_t>::max());
     }
     return gap;
+}
+
+StartRecord ReadStart(const Element& element, Ticks time)
+{
+    return {time, ReadWritableText(element.Member("wallClock"))};
 }
 
 } // namespace
@@ -114,6 +125,9 @@ Record ReadRecordLine(std::string_view line, std::vector<bd::UInt8>& block)
         const Ticks time(root.Member("ticks").Number(std::numeric_limits<std::uint64_t>::max()));
         if (root.Has("gap")) {
             return ReadGap(root.Member("gap"), time);
+        }
+        if (root.Has("start")) {
+            return ReadStart(root.Member("start"), time);
         }
         return ReadCallbackRecord(root, time, block);
     } catch (const Unreadable& error) {

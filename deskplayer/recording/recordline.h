@@ -14,7 +14,7 @@
 namespace deskplayer
 {
 
-using Record = std::variant<CallbackRecord, GapRecord>;
+using Record = std::variant<CallbackRecord, GapRecord, StartRecord>;
 
 /**
  * Reads a line, as docs/outputs.md describes it. Members of the line that are unknown are ignored;

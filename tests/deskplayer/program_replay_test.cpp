@@ -11,6 +11,7 @@ namespace
 {
 
 const std::string SampleDump = BDMVNAVIGATOR_SAMPLE_DUMP;
+const fs::path SampleLogs = BDMVNAVIGATOR_SAMPLE_LOGS;
 
 const std::string TwoCallbacks = R"({"ticks":9000000000,"time":"55:33:20.000",)"
                                  R"("interface":"control","callback":"Paused","arguments":{}})"
@@ -41,6 +42,63 @@ TEST_F(DeskPlayerReplay, EqualsTheSessionInEveryFormat)
             EXPECT_TRUE(replayed.output == direct.output) << session << ' ' << format;
         }
     }
+}
+
+/** Expects that the JSON of field logs, when replayed, equals what they give in every format. */
+void ExpectReplayOfFieldLog(const std::vector<std::string>& logs, const fs::path& recording)
+{
+    const auto read = [&logs](const std::vector<std::string>& further) {
+        std::vector<std::string> arguments = {"--field-log"};
+        arguments.insert(arguments.end(), logs.begin(), logs.end());
+        arguments.insert(arguments.end(), further.begin(), further.end());
+        return RunDeskPlayer(arguments);
+    };
+    ASSERT_EQ(read({"--format", "json", "--output", recording.string()}).status, 0);
+    for (const std::string format : {"text", "json", "trace"}) {
+        const ProgramResult direct = read({"--format", format});
+        const ProgramResult replayed =
+            RunDeskPlayer({"--replay", recording.string(), "--format", format});
+        EXPECT_EQ(replayed.status, 0) << replayed.errors;
+        EXPECT_FALSE(direct.output.empty());
+        EXPECT_EQ(replayed.output, direct.output) << format;
+    }
+}
+
+TEST_F(DeskPlayerReplay, EqualsTheFieldLogOfEachSampleLog)
+{
+    int logs = 0;
+    for (const fs::directory_entry& log : fs::directory_iterator(SampleLogs)) {
+        SCOPED_TRACE(log.path());
+        ExpectReplayOfFieldLog({log.path().string()}, folder / "recording");
+        ++logs;
+    }
+    EXPECT_GT(logs, 0);
+}
+
+TEST_F(DeskPlayerReplay, EqualsTheFieldLogOfSessions)
+{
+    for (const std::string& session : {AllEvents, Evening}) {
+        SCOPED_TRACE(session);
+        const ProgramResult result = RunDeskPlayer(
+            {SampleDisc, "--session", session, "--log", "BdmvNavigator=Event+hifreq|Warning"});
+        ASSERT_NE(result.errors, "");
+        ExpectReplayOfFieldLog({WriteFile("log", result.errors)}, folder / "recording");
+    }
+}
+
+TEST_F(DeskPlayerReplay, EqualsAFieldLogWithGapsAndSeveralStarts)
+{
+    const std::string log = "2024-05-31 20:15:00.123456 BdmvNavigator Event: Sending Paused\n"
+                            "2024-05-31 20:15:01.123456 Common Warning: lines lost: 17\n"
+                            "2024-05-31 20:15:02.123456 BdmvNavigator Event: Sending Continued\n"
+                            "2024-06-30 20:15:00.123456 BdmvNavigator Event: Sending Stopped\n";
+    const std::string file = WriteFile("log", log + "x");
+    ExpectReplayOfFieldLog({file, file}, folder / "recording");
+
+    const std::string recording = ReadContents(folder / "recording");
+    EXPECT_NE(recording.find(R"("start":{"wallClock":"2024-06-30 20:15:00.123456"})"),
+              std::string::npos);
+    EXPECT_NE(recording.find(R"("gap":{"lost":17,"cause":"lost"})"), std::string::npos);
 }
 
 TEST_F(DeskPlayerReplay, AppliesFilters)

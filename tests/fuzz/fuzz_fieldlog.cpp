@@ -13,7 +13,7 @@ namespace
 using namespace deskplayer;
 
 /** Expects what every reader of records may rely on. */
-class Checker : public FieldLogListener
+class Checker : public RecordListener
 {
 public:
     std::uint64_t callbacks = 0;

@@ -30,6 +30,7 @@ public:
     }
 
     void OnGap(const GapRecord& gap) override { m_rOutput.OnGap(gap); }
+    void OnStart(const StartRecord& start) override { m_rOutput.OnStart(start); }
 
 private:
     std::ostringstream m_Stream;

@@ -36,8 +36,8 @@ namespace deskplayer
 {
 
 /**
- * Called before each callback and gap with its time as recorded, which may be less than that of the
- * one before. Sets the clock of a test, or waits.
+ * Called before each callback, and at each gap and start, with its time as recorded, which may be
+ * less than that of the one before. Sets the clock of a test, or waits.
  */
 using ReplayClock = std::function<void(Ticks time)>;
 
@@ -59,12 +59,13 @@ struct ReplayOptions {
     MessageHandler onMessage;
 };
 
-/** How many callbacks and gaps a recording had. */
+/** How many callbacks, gaps and starts a recording had. */
 struct ReplayReport {
     std::uint64_t delivered = 0; ///< callbacks, with those that were filled
     std::uint64_t filled = 0;    ///< callbacks that lacked arguments and were delivered
     std::uint64_t skipped = 0;   ///< callbacks that lacked arguments and were not delivered
     std::uint64_t gaps = 0;
+    std::uint64_t starts = 0; ///< where a field log shows the wall clock; only counted
 };
 
 /**

@@ -118,6 +118,20 @@ TEST_F(Replayed, GapsAreReported)
     EXPECT_EQ(messages, std::vector<std::string>{"recording:1: gap: capacity"});
 }
 
+TEST_F(Replayed, StartsAreCountedAndPassTime)
+{
+    std::vector<Ticks> times;
+    const ReplayReport report =
+        Play("{\"ticks\":7,\"start\":{\"wallClock\":\"2024-05-31 20:15:00\"}}\n",
+             [&times](Ticks time) { times.push_back(time); });
+
+    EXPECT_EQ(report.starts, 1U);
+    EXPECT_EQ(report.gaps, 0U);
+    EXPECT_EQ(report.delivered, 0U);
+    EXPECT_EQ(times, std::vector<Ticks>{Ticks(7)});
+    EXPECT_EQ(messages, std::vector<std::string>());
+}
+
 TEST_F(Replayed, ClockIsSetBeforeEachCallbackAndGap)
 {
     std::vector<std::string> order;

@@ -18,7 +18,7 @@ namespace deskplayer
 {
 
 /** Keeps what a log contains, one line of text for each. */
-class FieldLogKeeper : public FieldLogListener
+class FieldLogKeeper : public RecordListener
 {
 public:
     std::vector<CallbackRecord> records;

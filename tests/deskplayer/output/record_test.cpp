@@ -180,6 +180,44 @@ TEST_F(WrittenRecords, EndAllSlicesOfATraceAtAGap)
                                         R"(i 400 gap {"cause":"restart"})"}));
 }
 
+TEST_F(WrittenRecords, ShowStartsInText)
+{
+    WriteIn(OutputFormat::Text);
+    Listener().OnStart({Ticks(45000), "2024-05-31 20:15:00.123456"});
+
+    EXPECT_EQ(Text(), "00:00:01.000  (start) at 2024-05-31 20:15:00.123456\n");
+}
+
+TEST_F(WrittenRecords, ShowStartsInJson)
+{
+    WriteIn(OutputFormat::Json);
+    Listener().OnStart({Ticks(45000), "2024-05-31 20:15:00.123456"});
+
+    EXPECT_EQ(Text(), R"({"ticks":45000,"start":{"wallClock":"2024-05-31 20:15:00.123456"}})"
+                      "\n");
+}
+
+TEST_F(WrittenRecords, ShowStartsInTracesWithoutEndingSlices)
+{
+    WriteIn(OutputFormat::Trace);
+    Listener().OnRecord({Ticks(0), callbacks::Paused{}, {}});
+    Listener().OnStart({Ticks(9), "2024-05-31 20:15:00"});
+
+    EXPECT_EQ(Events(),
+              (std::vector<std::string>{"B 0 Paused {}", "i 0 Paused {}",
+                                        R"(i 200 start {"wallClock":"2024-05-31 20:15:00"})",
+                                        "E 200 Paused {}"}));
+}
+
+TEST_F(WrittenRecords, ShowStartsWhateverTheFilter)
+{
+    settings.filter.KeepCallbacks("Stopped");
+    WriteIn(OutputFormat::Text);
+    Listener().OnStart({Ticks(0), "20:15"});
+
+    EXPECT_EQ(Text(), "00:00:00.000  (start) at 20:15\n");
+}
+
 TEST_F(WrittenRecords, ShowGapsWhateverTheFilter)
 {
     settings.filter.KeepCallbacks("Stopped");

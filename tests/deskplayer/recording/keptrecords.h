@@ -19,9 +19,11 @@ namespace deskplayer
 struct KeptRecords : RecordListener {
     std::vector<CallbackRecord> callbacks;
     std::vector<GapRecord> gaps;
+    std::vector<StartRecord> starts;
 
     void OnRecord(const CallbackRecord& record) override { callbacks.push_back(record); }
     void OnGap(const GapRecord& gap) override { gaps.push_back(gap); }
+    void OnStart(const StartRecord& start) override { starts.push_back(start); }
 };
 
 inline void ReadAll(const std::string& text, RecordListener& listener)

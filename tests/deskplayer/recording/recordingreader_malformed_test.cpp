@@ -52,6 +52,7 @@ TEST(MalformedRecording, IsAnObjectWithoutItsMembers)
     EXPECT_EQ(MessageOf(R"({"ticks":1,"callback":"Paused"})"),
               "test:1:1: missing member 'arguments'");
     EXPECT_EQ(MessageOf(R"({"ticks":1,"gap":{}})"), "test:1:18: missing member 'cause'");
+    EXPECT_EQ(MessageOf(R"({"ticks":1,"start":{}})"), "test:1:20: missing member 'wallClock'");
     EXPECT_EQ(MessageOfArguments("ZoomModeSet", R"({"clip":{"x":1,"y":2,"width":3}})"),
               "test:1:32: missing member 'height'");
 }
@@ -150,6 +151,20 @@ TEST(MalformedRecording, HasACauseThatCannotBeWritten)
                   std::string::npos)
             << cause;
     }
+}
+
+TEST(MalformedRecording, HasAStartOfTheWrongType)
+{
+    EXPECT_EQ(MessageOf(R"({"ticks":1,"start":5})"), "test:1:20: unexpected 5; expected an object");
+    EXPECT_EQ(MessageOf(R"({"ticks":1,"start":{"wallClock":5}})"),
+              "test:1:33: unexpected 5; expected a string");
+}
+
+TEST(MalformedRecording, HasAWallClockThatCannotBeWritten)
+{
+    EXPECT_EQ(MessageOf(R"({"ticks":1,"start":{"wallClock":"20:15\n"}})"),
+              "test:1:33: unexpected \"20:15\\x5Cn\"; expected printable ASCII without quotes and "
+              "backslashes");
 }
 
 TEST(MalformedRecording, IsNestedTooDeeply)

@@ -101,6 +101,18 @@ TEST(RecordingReader, ReadsGaps)
     EXPECT_EQ(read.gaps[1].lost, std::nullopt);
 }
 
+TEST(RecordingReader, ReadsStarts)
+{
+    const std::string line = R"({"ticks":7,"start":{"wallClock":"2024-05-31 20:15:00.123456"}})"
+                             "\n";
+    const KeptRecords read = RecordsOf(line);
+
+    ASSERT_EQ(read.starts.size(), 1U);
+    EXPECT_EQ(read.starts[0].time, Ticks(7));
+    EXPECT_EQ(read.starts[0].wallClock, "2024-05-31 20:15:00.123456");
+    EXPECT_EQ(WrittenAgain(line), line);
+}
+
 TEST(RecordingReader, ReadsNumbersOf64BitsExactly)
 {
     const KeptRecords read =
@@ -163,6 +175,7 @@ struct BlockExpectation : RecordListener {
     }
 
     void OnGap(const GapRecord& /*gap*/) override {}
+    void OnStart(const StartRecord& /*start*/) override {}
 };
 
 TEST(RecordingReader, ReadsBlocks)
