@@ -10,21 +10,13 @@
 #include "disc/bytewriter.h"
 #include "disc/testdiscs.h"
 #include "programtest.h"
+#include "sanitized.h"
 #include "session/script.h"
 
 namespace
 {
 
-// Sanitizers need more memory than the program is limited to.
-#if defined(__SANITIZE_ADDRESS__) || defined(__SANITIZE_THREAD__)
-constexpr bool Sanitized = true;
-#elif !defined(__has_feature)
-constexpr bool Sanitized = false;
-#elif __has_feature(address_sanitizer) || __has_feature(thread_sanitizer)
-constexpr bool Sanitized = true;
-#else
-constexpr bool Sanitized = false;
-#endif
+using bdmvtest::Sanitized;
 
 /** The CPU time of the children of this process. */
 double SecondsOfChildren()

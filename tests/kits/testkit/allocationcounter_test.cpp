@@ -8,6 +8,7 @@
 #include <new>
 #include <thread>
 
+#include "sanitized.h"
 #include "testkit/operatornew.h"
 
 namespace
@@ -16,17 +17,7 @@ namespace
 using bdmvtest::CountAllocations;
 using bdmvtest::CountLiveBlocks;
 using bdmvtest::FailAllocationAfter;
-
-// A sanitizer stops the program when an allocation is too large.
-#if defined(__SANITIZE_ADDRESS__) || defined(__SANITIZE_THREAD__)
-constexpr bool Sanitized = true;
-#elif !defined(__has_feature)
-constexpr bool Sanitized = false;
-#elif __has_feature(address_sanitizer) || __has_feature(thread_sanitizer)
-constexpr bool Sanitized = true;
-#else
-constexpr bool Sanitized = false;
-#endif
+using bdmvtest::Sanitized;
 
 constexpr std::align_val_t Alignment{256};
 
