@@ -8,6 +8,7 @@
 #include <vector>
 
 #include "programtest.h"
+#include "sanitized.h"
 
 namespace
 {
@@ -130,6 +131,9 @@ TEST_F(FieldLog, MayHaveLinesOfAnotherKind)
 
 TEST_F(FieldLog, OfAnySizeIsReadInConstantMemory)
 {
+    if (Sanitized) {
+        GTEST_SKIP() << "sanitizers need more memory";
+    }
     const std::string log = WriteFile("log", Paused + "x");
     ResizeSparsely(log, std::uintmax_t{100} << 20);
 
