@@ -115,7 +115,9 @@ public:
     {
         static_assert(std::is_convertible<Event*, INavigatorEvent*>::value,
                       "the queue delivers classes derived from INavigatorEvent");
-        static_assert(sizeof(Event) <= LargestEvent && alignof(Event) <= alignof(std::max_align_t),
+        static_assert(sizeof(Event) <= LargestEvent,
+                      "the event does not fit in a place of the queue");
+        static_assert(alignof(Event) <= alignof(std::max_align_t),
                       "the event does not fit in a place of the queue");
         const PlaceNumber place = TakePlace();
         if (place == NoPlace) {
