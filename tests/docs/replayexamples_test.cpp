@@ -63,7 +63,7 @@ TEST(ReplayExamples, ReplayWithOptions)
 
     deskplayer::ReplayOptions options;
     options.name = "failure.jsonl";
-    options.fill = true;      // replaces absent arguments by neutral values
+    options.fill = true;      // delivers neutral values instead of absent arguments
     options.onMessage = Show; // "failure.jsonl:3: filled PlayMode, which lacks speed"
     Replay(recording, listeners, SetClock, options);
 
