@@ -53,6 +53,7 @@ bool ReadNewSyslog(TextCursor cursor, LogLine& line)
         return false;
     }
     line.process = process.substr(0, name->size() + 1 + identifier->size());
+    cursor.SkipBlanks();         // rsyslog adds the one that follows the tag of a local message
     cursor.Skip("\xEF\xBB\xBF"); // the mark of a text in UTF-8
     return ReadMessage(cursor.Rest(), line);
 }

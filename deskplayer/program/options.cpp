@@ -125,8 +125,9 @@ void AddOptions(CLI::App& app, Options& options)
             ->type_name("FILE ...");
     auto* const logPrefix =
         app.add_option("--log-prefix", options.logPrefix,
-                       "What precedes the text of a log line, such as "
-                       "\"[{time}] {component} {level}: {text}\"; known forms are recognised")
+                       "Pattern of the log lines, such as "
+                       "\"[{time}] {component} {level}: {text}\"; without it, known forms are "
+                       "recognised")
             ->needs(fieldLog)
             ->type_name("PATTERN");
     for (CLI::Option* const playing :

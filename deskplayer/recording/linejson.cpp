@@ -1,6 +1,7 @@
 #include "recording/linejson.h"
 
 #include <algorithm>
+#include <array>
 #include <iterator>
 
 #include "text/printable.h"
@@ -54,16 +55,63 @@ private:
  */
 constexpr int MostEvents = 2000;
 
+/** The beginning of a text from a line, as a message shows it. */
+std::string Shortened(std::string_view text)
+{
+    constexpr std::size_t longest = 160;
+    return std::string(FirstCharacters(text, longest));
+}
+
 /** The library's message without its prefixes: "unexpected end of input; expected '}'". */
 std::string MessageOf(const json::exception& error)
 {
-    constexpr std::size_t longest = 160;
     const std::string_view message = error.what();
     const std::size_t prefix = message.find(" - ");
     const std::size_t start =
         prefix == std::string_view::npos ? message.find("] ") + 2 : prefix + 3;
-    return "not JSON: " + std::string(FirstCharacters(message.substr(start), longest));
+    return "not JSON: " + Shortened(message.substr(start));
 }
+
+/** Finds where the values and names of a line begin, as the parser reports them. */
+class Places
+{
+public:
+    explicit Places(std::string_view line) : m_Line(line) {}
+
+    /** Where the next value or name begins. @param consumed by the parser, up to its end */
+    std::size_t Next(std::size_t consumed)
+    {
+        // A number has ended one character before the parser knows it: a character to skip.
+        const std::size_t begin = m_Line.find_first_not_of(" \t\r,:}]", m_End);
+        m_End = consumed;
+        return begin;
+    }
+
+private:
+    const std::string_view m_Line;
+    std::size_t m_End = 0; ///< of the last one
+};
+
+/** The names that the open objects have so far, by depth. */
+class NamesByDepth
+{
+public:
+    void BeginObject(std::size_t depth) { m_Names.at(depth).clear(); }
+
+    /** @return false if the object at @p depth has this name already */
+    bool Add(std::size_t depth, const std::string& name)
+    {
+        std::vector<std::string>& names = m_Names.at(depth);
+        if (std::find(names.begin(), names.end(), name) != names.end()) {
+            return false;
+        }
+        names.push_back(name);
+        return true;
+    }
+
+private:
+    std::array<std::vector<std::string>, DeepestNesting + 1> m_Names;
+};
 
 /** @param onEvent called as a json::parser_callback_t; returns nothing */
 template <typename Callback>
@@ -83,14 +131,28 @@ json ParseLine(std::string_view line)
 {
     std::size_t consumed = 0;
     int events = 0;
+    Places places(line);
+    NamesByDepth names;
     try {
-        return Parse(line, consumed, [&](int depth, json::parse_event_t /*event*/, json&) {
+        return Parse(line, consumed, [&](int depth, json::parse_event_t event, const json& value) {
             if (depth > DeepestNesting) {
                 throw LineError{consumed, "nested too deeply; expected at most " +
                                               std::to_string(DeepestNesting) + " levels"};
             }
             if (++events > MostEvents) {
                 throw LineError{consumed, "too many values; expected at most a few hundred"};
+            }
+            const std::size_t begin = places.Next(consumed);
+            const auto level = static_cast<std::size_t>(depth);
+            if (event == json::parse_event_t::object_start) {
+                names.BeginObject(level);
+            } else if (event == json::parse_event_t::key) {
+                // The names of an object are a level deeper than the object.
+                const auto& name = value.get_ref<const std::string&>();
+                if (!names.Add(level - 1, name)) {
+                    throw LineError{begin + 1, "repeated member '" + Shortened(name) +
+                                                   "'; expected each member once"};
+                }
             }
         });
     } catch (const json::exception& error) {
@@ -101,13 +163,11 @@ json ParseLine(std::string_view line)
 std::size_t ColumnOf(std::string_view line, const std::vector<std::string>& path)
 {
     std::size_t consumed = 0;
-    std::size_t tokenEnd = 0;
     std::size_t column = 1;
+    Places places(line);
     std::vector<std::string> names;
     Parse(line, consumed, [&](int depth, json::parse_event_t event, const json& value) {
-        // A number has ended one character before the parser knows it: a character to skip.
-        const std::size_t begin = line.find_first_not_of(" \t\r,:}]", tokenEnd);
-        tokenEnd = consumed;
+        const std::size_t begin = places.Next(consumed);
         const auto level = static_cast<std::size_t>(depth);
         if (event == json::parse_event_t::key) {
             names.resize(level);

@@ -31,7 +31,10 @@ struct LineError {
 /** How deep objects and arrays may be nested: more than in any line that is written. */
 constexpr int DeepestNesting = 8;
 
-/** @throw LineError the line is not JSON, nested too deeply, or has thousands of values */
+/**
+ * @throw LineError the line is not JSON, nested too deeply, has thousands of values, or an object
+ *        in it has a member twice
+ */
 nlohmann::json ParseLine(std::string_view line);
 
 /**

@@ -1,7 +1,6 @@
 #include <gtest/gtest.h>
 
 #include <filesystem>
-#include <map>
 #include <nlohmann/json.hpp>
 #include <regex>
 #include <string>
@@ -12,55 +11,6 @@
 
 namespace
 {
-
-using nlohmann::ordered_json;
-
-/** The arguments that no line shows, by callback. */
-const std::map<std::string, std::vector<std::string>> Absent = {
-    {"AudioInfoChanged",
-     {"isPrimary", "format", "sampleRate", "bitsPerSample", "channels", "pid", "channelLayout"}},
-    {"ExecuteButton", {"commands"}},
-    {"MarkInfo", {"playListId"}},
-    {"SystemSuspended", {"data"}},
-    {"TriggerSet", {"type", "result"}},
-    {"ZoomModeSet", {"clip", "destination", "delay"}},
-};
-
-/** JSON lines of a session without the arguments that its log does not show. */
-std::string WithoutAbsent(const std::string& output)
-{
-    std::string result;
-    for (const std::string& line : LinesOf(output)) {
-        ordered_json object = ordered_json::parse(line);
-        const auto absent = Absent.find(object["callback"]);
-        if (absent != Absent.end()) {
-            for (const std::string& name : absent->second) {
-                EXPECT_EQ(object["arguments"].erase(name), 1U) << line;
-            }
-        }
-        result += object.dump() + "\n";
-    }
-    return result;
-}
-
-class FieldLogOfASession : public ScratchFolder, public testing::WithParamInterface<std::string>
-{
-};
-
-TEST_P(FieldLogOfASession, GivesTheSessionExceptWhatLinesDoNotShow)
-{
-    const ProgramResult session =
-        RunDeskPlayer({SampleDisc, "--session", GetParam(), "--format", "json", "--log",
-                       "BdmvNavigator=Event+hifreq|Warning"});
-    ASSERT_EQ(session.status, 0) << session.errors;
-    const ProgramResult back =
-        RunDeskPlayer({"--field-log", WriteFile("log", session.errors), "--format", "json"});
-
-    EXPECT_EQ(back.status, 0) << back.errors;
-    EXPECT_EQ(back.output, WithoutAbsent(session.output));
-}
-
-INSTANTIATE_TEST_SUITE_P(OfTheExamples, FieldLogOfASession, testing::Values(AllEvents, Evening));
 
 using FieldLog = ScratchFolder;
 

@@ -57,6 +57,13 @@ INSTANTIATE_TEST_SUITE_P(
              "2024-05-31T20:15:00.123456+02:00", "player[42]"},
         Form{"SyslogRfc5424", "<14>1 2024-05-31T20:15:00.123456+02:00 box player 42 - - ",
              LineClock::Wall, "2024-05-31T20:15:00.123456+02:00", "player 42"},
+        Form{"RsyslogSyslogProtocol23",
+             "<14>1 2026-11-22T00:15:40.566471+00:00 box player 42 - -  ", LineClock::Wall,
+             "2026-11-22T00:15:40.566471+00:00", "player 42"},
+        Form{"RsyslogTraditionalFile", "Nov 22 00:15:40 box player[42]: ",
+             LineClock::WallWithoutYear, "Nov 22 00:15:40", "player[42]"},
+        Form{"JournalShortIsoPrecise", "2024-05-31T22:15:00.000000+0200 box player[42]: ",
+             LineClock::Wall, "2024-05-31T22:15:00.000000+0200", "player[42]"},
         Form{"SyslogRfc5424WithData",
              "<14>1 2024-05-31T20:15:00Z box player 42 id [a b=\"\\]\"][c d=\"\\\"\"] \xEF\xBB\xBF",
              LineClock::Wall, "2024-05-31T20:15:00Z", "player 42"},
@@ -95,6 +102,25 @@ TEST(JournalLine, IsTakenApart)
     EXPECT_EQ(line->process, "ab 42");
     EXPECT_EQ(line->component, "BdmvNavigator");
     EXPECT_EQ(line->text, "Sending Paused");
+}
+
+TEST(JournalLine, IsTakenApartAsJournalctlWritesIt)
+{
+    JournalLineReader reader;
+    const auto line = reader.Read(
+        R"({"PRIORITY":"6","SYSLOG_PID":"42","_MACHINE_ID":"0123456789abcdef0123456789abcdef",)"
+        R"("_BOOT_ID":"0123456789abcdef0123456789abcdef","_PID":"42","__MONOTONIC_TIMESTAMP":"0",)"
+        R"("MESSAGE":"BdmvNavigator Event: Sending PlayItem - playListId: 1, playItemId: 0, )"
+        R"(videoFormat 6, aspectRatio 3","_HOSTNAME":"box","SYSLOG_FACILITY":"1",)"
+        R"("__REALTIME_TIMESTAMP":"1717186500000000","__CURSOR":"s=e2e91c1e5e41451994f9ce7f703e89b5;)"
+        R"(i=1;b=0123456789abcdef0123456789abcdef;m=0;t=619c5a3587900;x=44c800308fc7cceb",)"
+        R"("SYSLOG_IDENTIFIER":"player","_TRANSPORT":"syslog"})");
+
+    ASSERT_TRUE(line);
+    EXPECT_EQ(line->time.text, "2024-05-31T20:15:00.000000Z");
+    EXPECT_EQ(line->process, "0123456789abcdef0123456789abcdef 42");
+    EXPECT_EQ(line->text,
+              "Sending PlayItem - playListId: 1, playItemId: 0, videoFormat 6, aspectRatio 3");
 }
 
 TEST(JournalLine, HasItsTimeAsText)

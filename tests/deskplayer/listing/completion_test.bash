@@ -150,6 +150,18 @@ OffersAnyFileForARecording() {
     expect '0 12345 8 80 800' --replay evening.json disc --describe ''
 }
 
+OffersAnyFileForEachFieldLog() {
+    expect 'evening.json evening.session' --field-log e
+    expect 'evening.json evening.session' --field-log evening.json e
+    [[ ${readline_options[*]} == filenames ]] || exit 1
+    expect 'evening.json evening.session' --field-log evening.json notes.txt e
+    expect 'evening.json evening.session' --field-log = evening.json e
+    expect 'notes.txt' --format json --field-log - n
+    expect '--format' --field-log evening.json --fo
+    expect '' --field-log evening.json --log-prefix e
+    expect 'disc documents' --list d
+}
+
 OffersAnyFileForTheOutput() {
     expect 'evening.json evening.session' disc --output e
 }

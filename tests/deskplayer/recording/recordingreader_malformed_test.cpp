@@ -57,6 +57,36 @@ TEST(MalformedRecording, IsAnObjectWithoutItsMembers)
               "test:1:32: missing member 'height'");
 }
 
+TEST(MalformedRecording, HasAMemberTwice)
+{
+    const std::string message = "; expected each member once";
+
+    EXPECT_EQ(MessageOf(R"({"ticks":1,"ticks":1,"callback":"Paused","arguments":{}})"),
+              "test:1:12: repeated member 'ticks'" + message);
+    EXPECT_EQ(MessageOf(R"({ "ticks" : 12 , "callback":"Paused", "arguments":{}, "ticks":1})"),
+              "test:1:55: repeated member 'ticks'" + message);
+    EXPECT_EQ(MessageOfArguments("AngleInfo", R"({"number":1,"number":1})"),
+              "test:1:36: repeated member 'number'" + message);
+    EXPECT_EQ(
+        MessageOfArguments("ZoomModeSet", R"({"clip":{"x":1,"y":2,"width":3,"height":4,"y":2}})"),
+        "test:1:66: repeated member 'y'" + message);
+    EXPECT_EQ(MessageOf(R"({"unknown":[{"a":1,"a":2}],"ticks":1})"),
+              "test:1:20: repeated member 'a'" + message);
+    EXPECT_EQ(MessageOf(R"({"a\n":1,"a\u000a":2})"),
+              "test:1:10: repeated member 'a\\x0A'" + message);
+    EXPECT_EQ(
+        MessageOf("{\"" + std::string(1000, 'a') + "\":1,\"" + std::string(1000, 'a') + "\":1"),
+        "test:1:1007: repeated member '" + std::string(160, 'a') + "'" + message);
+}
+
+TEST(MalformedRecording, MayHaveTheSameMemberInDifferentObjects)
+{
+    const KeptRecords read = RecordsOf(
+        R"({"ticks":1,"a":[{"b":1},{"b":2}],"c":{"a":3,"b":4},"callback":"Paused","arguments":{}})");
+
+    EXPECT_EQ(read.callbacks.size(), 1U);
+}
+
 TEST(MalformedRecording, HasAWrongType)
 {
     EXPECT_EQ(MessageOf(R"({"ticks":"1"})"),
