@@ -30,6 +30,7 @@
 #include "program/failure.h"
 #include "program/fieldlogs.h"
 #include "program/logclock.h"
+#include "program/logfolder.h"
 #include "program/options.h"
 #include "program/progress.h"
 #include "program/remotescreen.h"
@@ -51,12 +52,14 @@ OutputOptions OutputOptionsOf(const Options& options)
     output.format = options.format;
     output.interfaces = options.listen;
     output.callbacks = options.only;
-    output.coloured = options.output.empty() &&
+    output.tags = options.tags;
+    output.coloured = options.output.empty() && options.outputFolder.empty() &&
                       WantsColours(STDOUT_FILENO, std::getenv("NO_COLOR"), std::getenv("TERM"));
     return output;
 }
 
-/** @throw UsageError the options name no format, interface or callback, or exclude each other */
+/** @throw UsageError the options name no format, interface, callback or tag, or exclude each other
+ */
 OutputSettings CheckOutput(const Options& options)
 {
     OutputSettings settings;
@@ -71,6 +74,9 @@ OutputSettings CheckOutput(const Options& options)
                                      : options.describe ? "--describe"
                                                         : "--check") +
                          " excludes --format trace");
+    }
+    if (!options.tags.empty() && settings.format != OutputFormat::Json) {
+        throw UsageError("--tag requires --format json");
     }
     return settings;
 }
@@ -135,7 +141,9 @@ int Run(const Options& options)
     const bool json = format == OutputFormat::Json;
     Target target(options.output);
     int status = ExitOk;
-    if (!options.fieldLogs.empty()) {
+    if (!options.outputFolder.empty()) {
+        status = ConvertFieldLogsToFolder(options, settings);
+    } else if (!options.fieldLogs.empty()) {
         ConvertFieldLogs(options, settings, target);
     } else if (!options.replay.empty()) {
         ReplayRecording(options, settings, target);

@@ -17,6 +17,7 @@ OutputSettings ReadOutputOptions(const OutputOptions& options)
         settings.filter.KeepCallbacks(options.callbacks);
     }
     settings.coloured = options.coloured;
+    settings.tags = ParseTags(options.tags);
     return settings;
 }
 

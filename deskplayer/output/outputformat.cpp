@@ -19,7 +19,7 @@ std::unique_ptr<Output> MakeOutput(const OutputSettings& settings, std::ostream&
 {
     switch (settings.format) {
     case OutputFormat::Json:
-        return std::make_unique<JsonOutput>(stream, clock, settings.filter);
+        return std::make_unique<JsonOutput>(stream, clock, settings.filter, settings.tags);
     case OutputFormat::Trace:
         return std::make_unique<TraceOutput>(stream, clock, settings.filter);
     case OutputFormat::Text:

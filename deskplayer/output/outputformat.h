@@ -24,6 +24,10 @@ enum class OutputFormat {
 /** Indexed by OutputFormat. */
 inline constexpr std::array<std::string_view, 3> OutputFormatNames{"text", "json", "trace"};
 
+/** What the names of files with such an output end in; indexed by OutputFormat. */
+inline constexpr std::array<std::string_view, OutputFormatNames.size()> OutputFormatExtensions{
+    ".txt", ".jsonl", ".json"};
+
 /**
  * @param name one of OutputFormatNames
  * @throw std::invalid_argument names the unknown word and a similar one or all valid ones
@@ -35,6 +39,7 @@ struct OutputSettings {
     OutputFormat format = OutputFormat::Text;
     OutputFilter filter;
     bool coloured = false; ///< for text only
+    Tags tags;             ///< for json only
 };
 
 /** @param stream does not throw; it and @p clock must outlive the output */

@@ -26,6 +26,7 @@
 
 #include "clientkit/callback.h"
 #include "deskplayer/ticks.h"
+#include "output/tags.h"
 
 namespace deskplayer
 {
@@ -44,6 +45,8 @@ struct CallbackRecord {
      * bytes `data` points to. Without it, as many as `size` says.
      */
     std::optional<bd::UInt32> knownBytes = std::nullopt;
+
+    Tags tags = {}; ///< that the recording has
 };
 
 /** Where a recording lost something. */
@@ -53,12 +56,14 @@ struct GapRecord {
 
     std::string cause; ///< printable ASCII without quotes and backslashes: "capacity", "restart"
     std::optional<std::uint64_t> lost; ///< how many callbacks or lines, if that is known
+    Tags tags = {};                    ///< that the recording has
 };
 
 /** Where a recording starts, or its clock begins anew after a gap. */
 struct StartRecord {
     Ticks time;
     std::string wallClock; ///< printable ASCII without quotes and backslashes: "May 31 20:15:00"
+    Tags tags = {};        ///< that the recording has
 };
 
 /** Receives a recording in its order. */

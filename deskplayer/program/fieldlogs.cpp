@@ -1,19 +1,15 @@
 #include "program/fieldlogs.h"
 
-#include <fcntl.h>
 #include <sys/stat.h>
-#include <unistd.h>
 
-#include <array>
-#include <cerrno>
 #include <memory>
 #include <stdexcept>
-#include <system_error>
 #include <vector>
 
 #include "fieldlog/fieldlogreader.h"
 #include "navigator/virtualclock.h"
 #include "program/failure.h"
+#include "program/logfile.h"
 #include "program/progress.h"
 #include "text/printable.h"
 
@@ -22,66 +18,6 @@ namespace deskplayer
 
 namespace
 {
-
-/** A log that is open. */
-class LogFile
-{
-public:
-    /** @param name of a file, or `-` for standard input */
-    explicit LogFile(const std::string& name)
-        : m_Name(name == "-" ? "standard input" : Printable(name)),
-          m_Descriptor(name == "-" ? STDIN_FILENO : open(name.c_str(), O_RDONLY | O_CLOEXEC))
-    {
-        if (m_Descriptor < 0 || fstat(m_Descriptor, &m_Status) != 0) {
-            Fail(errno);
-        }
-    }
-
-    ~LogFile()
-    {
-        if (m_Descriptor != STDIN_FILENO) {
-            close(m_Descriptor);
-        }
-    }
-
-    LogFile(const LogFile&) = delete;
-    LogFile& operator=(const LogFile&) = delete;
-
-    const std::string& Name() const { return m_Name; }
-
-    /** Whether it may still grow while it is read. */
-    bool IsLive() const { return !S_ISREG(m_Status.st_mode); }
-
-    bool IsFile(const struct stat& other) const
-    {
-        return S_ISREG(other.st_mode) && other.st_dev == m_Status.st_dev &&
-               other.st_ino == m_Status.st_ino;
-    }
-
-    /** What follows; empty at the end. */
-    std::string_view Read()
-    {
-        ssize_t size = 0;
-        do {
-            size = read(m_Descriptor, m_Buffer.data(), m_Buffer.size());
-        } while (size < 0 && errno == EINTR);
-        if (size < 0) {
-            Fail(errno);
-        }
-        return {m_Buffer.data(), static_cast<std::size_t>(size)};
-    }
-
-private:
-    [[noreturn]] void Fail(int error) const
-    {
-        throw UsageError(m_Name + ": cannot be read: " + std::generic_category().message(error));
-    }
-
-    const std::string m_Name;
-    const int m_Descriptor;
-    struct stat m_Status = {};
-    std::array<char, std::size_t{64} * 1024> m_Buffer;
-};
 
 using LogFiles = std::vector<std::unique_ptr<LogFile>>;
 
@@ -103,6 +39,13 @@ LogFiles OpenLogs(const Options& options)
     return logs;
 }
 
+std::string CountText(std::uint64_t count, const std::string& kind)
+{
+    return std::to_string(count) + " " + kind + (count == 1 ? " line" : " lines");
+}
+
+} // namespace
+
 std::optional<PrefixPattern> PatternOf(const Options& options)
 {
     if (!options.logPrefix) {
@@ -115,12 +58,13 @@ std::optional<PrefixPattern> PatternOf(const Options& options)
     }
 }
 
-std::string CountText(std::uint64_t count, const std::string& kind)
+void PrintSkipped(const FieldLogCounts& counts)
 {
-    return std::to_string(count) + " " + kind + (count == 1 ? " line" : " lines");
+    if (counts.foreignLines > 0 || counts.damagedLines > 0) {
+        PrintMessage("skipped " + CountText(counts.foreignLines, "foreign") + " and " +
+                     CountText(counts.damagedLines, "damaged"));
+    }
 }
-
-} // namespace
 
 void ConvertFieldLogs(const Options& options, const OutputSettings& settings, Target& target)
 {
@@ -149,10 +93,7 @@ void ConvertFieldLogs(const Options& options, const OutputSettings& settings, Ta
         counts = reader.Counts();
     }
     progress.Clear();
-    if (counts.foreignLines > 0 || counts.damagedLines > 0) {
-        PrintMessage("skipped " + CountText(counts.foreignLines, "foreign") + " and " +
-                     CountText(counts.damagedLines, "damaged"));
-    }
+    PrintSkipped(counts);
     if (counts.callbacks == 0) {
         PrintMessage("no line announces a callback");
     }

@@ -99,9 +99,10 @@ void AddOptions(CLI::App& app, Options& options)
     app.add_option("--format", options.format,
                    "Output format: text, json (one object per line) or trace (for trace viewers)")
         ->type_name("FORMAT");
-    app.add_option("--output", options.output, "File to write; standard output by default")
-        ->check(NotEmpty("the name of a file"))
-        ->type_name("FILE");
+    auto* const output =
+        app.add_option("--output", options.output, "File to write; standard output by default")
+            ->check(NotEmpty("the name of a file"))
+            ->type_name("FILE");
     auto* const listen =
         app.add_option(
                "--listen", options.listen,
@@ -130,8 +131,26 @@ void AddOptions(CLI::App& app, Options& options)
                        "recognised")
             ->needs(fieldLog)
             ->type_name("PATTERN");
-    for (CLI::Option* const playing :
-         {playList, session, strict, realTime, remote, listen, only, log, fieldLog, logPrefix}) {
+    auto* const outputFolder =
+        app.add_option("--output-folder", options.outputFolder,
+                       "Take each log file as a log of its own, and write a file for each to this "
+                       "folder")
+            ->check(NotEmpty("the name of a folder"))
+            ->needs(fieldLog)
+            ->excludes(output)
+            ->type_name("FOLDER");
+    app.add_option("--jobs", options.jobs,
+                   "Log files to read at the same time; by default, one per processor")
+        ->check(CLI::Range(1U, MostJobs).description(""))
+        ->needs(outputFolder)
+        ->type_name("N");
+    auto* const tag =
+        app.add_option("--tag", options.tags,
+                       "A tag for every JSON object, such as device=7; may be given several times")
+            ->allow_extra_args(false)
+            ->type_name("NAME=VALUE");
+    for (CLI::Option* const playing : {playList, session, strict, realTime, remote, listen, only,
+                                       log, fieldLog, logPrefix, tag}) {
         playing->excludes(list)->excludes(describe)->excludes(check);
     }
     for (CLI::Option* const ofDisc :
@@ -156,6 +175,8 @@ void AddOptions(CLI::App& app, Options& options)
         "  bdmv-deskplayer disc --only PlayItem,ChapterNumber --format json\n"
         "  bdmv-deskplayer disc --remote\n"
         "  bdmv-deskplayer --field-log player.1.log player.log --format json\n"
+        "  bdmv-deskplayer --field-log logs/*.log --format json --output-folder recordings \\\n"
+        "      --tag firmware=2.1\n"
         "  bdmv-deskplayer --replay evening.jsonl --format trace\n\n"
         "Exit status: 0 success, 1 the output could not be written, 2 incorrect usage, or a\n"
         "session, recording or log that cannot be read, 3 the disc cannot be read or has faults,\n"

@@ -15,6 +15,9 @@
 namespace deskplayer
 {
 
+/** The largest value of --jobs. */
+constexpr unsigned MostJobs = 256;
+
 /** The values given on the command line. */
 struct Options {
     std::string disc;
@@ -35,6 +38,9 @@ struct Options {
     std::optional<std::string> log;
     std::vector<std::string> fieldLogs;
     std::optional<std::string> logPrefix;
+    std::vector<std::string> tags;
+    std::string outputFolder;
+    std::optional<unsigned> jobs;
 };
 
 /** Declares every option, its help and its conflicts. @param options receives the values */

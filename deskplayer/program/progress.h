@@ -27,7 +27,8 @@ public:
      */
     explicit Progress(const Options& options)
         : m_Possible(isatty(STDERR_FILENO) != 0 &&
-                     (options.check || isatty(STDOUT_FILENO) == 0 || !options.output.empty()))
+                     (options.check || isatty(STDOUT_FILENO) == 0 || !options.output.empty() ||
+                      !options.outputFolder.empty()))
     {
     }
 

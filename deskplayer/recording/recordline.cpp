@@ -101,6 +101,21 @@ const std::string& ReadWritableText(const Element& element)
     return text;
 }
 
+Tags ReadTags(const Element& line)
+{
+    Tags tags;
+    if (line.Has("tags")) {
+        const Element element = line.Member("tags");
+        if (!element.Value().is_object()) {
+            element.Refuse("an object of strings");
+        }
+        for (const auto& tag : element.Value().items()) {
+            tags.emplace(tag.key(), element.Member(tag.key()).Text());
+        }
+    }
+    return tags;
+}
+
 GapRecord ReadGap(const Element& element, Ticks time)
 {
     GapRecord gap = {time, ReadWritableText(element.Member("cause")), std::nullopt};
@@ -115,6 +130,19 @@ StartRecord ReadStart(const Element& element, Ticks time)
     return {time, ReadWritableText(element.Member("wallClock"))};
 }
 
+/** Reads everything but the tags. */
+Record ReadRecord(const Element& line, std::vector<bd::UInt8>& block)
+{
+    const Ticks time(line.Member("ticks").Number(std::numeric_limits<std::uint64_t>::max()));
+    if (line.Has("gap")) {
+        return ReadGap(line.Member("gap"), time);
+    }
+    if (line.Has("start")) {
+        return ReadStart(line.Member("start"), time);
+    }
+    return ReadCallbackRecord(line, time, block);
+}
+
 } // namespace
 
 Record ReadRecordLine(std::string_view line, std::vector<bd::UInt8>& block)
@@ -122,14 +150,9 @@ Record ReadRecordLine(std::string_view line, std::vector<bd::UInt8>& block)
     const nlohmann::json json = ParseLine(line);
     try {
         const Element root(json);
-        const Ticks time(root.Member("ticks").Number(std::numeric_limits<std::uint64_t>::max()));
-        if (root.Has("gap")) {
-            return ReadGap(root.Member("gap"), time);
-        }
-        if (root.Has("start")) {
-            return ReadStart(root.Member("start"), time);
-        }
-        return ReadCallbackRecord(root, time, block);
+        Record record = ReadRecord(root, block);
+        std::visit([&root](auto& read) { read.tags = ReadTags(root); }, record);
+        return record;
     } catch (const Unreadable& error) {
         throw LineError{ColumnOf(line, error.path), error.message};
     }

@@ -65,6 +65,18 @@ std::string Printable(std::string_view text)
     return printable;
 }
 
+bool IsUtf8(std::string_view text)
+{
+    while (!text.empty()) {
+        const std::size_t length = LengthOfCharacter(text);
+        if (length == 0) {
+            return false;
+        }
+        text.remove_prefix(length);
+    }
+    return true;
+}
+
 std::string_view FirstCharacters(std::string_view text, std::size_t longest)
 {
     std::size_t end = 0;

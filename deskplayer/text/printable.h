@@ -18,6 +18,9 @@ namespace deskplayer
  */
 std::string Printable(std::string_view text);
 
+/** Whether @p text consists of valid UTF-8 characters only. */
+bool IsUtf8(std::string_view text);
+
 /** The start of @p text, at most @p longest bytes, that ends between two characters. */
 std::string_view FirstCharacters(std::string_view text, std::size_t longest);
 

@@ -21,6 +21,7 @@
 #include <memory>
 #include <ostream>
 #include <string>
+#include <vector>
 
 #include "deskplayer/desk.h"
 
@@ -35,6 +36,9 @@ struct OutputOptions {
     std::string interfaces;      ///< only their callbacks: "control,settings"; empty for all
     std::string callbacks;       ///< only these: "Paused,AudioInfo"; empty for all
     bool coloured = false;       ///< with a terminal's colours; for text only
+
+    /** "NAME=VALUE" each: what identifies the recording among others; for json only. */
+    std::vector<std::string> tags;
 };
 
 /** A listener that is registered while it exists, and writes every callback that it receives. */
@@ -46,7 +50,7 @@ public:
      * @param stream outlives the output and does not throw; its state shows whether writing
      *               succeeded. It is written to inside callbacks, and never flushed.
      * @throw std::invalid_argument names the unknown word of the options, and a similar one or all
-     *        valid ones
+     *        valid ones; or the malformed tag
      */
     DeskOutput(Desk& desk, std::ostream& stream, const OutputOptions& options = {});
 

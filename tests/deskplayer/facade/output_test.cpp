@@ -60,6 +60,18 @@ TEST(DeskOutput, WritesJson)
                                     "\"control\",\"callback\":\"Paused\",\"arguments\":{}}\n");
 }
 
+TEST(DeskOutput, WritesTagsInJson)
+{
+    OutputOptions options;
+    options.format = "json";
+    options.callbacks = "Paused";
+    options.tags = {"firmware=2.1", "device=box 7"};
+    EXPECT_EQ(
+        WrittenWith(options),
+        "{\"ticks\":225000,\"time\":\"00:00:05.000\",\"interface\":\"control\",\"callback\":"
+        "\"Paused\",\"arguments\":{},\"tags\":{\"device\":\"box 7\",\"firmware\":\"2.1\"}}\n");
+}
+
 TEST(DeskOutput, CompletesATrace)
 {
     OutputOptions options;

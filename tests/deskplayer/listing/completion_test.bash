@@ -97,7 +97,7 @@ OffersNoPlayListsWithoutADisc() {
 ExecutesNothingFromTheCommandLine() {
     for word in '$(touch run)' '`touch run`' '"$(touch run)"' 'a[$(touch run)]'; do
         for option in --playlist --describe --session --replay --field-log --format --output \
-            --listen --only --log --log-prefix --l; do
+            --output-folder --jobs --tag --listen --only --log --log-prefix --l; do
             complete_words "$word" $option ''
             complete_words $option "$word"
             complete_words $option "PlayItem,$word"
@@ -166,6 +166,11 @@ OffersAnyFileForTheOutput() {
     expect 'evening.json evening.session' disc --output e
 }
 
+OffersFoldersForOutputs() {
+    expect 'a disc disc documents' --field-log player.log --output-folder ''
+    [[ ${readline_options[*]} == filenames ]]
+}
+
 OffersFoldersForTheDisc() {
     expect 'disc documents' d
     expect 'a disc disc documents' --list ''
@@ -182,6 +187,12 @@ OffersNothingForTheLog() {
     expect '' --log ''
     expect '' --log e
     expect '' --field-log player.log --log-prefix ''
+}
+
+OffersNothingForJobsAndTags() {
+    expect '' --field-log player.log --jobs ''
+    expect '' --tag ''
+    expect '0 12345 8 80 800' --tag device=7 disc --describe ''
 }
 
 KeepsCompletingTheSameWordInAList() {

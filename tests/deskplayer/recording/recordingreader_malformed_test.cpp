@@ -197,6 +197,15 @@ TEST(MalformedRecording, HasAWallClockThatCannotBeWritten)
               "backslashes");
 }
 
+TEST(MalformedRecording, HasTagsThatAreNoTexts)
+{
+    const std::string line = R"({"ticks":1,"callback":"Paused","arguments":{},"tags":)";
+
+    EXPECT_EQ(MessageOf(line + "5}"), "test:1:54: unexpected 5; expected an object of strings");
+    EXPECT_EQ(MessageOf(line + R"({"device":["a"]}})"),
+              "test:1:64: unexpected array; expected a string");
+}
+
 TEST(MalformedRecording, IsNestedTooDeeply)
 {
     const std::string deepest = std::string(7, '[') + std::string(7, ']');

@@ -200,7 +200,7 @@ TEST(RecordingReader, KeepsTheSizeOfABlockThatIsKnownInPart)
 
 TEST(RecordingReader, ReadsMembersInAnyOrderAndIgnoresUnknownOnes)
 {
-    const std::string line = R"({"arguments":{"number":2},"tags":{"device":["a"]},)"
+    const std::string line = R"({"arguments":{"number":2},"mood":{"viewer":["a"]},)"
                              R"( "callback":"AngleInfo", "ticks":9 })";
 
     EXPECT_EQ(WrittenAgain(line), R"({"ticks":9,"time":"00:00:00.000","interface":"settings",)"

@@ -58,7 +58,15 @@ TEST(Printable, EscapesEveryByteThatIsNotValidUtf8)
                     {"\xF0\x9F\x8E", "\\xF0\\x9F\\x8E"}};
     for (const auto& example : examples) {
         EXPECT_EQ(Printable(example.text), example.printable);
+        EXPECT_FALSE(IsUtf8(example.text)) << example.printable;
     }
+}
+
+TEST(Utf8, ConsistsOfValidCharacters)
+{
+    EXPECT_TRUE(IsUtf8(""));
+    EXPECT_TRUE(IsUtf8("a\x1F\xC3\xA9\xE2\x82\xAC\xF0\x9F\x8E\xAC"));
+    EXPECT_FALSE(IsUtf8("a\xC3\xA9\xFF"));
 }
 
 TEST(FirstCharacters, EndBetweenTwoCharacters)
