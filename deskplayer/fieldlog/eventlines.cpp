@@ -185,6 +185,7 @@ EventText ReadValues(const EventLine& line, std::string_view text)
     }
     EventText result = Make(line.callback, values);
     result.role = line.role;
+    result.continues = line.continues;
     return result;
 }
 

@@ -40,6 +40,9 @@ struct EventLine {
     LineRole role;
     bdmv::CallbackId callback;
     std::array<std::int8_t, 4> arguments; ///< by conversion: the position of the argument it shows
+
+    /** If the event has announced another callback before: what its first line announces. */
+    std::optional<bdmv::CallbackId> continues;
 };
 
 /** An array of EventLine from begin() to end(), sorted by format. */
@@ -70,6 +73,7 @@ struct EventText {
     LineRole role = LineRole::Announces;    ///< with EventTextKind::Event only
     std::optional<bdmv::Callback> callback; ///< with EventTextKind::Event only
     ArgumentSet absent;                     ///< these arguments are neutral: zero, false or empty
+    std::optional<bdmv::CallbackId> continues; ///< as in EventLine
 };
 
 /**

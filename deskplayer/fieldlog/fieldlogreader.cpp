@@ -155,7 +155,8 @@ void FieldLogReader::ReadEvent(const EventText& event)
         m_Pending.reset();
     }
     SettlePending();
-    const CallbackRecord record{Now(), *event.callback, event.absent};
+    CallbackRecord record{Now(), *event.callback, event.absent};
+    record.continuesEvent = FollowEvent(event);
     switch (event.role) {
     case LineRole::Announces:
     case LineRole::Completes:
@@ -168,6 +169,18 @@ void FieldLogReader::ReadEvent(const EventText& event)
     case LineRole::Revokes:
         break;
     }
+}
+
+/** Whether the event of the last line continues. */
+bool FieldLogReader::FollowEvent(const EventText& event)
+{
+    const bool continues = event.continues && event.continues == m_Event;
+    if (!event.continues) {
+        m_Event = event.callback->Id();
+    } else if (!continues) {
+        m_Event.reset(); // lines of events that several threads dispatch, or a line is missing
+    }
+    return continues;
 }
 
 void FieldLogReader::FollowTime(const LogLine& line)
@@ -211,6 +224,7 @@ void FieldLogReader::Gap(const char* cause, std::optional<std::uint64_t> lost)
         m_Pending.reset();
     }
     SettlePending();
+    m_Event.reset();
     m_rListener.OnGap({Now(), cause, lost});
 }
 

@@ -44,6 +44,12 @@ struct CallbackRecord {
      * bytes `data` points to. Without it, as many as `size` says.
      */
     std::optional<bd::UInt32> knownBytes = std::nullopt;
+
+    /**
+     * Whether the record before it is an earlier callback of the same event. Only log lines show
+     * that: it is false in all other recordings.
+     */
+    bool continuesEvent = false;
 };
 
 /** Where a recording lost something. */
