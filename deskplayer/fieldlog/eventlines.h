@@ -37,6 +37,7 @@ constexpr std::int8_t NoArgument = -1;
 /** A line that an event writes. */
 struct EventLine {
     std::string_view format; ///< of printf, as in the navigator's source
+    std::string_view head;   ///< the format up to its first conversion
     LineRole role;
     bdmv::CallbackId callback;
     std::array<std::int8_t, 4> arguments; ///< by conversion: the position of the argument it shows

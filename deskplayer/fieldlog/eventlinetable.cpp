@@ -11,8 +11,12 @@ template <typename... Position>
 constexpr EventLine Line(std::string_view format, LineRole role, bdmv::CallbackId callback,
                          Position... arguments)
 {
-    EventLine line = {
-        format, role, callback, {NoArgument, NoArgument, NoArgument, NoArgument}, std::nullopt};
+    EventLine line = {format,
+                      format.substr(0, format.find('%')),
+                      role,
+                      callback,
+                      {NoArgument, NoArgument, NoArgument, NoArgument},
+                      std::nullopt};
     std::size_t conversion = 0;
     ((line.arguments[conversion++] = static_cast<std::int8_t>(arguments)), ...);
     return line;

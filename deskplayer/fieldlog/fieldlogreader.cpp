@@ -16,7 +16,8 @@ namespace
 /** Whether a word of a line names a component or level, by name or by number, or is missing. */
 bool Names(std::string_view word, std::string_view name, unsigned number)
 {
-    return word.empty() || word == name || word == std::to_string(number);
+    return word.empty() || word == name ||
+           (TextCursor(word).AtDigit() && word == std::to_string(number));
 }
 
 bool IsOfLevel(const LogLine& line, std::string_view name, bd::LogLevelDef level)
@@ -34,8 +35,8 @@ bool IsOfEvents(const LogLine& line)
 std::optional<std::uint64_t> LostLines(const LogLine& line)
 {
     TextCursor cursor(line.text);
-    if (!Names(line.component, "Common", bd::CompIdCommon) ||
-        !IsOfLevel(line, "Warning", bd::LogWarning) || !cursor.Skip("lines lost: ")) {
+    if (!cursor.Skip("lines lost: ") || !Names(line.component, "Common", bd::CompIdCommon) ||
+        !IsOfLevel(line, "Warning", bd::LogWarning)) {
         return std::nullopt;
     }
     const auto lost = cursor.Number(1, 18);
