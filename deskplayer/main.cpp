@@ -72,6 +72,10 @@ OutputSettings CheckOutput(const Options& options)
                                                         : "--check") +
                          " excludes --format trace");
     }
+    if (options.summary && settings.format != OutputFormat::Text &&
+        settings.format != OutputFormat::Json) {
+        throw UsageError("--summary excludes --format " + options.format);
+    }
     return settings;
 }
 

@@ -35,6 +35,7 @@ struct Options {
     std::optional<std::string> log;
     std::vector<std::string> fieldLogs;
     std::optional<std::string> logPrefix;
+    bool summary = false;
 };
 
 /** Declares every option, its help and its conflicts. @param options receives the values */
