@@ -119,6 +119,13 @@ TEST(FieldLog, SkipsAndCountsForeignLines)
     EXPECT_EQ(counts.damagedLines, 0U);
 }
 
+TEST(FieldLog, SkipsALineWithoutAComponentOrALevel)
+{
+    EXPECT_EQ(ReadLog("00:00:00.000000  Event: Sending Paused\n"
+                      "00:00:00.000000 BdmvNavigator : Sending Paused\n"),
+              Lines());
+}
+
 TEST(FieldLog, HasAGapForADamagedLine)
 {
     FieldLogCounts counts;
