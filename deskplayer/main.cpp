@@ -78,6 +78,10 @@ OutputSettings CheckOutput(const Options& options)
     if (!options.tags.empty() && settings.format != OutputFormat::Json) {
         throw UsageError("--tag requires --format json");
     }
+    if (options.summary && settings.format != OutputFormat::Text &&
+        settings.format != OutputFormat::Json) {
+        throw UsageError("--summary excludes --format " + options.format);
+    }
     return settings;
 }
 

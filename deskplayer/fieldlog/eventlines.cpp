@@ -150,12 +150,6 @@ std::optional<std::uint64_t> TakeConversion(std::string_view& format, std::strin
     return TakeNumber<std::uint32_t>(text);
 }
 
-/** The format up to its first conversion. */
-std::string_view HeadOf(const EventLine& line)
-{
-    return line.format.substr(0, line.format.find('%'));
-}
-
 EventText ReadValues(const EventLine& line, std::string_view text)
 {
     EventText damaged;
@@ -185,6 +179,7 @@ EventText ReadValues(const EventLine& line, std::string_view text)
     }
     EventText result = Make(line.callback, values);
     result.role = line.role;
+    result.continues = line.continues;
     return result;
 }
 
@@ -207,15 +202,14 @@ EventText ReadEventText(std::string_view text)
     const EventLines lines = AllEventLines();
     const EventLine* const next = std::upper_bound(
         lines.begin(), lines.end(), text,
-        [](std::string_view value, const EventLine& line) { return value < HeadOf(line); });
+        [](std::string_view value, const EventLine& line) { return value < line.head; });
     if (next == lines.begin()) {
         return {};
     }
     const EventLine& line = *(next - 1);
-    const std::string_view head = HeadOf(line);
-    const bool hasValues = head.size() != line.format.size();
-    const bool begins = text.substr(0, head.size()) == head;
-    if (!begins || (!hasValues && text.size() != head.size())) {
+    const bool hasValues = line.head.size() != line.format.size();
+    const bool begins = text.substr(0, line.head.size()) == line.head;
+    if (!begins || (!hasValues && text.size() != line.head.size())) {
         return {};
     }
     return ReadValues(line, text);

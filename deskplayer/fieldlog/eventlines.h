@@ -37,9 +37,13 @@ constexpr std::int8_t NoArgument = -1;
 /** A line that an event writes. */
 struct EventLine {
     std::string_view format; ///< of printf, as in the navigator's source
+    std::string_view head;   ///< the format up to its first conversion
     LineRole role;
     bdmv::CallbackId callback;
     std::array<std::int8_t, 4> arguments; ///< by conversion: the position of the argument it shows
+
+    /** If the event has announced another callback before: what its first line announces. */
+    std::optional<bdmv::CallbackId> continues;
 };
 
 /** An array of EventLine from begin() to end(), sorted by format. */
@@ -70,6 +74,7 @@ struct EventText {
     LineRole role = LineRole::Announces;    ///< with EventTextKind::Event only
     std::optional<bdmv::Callback> callback; ///< with EventTextKind::Event only
     ArgumentSet absent;                     ///< these arguments are neutral: zero, false or empty
+    std::optional<bdmv::CallbackId> continues; ///< as in EventLine
 };
 
 /**

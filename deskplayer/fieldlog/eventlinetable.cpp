@@ -11,38 +11,60 @@ template <typename... Position>
 constexpr EventLine Line(std::string_view format, LineRole role, bdmv::CallbackId callback,
                          Position... arguments)
 {
-    EventLine line = {format, role, callback, {NoArgument, NoArgument, NoArgument, NoArgument}};
+    EventLine line = {format,
+                      format.substr(0, format.find('%')),
+                      role,
+                      callback,
+                      {NoArgument, NoArgument, NoArgument, NoArgument},
+                      std::nullopt};
     std::size_t conversion = 0;
     ((line.arguments[conversion++] = static_cast<std::int8_t>(arguments)), ...);
     return line;
 }
 
+/** A line after the first one of an event with several callbacks. @param first of its callbacks */
+constexpr EventLine Continuing(bdmv::CallbackId first, EventLine line)
+{
+    line.continues = first;
+    return line;
+}
+
 /** Sorted by byte values. */
 constexpr EventLine Lines[] = {
-    Line("For normal play notify async 2ndaud available", LineRole::Announces,
-         bdmv::CallbackSecondaryAudioAvailable),
-    Line("For normal play notify async pip available", LineRole::Announces,
-         bdmv::CallbackPictureInPictureAvailable),
-    Line("For speed play notify async 2ndaud unavailable", LineRole::Announces,
-         bdmv::CallbackSecondaryAudioUnavailable),
-    Line("For speed play notify async pip unavailable", LineRole::Announces,
-         bdmv::CallbackPictureInPictureUnavailable),
+    Continuing(bdmv::CallbackPlayMode,
+               Line("For normal play notify async 2ndaud available", LineRole::Announces,
+                    bdmv::CallbackSecondaryAudioAvailable)),
+    Continuing(bdmv::CallbackPlayMode,
+               Line("For normal play notify async pip available", LineRole::Announces,
+                    bdmv::CallbackPictureInPictureAvailable)),
+    Continuing(bdmv::CallbackPlayMode,
+               Line("For speed play notify async 2ndaud unavailable", LineRole::Announces,
+                    bdmv::CallbackSecondaryAudioUnavailable)),
+    Continuing(bdmv::CallbackPlayMode,
+               Line("For speed play notify async pip unavailable", LineRole::Announces,
+                    bdmv::CallbackPictureInPictureUnavailable)),
     Line("Not send unavailable for async 2nd audio", LineRole::Revokes,
          bdmv::CallbackSecondaryAudioUnavailable),
     Line("Not send unavailable for async 2nd video", LineRole::Revokes,
          bdmv::CallbackPictureInPictureUnavailable),
-    Line("Send available for async 2nd audio", LineRole::Announces,
-         bdmv::CallbackSecondaryAudioAvailable),
-    Line("Send available for async 2nd video", LineRole::Announces,
-         bdmv::CallbackPictureInPictureAvailable),
-    Line("Send unavailable for 2nd audio", LineRole::Announces,
-         bdmv::CallbackSecondaryAudioUnavailable),
-    Line("Send unavailable for 2nd video", LineRole::Announces,
-         bdmv::CallbackPictureInPictureUnavailable),
-    Line("Sending ((SecondaryAudioDisplay)) - audioNr %d, numOfAudios %d, shown: %s",
-         LineRole::Announces, bdmv::CallbackSecondaryAudioDisplay, 0, NoArgument, 1),
-    Line("Sending ((SecondaryVideoDisplay)) - video Nr %d, numofVideos %d, async %d, shown: %s",
-         LineRole::Announces, bdmv::CallbackSecondaryVideoDisplay, 0, NoArgument, NoArgument, 1),
+    Continuing(bdmv::CallbackPlayItem,
+               Line("Send available for async 2nd audio", LineRole::Announces,
+                    bdmv::CallbackSecondaryAudioAvailable)),
+    Continuing(bdmv::CallbackPlayItem,
+               Line("Send available for async 2nd video", LineRole::Announces,
+                    bdmv::CallbackPictureInPictureAvailable)),
+    Continuing(bdmv::CallbackPlayItem, Line("Send unavailable for 2nd audio", LineRole::Announces,
+                                            bdmv::CallbackSecondaryAudioUnavailable)),
+    Continuing(bdmv::CallbackPlayItem, Line("Send unavailable for 2nd video", LineRole::Announces,
+                                            bdmv::CallbackPictureInPictureUnavailable)),
+    Continuing(bdmv::CallbackSecondaryAudioInfo,
+               Line("Sending ((SecondaryAudioDisplay)) - audioNr %d, numOfAudios %d, shown: %s",
+                    LineRole::Announces, bdmv::CallbackSecondaryAudioDisplay, 0, NoArgument, 1)),
+    Continuing(
+        bdmv::CallbackSecondaryVideoInfo,
+        Line("Sending ((SecondaryVideoDisplay)) - video Nr %d, numofVideos %d, async %d, shown: %s",
+             LineRole::Announces, bdmv::CallbackSecondaryVideoDisplay, 0, NoArgument, NoArgument,
+             1)),
     Line("Sending AngleInfo - angleNr: %u", LineRole::Announces, bdmv::CallbackAngleInfo, 0),
     Line("Sending AudioChannelsChanged", LineRole::Announces, bdmv::CallbackAudioInfoChanged),
     Line("Sending AudioInfo - audioNr: %u", LineRole::Announces, bdmv::CallbackAudioInfo, 0),

@@ -16,7 +16,8 @@ namespace
 /** Whether a word of a line names a component or level, by name or by number, or is missing. */
 bool Names(std::string_view word, std::string_view name, unsigned number)
 {
-    return word.empty() || word == name || word == std::to_string(number);
+    return word.empty() || word == name ||
+           (TextCursor(word).AtDigit() && word == std::to_string(number));
 }
 
 bool IsOfLevel(const LogLine& line, std::string_view name, bd::LogLevelDef level)
@@ -34,8 +35,8 @@ bool IsOfEvents(const LogLine& line)
 std::optional<std::uint64_t> LostLines(const LogLine& line)
 {
     TextCursor cursor(line.text);
-    if (!Names(line.component, "Common", bd::CompIdCommon) ||
-        !IsOfLevel(line, "Warning", bd::LogWarning) || !cursor.Skip("lines lost: ")) {
+    if (!cursor.Skip("lines lost: ") || !Names(line.component, "Common", bd::CompIdCommon) ||
+        !IsOfLevel(line, "Warning", bd::LogWarning)) {
         return std::nullopt;
     }
     const auto lost = cursor.Number(1, 18);
@@ -155,7 +156,8 @@ void FieldLogReader::ReadEvent(const EventText& event)
         m_Pending.reset();
     }
     SettlePending();
-    const CallbackRecord record{Now(), *event.callback, event.absent};
+    CallbackRecord record{Now(), *event.callback, event.absent};
+    record.continuesEvent = FollowEvent(event);
     switch (event.role) {
     case LineRole::Announces:
     case LineRole::Completes:
@@ -168,6 +170,18 @@ void FieldLogReader::ReadEvent(const EventText& event)
     case LineRole::Revokes:
         break;
     }
+}
+
+/** Whether the event of the last line continues. */
+bool FieldLogReader::FollowEvent(const EventText& event)
+{
+    const bool continues = event.continues && event.continues == m_Event;
+    if (!event.continues) {
+        m_Event = event.callback->Id();
+    } else if (!continues) {
+        m_Event.reset(); // lines of events that several threads dispatch, or a line is missing
+    }
+    return continues;
 }
 
 void FieldLogReader::FollowTime(const LogLine& line)
@@ -211,6 +225,7 @@ void FieldLogReader::Gap(const char* cause, std::optional<std::uint64_t> lost)
         m_Pending.reset();
     }
     SettlePending();
+    m_Event.reset();
     m_rListener.OnGap({Now(), cause, lost});
 }
 

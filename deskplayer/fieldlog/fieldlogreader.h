@@ -82,6 +82,7 @@ private:
     std::optional<LogLine> TakeApart(std::string_view text);
     void ReadText(const LogLine& line);
     void ReadEvent(const EventText& event);
+    bool FollowEvent(const EventText& event);
     void FollowTime(const LogLine& line);
     void Announce(const CallbackRecord& record);
     void SettlePending();
@@ -99,6 +100,7 @@ private:
     bool m_IsTooLong = false;
     bool m_Restarted = false; ///< the next line that is read is of another run
     std::optional<Pending> m_Pending;
+    std::optional<bdmv::CallbackId> m_Event; ///< the first callback of the event of the last line
 };
 
 } // namespace deskplayer

@@ -42,13 +42,10 @@ std::int64_t TakeFraction(TextCursor& cursor)
     std::int64_t unit = MicrosecondsPerSecond;
     std::int64_t fraction = 0;
     std::size_t digits = 0;
-    for (; !next.Rest().empty(); ++digits) {
-        const char character = next.Rest().front();
-        if (!next.SkipOneOf("0123456789")) {
-            break;
-        }
+    for (; next.AtDigit(); ++digits) {
         unit /= 10;
-        fraction += unit * (character - '0');
+        fraction += unit * (next.Rest().front() - '0');
+        next = TextCursor(next.Rest().substr(1));
     }
     if (digits > 0) {
         cursor = next;
@@ -178,15 +175,24 @@ std::optional<LineTime> TakeCounter(TextCursor& cursor)
 
 std::optional<LineTime> TakeLineTime(std::string_view& rest)
 {
-    for (const auto take : {TakeNumericDate, TakeNamedDate, TakeSessionTime, TakeCounter}) {
-        TextCursor cursor(rest);
-        if (std::optional<LineTime> time = take(cursor)) {
-            time->text = rest.substr(0, rest.size() - cursor.Rest().size());
-            rest = cursor.Rest();
-            return time;
+    TextCursor cursor(rest);
+    std::optional<LineTime> time;
+    if (!cursor.AtDigit()) {
+        time = TakeNamedDate(cursor);
+    } else {
+        for (const auto take : {TakeNumericDate, TakeSessionTime, TakeCounter}) {
+            cursor = TextCursor(rest);
+            time = take(cursor);
+            if (time) {
+                break;
+            }
         }
     }
-    return std::nullopt;
+    if (time) {
+        time->text = rest.substr(0, rest.size() - cursor.Rest().size());
+        rest = cursor.Rest();
+    }
+    return time;
 }
 
 } // namespace deskplayer

@@ -1,5 +1,7 @@
 #include "fieldlog/logline.h"
 
+#include <algorithm>
+
 #include "fieldlog/textcursor.h"
 
 namespace deskplayer
@@ -11,12 +13,17 @@ namespace
 /** A word before @p end: a component, a level, a host. */
 std::optional<std::string_view> TakeWord(TextCursor& cursor, std::string_view end)
 {
-    const std::size_t length = cursor.Rest().find_first_of(" :");
-    if (length == 0 || length == std::string_view::npos ||
-        cursor.Rest().substr(length, end.size()) != end) {
+    const std::string_view rest = cursor.Rest();
+    const auto* const stop = std::find_if(rest.begin(), rest.end(), [](char character) {
+        return character == ' ' || character == ':';
+    });
+    const std::string_view word = rest.substr(0, static_cast<std::size_t>(stop - rest.begin()));
+    TextCursor next(rest.substr(word.size()));
+    if (word.empty() || !next.Skip(end)) {
         return std::nullopt;
     }
-    return cursor.Until(end);
+    cursor = next;
+    return word;
 }
 
 /** Skips structured data: "-", or elements in brackets, in whose values a backslash escapes. */

@@ -21,6 +21,9 @@ public:
 
     std::string_view Rest() const { return m_Rest; }
 
+    /** Whether a digit follows. */
+    bool AtDigit() const { return !m_Rest.empty() && IsDigit(m_Rest.front()); }
+
     bool Skip(std::string_view literal)
     {
         if (m_Rest.substr(0, literal.size()) != literal) {
@@ -44,13 +47,16 @@ public:
     /** A number of @p fewest to @p most digits; at most 18. */
     std::optional<std::int64_t> Number(std::size_t fewest, std::size_t most)
     {
-        const std::size_t digits = Length(m_Rest.find_first_not_of("0123456789"));
-        if (digits < fewest || digits > most) {
-            return std::nullopt;
-        }
         std::int64_t number = 0;
-        for (const char digit : m_Rest.substr(0, digits)) {
-            number = 10 * number + (digit - '0');
+        std::size_t digits = 0;
+        for (; digits < m_Rest.size() && IsDigit(m_Rest[digits]); ++digits) {
+            if (digits == most) {
+                return std::nullopt;
+            }
+            number = 10 * number + (m_Rest[digits] - '0');
+        }
+        if (digits < fewest) {
+            return std::nullopt;
         }
         m_Rest.remove_prefix(digits);
         return number;
@@ -69,6 +75,8 @@ public:
     }
 
 private:
+    static bool IsDigit(char character) { return character >= '0' && character <= '9'; }
+
     std::size_t Length(std::size_t found) const
     {
         return found == std::string_view::npos ? m_Rest.size() : found;

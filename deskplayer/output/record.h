@@ -47,6 +47,12 @@ struct CallbackRecord {
     std::optional<bd::UInt32> knownBytes = std::nullopt;
 
     Tags tags = {}; ///< that the recording has
+
+    /**
+     * Whether the record before it is an earlier callback of the same event. Only log lines show
+     * that: it is false in all other recordings.
+     */
+    bool continuesEvent = false;
 };
 
 /** Where a recording lost something. */

@@ -2,15 +2,16 @@
 
 #include <sys/stat.h>
 
+#include <algorithm>
 #include <memory>
 #include <stdexcept>
 #include <vector>
 
 #include "fieldlog/fieldlogreader.h"
-#include "navigator/virtualclock.h"
 #include "program/failure.h"
 #include "program/logfile.h"
 #include "program/progress.h"
+#include "program/recordwriter.h"
 #include "text/printable.h"
 
 namespace deskplayer
@@ -44,6 +45,45 @@ std::string CountText(std::uint64_t count, const std::string& kind)
     return std::to_string(count) + " " + kind + (count == 1 ? " line" : " lines");
 }
 
+/** How far the logs have been read. */
+class ReadProgress
+{
+public:
+    ReadProgress(const Options& options, const LogFiles& logs) : m_Progress(options)
+    {
+        for (const auto& log : logs) {
+            m_IsLive = m_IsLive || log->IsLive();
+            m_Total += log->IsLive() ? 0 : log->Size();
+        }
+    }
+
+    void Advance(std::size_t bytes)
+    {
+        m_Read += bytes;
+        m_Progress.Update([this] { return Text(); });
+    }
+
+    void Clear() { m_Progress.Clear(); }
+
+private:
+    /** "512 of 1024 MiB, 50 %". A file may have grown. */
+    std::string Text() const
+    {
+        const std::string read = std::to_string(m_Read >> 20);
+        if (m_IsLive) {
+            return read + " MiB";
+        }
+        const std::uint64_t total = std::max(m_Total, m_Read);
+        return read + " of " + std::to_string(total >> 20) + " MiB, " +
+               std::to_string(m_Read * 100 / total) + " %";
+    }
+
+    Progress m_Progress;
+    std::uint64_t m_Read = 0;  ///< bytes
+    std::uint64_t m_Total = 0; ///< bytes
+    bool m_IsLive = false;     ///< so the total is unknown
+};
+
 } // namespace
 
 std::optional<PrefixPattern> PatternOf(const Options& options)
@@ -71,28 +111,26 @@ void ConvertFieldLogs(const Options& options, const OutputSettings& settings, Ta
     std::optional<PrefixPattern> pattern = PatternOf(options);
     const LogFiles logs = OpenLogs(options);
     std::ostream& stream = target.Open();
-    Progress progress(options);
-    std::uint64_t bytes = 0;
-    FieldLogCounts counts;
-    {
-        const VirtualClock unused; // records have times of their own
-        const std::unique_ptr<Output> output = MakeOutput(settings, stream, unused);
-        FieldLogReader reader(*output, std::move(pattern));
-        for (const auto& log : logs) {
-            for (std::string_view part = log->Read(); !part.empty(); part = log->Read()) {
-                reader.Read(part);
-                bytes += part.size();
-                progress.Update([bytes] { return std::to_string(bytes >> 20) + " MiB read"; });
-                if (log->IsLive()) {
-                    stream.flush();
-                }
+    ReadProgress progress(options, logs);
+    RecordWriter writer(options, settings, stream);
+    FieldLogReader reader(writer.Listener(), std::move(pattern));
+    for (const auto& log : logs) {
+        for (std::string_view part = log->Read(); !part.empty(); part = log->Read()) {
+            reader.Read(part);
+            progress.Advance(part.size());
+            if (log->IsLive()) {
+                stream.flush();
             }
-            reader.EndFile();
         }
-        reader.Finish();
-        counts = reader.Counts();
+        reader.EndFile();
     }
+    reader.Finish();
     progress.Clear();
+    const FieldLogCounts& counts = reader.Counts();
+    writer.Finish(LogSummary{counts.foreignLines, counts.damagedLines});
+    if (options.summary) {
+        return; // it has these counts
+    }
     PrintSkipped(counts);
     if (counts.callbacks == 0) {
         PrintMessage("no line announces a callback");

@@ -19,6 +19,7 @@
 #include <array>
 #include <cerrno>
 #include <cstddef>
+#include <cstdint>
 #include <string>
 #include <string_view>
 #include <system_error>
@@ -57,6 +58,9 @@ public:
 
     /** Whether it may still grow while it is read. */
     bool IsLive() const { return !S_ISREG(m_Status.st_mode); }
+
+    /** In bytes, when it was opened. Only if it is not live. */
+    std::uint64_t Size() const { return static_cast<std::uint64_t>(m_Status.st_size); }
 
     bool IsFile(const struct stat& other) const
     {

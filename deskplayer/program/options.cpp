@@ -93,9 +93,9 @@ void AddOptions(CLI::App& app, Options& options)
                        "Recording to replay instead of a disc: JSON lines, - for standard input")
             ->check(NotEmpty("the name of a file"))
             ->type_name("FILE");
-    app.add_flag("--fill", options.fill,
-                 "Replace arguments that the recording lacks by neutral values")
-        ->needs(replay);
+    auto* const fill = app.add_flag("--fill", options.fill,
+                                    "Replace arguments that the recording lacks by neutral values")
+                           ->needs(replay);
     app.add_option("--format", options.format,
                    "Output format: text, json (one object per line) or trace (for trace viewers)")
         ->type_name("FORMAT");
@@ -149,6 +149,12 @@ void AddOptions(CLI::App& app, Options& options)
                        "A tag for every JSON object, such as device=7; may be given several times")
             ->allow_extra_args(false)
             ->type_name("NAME=VALUE");
+    auto* const summary =
+        app.add_flag("--summary", options.summary,
+                     "Write a summary of the log or recording instead of its callbacks");
+    for (CLI::Option* const ofCallbacks : {listen, only, realTime, fill, outputFolder, tag}) {
+        summary->excludes(ofCallbacks);
+    }
     for (CLI::Option* const playing : {playList, session, strict, realTime, remote, listen, only,
                                        log, fieldLog, logPrefix, tag}) {
         playing->excludes(list)->excludes(describe)->excludes(check);
@@ -159,8 +165,12 @@ void AddOptions(CLI::App& app, Options& options)
     }
     realTime->excludes(fieldLog);
     fieldLog->excludes(replay);
-    app.final_callback([disc, fieldLog, replay] {
-        if (disc->count() == 0 && fieldLog->count() == 0 && replay->count() == 0) {
+    app.final_callback([disc, fieldLog, replay, summary] {
+        const bool isRecorded = fieldLog->count() != 0 || replay->count() != 0;
+        if (summary->count() != 0 && !isRecorded) {
+            throw CLI::RequiresError("--summary", "--field-log or --replay");
+        }
+        if (disc->count() == 0 && !isRecorded) {
             throw CLI::RequiredError("DISC");
         }
     });
@@ -177,6 +187,7 @@ void AddOptions(CLI::App& app, Options& options)
         "  bdmv-deskplayer --field-log player.1.log player.log --format json\n"
         "  bdmv-deskplayer --field-log logs/*.log --format json --output-folder recordings \\\n"
         "      --tag firmware=2.1\n"
+        "  bdmv-deskplayer --field-log player.log --summary\n"
         "  bdmv-deskplayer --replay evening.jsonl --format trace\n\n"
         "Exit status: 0 success, 1 the output could not be written, 2 incorrect usage, or a\n"
         "session, recording or log that cannot be read, 3 the disc cannot be read or has faults,\n"

@@ -41,6 +41,7 @@ struct Options {
     std::vector<std::string> tags;
     std::string outputFolder;
     std::optional<unsigned> jobs;
+    bool summary = false;
 };
 
 /** Declares every option, its help and its conflicts. @param options receives the values */

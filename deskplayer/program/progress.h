@@ -23,12 +23,12 @@ class Progress
 public:
     /**
      * @param options if they send the output of playback to the same terminal, progress is not
-     *        shown; a check clears it before it writes
+     *        shown; a check clears it before it writes, and a summary is written at the end
      */
     explicit Progress(const Options& options)
         : m_Possible(isatty(STDERR_FILENO) != 0 &&
-                     (options.check || isatty(STDOUT_FILENO) == 0 || !options.output.empty() ||
-                      !options.outputFolder.empty()))
+                     (options.check || options.summary || isatty(STDOUT_FILENO) == 0 ||
+                      !options.output.empty() || !options.outputFolder.empty()))
     {
     }
 

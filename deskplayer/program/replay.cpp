@@ -9,9 +9,9 @@
 #include <system_error>
 #include <thread>
 
-#include "navigator/virtualclock.h"
 #include "program/failure.h"
 #include "program/progress.h"
+#include "program/recordwriter.h"
 #include "recording/absence.h"
 #include "recording/recordingreader.h"
 #include "text/printable.h"
@@ -60,6 +60,9 @@ public:
 
     std::uint64_t Incomplete() const { return m_Incomplete; }
     std::uint64_t Gaps() const { return m_Gaps; }
+
+    /** Removes the progress from the terminal. */
+    void Finish() { m_Progress.Clear(); }
 
     void OnRecord(const CallbackRecord& record) override
     {
@@ -143,17 +146,19 @@ void ReplayRecording(const Options& options, const OutputSettings& settings, Tar
     std::ifstream file;
     RecordingReader reader(Open(file, options.replay), NameOf(options.replay));
     std::ostream& stream = target.Open();
-    const VirtualClock unused; // records have times of their own
-    std::unique_ptr<Output> output = MakeOutput(settings, stream, unused);
-    Player player(options, *output, stream);
+    RecordWriter writer(options, settings, stream);
+    Player player(options, writer.Listener(), stream);
     try {
         while (reader.Next(player)) {
         }
     } catch (const RecordingError&) {
-        output.reset();
+        player.Finish();
+        writer.Finish();
         target.Finish(); // what could be read
         throw;
     }
+    player.Finish();
+    writer.Finish();
     if (player.Incomplete() != 0 || player.Gaps() != 0) {
         PrintMessage(Printable(NameOf(options.replay)) + ": " +
                      Counted(player.Incomplete(), "callback") + " with absent arguments" +

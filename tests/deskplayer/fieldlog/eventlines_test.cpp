@@ -183,6 +183,7 @@ TEST(EventLines, OfEveryEventGiveTheCallbacksThatAListenerReceives)
                 const bdmv::Callback& expected = listener.callbacks[i];
                 const CallbackRecord& record = records[i];
                 ASSERT_EQ(record.callback.Id(), expected.Id()) << log;
+                ASSERT_EQ(record.continuesEvent, i > 0) << log;
                 ASSERT_EQ(AbsentNames(record.callback, record.absent),
                           ExceptionsOf(NameOf(expected.Id())))
                     << log;

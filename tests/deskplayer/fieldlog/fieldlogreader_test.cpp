@@ -119,6 +119,13 @@ TEST(FieldLog, SkipsAndCountsForeignLines)
     EXPECT_EQ(counts.damagedLines, 0U);
 }
 
+TEST(FieldLog, SkipsALineWithoutAComponentOrALevel)
+{
+    EXPECT_EQ(ReadLog("00:00:00.000000  Event: Sending Paused\n"
+                      "00:00:00.000000 BdmvNavigator : Sending Paused\n"),
+              Lines());
+}
+
 TEST(FieldLog, HasAGapForADamagedLine)
 {
     FieldLogCounts counts;
@@ -280,6 +287,55 @@ TEST(FieldLog, OfAnotherKindIsReadByAPattern)
     EXPECT_EQ(keeper.lines,
               (Lines{"0 Paused {}", "45000 Stopped {}", "67500 gap restart", "67500 Paused {}"}));
     EXPECT_EQ(reader.Counts().foreignLines, 1U);
+}
+
+/** Whether each callback of a log continues the event of the one before. */
+std::string Continuations(const std::string& log)
+{
+    FieldLogKeeper keeper;
+    FieldLogReader reader(keeper);
+    reader.Read(log);
+    reader.Finish();
+    std::string flags;
+    for (const CallbackRecord& record : keeper.records) {
+        flags += record.continuesEvent ? '+' : '-';
+    }
+    return flags;
+}
+
+const std::string Item =
+    AtZero("Sending PlayItem - playListId: 1, playItemId: 0, videoFormat 6, aspectRatio 3");
+const std::string ItemVideo = AtZero("Send available for async 2nd video");
+const std::string ItemAudio = AtZero("Send unavailable for 2nd audio");
+
+TEST(FieldLog, ShowsWhichCallbacksContinueAnEvent)
+{
+    EXPECT_EQ(Continuations(Item + "a foreign line\n" + ItemVideo + ItemAudio + Item + Item),
+              "-++--");
+    EXPECT_EQ(Continuations(AtZero("Sending Trigger Reached") +
+                            At("00:00:00.000000", "TriggerRead time type=6,time = 90", "Warning")),
+              "-");
+}
+
+TEST(FieldLog, ContinuesNoEventWhoseFirstLineIsMissing)
+{
+    EXPECT_EQ(Continuations(ItemVideo + ItemAudio), "--");
+    EXPECT_EQ(Continuations(AtZero("Sending PlayMode - direction: 0, speedIndex: 0") + ItemVideo),
+              "--");
+}
+
+TEST(FieldLog, ContinuesNoEventAfterAnotherOne)
+{
+    EXPECT_EQ(Continuations(Item + AtZero("Sending Paused") + ItemVideo), "---");
+    EXPECT_EQ(
+        Continuations(Item + AtZero("For normal play notify async pip available") + ItemVideo),
+        "---");
+}
+
+TEST(FieldLog, ContinuesNoEventAfterAGap)
+{
+    EXPECT_EQ(Continuations(Item + Lost + At("00:00:01.000000", "Send unavailable for 2nd audio")),
+              "--");
 }
 
 TEST(FieldLog, NeverExceedsTheLargestTime)

@@ -57,7 +57,7 @@ sorted() { tr -s ' \n' '\n' | LC_ALL=C sort; }
 
 OffersOptions() {
     expect '--list --listen --log --log-prefix' --l
-    expect '--session --strict' disc --s
+    expect '--session --strict --summary' disc --s
     expect '--remote' --playlist 1 disc --rem
 }
 
