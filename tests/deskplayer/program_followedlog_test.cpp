@@ -105,30 +105,47 @@ TEST_F(FollowedLog, FromAPipeThatStaysOpenShowsEachCallbackAsItComes)
     }
 }
 
-TEST_F(FollowedLog, ShowsProgressOnATerminalAndErasesItBeforeTheSummary)
+/** What a terminal shows while a log is read that is written until progress is shown. */
+std::string ScreenDuringALongLog(const std::string& folder, const std::vector<std::string>& options)
 {
-    Pipe log(folder / "log");
-    TerminalProgram program({"--field-log", log.Name(), "--summary"});
+    Pipe log(folder + "/log");
+    std::vector<std::string> arguments = {"--field-log", log.Name()};
+    arguments.insert(arguments.end(), options.begin(), options.end());
+    TerminalProgram program(arguments);
     std::atomic<bool> isShown{false};
     std::thread writer([&] {
-        std::string part;
+        std::string part = "a foreign line\n";
         while (part.size() < 60000) {
             part += Paused;
         }
         while (!isShown && log.Write(part)) {
         }
     });
-
     isShown = program.WaitFor(" MiB");
     EXPECT_TRUE(isShown);
     writer.join();
     log.Close();
-
     const ProgramResult result = program.Finish();
     EXPECT_EQ(result.status, 0);
-    EXPECT_TRUE(std::regex_search(result.output,
-                                  std::regex("^(\r[0-9]+ MiB\r {5,}\r)+Recording\r\n  begin ")))
-        << testing::PrintToString(result.output.substr(0, 1000));
+    return result.output.substr(0, 10000);
+}
+
+const std::string ErasedProgress = "(\r[0-9]+ MiB\r {5,}\r)+";
+
+TEST_F(FollowedLog, ShowsProgressOnATerminalAndErasesItBeforeTheSummary)
+{
+    const std::string screen = ScreenDuringALongLog(folder, {"--summary"});
+    EXPECT_TRUE(
+        std::regex_search(screen, std::regex("^" + ErasedProgress + "Recording\r\n  begin ")))
+        << testing::PrintToString(screen);
+}
+
+TEST_F(FollowedLog, ErasesItsProgressBeforeAMessage)
+{
+    const std::string screen = ScreenDuringALongLog(folder, {"--output", "/dev/null"});
+    EXPECT_TRUE(
+        std::regex_search(screen, std::regex("^" + ErasedProgress + "bdmv-deskplayer: skipped ")))
+        << testing::PrintToString(screen);
 }
 
 TEST_F(FollowedLog, ShowsHowMuchOfTheFilesHasBeenRead)
