@@ -131,7 +131,7 @@ TEST_F(FieldLog, MayHaveLinesOfAnotherKind)
 
 TEST_F(FieldLog, OfAnySizeIsReadInConstantMemory)
 {
-    if (Sanitized) {
+    if (bdmvtest::Sanitized) {
         GTEST_SKIP() << "sanitizers need more memory";
     }
     const std::string log = WriteFile("log", Paused + "x");
