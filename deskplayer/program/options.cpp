@@ -97,9 +97,20 @@ void AddOptions(CLI::App& app, Options& options)
                  "Replace arguments that the recording lacks by neutral values")
         ->needs(replay);
     app.add_option("--format", options.format,
-                   "Output format: text, json (one object per line) or trace (for trace viewers)")
+                   "Output format: text, json (one object per line), trace (for trace viewers) or "
+                   "html (a page for a browser)")
         ->type_name("FORMAT");
     app.add_option("--output", options.output, "File to write; standard output by default")
+        ->check(NotEmpty("the name of a file"))
+        ->type_name("FILE");
+    app.add_option("--compare", options.compare,
+                   "Recording to show beside the callbacks, with --format html: JSON lines, - for "
+                   "standard input")
+        ->check(NotEmpty("the name of a file"))
+        ->type_name("FILE");
+    app.add_option(
+           "--page", options.page,
+           "Page that --format html fills in; by default the one installed with the program")
         ->check(NotEmpty("the name of a file"))
         ->type_name("FILE");
     auto* const listen =
@@ -155,11 +166,12 @@ void AddOptions(CLI::App& app, Options& options)
         "  bdmv-deskplayer disc --only PlayItem,ChapterNumber --format json\n"
         "  bdmv-deskplayer disc --remote\n"
         "  bdmv-deskplayer --field-log player.1.log player.log --format json\n"
-        "  bdmv-deskplayer --replay evening.jsonl --format trace\n\n"
+        "  bdmv-deskplayer --replay evening.jsonl --format trace\n"
+        "  bdmv-deskplayer --replay new.jsonl --compare old.jsonl --format html\n\n"
         "Exit status: 0 success, 1 the output could not be written, 2 incorrect usage, or a\n"
-        "session, recording or log that cannot be read, 3 the disc cannot be read or has faults,\n"
-        "4 the session failed: an expectation was not met or, with --strict, a command was\n"
-        "refused.");
+        "session, recording, log or page that cannot be read, 3 the disc cannot be read or has\n"
+        "faults, 4 the session failed: an expectation was not met or, with --strict, a command\n"
+        "was refused.");
 }
 
 } // namespace deskplayer

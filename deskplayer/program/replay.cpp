@@ -3,8 +3,6 @@
 #include <algorithm>
 #include <chrono>
 #include <filesystem>
-#include <fstream>
-#include <iostream>
 #include <optional>
 #include <system_error>
 #include <thread>
@@ -12,6 +10,7 @@
 #include "navigator/virtualclock.h"
 #include "program/failure.h"
 #include "program/progress.h"
+#include "program/recordingfile.h"
 #include "recording/absence.h"
 #include "recording/recordingreader.h"
 #include "text/printable.h"
@@ -112,26 +111,6 @@ std::string Counted(std::uint64_t count, const std::string& noun)
     return std::to_string(count) + " " + noun + (count == 1 ? "" : "s");
 }
 
-constexpr const char* StandardInput = "-";
-
-/** As messages show it. */
-std::string NameOf(const std::string& recording)
-{
-    return recording == StandardInput ? "standard input" : recording;
-}
-
-std::istream& Open(std::ifstream& file, const std::string& name)
-{
-    if (name == StandardInput) {
-        return std::cin;
-    }
-    file.open(name);
-    if (!file) {
-        throw RecordingError(Printable(name) + ": cannot open recording");
-    }
-    return file;
-}
-
 } // namespace
 
 void ReplayRecording(const Options& options, const OutputSettings& settings, Target& target)
@@ -140,8 +119,8 @@ void ReplayRecording(const Options& options, const OutputSettings& settings, Tar
     if (std::filesystem::equivalent(options.replay, options.output, notBothExist)) {
         throw UsageError("--output: is the recording");
     }
-    std::ifstream file;
-    RecordingReader reader(Open(file, options.replay), NameOf(options.replay));
+    RecordingFile recording(options.replay);
+    RecordingReader reader(recording.Stream(), recording.Name());
     std::ostream& stream = target.Open();
     const VirtualClock unused; // records have times of their own
     std::unique_ptr<Output> output = MakeOutput(settings, stream, unused);
@@ -155,9 +134,9 @@ void ReplayRecording(const Options& options, const OutputSettings& settings, Tar
         throw;
     }
     if (player.Incomplete() != 0 || player.Gaps() != 0) {
-        PrintMessage(Printable(NameOf(options.replay)) + ": " +
-                     Counted(player.Incomplete(), "callback") + " with absent arguments" +
-                     (options.fill ? ", filled; " : "; ") + Counted(player.Gaps(), "gap"));
+        PrintMessage(Printable(recording.Name()) + ": " + Counted(player.Incomplete(), "callback") +
+                     " with absent arguments" + (options.fill ? ", filled; " : "; ") +
+                     Counted(player.Gaps(), "gap"));
     }
 }
 

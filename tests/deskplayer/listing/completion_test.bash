@@ -97,7 +97,7 @@ OffersNoPlayListsWithoutADisc() {
 ExecutesNothingFromTheCommandLine() {
     for word in '$(touch run)' '`touch run`' '"$(touch run)"' 'a[$(touch run)]'; do
         for option in --playlist --describe --session --replay --field-log --format --output \
-            --listen --only --log --log-prefix --l; do
+            --compare --page --listen --only --log --log-prefix --l; do
             complete_words "$word" $option ''
             complete_words $option "$word"
             complete_words $option "PlayItem,$word"
@@ -109,7 +109,7 @@ ExecutesNothingFromTheCommandLine() {
 }
 
 OffersFormats() {
-    expect 'json text trace' --format ''
+    expect 'html json text trace' --format ''
     expect 'text trace' disc --format t
     expect 'json' disc --format = j
 }
@@ -148,6 +148,12 @@ OffersSessionsAndFolders() {
 OffersAnyFileForARecording() {
     expect 'evening.json evening.session' --replay e
     expect '0 12345 8 80 800' --replay evening.json disc --describe ''
+}
+
+OffersAnyFileForAPage() {
+    expect 'evening.json evening.session' --compare e
+    expect 'evening.json evening.session' --page e
+    expect '0 12345 8 80 800' --compare evening.json --page notes.txt disc --describe ''
 }
 
 OffersAnyFileForTheOutput() {
