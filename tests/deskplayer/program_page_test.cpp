@@ -183,6 +183,18 @@ TEST_F(DeskPlayerPage, ContainsTheOtherRecordingAsItWouldBeWrittenAgain)
                Element(recording, "") + Element(other, Paused));
 }
 
+TEST_F(DeskPlayerPage, ContainsAllOfALongOtherRecording)
+{
+    std::string lines;
+    for (int line = 0; line < 2000; ++line) {
+        lines += Paused;
+    }
+    const std::string other = WriteFile("other", lines);
+
+    ExpectPage({"--replay", WriteFile("recording", ""), "--compare", other},
+               Element(folder / "recording", "") + Element(other, lines));
+}
+
 TEST_F(DeskPlayerPage, ContainsBothRecordingsFilledOnDemand)
 {
     const auto line = [](const std::string& arguments) {
@@ -333,12 +345,16 @@ TEST_F(DeskPlayerPage, OfLongRecordingsIsWrittenInConstantMemory)
     }
     const std::string recording = WriteFile("recording", lines);
 
+    const std::string output = folder / "output";
+
     const ProgramResult result =
         RunDeskPlayerWithLimitedMemory({"--replay", recording, "--compare", recording, "--format",
-                                        "html", "--page", page, "--output", "/dev/null"},
+                                        "html", "--page", page, "--output", output},
                                        24 * 1024);
 
     EXPECT_EQ(result.status, 0) << result.errors;
+    EXPECT_TRUE(ReadContents(output) ==
+                Head + Element(recording, lines) + Element(recording, lines) + Tail);
 }
 
 } // namespace
