@@ -42,7 +42,7 @@
  * @property {Lane[]} lanes from top to bottom
  * @property {Span[]} gaps
  * @property {Span[]} folds
- * @property {number} unplaced number of entries without a media time
+ * @property {number} unplaced number of entries without a media time that can be drawn
  */
 
 import { mediaTimes, piecesOf } from './mediatime.js';
@@ -51,8 +51,11 @@ import { foldsOf } from './standby.js';
 import { TicksPerMillisecond, TicksPerSecond } from './ticks.js';
 import { InstantTracks, SliceTracks } from './tracks.js';
 
-/** The timeline library works with dates, which cannot express much more. */
-const MostMilliseconds = 4e15;
+/** The timeline library works with dates. Later times are drawn at this one, about a hundred years. */
+const MostMilliseconds = 3e12;
+
+/** No play list is longer; a later position, such as one from a damaged log, would leave no room for the others. */
+const LastPosition = 100n * 3600n * TicksPerSecond;
 
 /**
  * @param {Recording} recording
@@ -74,7 +77,7 @@ export function analyse(recording) {
 export function labelOf(entry) {
   if (entry.kind === 'gap') {
     const { lost, cause } = entry.values;
-    return lost === undefined ? `${cause}` : `${cause}: ${lost} lost`;
+    return lost === undefined ? `${cause}` : `${cause}: ${lost} missing`;
   }
   return entry.kind === 'start' ? `${entry.values.wallClock}` : entry.name;
 }
@@ -93,6 +96,7 @@ export function sceneOf(analyses, base) {
 
   analyses.forEach((analysis, side) => {
     const { entries } = analysis.recording;
+    const media = analysis.media.map((time) => (time !== null && time <= LastPosition ? time : null));
     /** @type {Map<string, Lane>} */
     const lanes = new Map();
     for (const [track, count] of analysis.counts) {
@@ -104,7 +108,7 @@ export function sceneOf(analyses, base) {
       scene.end = Math.max(scene.end, mark.end);
     };
     for (const slice of analysis.slices) {
-      const pieces = base === 'media' ? piecesOf(slice, entries, analysis.media) : [slice];
+      const pieces = base === 'media' ? piecesOf(slice, entries, media) : [slice];
       for (const { start, end } of pieces) {
         add(slice.track, {
           start: toMilliseconds(start),
@@ -116,7 +120,7 @@ export function sceneOf(analyses, base) {
       }
     }
     for (const entry of entries) {
-      const time = base === 'media' ? analysis.media[entry.index] : entry.ticks;
+      const time = base === 'media' ? media[entry.index] : entry.ticks;
       if (time === null) {
         scene.unplaced += 1;
         continue;
@@ -128,17 +132,30 @@ export function sceneOf(analyses, base) {
         scene.gaps.push({ start: before, end: start, side });
       }
     }
-    if (base === 'session' && analyses.length === 1) {
-      scene.folds = analysis.folds.map(({ start, end }) => (
-        { start: toMilliseconds(start), end: toMilliseconds(end), side }));
-    }
     for (const lane of lanes.values()) {
       lane.marks.sort((one, other) => one.start - other.start);
       scene.lanes.push(lane);
     }
   });
   sortByTrack(scene.lanes);
+  if (base === 'session') {
+    scene.folds = commonFolds(analyses).map(({ start, end }) => (
+      { start: toMilliseconds(start), end: toMilliseconds(end), side: 0 }));
+  }
   return scene;
+}
+
+/**
+ * What is folded in all recordings.
+ * @param {Analysis[]} analyses
+ * @returns {Fold[]}
+ */
+function commonFolds(analyses) {
+  return analyses.map(({ folds }) => folds).reduce((common, folds) => common.flatMap((one) => (
+    folds.map((other) => ({
+      start: one.start > other.start ? one.start : other.start,
+      end: one.end < other.end ? one.end : other.end,
+    })).filter(({ start, end }) => start < end))));
 }
 
 /**

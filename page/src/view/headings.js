@@ -72,7 +72,7 @@ export function showMatches(matches, selected, all) {
 /** @param {Scene} scene */
 export function showNote({ base, unplaced }) {
   get('picture-note', HTMLParagraphElement).textContent = base === 'media' && unplaced > 0
-    ? `${plural(unplaced, 'callback')} without a known media time ${unplaced === 1 ? 'is' : 'are'} only in the table.`
+    ? `${plural(unplaced, 'callback')} without a media time ${unplaced === 1 ? 'is' : 'are'} only in the table.`
     : '';
 }
 

@@ -29,8 +29,9 @@
 
 import { create } from './dom.js';
 
-/** A slice below this width, in pixels, has no label. */
+/** Slices and clusters of slices below these widths, in pixels, have no label. */
 const LabelledSlice = 26;
+const LabelledCluster = 15;
 
 /** Tracks of instants with so few of them that there is room for labels. */
 const Labelled = new Set(['gaps', 'starts']);
@@ -61,9 +62,11 @@ export function toItem(lane, shape, scale, flagsOf) {
     flags.every((flag) => flag.dimmed) ? 'dimmed' : '',
     difference ? `difference ${difference}` : '',
   ];
-  const hasLabel = lane.slices ? shape.end - shape.start >= LabelledSlice * scale : Labelled.has(lane.track);
-  const symbol = difference && (!lane.slices || hasLabel) ? Symbols[difference] : '';
-  const label = single ? (hasLabel ? first.label : '') : String(marks.length);
+  const width = (shape.end - shape.start) / scale;
+  const hasLabel = lane.slices ? width >= (single ? LabelledSlice : LabelledCluster)
+    : !single || Labelled.has(lane.track);
+  const symbol = difference && (hasLabel || !lane.slices) ? Symbols[difference] : '';
+  const label = hasLabel && (single || !symbol) ? (single ? first.label : String(marks.length)) : '';
   const text = [symbol, label].filter(Boolean).join(' ');
   const className = classes.filter(Boolean).join(' ');
   const start = Math.round(shape.start);

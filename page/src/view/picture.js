@@ -16,7 +16,7 @@ import { DataSet } from 'vis-data/esnext';
 import { Timeline } from 'vis-timeline/esnext';
 
 import { Axis } from '../model/axis.js';
-import { layOut } from '../model/layout.js';
+import { Densities, layOut } from '../model/layout.js';
 import { TicksPerMillisecond, formatTime } from '../model/ticks.js';
 import { create } from './dom.js';
 import { mergeSpans, toBackground, toItem } from './items.js';
@@ -24,8 +24,12 @@ import { mergeSpans, toBackground, toItem } from './items.js';
 /** Pixels of a gap or a fold at least. */
 const SpanWidth = 6;
 
-/** Part of the picture that stays free at either end. */
-const Margin = 0.02;
+/** Parts of the picture that stay free before and after the recording. */
+const MarginBefore = 0.02;
+const MarginAfter = 0.04;
+
+/** The library measures each new element, so there must not be too many. */
+const MostElements = 700;
 
 /** The shortest window in milliseconds. */
 const ShortestWindow = 20;
@@ -44,17 +48,23 @@ export class Picture {
     this.flagsOf = () => ({ selected: false, match: false, dimmed: false, difference: null });
     /** @type {(mark: Mark, lane: Lane) => boolean} */
     this.isShown = () => true;
-    /** @type {Map<string, { scale: number, shapes: Shape[] }>} */
+    /** @type {Map<string, Shape[]>} by lane and density, at the scale shapesScale */
     this.shapes = new Map();
+    this.shapesScale = 0;
     /** @type {Map<string, { lane: Lane, shape: Shape }>} */
     this.drawn = new Map();
     this.items = new DataSet(/** @type {Item[]} */ ([]));
     this.groups = new DataSet(/** @type {any[]} */ ([]));
     this.waiting = false;
+    /** The library's own first window is that of no items; drawing waits for it. */
+    this.ready = false;
     const frame = create('div', { 'aria-hidden': 'true' });
     container.append(frame);
     this.timeline = new Timeline(frame, /** @type {any} */ (this.items), this.groups, {
-      onInitialDrawComplete: () => this.fit(), // the library's own first window ignores folds
+      onInitialDrawComplete: () => {
+        this.ready = true;
+        this.fit();
+      },
       height: '100%',
       stack: false,
       selectable: false,
@@ -132,8 +142,8 @@ export class Picture {
 
   fit() {
     const end = Math.max(this.scene?.end ?? 0, 1000);
-    const margin = this.axis.toVisible(end) * Margin;
-    this.setWindow({ start: -margin, end: end + margin });
+    const visible = this.axis.toVisible(end);
+    this.setWindow({ start: -visible * MarginBefore, end: end + visible * MarginAfter });
   }
 
   /** @param {{ start: number, end: number }} window */
@@ -208,7 +218,7 @@ export class Picture {
 
   /** Updates the elements to the current window. */
   draw() {
-    if (!this.scene) {
+    if (!this.scene || !this.ready) {
       return;
     }
     const { start, end } = this.window();
@@ -223,14 +233,10 @@ export class Picture {
     /** @type {Map<string, Item>} */
     const items = new Map();
     this.drawn.clear();
-    for (const lane of this.scene.lanes) {
-      for (const shape of this.shapesOf(lane, scale)) {
-        if (shape.end >= from && shape.start <= to) {
-          const item = toItem(lane, shape, scale, this.flagsOf);
-          items.set(item.id, item);
-          this.drawn.set(item.id, { lane, shape });
-        }
-      }
+    for (const { lane, shape } of this.visibleShapes(scale, from, to)) {
+      const item = toItem(lane, shape, scale, this.flagsOf);
+      items.set(item.id, item);
+      this.drawn.set(item.id, { lane, shape });
     }
     for (const item of this.backgrounds(scale)) {
       items.set(item.id, item);
@@ -239,17 +245,43 @@ export class Picture {
   }
 
   /**
+   * The shapes in a window, as dense as there may be elements.
+   * @param {number} scale
+   * @param {number} from
+   * @param {number} to
+   */
+  visibleShapes(scale, from, to) {
+    /** @type {{ lane: Lane, shape: Shape }[]} */
+    let visible = [];
+    for (let density = 0; density < Densities.length; density += 1) {
+      visible = (this.scene?.lanes ?? []).flatMap((lane) => this.shapesOf(lane, scale, density)
+        .filter((shape) => shape.end >= from && shape.start <= to)
+        .map((shape) => ({ lane, shape })));
+      if (visible.length <= MostElements) {
+        break;
+      }
+    }
+    return visible;
+  }
+
+  /**
    * @param {Lane} lane
    * @param {number} scale
+   * @param {number} density
    */
-  shapesOf(lane, scale) {
-    const cached = this.shapes.get(lane.id);
-    if (cached && Math.abs(cached.scale - scale) < scale * 1e-6) {
-      return cached.shapes;
+  shapesOf(lane, scale, density) {
+    if (Math.abs(this.shapesScale - scale) > scale * 1e-6) {
+      this.shapes.clear();
+      this.shapesScale = scale;
+    }
+    const key = `${density} ${lane.id}`;
+    const cached = this.shapes.get(key);
+    if (cached) {
+      return cached;
     }
     const marks = lane.slices ? lane.marks : lane.marks.filter((mark) => this.isShown(mark, lane));
-    const shapes = layOut({ ...lane, marks }, scale);
-    this.shapes.set(lane.id, { scale, shapes });
+    const shapes = layOut({ ...lane, marks }, scale, density);
+    this.shapes.set(key, shapes);
     return shapes;
   }
 

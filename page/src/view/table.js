@@ -48,8 +48,10 @@ export class Table {
     this.comparing = media.length > 1;
     const columns = this.comparing ? ['Difference', 'Time in A', 'Time in B', 'Callback', 'Arguments']
       : ['Time', 'Media time', 'Interface', 'Callback', 'Arguments'];
+    const minor = this.comparing ? ['Time in B'] : ['Media time', 'Interface'];
     const head = /** @type {HTMLTableSectionElement} */ (this.table.tHead);
-    head.replaceChildren(create('tr', {}, ...columns.map((name) => create('th', { scope: 'col' }, name))));
+    head.replaceChildren(create('tr', {}, ...columns.map((name) => (
+      create('th', { scope: 'col', class: minor.includes(name) ? 'minor' : '' }, name)))));
   }
 
   /**
@@ -140,13 +142,13 @@ export class Table {
       click: () => this.onSelect(index),
     }, entry.kind === 'callback' ? entry.name : `${entry.name}: ${labelOf(entry)}`);
     const cell = (/** @type {Node | string} */ content, kind = '') => create('td', { class: kind }, content);
-    const time = (/** @type {Entry | null} */ one) => cell(one ? formatTime(one.ticks) : '', 'time');
+    const time = (/** @type {Entry | null} */ one, kind = 'time') => cell(one ? formatTime(one.ticks) : '', kind);
     const callback = create('th', { scope: 'row' }, name);
     const classes = [row.difference ?? '', this.isMatch(index) ? 'match' : '', entry.kind].filter(Boolean).join(' ');
     const cells = this.comparing
       ? [cell(row.difference ? `${Symbols[row.difference]} ${DifferenceNames[row.difference]}` : '', 'difference'),
-        time(row.a), time(row.b), callback, cell(this.pairText(row), 'arguments')]
-      : [time(entry), cell(this.mediaText(entry), 'time'), cell(entry.track), callback,
+        time(row.a), time(row.b, 'time minor'), callback, cell(this.pairText(row), 'arguments')]
+      : [time(entry), cell(this.mediaText(entry), 'time minor'), cell(entry.track, 'minor'), callback,
         cell(entry.kind === 'callback' ? argumentsText(entry) : '', 'arguments')];
     return create('tr', { class: classes, 'data-row': String(index), 'aria-current': index === this.selected && 'true' },
       ...cells);
