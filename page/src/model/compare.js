@@ -40,21 +40,38 @@ const keyOf = (entry) => `${entry.kind} ${entry.track} ${entry.name} ${
 const nameOf = (entry) => `${entry.kind} ${entry.track} ${entry.name}`;
 
 /**
- * Replaces keys by small numbers, which compare faster.
+ * The longest common subsequence by a key. Entries whose key the other recording lacks are left out beforehand: they
+ * cost the search most.
  * @param {readonly Entry[]} a
  * @param {readonly Entry[]} b
  * @param {(entry: Entry) => string} key
+ * @returns {[number, number][]} places in a and b
  */
-function numberKeys(a, b, key) {
+function matchByKey(a, b, key) {
+  const keys = [a.map(key), b.map(key)];
   /** @type {Map<string, number>} */
   const numbers = new Map();
-  const numberOf = (/** @type {Entry} */ entry) => {
-    const text = key(entry);
-    const number = numbers.get(text) ?? numbers.size;
-    numbers.set(text, number);
-    return number;
+  const inB = new Set(keys[1]);
+  keys[0].forEach((text) => inB.has(text) && !numbers.has(text) && numbers.set(text, numbers.size));
+  const places = keys.map((texts) => [...texts.keys()].filter((place) => numbers.has(texts[place])));
+  const [codesOfA, codesOfB] = places.map((kept, side) => (
+    Uint32Array.from(kept, (place) => /** @type {number} */ (numbers.get(keys[side][place])))));
+  /** @type {[number, number][]} */
+  const matches = [];
+  let next = 0;
+  let shift = 0;
+  const matchUntil = (/** @type {number} */ end) => {
+    for (; next < end; next += 1) {
+      matches.push([places[0][next], places[1][next + shift]]);
+    }
   };
-  return [Uint32Array.from(a, numberOf), Uint32Array.from(b, numberOf)];
+  for (const [startA, endA, , endB] of diff(codesOfA, codesOfB)) {
+    matchUntil(startA);
+    next = endA;
+    shift = endB - endA;
+  }
+  matchUntil(codesOfA.length);
+  return matches;
 }
 
 /**
@@ -72,21 +89,16 @@ function align(a, b, keys) {
     b.forEach((entry) => pairs.push([null, entry]));
     return pairs;
   }
-  let inA = 0;
-  let inB = 0;
-  const matchUntil = (/** @type {number} */ end) => {
-    for (; inA < end; inA += 1, inB += 1) {
+  let nextA = 0;
+  let nextB = 0;
+  for (const [inA, inB] of [...matchByKey(a, b, key), [a.length, b.length]]) {
+    align(a.slice(nextA, inA), b.slice(nextB, inB), rest).forEach((pair) => pairs.push(pair));
+    if (inA < a.length) {
       pairs.push([a[inA], b[inB]]);
     }
-  };
-  const [numbersOfA, numbersOfB] = numberKeys(a, b, key);
-  for (const [startA, endA, startB, endB] of diff(numbersOfA, numbersOfB)) {
-    matchUntil(startA);
-    align(a.slice(startA, endA), b.slice(startB, endB), rest).forEach((pair) => pairs.push(pair));
-    inA = endA;
-    inB = endB;
+    nextA = inA + 1;
+    nextB = inB + 1;
   }
-  matchUntil(a.length);
   return pairs;
 }
 

@@ -97,7 +97,7 @@ export function mergeSpans(spans, least) {
   for (const span of spans) {
     const end = Math.max(span.end, span.start + least);
     const before = merged.at(-1);
-    if (before && before.side === span.side && span.start <= before.end) {
+    if (before && before.side === span.side && span.start < before.end) {
       before.end = Math.max(before.end, end);
     } else {
       merged.push({ ...span, end });

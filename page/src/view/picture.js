@@ -103,7 +103,8 @@ export class Picture {
 
   /** @param {number} time */
   axisLabel(time) {
-    return formatTime((this.scene?.origin ?? 0n) + BigInt(Math.round(time)) * TicksPerMillisecond).replace(/\.000$/, '');
+    const ticks = (this.scene?.origin ?? 0n) + BigInt(Math.round(time)) * TicksPerMillisecond;
+    return ticks < 0n ? '' : formatTime(ticks).replace(/\.000$/, '');
   }
 
   /**

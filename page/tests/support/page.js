@@ -67,15 +67,12 @@ export class Browser {
    * @param {{ width?: number, height?: number, scheme?: 'light' | 'dark' }} [options]
    */
   async open(html, { width = 1280, height = 900, scheme = 'light' } = {}) {
-    this.pages += 1;
-    const file = join(this.folder, `page${this.pages}.html`);
-    writeFileSync(file, html);
+    const address = this.write(html);
     const page = await this.browser.newPage();
     await page.setViewport({ width, height });
     await page.emulateMediaFeatures([{ name: 'prefers-color-scheme', value: scheme }]);
     const requests = [];
     const messages = [];
-    const address = pathToFileURL(file).href;
     page.on('request', (request) => {
       if (request.url() !== address && !request.url().startsWith('data:')) {
         requests.push(request.url());
@@ -86,6 +83,14 @@ export class Browser {
     await page.goto(address);
     await settle(page);
     return { page, requests, messages };
+  }
+
+  /** @returns {string} the address of a page */
+  write(html) {
+    this.pages += 1;
+    const file = join(this.folder, `page${this.pages}.html`);
+    writeFileSync(file, html);
+    return pathToFileURL(file).href;
   }
 
   async stop() {
