@@ -206,8 +206,8 @@ export class App {
 
   /** @param {number} row @param {number} [side] */
   selectRow(row, side = this.rows[row].a ? 0 : 1) {
-    const entry = /** @type {import('./model/recording.js').Entry} */ (side === 0 ? this.rows[row].a : this.rows[row].b);
-    const lane = this.scene.lanes.find((one) => !one.slices && one.side === side && one.track === entry.track) ?? null;
+    const entry = side === 0 ? this.rows[row].a : this.rows[row].b;
+    const lane = this.scene.lanes.find((one) => !one.slices && one.side === side && one.track === entry?.track) ?? null;
     const mark = lane?.marks.find((one) => one.entry === entry) ?? null;
     this.selection = { row, side, lane, mark, cluster: [] };
     this.showSelection();

@@ -56,14 +56,15 @@ const tableOf = (caption, columns, rows) => create('table', {},
  * @param {(Entry | null)[]} entries one, or a pair
  * @param {readonly string[]} changes
  */
-function argumentsTable(entries, changes) {
+function valuesTable(entries, changes) {
   const names = [...new Set(entries.flatMap((entry) => (
     entry ? [...Object.keys(entry.values), ...entry.absent] : [])))];
   if (names.length === 0) {
     return create('p', {}, 'No arguments.');
   }
+  const caption = entries.some((entry) => entry?.kind === 'callback') ? 'Arguments' : 'Values';
   const columns = entries.length > 1 ? ['Name', 'A', 'B'] : ['Name', 'Value'];
-  return tableOf('Arguments', columns, names.map((name) => [
+  return tableOf(caption, columns, names.map((name) => [
     create('th', { scope: 'row', class: changes.includes(name) ? 'changed' : '' },
       changes.includes(name) ? `≠ ${name}` : name),
     ...entries.map((entry) => valueCell(entry, name)),
@@ -161,7 +162,7 @@ export function showDetails(container, { row, side, mark, cluster }, analyses, o
     title(name),
     row.difference ? create('p', { class: `difference ${row.difference}` }, differenceText(row)) : '',
     list(mark?.slice ? sliceLines(mark, analyses[side]) : entryLines(row, analyses)),
-    argumentsTable(several ? [row.a, row.b] : [entry], row.changes),
+    valuesTable(several ? [row.a, row.b] : [entry], row.changes),
     tagsTable(entry),
     clusterList(cluster, onSelect),
   );

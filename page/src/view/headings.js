@@ -48,7 +48,8 @@ export function showDifferenceCounts(rows) {
   const kinds = /** @type {(keyof typeof counts)[]} */ (Object.keys(counts)).filter((kind) => counts[kind] > 0);
   get('difference-counts', HTMLSpanElement).replaceChildren(
     create('b', {}, all === 0 ? 'No differences' : plural(all, 'difference')),
-    ...kinds.map((kind) => create('span', { class: `difference ${kind}` }, `${Symbols[kind]} ${counts[kind]} ${kind}`)));
+    ...kinds.map((kind) => (
+      create('span', { class: `difference ${kind}` }, `${Symbols[kind]} ${counts[kind]} ${kind}`))));
 }
 
 /**

@@ -79,12 +79,15 @@ export function toItem(lane, shape, scale, flagsOf) {
     type: 'range',
     className,
     content: create('span', {}, text),
-    title: single ? first.label : `${marks.length} ${lane.slices ? 'slices' : 'callbacks'}`,
+    title: single ? escapeMarkup(first.label) : `${marks.length} ${lane.slices ? 'slices' : 'callbacks'}`,
     track: lane.track,
     count: marks.length,
     look: `${end} ${className} ${text}`,
   };
 }
+
+/** The library takes titles as markup. @param {string} text */
+const escapeMarkup = (text) => text.replaceAll('&', '&amp;').replaceAll('<', '&lt;');
 
 /**
  * @param {readonly Span[]} spans in order of their start

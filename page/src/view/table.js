@@ -150,8 +150,8 @@ export class Table {
         time(row.a), time(row.b, 'time minor'), callback, cell(this.pairText(row), 'arguments')]
       : [time(entry), cell(this.mediaText(entry), 'time minor'), cell(entry.track, 'minor'), callback,
         cell(entry.kind === 'callback' ? argumentsText(entry) : '', 'arguments')];
-    return create('tr', { class: classes, 'data-row': String(index), 'aria-current': index === this.selected && 'true' },
-      ...cells);
+    const current = index === this.selected && 'true';
+    return create('tr', { class: classes, 'data-row': String(index), 'aria-current': current }, ...cells);
   }
 
   /** @param {Entry} entry */

@@ -95,7 +95,8 @@ test('gaps are hatched and name their cause and number', async () => {
   const { page } = await open(toText([start(0, '2024-05-31 20:15:00'), line(0, 'PlayStarted'), gap(30, 'lost', 12),
     line(30, 'Paused'), gap(60, 'restart'), line(60, 'PlayStarted'), line(90, 'Stopped')]));
   assert.equal((await page.$$('#picture .vis-item.gap')).length, 2);
-  assert.match(await page.$eval('#picture .vis-item.gap', (item) => getComputedStyle(item).backgroundImage), /repeating/);
+  const background = await page.$eval('#picture .vis-item.gap', (item) => getComputedStyle(item).backgroundImage);
+  assert.match(background, /repeating/);
   assert.deepEqual(await page.$$eval('#picture .vis-item.on-gaps', (items) => items.map((item) => item.textContent)),
     ['lost: 12 missing', 'restart']);
   assert.deepEqual(await page.$$eval('#picture .vis-item.on-starts', (items) => items.map((item) => item.textContent)),
@@ -109,7 +110,8 @@ test('gaps are hatched and name their cause and number', async () => {
 
 test('lines that cannot be read are reported with their numbers, and the others are shown', async () => {
   const broken = new Array(7).fill('{"ticks":\n').join('');
-  const { page, messages } = await open(`${toText([line(0, 'Paused')])}not json\n${broken}${toText([line(9, 'Stopped')])}`);
+  const [first, last] = [line(0, 'Paused'), line(9, 'Stopped')].map((one) => toText([one]));
+  const { page, messages } = await open(`${first}not json\n${broken}${last}`);
   const notice = await textIn(page, '#notices');
   assert.match(notice, /evening\.session: 8 lines cannot be read\./);
   assert.match(notice, /line 2: /);
@@ -143,7 +145,8 @@ test('text from recordings is never markup', async () => {
     line(9, 'Stopped'),
   ]), evil);
   await page.click('#table tbody button');
-  await page.hover('#picture .vis-item.on-play-item');
+  await page.hover('#picture .vis-item.on-play-mode');
+  await page.waitForFunction(() => document.querySelector('.vis-tooltip')?.textContent.includes('onerror'));
   assert.equal(await textIn(page, 'h1'), evil);
   assert.match(await textIn(page, '#details'), /onerror/);
   assert.equal((await page.$$('img')).length, 0);

@@ -55,7 +55,8 @@ test('the table shows both, row by row, with what differs', async () => {
 
 test('the picture has both recordings on each track, and marks differences', async () => {
   const { page } = await open(toText(first), toText(second));
-  assert.deepEqual(await page.$$eval('#picture .lane', (lanes) => lanes.slice(0, 4).map(({ textContent }) => textContent)),
+  const lanes = await page.$$eval('#picture .lane', (all) => all.map(({ textContent }) => textContent));
+  assert.deepEqual(lanes.slice(0, 4),
     ['playbackA3', 'playbackB4', 'audioA1', 'audioB1']);
   for (const kind of ['added', 'missing', 'changed', 'moved']) {
     assert.ok(await page.$(`#picture .vis-item.instant.difference.${kind}`), kind);

@@ -161,7 +161,8 @@ test('media time places callbacks at their positions', async () => {
 });
 
 test('callbacks without a media time are counted below the picture', async () => {
-  const { page } = await open(toText([line(0, 'PlayStarted'), line(1, 'Paused'), position(2, 5), line(3, 'Continued')]));
+  const { page } = await open(toText([line(0, 'PlayStarted'), line(1, 'Paused'), position(2, 5),
+    line(3, 'Continued')]));
   await page.click('input[value=media]');
   await settle(page);
   assert.equal(await textIn(page, '#picture-note'), '2 callbacks without a media time are only in the table.');

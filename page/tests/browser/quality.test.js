@@ -87,7 +87,7 @@ const axe = await readFile(createRequire(import.meta.url).resolve('axe-core/axe.
 async function violations(page) {
   const result = await page.evaluate(`${axe}; axe.run()`);
   return result.violations.filter(({ impact }) => impact === 'serious' || impact === 'critical')
-    .map(({ id, nodes }) => `${id}: ${nodes.map(({ html, failureSummary }) => `${html} ${failureSummary}`).join('; ')}`);
+    .flatMap(({ id, nodes }) => nodes.map(({ html, failureSummary }) => `${id}: ${html} ${failureSummary}`));
 }
 
 for (const scheme of ['light', 'dark']) {
@@ -119,7 +119,8 @@ for (const scheme of ['light', 'dark']) {
 }
 
 test('nothing is wider than a narrow window', async () => {
-  const { page } = await browser.open(pageWith([{ name: 'evening', lines: runSession('evening', 'json') }]), { width: 360 });
+  const html = pageWith([{ name: 'evening', lines: runSession('evening', 'json') }]);
+  const { page } = await browser.open(html, { width: 360 });
   assert.ok(await page.evaluate(() => document.documentElement.scrollWidth <= window.innerWidth));
   await page.close();
 });

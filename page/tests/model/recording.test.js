@@ -59,7 +59,8 @@ test('a member tags is kept', () => {
 });
 
 test('gaps and starts have tracks of their own', () => {
-  assert.deepEqual(entriesOf([start(0, '2024-05-31'), gap(1, 'lost', 2)]).map(({ track }) => track), ['starts', 'gaps']);
+  const entries = entriesOf([start(0, '2024-05-31'), gap(1, 'lost', 2)]);
+  assert.deepEqual(entries.map(({ track }) => track), ['starts', 'gaps']);
 });
 
 test('values are text for people', () => {

@@ -22,8 +22,8 @@ test('the end of playback leaves streams selected', () => {
 });
 
 test('the number 0 ends a slice and begins none', () => {
-  assert.deepEqual(namesOn('chapter', [line(0, 'ChapterNumber', { chapter: 2 }), line(1, 'ChapterNumber', { chapter: 0 })]),
-    ['chapter 2']);
+  const chapter = (seconds, number) => line(seconds, 'ChapterNumber', { chapter: number });
+  assert.deepEqual(namesOn('chapter', [chapter(0, 2), chapter(1, 0)]), ['chapter 2']);
 });
 
 test('play items are numbered from 0', () => {

@@ -17,7 +17,8 @@ test('media time is the position reported last', () => {
 });
 
 test('before the first position media time is that of the same time', () => {
-  assert.deepEqual(mediaOf([line(0, 'PlayStarted'), line(0, 'Playlist', { playListId: 1 }), position(0, 7)]), [7, 7, 7]);
+  const play = [line(0, 'PlayStarted'), line(0, 'Playlist', { playListId: 1 })];
+  assert.deepEqual(mediaOf([...play, position(0, 7)]), [7, 7, 7]);
   assert.deepEqual(mediaOf([line(0, 'PlayStarted'), position(1, 7)]), [null, 7]);
 });
 

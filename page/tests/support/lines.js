@@ -20,7 +20,8 @@ export const line = (seconds, callback, values = {}, more = {}) => ({
 /** The position that playback has reached, at times and positions in seconds. */
 export const position = (seconds, media) => line(seconds, 'CurrentTimePosition', { position: media * 45000 });
 
-export const gap = (seconds, cause, lost) => ({ ticks: seconds * 45000, gap: lost === undefined ? { cause } : { lost, cause } });
+export const gap = (seconds, cause, lost) => (
+  { ticks: seconds * 45000, gap: lost === undefined ? { cause } : { lost, cause } });
 
 export const start = (seconds, wallClock) => ({ ticks: seconds * 45000, start: { wallClock } });
 
