@@ -19,6 +19,7 @@ import { Axis } from '../model/axis.js';
 import { Densities, layOut } from '../model/layout.js';
 import { TicksPerMillisecond, formatTime } from '../model/ticks.js';
 import { create } from './dom.js';
+import { Gestures } from './gestures.js';
 import { mergeSpans, toBackground, toItem } from './items.js';
 
 /** Pixels of a gap or a fold at least. */
@@ -30,6 +31,9 @@ const MarginAfter = 0.04;
 
 /** The library measures each new element, so there must not be too many. */
 const MostElements = 700;
+
+/** The longest window shows the recording so many times. */
+const MostOverview = 2;
 
 /** The shortest window in milliseconds. */
 const ShortestWindow = 20;
@@ -75,9 +79,7 @@ export class Picture {
       margin: { axis: 0, item: { horizontal: 0, vertical: 2 } },
       groupOrder: 'order',
       verticalScroll: true,
-      horizontalScroll: true,
-      horizontalScrollKey: 'shiftKey',
-      zoomKey: 'ctrlKey',
+      moveable: false, // view/gestures.js
       zoomMin: ShortestWindow,
       zoomMax: 1e16,
       dataAttributes: ['track', 'count'],
@@ -87,9 +89,10 @@ export class Picture {
     this.timeline.on('rangechange', () => this.scheduleDraw());
     this.timeline.on('rangechanged', () => this.scheduleDraw());
     this.timeline.on('changed', () => this.scheduleDraw());
+    const gestures = new Gestures(this);
     this.timeline.on('click', (event) => {
       const hit = this.drawn.get(event.item);
-      if (hit) {
+      if (hit && !gestures.dragged) {
         onSelect(hit.lane, hit.shape.marks);
       }
     });
@@ -147,10 +150,24 @@ export class Picture {
     this.setWindow({ start: -visible * MarginBefore, end: end + visible * MarginAfter });
   }
 
-  /** @param {{ start: number, end: number }} window */
+  /**
+   * Shows a part of the axis, moved so that something of the recording remains visible.
+   * @param {{ start: number, end: number }} window
+   */
   setWindow({ start, end }) {
-    this.timeline.setWindow(start, Math.max(end, start + ShortestWindow), { animation: false });
+    const all = this.axis.toVisible(Math.max(this.scene?.end ?? 0, 1000));
+    const from = this.axis.toVisible(start);
+    const length = Math.min(Math.max(this.axis.toVisible(end) - from, ShortestWindow), all * MostOverview);
+    const least = Math.min(Math.max(from, -length / 2), all - length / 2);
+    this.timeline.setWindow(this.axis.fromVisible(least), this.axis.fromVisible(least + length), { animation: false });
     this.draw();
+  }
+
+  /** @param {number} fraction of the window */
+  timeAt(fraction) {
+    const { start, end } = this.window();
+    const from = this.axis.toVisible(start);
+    return this.axis.fromVisible(from + (this.axis.toVisible(end) - from) * fraction);
   }
 
   /** @returns {{ start: number, end: number }} */
@@ -165,8 +182,7 @@ export class Picture {
    */
   zoom(factor, centre) {
     const { start, end } = this.window();
-    const middle = this.axis.fromVisible((this.axis.toVisible(start) + this.axis.toVisible(end)) / 2);
-    const at = centre !== undefined && centre >= start && centre <= end ? centre : middle;
+    const at = centre !== undefined && centre >= start && centre <= end ? centre : this.timeAt(0.5);
     this.setWindow(this.axis.zoom(start, end, factor, at));
   }
 

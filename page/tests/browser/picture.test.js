@@ -168,3 +168,48 @@ test('callbacks without a media time are counted below the picture', async () =>
   assert.equal(await textIn(page, '#picture-note'), '2 callbacks without a media time are only in the table.');
   await page.close();
 });
+
+test('dragging scrolls and is no click', async () => {
+  const { page } = await open(evening);
+  const whole = await axisText(page);
+  await page.mouse.move(700, 300);
+  await page.mouse.down();
+  await page.mouse.move(400, 300, { steps: 4 });
+  await page.mouse.up();
+  await settle(page);
+  const moved = await axisText(page);
+  assert.ok(whole.includes('00:00:00'));
+  assert.ok(!moved.includes('00:00:00') && moved.includes('08:02:00'), `${moved}`);
+  assert.equal(await textIn(page, '#details h2'), 'Details');
+  await page.close();
+});
+
+test('the wheel zooms with Ctrl, scrolls with Shift, and otherwise scrolls the page', async () => {
+  const { page } = await open(evening, { width: 480, height: 700 });
+  const turn = async (deltaY, key) => {
+    const first = () => page.$eval('#picture .vis-item.on-play-list', (item) => item.style.transform + item.style.width);
+    const old = await first();
+    await page.keyboard.down(key);
+    await page.mouse.wheel({ deltaY });
+    while (await first() === old) {
+      await settle(page);
+    }
+    await page.keyboard.up(key);
+  };
+  await page.mouse.move(300, 400);
+  await turn(-400, 'Control');
+  await turn(200, 'Shift');
+  assert.equal(await page.evaluate(() => window.scrollY), 0);
+  await page.mouse.wheel({ deltaY: 200 });
+  await page.waitForFunction(() => window.scrollY > 0);
+  await page.close();
+});
+
+test('a double click enlarges what is under it', async () => {
+  const { page } = await open(evening);
+  await page.click('#picture .vis-item.on-subtitles', { count: 2 });
+  await settle(page);
+  const width = await page.$eval('#picture .vis-item.on-subtitles', (item) => item.clientWidth);
+  assert.ok(width > 800, `${width}`);
+  await page.close();
+});
