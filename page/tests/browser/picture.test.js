@@ -187,7 +187,7 @@ test('dragging scrolls and is no click', async () => {
 test('the wheel zooms with Ctrl, scrolls with Shift, and otherwise scrolls the page', async () => {
   const { page } = await open(evening, { width: 480, height: 700 });
   const turn = async (deltaY, key) => {
-    const first = () => page.$eval('#picture .vis-item.on-play-list', (item) => item.style.transform + item.style.width);
+    const first = () => page.$eval('#picture .vis-item.on-play-list', ({ style }) => style.transform + style.width);
     const old = await first();
     await page.keyboard.down(key);
     await page.mouse.wheel({ deltaY });
