@@ -34,11 +34,12 @@
  * or a destructor runs, so each of them may call Post(), Close() and GetCounters(). They must not
  * dispatch: DispatchNext() and Run() throw there.
  *
- * Locking. Most calls of Post() and DispatchNext() take no lock. The queue's mutex is taken by a
- * Post() that wakes Run(), raises Counters::mostAtOnce or is refused, by one whose constructor
- * throws and by one that uses the place this leaves; by the deliverer before it blocks, and each
- * time it has dispatched as many events as there are places; by Close(); and by GetCounters(). All
- * hold it for a few instructions, except GetCounters(), which counts the queued events under it.
+ * Locking. Most calls of Post() and DispatchNext() take no lock. A Post() that meets another one
+ * lets it go first for about a microsecond. The queue's mutex is taken by a Post() that wakes
+ * Run(), raises Counters::mostAtOnce or is refused, by one whose constructor throws and by one that
+ * uses the place this leaves; by the deliverer before it blocks, and each time it has dispatched as
+ * many events as there are places; by Close(); and by GetCounters(). All hold it for a few
+ * instructions, except GetCounters(), which counts the queued events under it.
  *
  * Exceptions. What a callback throws leaves DispatchNext() and Run() after the event has been
  * destroyed; the next call continues with the next event. What a constructor throws leaves Post(),
@@ -114,7 +115,9 @@ public:
     {
         static_assert(std::is_convertible<Event*, INavigatorEvent*>::value,
                       "the queue delivers classes derived from INavigatorEvent");
-        static_assert(sizeof(Event) <= LargestEvent && alignof(Event) <= alignof(std::max_align_t),
+        static_assert(sizeof(Event) <= LargestEvent,
+                      "the event does not fit in a place of the queue");
+        static_assert(alignof(Event) <= alignof(std::max_align_t),
                       "the event does not fit in a place of the queue");
         const PlaceNumber place = TakePlace();
         if (place == NoPlace) {

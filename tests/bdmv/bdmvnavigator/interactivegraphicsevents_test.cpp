@@ -35,7 +35,7 @@ void HasAButtonPending(Context& context)
     context.executeButtonId = 65535;
 }
 
-const Scenario scenarios[] = {
+const Scenario interactiveGraphicsScenarios[] = {
     Notification<bdmv::InteractiveGraphicsVisibleEvent>("Sending InteractiveGraphicsVisible",
                                                         "InteractiveGraphicsVisible()"),
     Notification<bdmv::InteractiveGraphicsInvisibleEvent>("Sending InteractiveGraphicsInvisible",
@@ -75,8 +75,8 @@ const Scenario scenarios[] = {
          Fired("ExecuteButton(0, 0, no program)")},
 };
 
-INSTANTIATE_TEST_SUITE_P(InteractiveGraphics, EventScenario, testing::ValuesIn(scenarios),
-                         EventScenario::Name);
+INSTANTIATE_TEST_SUITE_P(InteractiveGraphics, EventScenario,
+                         testing::ValuesIn(interactiveGraphicsScenarios), EventScenario::Name);
 
 class ButtonExecution : public EventTest
 {

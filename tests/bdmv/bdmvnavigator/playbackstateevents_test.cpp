@@ -24,7 +24,7 @@ std::function<void(Context&)> FinishesFor(int reason)
 
 const std::string assertion = "assert: false, bdmv/bdmvnavigator/navigatorevent.cpp:885\n";
 
-const Scenario scenarios[] = {
+const Scenario playbackStateScenarios[] = {
     Notification<bdmv::PlayStartedEvent>("Sending PlayStarted", "PlayStarted()"),
     Notification<bdmv::FirstPictureDeliveredEvent>("Sending FirstPictureDeliveredEvent",
                                                    "FirstPictureDelivered()"),
@@ -89,7 +89,7 @@ const Scenario scenarios[] = {
          Fired("Finished(EndOfMedia)")},
 };
 
-INSTANTIATE_TEST_SUITE_P(PlaybackState, EventScenario, testing::ValuesIn(scenarios),
+INSTANTIATE_TEST_SUITE_P(PlaybackState, EventScenario, testing::ValuesIn(playbackStateScenarios),
                          EventScenario::Name);
 
 class PlaybackStateEvents : public EventTest

@@ -8,7 +8,7 @@ namespace
 
 bd::UInt8 resumeData[] = {1, 2, 3};
 
-const Scenario scenarios[] = {
+const Scenario systemSuspendScenarios[] = {
     {"SystemSuspended", New<bdmv::SystemSuspendedEvent>(),
      [](Context& context) {
          context.systemResumeData = {resumeData, 3};
@@ -46,7 +46,7 @@ const Scenario scenarios[] = {
          Queried("CleanupSystemResumeData()")},
 };
 
-INSTANTIATE_TEST_SUITE_P(SystemSuspend, EventScenario, testing::ValuesIn(scenarios),
+INSTANTIATE_TEST_SUITE_P(SystemSuspend, EventScenario, testing::ValuesIn(systemSuspendScenarios),
                          EventScenario::Name);
 
 class SystemSuspension : public EventTest

@@ -24,7 +24,7 @@ const std::string markPassed = Queried("GetCurrentPLMarkId(18446744073709551615)
                                Logged("Sending MarkInfo - markId: 5, time: 6000000000") +
                                Fired("MarkInfo(800, 5, 6000000000)");
 
-const Scenario scenarios[] = {
+const Scenario titlePositionScenarios[] = {
     {"Playlist", New<bdmv::PlaylistEvent>(), [](Context& context) { context.playListId = 800; },
      Queried("GetPlayListId() -> 800") + Logged("Sending Playlist - playListId: 800") +
          Fired("Playlist(800)")},
@@ -74,7 +74,7 @@ const Scenario scenarios[] = {
          Fired("MarkInfo(800, 65535, 18446744073709551615)")},
 };
 
-INSTANTIATE_TEST_SUITE_P(TitlePosition, EventScenario, testing::ValuesIn(scenarios),
+INSTANTIATE_TEST_SUITE_P(TitlePosition, EventScenario, testing::ValuesIn(titlePositionScenarios),
                          EventScenario::Name);
 
 /** A secondary stream in the current and the previous play item, and the notification sent. */

@@ -223,13 +223,13 @@ std::function<void(Context&)> Plays(PlayDirectionDef direction, PlaySpeedDef spe
     };
 }
 
-const std::string pipAvailable =
+const std::string playsPip =
     Logged("For normal play notify async pip available") + Fired("PictureInPictureAvailable()");
-const std::string audioAvailable =
+const std::string playsAudio =
     Logged("For normal play notify async 2ndaud available") + Fired("SecondaryAudioAvailable()");
-const std::string pipUnavailable =
+const std::string stopsPip =
     Logged("For speed play notify async pip unavailable") + Fired("PictureInPictureUnavailable()");
-const std::string audioUnavailable =
+const std::string stopsAudio =
     Logged("For speed play notify async 2ndaud unavailable") + Fired("SecondaryAudioUnavailable()");
 
 const std::string normalPlay =
@@ -252,13 +252,13 @@ const Scenario playModeScenarios[] = {
      normalPlay + AsyncFlags("false, false, false, false")},
     {"NormalPlayWithAsyncVideo", New<bdmv::PlayModeEvent>(),
      Plays(PlayDirectionForward, PlaySpeedNormal, true, false),
-     normalPlay + AsyncFlags("true, false, false, false") + pipAvailable},
+     normalPlay + AsyncFlags("true, false, false, false") + playsPip},
     {"NormalPlayWithAsyncAudio", New<bdmv::PlayModeEvent>(),
      Plays(PlayDirectionForward, PlaySpeedNormal, false, true),
-     normalPlay + AsyncFlags("false, true, false, false") + audioAvailable},
+     normalPlay + AsyncFlags("false, true, false, false") + playsAudio},
     {"NormalPlayWithAsyncVideoAndAudio", New<bdmv::PlayModeEvent>(),
      Plays(PlayDirectionForward, PlaySpeedNormal, true, true),
-     normalPlay + AsyncFlags("true, true, false, false") + pipAvailable + audioAvailable},
+     normalPlay + AsyncFlags("true, true, false, false") + playsPip + playsAudio},
     {"NormalPlayWithPreviousStreamsOnly", New<bdmv::PlayModeEvent>(),
      Plays(PlayDirectionForward, PlaySpeedNormal, false, false, true),
      normalPlay + AsyncFlags("false, false, true, true")},
@@ -267,13 +267,13 @@ const Scenario playModeScenarios[] = {
      fastPlay + AsyncFlags("false, false, false, false")},
     {"FastPlayWithAsyncVideo", New<bdmv::PlayModeEvent>(),
      Plays(PlayDirectionForward, PlaySpeedFast1, true, false),
-     fastPlay + AsyncFlags("true, false, false, false") + pipUnavailable},
+     fastPlay + AsyncFlags("true, false, false, false") + stopsPip},
     {"FastPlayWithAsyncAudio", New<bdmv::PlayModeEvent>(),
      Plays(PlayDirectionForward, PlaySpeedFast1, false, true),
-     fastPlay + AsyncFlags("false, true, false, false") + audioUnavailable},
+     fastPlay + AsyncFlags("false, true, false, false") + stopsAudio},
     {"FastPlayWithAsyncVideoAndAudio", New<bdmv::PlayModeEvent>(),
      Plays(PlayDirectionForward, PlaySpeedFast1, true, true),
-     fastPlay + AsyncFlags("true, true, false, false") + pipUnavailable + audioUnavailable},
+     fastPlay + AsyncFlags("true, true, false, false") + stopsPip + stopsAudio},
     {"FastPlayWithPreviousStreamsOnly", New<bdmv::PlayModeEvent>(),
      Plays(PlayDirectionForward, PlaySpeedFast1, false, false, true),
      fastPlay + AsyncFlags("false, false, true, true")},
@@ -282,7 +282,7 @@ const Scenario playModeScenarios[] = {
      Queried("GetCurrentPlayMode() -> (PlayDirectionBackward, PlaySpeedNormal)") +
          Logged("Sending PlayMode - direction: 1, speedIndex: 5") +
          Fired("PlayMode(PlayDirectionBackward, PlaySpeedNormal)") +
-         AsyncFlags("true, true, false, false") + pipAvailable + audioAvailable},
+         AsyncFlags("true, true, false, false") + playsPip + playsAudio},
     {"AsyncFlagsUntouched", New<bdmv::PlayModeEvent>(),
      [](Context& context) {
          Plays(PlayDirectionForward, PlaySpeedNormal, true, true)(context);
@@ -305,14 +305,13 @@ TEST_F(PlayModeEvents, WithdrawsAsyncStreamsAtEverySpeedButNormal)
             const PlayMode mode(direction, static_cast<PlaySpeedDef>(speed));
             Plays(mode.Direction(), mode.Speed(), true, true)(context);
 
-            EXPECT_EQ(Dispatch<bdmv::PlayModeEvent>(),
-                      Queried("GetCurrentPlayMode() -> " + Describe(mode)) +
-                          Logged("Sending PlayMode - direction: " + std::to_string(direction) +
-                                 ", speedIndex: " + std::to_string(speed)) +
-                          Fired("PlayMode" + Describe(mode)) +
-                          AsyncFlags("true, true, false, false") +
-                          (speed == PlaySpeedNormal ? pipAvailable + audioAvailable
-                                                    : pipUnavailable + audioUnavailable));
+            EXPECT_EQ(
+                Dispatch<bdmv::PlayModeEvent>(),
+                Queried("GetCurrentPlayMode() -> " + Describe(mode)) +
+                    Logged("Sending PlayMode - direction: " + std::to_string(direction) +
+                           ", speedIndex: " + std::to_string(speed)) +
+                    Fired("PlayMode" + Describe(mode)) + AsyncFlags("true, true, false, false") +
+                    (speed == PlaySpeedNormal ? playsPip + playsAudio : stopsPip + stopsAudio));
         }
     }
 }
@@ -324,7 +323,7 @@ TEST_F(PlayModeEvents, DecidesByTheReportedSpeedAndTheLaterFlags)
     c.onCallback = [this](const std::string&) { context.async2ndVid = true; };
 
     EXPECT_EQ(Dispatch<bdmv::PlayModeEvent>(),
-              normalPlay + AsyncFlags("true, false, false, false") + pipAvailable);
+              normalPlay + AsyncFlags("true, false, false, false") + playsPip);
 }
 
 TEST_F(PlayModeEvents, QueriesTheFlagsOnce)
@@ -337,7 +336,7 @@ TEST_F(PlayModeEvents, QueriesTheFlagsOnce)
     };
 
     EXPECT_EQ(Dispatch<bdmv::PlayModeEvent>(),
-              normalPlay + AsyncFlags("true, true, false, false") + pipAvailable + audioAvailable);
+              normalPlay + AsyncFlags("true, true, false, false") + playsPip + playsAudio);
 }
 
 TEST_F(PlayModeEvents, AllowsListChangesBetweenItsCallbacks)

@@ -15,7 +15,7 @@ const Fault OfAFile = {"disc\n/BDMV/index.bdmv", std::nullopt, "No such file or 
                        "a file"};
 const Fault OfAFolder = {"index.bdmv", std::nullopt, "", "a regular file"};
 
-std::string TextOf(const Fault& fault)
+std::string LineOf(const Fault& fault)
 {
     std::ostringstream output;
     WriteFault(output, fault);
@@ -31,11 +31,11 @@ std::string JsonOf(const Fault& fault)
 
 TEST(FaultOutput, IsALineOfText)
 {
-    EXPECT_EQ(TextOf(AtAnOffset),
+    EXPECT_EQ(LineOf(AtAnOffset),
               "BDMV/index.bdmv: offset 84: movie object of title 1 is 9, but expected below 3\n");
-    EXPECT_EQ(TextOf(OfAFile),
+    EXPECT_EQ(LineOf(OfAFile),
               "disc\\x0A/BDMV/index.bdmv: No such file or directory, expected a file\n");
-    EXPECT_EQ(TextOf(OfAFolder), "index.bdmv: expected a regular file\n");
+    EXPECT_EQ(LineOf(OfAFolder), "index.bdmv: expected a regular file\n");
 }
 
 TEST(FaultOutput, IsALineOfJson)

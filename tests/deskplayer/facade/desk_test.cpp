@@ -10,6 +10,7 @@
 
 #include "bdmvnavigator/navigatorlisteneradapter.h"
 #include "deskplayer/session.h"
+#include "sampledisc.h"
 
 namespace deskplayer
 {
@@ -19,7 +20,7 @@ namespace
 
 namespace fs = std::filesystem;
 
-const char* const SampleDisc = BDMVNAVIGATOR_SAMPLE_DISC;
+using bdmvtest::SampleDisc;
 
 TEST(Desk, PlaysTheLongestPlayListUnlessANumberIsGiven)
 {

@@ -8,6 +8,7 @@
 #include <vector>
 
 #include "deskplayer/session.h"
+#include "sampledisc.h"
 
 namespace deskplayer
 {
@@ -15,7 +16,7 @@ namespace deskplayer
 namespace
 {
 
-const char* const SampleDisc = BDMVNAVIGATOR_SAMPLE_DISC;
+using bdmvtest::SampleDisc;
 
 /** What an output writes of a pause, a stop and the callbacks before them. */
 std::string WrittenWith(const OutputOptions& options)

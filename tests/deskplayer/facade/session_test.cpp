@@ -10,6 +10,7 @@
 
 #include "bdmvnavigator/navigatorlisteneradapter.h"
 #include "deskplayer/output.h"
+#include "sampledisc.h"
 
 namespace deskplayer
 {
@@ -19,7 +20,7 @@ namespace
 
 using Lines = std::vector<std::string>;
 
-const char* const SampleDisc = BDMVNAVIGATOR_SAMPLE_DISC;
+using bdmvtest::SampleDisc;
 
 /** Play list 2 of the sample disc, which lasts 20 s. */
 class SessionOnADesk : public testing::Test

@@ -8,6 +8,7 @@
 #include <cstddef>
 #include <vector>
 
+#include "callbackqueuebench.h"
 #include "stream.h"
 
 namespace
@@ -22,14 +23,6 @@ using bdmvtest::Stream;
 /** The largest block that the queues of this test keep; blocks of these streams have one byte more.
  */
 constexpr std::size_t LargestBlock = 3;
-
-bdmv::QueuedListener::Options OptionsOf(std::size_t places)
-{
-    bdmv::QueuedListener::Options options;
-    options.places = places;
-    options.largestBlock = LargestBlock;
-    return options;
-}
 
 /** Receives callbacks of a resync for a follower. */
 class Repetition : public bdmv::CallbackListener
@@ -48,7 +41,8 @@ class Run
 {
 public:
     Run(const Stream& stream, std::size_t places)
-        : m_rStream(stream), m_Places(places), m_Queue(OptionsOf(places)), m_Follower(stream)
+        : m_rStream(stream), m_Places(places), m_Queue(bdmvtest::OptionsOf(places, LargestBlock)),
+          m_Follower(stream)
     {
     }
 

@@ -40,10 +40,10 @@ private:
 };
 
 /** Its constructor may throw. */
-class UnreliableEvent : public NumberedEvent
+class UnreliableNumberedEvent : public NumberedEvent
 {
 public:
-    UnreliableEvent(std::vector<Delivered>& delivered, Delivered self, bool fails)
+    UnreliableNumberedEvent(std::vector<Delivered>& delivered, Delivered self, bool fails)
         : NumberedEvent(delivered, self)
     {
         if (fails) {
@@ -208,11 +208,12 @@ TEST_F(EventQueueThreads, LoseNoPlaceToConstructorsThatThrow)
             for (int number = 0; number < EventsEach; ++number) {
                 for (bool taken = false; !taken;) {
                     try {
-                        queue.Post<UnreliableEvent>(delivered, Delivered{producer, number}, true);
+                        queue.Post<UnreliableNumberedEvent>(delivered, Delivered{producer, number},
+                                                            true);
                     } catch (const std::runtime_error&) {
                     }
-                    taken =
-                        queue.Post<UnreliableEvent>(delivered, Delivered{producer, number}, false);
+                    taken = queue.Post<UnreliableNumberedEvent>(delivered,
+                                                                Delivered{producer, number}, false);
                     std::this_thread::yield();
                 }
             }
