@@ -8,7 +8,8 @@ import { pathOf } from '../support/page.js';
 const press = (key, more = {}) => ({ key, shiftKey: false, altKey: false, ctrlKey: false, metaKey: false, ...more });
 
 test('docs/timeline.md lists every key', () => {
-  const rows = [...readFileSync(pathOf('docs/timeline.md'), 'utf8').matchAll(/^\| (.+) \| (?:picture|both) \| .+ \|$/gm)];
+  const text = readFileSync(pathOf('docs/timeline.md'), 'utf8');
+  const rows = [...text.matchAll(/^\| (.+) \| (?:picture|both) \| .+ \|$/gm)];
   const documented = rows.flatMap(([, keys]) => keys.split(/[ ,]+/));
   for (const { shown } of Keys) {
     for (const part of shown.split(' ')) {
