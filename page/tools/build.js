@@ -28,6 +28,7 @@ async function bundle(entry) {
     minify: true,
     write: false,
     format: 'iife',
+    tsconfigRaw: {}, // whatever lies in the folders above
     target: ['chrome111', 'firefox115', 'safari16.4'],
     charset: 'ascii',
     legalComments: 'inline',

@@ -78,6 +78,11 @@ test('a shift within the tolerance is none', () => {
   assert.deepEqual(differences([play, pause], [play, line(5.09, 'Paused')]), [null, null]);
 });
 
+test('equal arguments are aligned before equal names', () => {
+  const all = [0, 1, 2, 3].map((second) => position(second, second));
+  assert.deepEqual(differences(all, [all[0], all[2], all[3]]), [null, 'missing', null, null]);
+});
+
 test('differences are counted by kind', () => {
   const pairs = compare(entriesOf([play, pause, stop]), entriesOf([play, line(2, 'StillOn'), stop]));
   assert.deepEqual(countDifferences(pairs), { added: 1, missing: 1, changed: 0, moved: 0 });
