@@ -11,34 +11,34 @@
 namespace
 {
 
-const fs::path SampleLogs = BDMVNAVIGATOR_SAMPLE_LOGS;
+const fs::path SampleLogFolder = BDMVNAVIGATOR_SAMPLE_LOGS;
 
-const std::string Head = "<!DOCTYPE html>\n<p>no <!--recordings--> here</p>\n";
-const std::string Tail = "\n</html>\n";
+const std::string PageHead = "<!DOCTYPE html>\n<p>no <!--recordings--> here</p>\n";
+const std::string PageTail = "\n</html>\n";
 
-const std::string Paused =
+const std::string PausedLine =
     R"({"ticks":45000,"time":"00:00:01.000","interface":"control","callback":"Paused","arguments":{}})"
     "\n";
-const std::string Stopped =
+const std::string StoppedLine =
     R"({"ticks":90000,"time":"00:00:02.000","interface":"control","callback":"Stopped","arguments":{}})"
     "\n";
 
-const std::string Gap = R"({"ticks":90000,"gap":{"cause":"</script>"}})"
-                        "\n";
-const std::string GapInPage = R"({"ticks":90000,"gap":{"cause":"\u003c/script>"}})"
-                              "\n";
+const std::string GapLine = R"({"ticks":90000,"gap":{"cause":"</script>"}})"
+                            "\n";
+const std::string GapLineInPage = R"({"ticks":90000,"gap":{"cause":"\u003c/script>"}})"
+                                  "\n";
 
-std::string Element(const std::string& name, const std::string& lines)
+std::string ElementOf(const std::string& name, const std::string& lines)
 {
     return "<script type=\"application/x-ndjson\" data-name=\"" + name + "\">\n" + lines +
            "</script>";
 }
 
-std::vector<std::string> operator+(std::vector<std::string> left,
-                                   const std::vector<std::string>& right)
+std::vector<std::string> With(std::vector<std::string> arguments,
+                              const std::vector<std::string>& further)
 {
-    left.insert(left.end(), right.begin(), right.end());
-    return left;
+    arguments.insert(arguments.end(), further.begin(), further.end());
+    return arguments;
 }
 
 class DeskPlayerPage : public ScratchFolder
@@ -46,8 +46,7 @@ class DeskPlayerPage : public ScratchFolder
 protected:
     ProgramResult RunWithPage(const std::vector<std::string>& arguments) const
     {
-        return RunDeskPlayer(arguments +
-                             std::vector<std::string>{"--format", "html", "--page", page});
+        return RunDeskPlayer(With(arguments, {"--format", "html", "--page", page}));
     }
 
     /** Expects a page with these elements. */
@@ -55,7 +54,8 @@ protected:
     {
         const ProgramResult result = RunWithPage(arguments);
         EXPECT_EQ(result.status, 0) << result.errors;
-        EXPECT_TRUE(result.output == Head + elements + Tail) << result.output.substr(0, 2000);
+        EXPECT_TRUE(result.output == PageHead + elements + PageTail)
+            << result.output.substr(0, 2000);
     }
 
     /** Expects a message, and that neither a new nor an existing output is written. */
@@ -65,20 +65,18 @@ protected:
         const std::string existing = WriteFile("existing", "precious");
         const std::string created = folder / "created";
         for (const std::string& output : {existing, created}) {
-            EXPECT_EQ(
-                RunDeskPlayer(arguments + std::vector<std::string>{"--output", output}).status, 2);
+            EXPECT_EQ(RunDeskPlayer(With(arguments, {"--output", output})).status, 2);
         }
         EXPECT_EQ(ReadContents(existing), "precious");
         EXPECT_FALSE(fs::exists(created));
     }
 
-    const std::string page = WriteFile("page.html", Head + "<!--recordings-->" + Tail);
+    const std::string page = WriteFile("page.html", PageHead + "<!--recordings-->" + PageTail);
 };
 
-std::string JsonOf(const std::vector<std::string>& arguments)
+std::string JsonLinesOf(const std::vector<std::string>& arguments)
 {
-    const std::string json =
-        RunDeskPlayer(arguments + std::vector<std::string>{"--format", "json"}).output;
+    const std::string json = RunDeskPlayer(With(arguments, {"--format", "json"})).output;
     EXPECT_NE(json, "");
     return json;
 }
@@ -87,29 +85,29 @@ TEST_F(DeskPlayerPage, ContainsTheJsonOfASession)
 {
     for (const std::string& session : {AllEvents, Evening}) {
         const std::vector<std::string> arguments = {SampleDisc, "--session", session};
-        ExpectPage(arguments, Element(session, JsonOf(arguments)));
+        ExpectPage(arguments, ElementOf(session, JsonLinesOf(arguments)));
     }
 }
 
 TEST_F(DeskPlayerPage, ContainsTheJsonOfADiscFromStartToEnd)
 {
-    ExpectPage({SampleDisc}, Element(SampleDisc, JsonOf({SampleDisc})));
+    ExpectPage({SampleDisc}, ElementOf(SampleDisc, JsonLinesOf({SampleDisc})));
 }
 
 TEST_F(DeskPlayerPage, OfAReplayContainsWhatThatOfItsSessionDoes)
 {
-    const std::string json = JsonOf({SampleDisc, "--session", Evening});
+    const std::string json = JsonLinesOf({SampleDisc, "--session", Evening});
     const std::string recording = WriteFile("recording", json);
 
-    ExpectPage({"--replay", recording}, Element(recording, json));
+    ExpectPage({"--replay", recording}, ElementOf(recording, json));
 }
 
 TEST_F(DeskPlayerPage, ContainsTheJsonOfFieldLogs)
 {
     int logs = 0;
-    for (const fs::directory_entry& log : fs::directory_iterator(SampleLogs)) {
+    for (const fs::directory_entry& log : fs::directory_iterator(SampleLogFolder)) {
         const std::vector<std::string> arguments = {"--field-log", log.path()};
-        ExpectPage(arguments, Element(log.path(), JsonOf(arguments)));
+        ExpectPage(arguments, ElementOf(log.path(), JsonLinesOf(arguments)));
         ++logs;
     }
     EXPECT_GT(logs, 0);
@@ -117,10 +115,10 @@ TEST_F(DeskPlayerPage, ContainsTheJsonOfFieldLogs)
 
 TEST_F(DeskPlayerPage, NamesTheFirstOfSeveralLogs)
 {
-    const std::string log = SampleLogs / "field.log";
+    const std::string log = SampleLogFolder / "field.log";
     const std::vector<std::string> arguments = {"--field-log", log, log, log};
 
-    ExpectPage(arguments, Element(log + " and 2 more", JsonOf(arguments)));
+    ExpectPage(arguments, ElementOf(log + " and 2 more", JsonLinesOf(arguments)));
 }
 
 TEST_F(DeskPlayerPage, GoesToTheNamedFile)
@@ -136,41 +134,41 @@ TEST_F(DeskPlayerPage, GoesToTheNamedFile)
 
 TEST_F(DeskPlayerPage, ContainsTheSelectedCallbacksOfBothRecordings)
 {
-    const std::string first = WriteFile("first", Paused + Stopped);
-    const std::string second = WriteFile("second", Stopped + Paused + Stopped);
+    const std::string first = WriteFile("first", PausedLine + StoppedLine);
+    const std::string second = WriteFile("second", StoppedLine + PausedLine + StoppedLine);
 
     ExpectPage({"--replay", first, "--compare", second, "--only", "Stopped"},
-               Element(first, Stopped) + Element(second, Stopped + Stopped));
+               ElementOf(first, StoppedLine) + ElementOf(second, StoppedLine + StoppedLine));
     ExpectPage({"--replay", first, "--compare", second, "--listen", "button"},
-               Element(first, "") + Element(second, ""));
+               ElementOf(first, "") + ElementOf(second, ""));
 }
 
 TEST_F(DeskPlayerPage, KeepsTextOfTheRecordingFromEndingTheElement)
 {
-    const std::string recording = WriteFile("recording", Gap);
-    const std::string name = WriteFile("<\"&>", Gap);
+    const std::string recording = WriteFile("recording", GapLine);
+    const std::string name = WriteFile("<\"&>", GapLine);
 
     ExpectPage({"--replay", recording, "--compare", name},
-               Element(recording, GapInPage) +
-                   Element(folder.string() + "/&lt;&quot;&amp;&gt;", GapInPage));
+               ElementOf(recording, GapLineInPage) +
+                   ElementOf(folder.string() + "/&lt;&quot;&amp;&gt;", GapLineInPage));
 }
 
 TEST_F(DeskPlayerPage, ComparesASessionWithARecording)
 {
-    const std::string other = WriteFile("other", Paused);
+    const std::string other = WriteFile("other", PausedLine);
     const std::vector<std::string> arguments = {SampleDisc, "--session", Evening};
 
-    ExpectPage(arguments + std::vector<std::string>{"--compare", other},
-               Element(Evening, JsonOf(arguments)) + Element(other, Paused));
+    ExpectPage(With(arguments, {"--compare", other}),
+               ElementOf(Evening, JsonLinesOf(arguments)) + ElementOf(other, PausedLine));
 }
 
 TEST_F(DeskPlayerPage, ComparesAFieldLogWithARecording)
 {
-    const std::string other = WriteFile("other", Paused);
-    const std::vector<std::string> arguments = {"--field-log", SampleLogs / "field.log"};
+    const std::string other = WriteFile("other", PausedLine);
+    const std::vector<std::string> arguments = {"--field-log", SampleLogFolder / "field.log"};
 
-    ExpectPage(arguments + std::vector<std::string>{"--compare", other},
-               Element(arguments[1], JsonOf(arguments)) + Element(other, Paused));
+    ExpectPage(With(arguments, {"--compare", other}),
+               ElementOf(arguments[1], JsonLinesOf(arguments)) + ElementOf(other, PausedLine));
 }
 
 TEST_F(DeskPlayerPage, ContainsTheOtherRecordingAsItWouldBeWrittenAgain)
@@ -180,19 +178,19 @@ TEST_F(DeskPlayerPage, ContainsTheOtherRecordingAsItWouldBeWrittenAgain)
                                                  "\"unknown\": 1, \"arguments\": {}}");
 
     ExpectPage({"--replay", recording, "--compare", other},
-               Element(recording, "") + Element(other, Paused));
+               ElementOf(recording, "") + ElementOf(other, PausedLine));
 }
 
 TEST_F(DeskPlayerPage, ContainsAllOfALongOtherRecording)
 {
     std::string lines;
     for (int line = 0; line < 2000; ++line) {
-        lines += Paused;
+        lines += PausedLine;
     }
     const std::string other = WriteFile("other", lines);
 
     ExpectPage({"--replay", WriteFile("recording", ""), "--compare", other},
-               Element(folder / "recording", "") + Element(other, lines));
+               ElementOf(folder / "recording", "") + ElementOf(other, lines));
 }
 
 TEST_F(DeskPlayerPage, ContainsBothRecordingsFilledOnDemand)
@@ -206,35 +204,35 @@ TEST_F(DeskPlayerPage, ContainsBothRecordingsFilledOnDemand)
     const std::string recording = WriteFile("recording", line(""));
     const std::vector<std::string> arguments = {"--replay", recording, "--compare", recording};
 
-    ExpectPage(arguments, Element(recording, line("")) + Element(recording, line("")));
-    ExpectPage(arguments + std::vector<std::string>{"--fill"},
-               Element(recording, filled) + Element(recording, filled));
+    ExpectPage(arguments, ElementOf(recording, line("")) + ElementOf(recording, line("")));
+    ExpectPage(With(arguments, {"--fill"}),
+               ElementOf(recording, filled) + ElementOf(recording, filled));
 }
 
 TEST_F(DeskPlayerPage, ReadsTheOtherRecordingFromStandardInput)
 {
-    const std::string recording = WriteFile("recording", Paused);
+    const std::string recording = WriteFile("recording", PausedLine);
 
     const ProgramResult result = RunDeskPlayerWithInput(
         {"--replay", recording, "--compare", "-", "--format", "html", "--page", page},
-        WriteFile("input", Stopped));
+        WriteFile("input", StoppedLine));
 
-    EXPECT_EQ(result.output,
-              Head + Element(recording, Paused) + Element("standard input", Stopped) + Tail);
+    EXPECT_EQ(result.output, PageHead + ElementOf(recording, PausedLine) +
+                                 ElementOf("standard input", StoppedLine) + PageTail);
 }
 
 TEST_F(DeskPlayerPage, UsesStandardInputOnce)
 {
     const std::string message = "--compare: standard input is already in use";
     const std::vector<std::string> further = {"--compare", "-", "--format", "html", "--page", page};
-    ExpectRefused(std::vector<std::string>{"--replay", "-"} + further, message);
-    ExpectRefused(std::vector<std::string>{"--field-log", page, "-"} + further, message);
-    ExpectRefused(std::vector<std::string>{SampleDisc, "--remote"} + further, message);
+    ExpectRefused(With({"--replay", "-"}, further), message);
+    ExpectRefused(With({"--field-log", page, "-"}, further), message);
+    ExpectRefused(With({SampleDisc, "--remote"}, further), message);
 }
 
 TEST_F(DeskPlayerPage, IsNotWrittenIfTheOtherRecordingIsFaulty)
 {
-    const std::string other = WriteFile("other", Paused + "{\"ticks\":1}\n");
+    const std::string other = WriteFile("other", PausedLine + "{\"ticks\":1}\n");
     const std::string missing = folder / "missing";
     const auto comparing = [this](const std::string& file) -> std::vector<std::string> {
         return {SampleDisc, "--format", "html", "--page", page, "--compare", file};
@@ -247,13 +245,14 @@ TEST_F(DeskPlayerPage, IsNotWrittenIfTheOtherRecordingIsFaulty)
 
 TEST_F(DeskPlayerPage, OfAMalformedReplayHasTheLinesBeforeAndIsComplete)
 {
-    const std::string recording = WriteFile("recording", Paused + "x");
-    const std::string other = WriteFile("other", Stopped);
+    const std::string recording = WriteFile("recording", PausedLine + "x");
+    const std::string other = WriteFile("other", StoppedLine);
 
     const ProgramResult result = RunWithPage({"--replay", recording, "--compare", other});
 
     EXPECT_EQ(result.status, 2);
-    EXPECT_EQ(result.output, Head + Element(recording, Paused) + Element(other, Stopped) + Tail);
+    EXPECT_EQ(result.output, PageHead + ElementOf(recording, PausedLine) +
+                                 ElementOf(other, StoppedLine) + PageTail);
 }
 
 TEST_F(DeskPlayerPage, OfALogThatCannotBeReadIsComplete)
@@ -261,7 +260,7 @@ TEST_F(DeskPlayerPage, OfALogThatCannotBeReadIsComplete)
     const ProgramResult result = RunWithPage({"--field-log", folder});
 
     EXPECT_EQ(result.status, 2);
-    EXPECT_EQ(result.output, Head + Element(folder, "") + Tail);
+    EXPECT_EQ(result.output, PageHead + ElementOf(folder, "") + PageTail);
 }
 
 TEST_F(DeskPlayerPage, ReportsThatItCouldNotBeWritten)
@@ -275,7 +274,7 @@ TEST_F(DeskPlayerPage, HasOneLineForTheRecordings)
         std::string text;
         int found;
     } pages[] = {{"", 0},
-                 {Head + Tail, 0},
+                 {PageHead + PageTail, 0},
                  {" <!--recordings-->\n", 0},
                  {"<!--recordings--> \n", 0},
                  {"<!--recordings-->\n<!--recordings-->\n", 2}};
@@ -288,8 +287,8 @@ TEST_F(DeskPlayerPage, HasOneLineForTheRecordings)
                           std::to_string(wrong.found));
     }
     WriteFile("page.html", "<!--recordings-->");
-    EXPECT_EQ(RunWithPage({"--replay", WriteFile("recording", Paused)}).output,
-              Element(folder / "recording", Paused));
+    EXPECT_EQ(RunWithPage({"--replay", WriteFile("recording", PausedLine)}).output,
+              ElementOf(folder / "recording", PausedLine));
 }
 
 TEST_F(DeskPlayerPage, CanBeReadWhole)
@@ -307,24 +306,23 @@ TEST_F(DeskPlayerPage, CanBeReadWhole)
 
 TEST_F(DeskPlayerPage, DoesNotOverwriteItsInputs)
 {
-    const std::string recording = WriteFile("recording", Paused);
-    const std::string other = WriteFile("other", Paused);
+    const std::string recording = WriteFile("recording", PausedLine);
+    const std::string other = WriteFile("other", PausedLine);
     const std::vector<std::string> arguments = {
         "--replay", recording, "--compare", other, "--format", "html", "--page", page, "--output"};
 
-    ExpectUsageError(arguments + std::vector<std::string>{recording}, "--output: is the recording");
-    ExpectUsageError(arguments + std::vector<std::string>{other},
-                     "--output: is the recording to compare with");
-    ExpectUsageError(arguments + std::vector<std::string>{page}, "--output: is the page");
+    ExpectUsageError(With(arguments, {recording}), "--output: is the recording");
+    ExpectUsageError(With(arguments, {other}), "--output: is the recording to compare with");
+    ExpectUsageError(With(arguments, {page}), "--output: is the page");
 
-    EXPECT_EQ(ReadContents(recording), Paused);
-    EXPECT_EQ(ReadContents(other), Paused);
-    EXPECT_EQ(ReadContents(page), Head + "<!--recordings-->" + Tail);
+    EXPECT_EQ(ReadContents(recording), PausedLine);
+    EXPECT_EQ(ReadContents(other), PausedLine);
+    EXPECT_EQ(ReadContents(page), PageHead + "<!--recordings-->" + PageTail);
 }
 
 TEST_F(DeskPlayerPage, IsRequiredToCompare)
 {
-    const std::string other = WriteFile("other", Paused);
+    const std::string other = WriteFile("other", PausedLine);
     for (const std::string format : {"text", "json", "trace"}) {
         ExpectRefused({SampleDisc, "--format", format, "--compare", other},
                       "--compare requires --format html");
@@ -354,7 +352,7 @@ TEST_F(DeskPlayerPage, OfLongRecordingsIsWrittenInConstantMemory)
 
     EXPECT_EQ(result.status, 0) << result.errors;
     EXPECT_TRUE(ReadContents(output) ==
-                Head + Element(recording, lines) + Element(recording, lines) + Tail);
+                PageHead + ElementOf(recording, lines) + ElementOf(recording, lines) + PageTail);
 }
 
 } // namespace
