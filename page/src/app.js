@@ -181,15 +181,16 @@ export class App {
     const isShown = (/** @type {number} */ row) => (!onlyMatches || this.matches.has(row))
       && (!onlyDifferences || this.rows[row].difference !== null);
     const shown = [...this.rows.keys()].filter(isShown);
-    this.table?.setFilter(shown, (row) => this.matches.has(row));
+    // With nothing else to see, a mark on every match says nothing.
+    const isMarked = (/** @type {number} */ row) => !onlyMatches && this.matches.has(row);
+    this.table?.setFilter(shown, isMarked);
     this.picture?.setFlags(
       (mark, lane) => {
         const row = this.rowOf(mark, lane.side);
-        const match = !mark.slice && this.matches.has(row);
         return {
           selected: this.selection.mark === mark,
-          match,
-          dimmed: this.searching && !mark.slice && !match,
+          match: !mark.slice && isMarked(row),
+          dimmed: this.searching && !mark.slice && !this.matches.has(row),
           difference: this.rows[row].difference,
         };
       },

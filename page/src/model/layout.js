@@ -16,6 +16,8 @@ const InstantWidth = 5;
 const DigitWidth = 7;
 const ClusterPadding = 8;
 
+const MostRows = 4;
+
 /**
  * What becomes a cluster, in pixels: instants within `bucket`, and within it slices narrower than `narrow`. The first
  * density shows most: it merges only what would overlap.
@@ -82,11 +84,36 @@ export function layOutSlices(marks, scale, bucket = 0, narrow = Densities[0].nar
 }
 
 /**
+ * Passages that were played several times overlap on the axis of media time, and take a row each. What does not fit
+ * into the rows becomes a cluster in the last one.
+ * @param {readonly Shape[]} shapes in order of their start
+ * @param {number} [most] rows
+ * @returns {Shape[]}
+ */
+export function limitRows(shapes, most = MostRows) {
+  /** @type {Shape[]} the last shape in each row */
+  const rows = [];
+  return shapes.filter((shape) => {
+    const free = rows.findIndex(({ end }) => end <= shape.start);
+    const row = free < 0 ? rows.length : free;
+    if (row < most) {
+      rows[row] = shape;
+      return true;
+    }
+    const last = rows[most - 1];
+    shape.marks.forEach((mark) => last.marks.push(mark));
+    last.end = Math.max(last.end, shape.end);
+    return false;
+  });
+}
+
+/**
  * @param {Lane} lane
  * @param {number} scale milliseconds per pixel
  * @param {number} density place in Densities
  */
 export function layOut(lane, scale, density) {
   const { bucket, narrow } = Densities[density];
-  return lane.slices ? layOutSlices(lane.marks, scale, bucket, narrow) : layOutInstants(lane.marks, scale, bucket);
+  return lane.slices ? limitRows(layOutSlices(lane.marks, scale, bucket, narrow))
+    : layOutInstants(lane.marks, scale, bucket);
 }

@@ -28,6 +28,7 @@ test('the table has a caption, headers and every callback with its arguments', a
   assert.equal(await textIn(page, '#table caption'), 'Callbacks: 300');
   assert.deepEqual(await page.$$eval('#table thead th', (cells) => cells.map(({ scope, textContent }) => (
     `${scope} ${textContent}`))), ['col Time', 'col Media time', 'col Interface', 'col Callback', 'col Arguments']);
+  assert.equal((await page.$$('#table tbody th[scope=row]')).length, 100);
   const seen = [];
   for (let number = 0; number < 3; number += 1) {
     seen.push(...await rowTexts(page));
@@ -77,6 +78,7 @@ test('the filter leaves matches in the table and among the instants, and all sli
   assert.equal(instants, 127);
   assert.equal((await page.$$('#picture .vis-item.slice')).length, slices);
   assert.ok((await rowTexts(page)).every((cells) => !cells.includes('CurrentTimePosition')));
+  assert.equal((await page.$$('.match')).length, 0);
   await page.close();
 });
 

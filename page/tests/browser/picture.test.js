@@ -180,6 +180,8 @@ test('dragging scrolls and is no click', async () => {
   const moved = await axisText(page);
   assert.ok(whole.includes('00:00:00'));
   assert.ok(!moved.includes('00:00:00') && moved.includes('08:02:00'), `${moved}`);
+  // Some browsers send the click to what is under the pointer, others to what was pressed.
+  await page.$eval('#picture .vis-item.on-play-list', (item) => item.click());
   assert.equal(await textIn(page, '#details h2'), 'Details');
   await page.close();
 });

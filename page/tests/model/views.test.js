@@ -2,7 +2,7 @@ import assert from 'node:assert/strict';
 import { test } from 'node:test';
 
 import { compare, countDifferences } from '../../src/model/compare.js';
-import { layOutInstants, layOutSlices } from '../../src/model/layout.js';
+import { layOutInstants, layOutSlices, limitRows } from '../../src/model/layout.js';
 import { readRecording } from '../../src/model/recording.js';
 import { matcher, searchText } from '../../src/model/search.js';
 import { entriesOf, line, position, toText } from '../support/lines.js';
@@ -131,4 +131,9 @@ test('many narrow slices are several clusters', () => {
   const shapes = layOutSlices(marks, 1);
   assert.ok(shapes.length > 3);
   assert.equal(shapes.reduce((sum, shape) => sum + shape.marks.length, 0), 100);
+});
+
+test('slices that overlap more often than there are rows are a cluster in the last row', () => {
+  const shapes = [0, 10, 20, 30, 200].map((start) => ({ start, end: start + 100, marks: [slice(start, start + 100)] }));
+  assert.deepEqual(extents(limitRows(shapes, 2)), [[0, 100, 1], [10, 130, 3], [200, 300, 1]]);
 });
