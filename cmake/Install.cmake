@@ -52,6 +52,8 @@ if(BDMVNAVIGATOR_BUILD_DESKPLAYER)
   install(FILES deskplayer/bdmv-deskplayer.1 DESTINATION ${CMAKE_INSTALL_MANDIR}/man1)
   install(FILES deskplayer/completion/bdmv-deskplayer
     DESTINATION ${CMAKE_INSTALL_DATADIR}/bash-completion/completions)
+  # Only if scripts/page has built it; the program looks for it in ../share relative to itself.
+  install(FILES page/dist/timeline.html DESTINATION ${CMAKE_INSTALL_DATADIR}/bdmvnavigator OPTIONAL)
 endif()
 
 configure_package_config_file(cmake/bdmvnavigator-config.cmake.in

@@ -8,6 +8,7 @@
 #include <chrono>
 #include <cstdlib>
 #include <iostream>
+#include <memory>
 #include <optional>
 #include <stdexcept>
 #include <string>
@@ -16,6 +17,7 @@
 
 #include "check/check.h"
 #include "check/faultoutput.h"
+#include "clientkit/scopedlistener.h"
 #include "deskplayer/desk.h"
 #include "deskplayer/output.h"
 #include "deskplayer/session.h"
@@ -32,6 +34,7 @@
 #include "program/logclock.h"
 #include "program/logfolder.h"
 #include "program/options.h"
+#include "program/page.h"
 #include "program/progress.h"
 #include "program/remotescreen.h"
 #include "program/replay.h"
@@ -58,7 +61,9 @@ OutputOptions OutputOptionsOf(const Options& options)
     return output;
 }
 
-/** @throw UsageError the options name no format, interface, callback or tag, or exclude each other
+/**
+ * @throw UsageError the options name no format, interface, callback or tag, or exclude each other
+ * @throw whatever PreparePage() throws
  */
 OutputSettings CheckOutput(const Options& options)
 {
@@ -69,11 +74,11 @@ OutputSettings CheckOutput(const Options& options)
         throw UsageError(error.what());
     }
     if ((options.list || options.describe || options.check) &&
-        settings.format == OutputFormat::Trace) {
+        (settings.format == OutputFormat::Trace || settings.format == OutputFormat::Html)) {
         throw UsageError(std::string(options.list       ? "--list"
                                      : options.describe ? "--describe"
                                                         : "--check") +
-                         " excludes --format trace");
+                         " excludes --format " + options.format);
     }
     if (!options.tags.empty() && settings.format != OutputFormat::Json) {
         throw UsageError("--tag requires --format json");
@@ -82,15 +87,18 @@ OutputSettings CheckOutput(const Options& options)
         settings.format != OutputFormat::Json) {
         throw UsageError("--summary excludes --format " + options.format);
     }
+    PreparePage(options, settings);
     return settings;
 }
 
 /** @return the exit status */
 int Play(Desk& desk, const std::optional<Session>& session, const Options& options,
-         std::ostream& stream)
+         const OutputSettings& settings, std::ostream& stream)
 {
-    const LogClock logClock(PartsOf(desk).Clock());
-    const DeskOutput output(desk, stream, OutputOptionsOf(options));
+    VirtualClock& clock = PartsOf(desk).Clock();
+    const LogClock logClock(clock);
+    const std::unique_ptr<Output> output = MakeOutput(settings, stream, clock);
+    const bdmv::ScopedListener<bdmv::INavigatorListener> registration(desk.Listeners(), *output);
     if (options.remote) {
         RemoteScreen screen(PartsOf(desk), stream);
         PlayByRemote(PartsOf(desk), STDIN_FILENO, screen.Hooks());
@@ -148,7 +156,12 @@ int Run(const Options& options)
     if (!options.outputFolder.empty()) {
         status = ConvertFieldLogsToFolder(options, settings);
     } else if (!options.fieldLogs.empty()) {
-        ConvertFieldLogs(options, settings, target);
+        try {
+            ConvertFieldLogs(options, settings, target);
+        } catch (const UsageError&) {
+            target.Finish(); // what could be read
+            throw;
+        }
     } else if (!options.replay.empty()) {
         ReplayRecording(options, settings, target);
     } else if (options.check) {
@@ -171,7 +184,7 @@ int Run(const Options& options)
         if (!options.session.empty()) {
             session = ReadSessionFile(options.session);
         }
-        status = Play(desk, session, options, target.Open());
+        status = Play(desk, session, options, settings, target.Open());
     }
     target.Finish();
     return status;

@@ -1,5 +1,7 @@
 #include "deskplayer/output.h"
 
+#include <stdexcept>
+
 #include "facade/outputsettings.h"
 #include "facade/parts.h"
 
@@ -21,9 +23,25 @@ OutputSettings ReadOutputOptions(const OutputOptions& options)
     return settings;
 }
 
+namespace
+{
+
+/** A page needs a file that is not part of the library. */
+OutputSettings ReadDeskOutputOptions(const OutputOptions& options)
+{
+    OutputSettings settings = ReadOutputOptions(options);
+    if (settings.format == OutputFormat::Html) {
+        throw std::invalid_argument(
+            "only bdmv-deskplayer writes html; expected text, json or trace");
+    }
+    return settings;
+}
+
+} // namespace
+
 DeskOutput::DeskOutput(Desk& desk, std::ostream& stream, const OutputOptions& options)
     : m_rDesk(desk),
-      m_pOutput(MakeOutput(ReadOutputOptions(options), stream, PartsOf(desk).Clock()))
+      m_pOutput(MakeOutput(ReadDeskOutputOptions(options), stream, PartsOf(desk).Clock()))
 {
     m_rDesk.Listeners().AddListener(m_pOutput.get());
 }

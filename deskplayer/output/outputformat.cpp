@@ -22,6 +22,9 @@ std::unique_ptr<Output> MakeOutput(const OutputSettings& settings, std::ostream&
         return std::make_unique<JsonOutput>(stream, clock, settings.filter, settings.tags);
     case OutputFormat::Trace:
         return std::make_unique<TraceOutput>(stream, clock, settings.filter);
+    case OutputFormat::Html:
+        return std::make_unique<HtmlOutput>(stream, clock, settings.filter, settings.recordingName,
+                                            settings.page);
     case OutputFormat::Text:
         break;
     }

@@ -8,25 +8,28 @@
 #include <array>
 #include <memory>
 #include <ostream>
+#include <string>
 #include <string_view>
 
+#include "output/htmloutput.h"
 #include "output/output.h"
 
 namespace deskplayer
 {
 
 enum class OutputFormat {
-    Text, ///< TextOutput
-    Json, ///< JsonOutput
-    Trace ///< TraceOutput
+    Text,  ///< TextOutput
+    Json,  ///< JsonOutput
+    Trace, ///< TraceOutput
+    Html   ///< HtmlOutput
 };
 
 /** Indexed by OutputFormat. */
-inline constexpr std::array<std::string_view, 3> OutputFormatNames{"text", "json", "trace"};
+inline constexpr std::array<std::string_view, 4> OutputFormatNames{"text", "json", "trace", "html"};
 
 /** What the names of files with such an output end in; indexed by OutputFormat. */
 inline constexpr std::array<std::string_view, OutputFormatNames.size()> OutputFormatExtensions{
-    ".txt", ".jsonl", ".json"};
+    ".txt", ".jsonl", ".json", ".html"};
 
 /**
  * @param name one of OutputFormatNames
@@ -40,6 +43,9 @@ struct OutputSettings {
     OutputFilter filter;
     bool coloured = false; ///< for text only
     Tags tags;             ///< for json only
+
+    std::string recordingName;             ///< for people; for html only
+    std::shared_ptr<const PageFrame> page; ///< not null for html
 };
 
 /** @param stream does not throw; it and @p clock must outlive the output */

@@ -212,7 +212,9 @@ private:
         const auto log = std::make_unique<LogFile>(conversion.log); // too large for a stack
         OutputFile file(conversion);
         const VirtualClock unused; // records have times of their own
-        std::unique_ptr<Output> output = MakeOutput(m_rSettings, file.Open(), unused);
+        OutputSettings settings = m_rSettings;
+        settings.recordingName = conversion.log;
+        std::unique_ptr<Output> output = MakeOutput(settings, file.Open(), unused);
         FieldLogReader reader(*output, m_Pattern);
         for (std::string_view part = log->Read(); !part.empty(); part = log->Read()) {
             Pass();

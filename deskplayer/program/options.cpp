@@ -97,12 +97,25 @@ void AddOptions(CLI::App& app, Options& options)
                                     "Replace arguments that the recording lacks by neutral values")
                            ->needs(replay);
     app.add_option("--format", options.format,
-                   "Output format: text, json (one object per line) or trace (for trace viewers)")
+                   "Output format: text, json (one object per line), trace (for trace viewers) or "
+                   "html (a page for a browser)")
         ->type_name("FORMAT");
     auto* const output =
         app.add_option("--output", options.output, "File to write; standard output by default")
             ->check(NotEmpty("the name of a file"))
             ->type_name("FILE");
+    auto* const compare =
+        app.add_option(
+               "--compare", options.compare,
+               "Recording to show beside the callbacks, with --format html: JSON lines, - for "
+               "standard input")
+            ->check(NotEmpty("the name of a file"))
+            ->type_name("FILE");
+    app.add_option(
+           "--page", options.page,
+           "Page that --format html fills in; by default the one installed with the program")
+        ->check(NotEmpty("the name of a file"))
+        ->type_name("FILE");
     auto* const listen =
         app.add_option(
                "--listen", options.listen,
@@ -138,6 +151,7 @@ void AddOptions(CLI::App& app, Options& options)
             ->check(NotEmpty("the name of a folder"))
             ->needs(fieldLog)
             ->excludes(output)
+            ->excludes(compare)
             ->type_name("FOLDER");
     app.add_option("--jobs", options.jobs,
                    "Log files to read at the same time; by default, one per processor")
@@ -188,11 +202,12 @@ void AddOptions(CLI::App& app, Options& options)
         "  bdmv-deskplayer --field-log logs/*.log --format json --output-folder recordings \\\n"
         "      --tag firmware=2.1\n"
         "  bdmv-deskplayer --field-log player.log --summary\n"
-        "  bdmv-deskplayer --replay evening.jsonl --format trace\n\n"
+        "  bdmv-deskplayer --replay evening.jsonl --format trace\n"
+        "  bdmv-deskplayer --replay new.jsonl --compare old.jsonl --format html\n\n"
         "Exit status: 0 success, 1 the output could not be written, 2 incorrect usage, or a\n"
-        "session, recording or log that cannot be read, 3 the disc cannot be read or has faults,\n"
-        "4 the session failed: an expectation was not met or, with --strict, a command was\n"
-        "refused.");
+        "session, recording, log or page that cannot be read, 3 the disc cannot be read or has\n"
+        "faults, 4 the session failed: an expectation was not met or, with --strict, a command\n"
+        "was refused.");
 }
 
 } // namespace deskplayer

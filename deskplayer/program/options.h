@@ -33,6 +33,8 @@ struct Options {
     bool fill = false;
     std::string format = "text";
     std::string output;
+    std::string compare;
+    std::string page;
     std::string listen;
     std::string only;
     std::optional<std::string> log;

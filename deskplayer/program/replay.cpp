@@ -3,14 +3,13 @@
 #include <algorithm>
 #include <chrono>
 #include <filesystem>
-#include <fstream>
-#include <iostream>
 #include <optional>
 #include <system_error>
 #include <thread>
 
 #include "program/failure.h"
 #include "program/progress.h"
+#include "program/recordingfile.h"
 #include "program/recordwriter.h"
 #include "recording/absence.h"
 #include "recording/recordingreader.h"
@@ -115,26 +114,6 @@ std::string Counted(std::uint64_t count, const std::string& noun)
     return std::to_string(count) + " " + noun + (count == 1 ? "" : "s");
 }
 
-constexpr const char* StandardInput = "-";
-
-/** As messages show it. */
-std::string NameOf(const std::string& recording)
-{
-    return recording == StandardInput ? "standard input" : recording;
-}
-
-std::istream& Open(std::ifstream& file, const std::string& name)
-{
-    if (name == StandardInput) {
-        return std::cin;
-    }
-    file.open(name);
-    if (!file) {
-        throw RecordingError(Printable(name) + ": cannot open recording");
-    }
-    return file;
-}
-
 } // namespace
 
 void ReplayRecording(const Options& options, const OutputSettings& settings, Target& target)
@@ -143,8 +122,8 @@ void ReplayRecording(const Options& options, const OutputSettings& settings, Tar
     if (std::filesystem::equivalent(options.replay, options.output, notBothExist)) {
         throw UsageError("--output: is the recording");
     }
-    std::ifstream file;
-    RecordingReader reader(Open(file, options.replay), NameOf(options.replay));
+    RecordingFile recording(options.replay);
+    RecordingReader reader(recording.Stream(), recording.Name());
     std::ostream& stream = target.Open();
     RecordWriter writer(options, settings, stream);
     Player player(options, writer.Listener(), stream);
@@ -160,9 +139,9 @@ void ReplayRecording(const Options& options, const OutputSettings& settings, Tar
     player.Finish();
     writer.Finish();
     if (player.Incomplete() != 0 || player.Gaps() != 0) {
-        PrintMessage(Printable(NameOf(options.replay)) + ": " +
-                     Counted(player.Incomplete(), "callback") + " with absent arguments" +
-                     (options.fill ? ", filled; " : "; ") + Counted(player.Gaps(), "gap"));
+        PrintMessage(Printable(recording.Name()) + ": " + Counted(player.Incomplete(), "callback") +
+                     " with absent arguments" + (options.fill ? ", filled; " : "; ") +
+                     Counted(player.Gaps(), "gap"));
     }
 }
 

@@ -20,8 +20,8 @@ namespace deskplayer
  * @param kind    the noun for a choice, with its article, for the message: "an output format"
  * @param choices at least two
  * @return index into @p choices
- * @throw std::invalid_argument "'xml' is not an output format; expected text, json or trace", or
- *        "'jason' is not an output format; did you mean json?"
+ * @throw std::invalid_argument "'xml' is not an output format; expected text, json, trace or html",
+ *        or "'jason' is not an output format; did you mean json?"
  */
 std::size_t FindChoice(std::string_view word, std::string_view kind,
                        const std::vector<std::string_view>& choices);

@@ -158,7 +158,7 @@ TEST_F(DeskPlayerOutput, IsLimitedToTheSelectedInterfacesAndCallbacks)
 TEST_F(DeskPlayerOutput, RefusesUnknownFormatsInterfacesAndCallbacks)
 {
     ExpectUsageError({SampleDisc, "--format", "xml"},
-                     "'xml' is not an output format; expected text, json or trace");
+                     "'xml' is not an output format; expected text, json, trace or html");
     ExpectUsageError({SampleDisc, "--listen", "control,x"},
                      "'x' is not a listener interface; expected control, settings, button or "
                      "interactive");

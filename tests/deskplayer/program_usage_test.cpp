@@ -17,7 +17,7 @@ TEST(DeskPlayerUsage, IsDescribedByHelp)
     for (const char* const option :
          {"--help", "--version", "--commands", "--playlist", "--list", "--check", "--describe",
           "--session", "--strict", "--realtime", "--remote", "--format", "--output", "--listen",
-          "--only", "--log"}) {
+          "--only", "--log", "--compare", "--page"}) {
         EXPECT_NE(help.output.find(option), std::string::npos) << option;
     }
 
@@ -81,13 +81,16 @@ TEST(DeskPlayerUsage, RefusesOptionsThatExcludeEachOther)
                                                          {"--list", "--log", "*=*"},
                                                          {"--list", "--log", ""},
                                                          {"--list", "--format", "trace"},
+                                                         {"--list", "--format", "html"},
                                                          {"--describe", "1", "--listen", "button"},
                                                          {"--describe", "1", "--only", "PlayItem"},
                                                          {"--describe", "1", "--log", "*=*"},
                                                          {"--describe", "1", "--format", "trace"},
+                                                         {"--describe", "1", "--format", "html"},
                                                          {"--check", "--only", "PlayItem"},
                                                          {"--check", "--log", "*=*"},
                                                          {"--check", "--format", "trace"},
+                                                         {"--check", "--format", "html"},
                                                          {"--remote", "--session", Evening}};
     for (std::vector<std::string> arguments : pairs) {
         SCOPED_TRACE(arguments.front() + " and others");
@@ -101,7 +104,8 @@ TEST(DeskPlayerUsage, RefusesOptionsThatExcludeEachOther)
 
 TEST(DeskPlayerUsage, RefusesEmptyNames)
 {
-    for (const std::string option : {"--session", "--output", "--listen", "--only"}) {
+    for (const std::string option :
+         {"--session", "--output", "--compare", "--page", "--listen", "--only"}) {
         for (const std::vector<std::string>& words :
              std::vector<std::vector<std::string>>{{option, ""}, {option + "="}}) {
             std::vector<std::string> arguments = {SampleDisc};

@@ -158,7 +158,7 @@ const std::map<std::string, std::vector<std::string>> Allowed = {
      Library + std::vector<std::string>{"deskplayer/inc", "deskplayer/disc", "deskplayer/navigator",
                                         "deskplayer/output", "deskplayer/recording",
                                         "deskplayer/session", "deskplayer/text"}},
-    {"deskplayer", Library + std::vector<std::string>{"ports"}},
+    {"deskplayer", Library + std::vector<std::string>{"kits/clientkit", "ports"}},
     {"examples", Library + std::vector<std::string>{"deskplayer/inc", "kits"}},
     {"measure", AllFolders},
     {"tests", AllFolders}};

@@ -106,6 +106,8 @@ TEST(DeskOutput, RefusesUnknownWords)
     OutputOptions format;
     format.format = "xml";
     EXPECT_EQ(errorOf(format).rfind("'xml' is not an output format", 0), 0U) << errorOf(format);
+    format.format = "html";
+    EXPECT_EQ(errorOf(format), "only bdmv-deskplayer writes html; expected text, json or trace");
     OutputOptions callbacks;
     callbacks.callbacks = "Pause";
     EXPECT_EQ(errorOf(callbacks), "'Pause' is not a callback; did you mean Paused?");

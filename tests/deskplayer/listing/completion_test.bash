@@ -97,7 +97,7 @@ OffersNoPlayListsWithoutADisc() {
 ExecutesNothingFromTheCommandLine() {
     for word in '$(touch run)' '`touch run`' '"$(touch run)"' 'a[$(touch run)]'; do
         for option in --playlist --describe --session --replay --field-log --format --output \
-            --output-folder --jobs --tag --listen --only --log --log-prefix --l; do
+            --output-folder --jobs --tag --compare --page --listen --only --log --log-prefix --l; do
             complete_words "$word" $option ''
             complete_words $option "$word"
             complete_words $option "PlayItem,$word"
@@ -109,7 +109,7 @@ ExecutesNothingFromTheCommandLine() {
 }
 
 OffersFormats() {
-    expect 'json text trace' --format ''
+    expect 'html json text trace' --format ''
     expect 'text trace' disc --format t
     expect 'json' disc --format = j
 }
@@ -160,6 +160,12 @@ OffersAnyFileForEachFieldLog() {
     expect '--format' --field-log evening.json --fo
     expect '' --field-log evening.json --log-prefix e
     expect 'disc documents' --list d
+}
+
+OffersAnyFileForAPage() {
+    expect 'evening.json evening.session' --compare e
+    expect 'evening.json evening.session' --page e
+    expect '0 12345 8 80 800' --compare evening.json --page notes.txt disc --describe ''
 }
 
 OffersAnyFileForTheOutput() {

@@ -2,6 +2,7 @@
 
 #include <gtest/gtest.h>
 
+#include <memory>
 #include <sstream>
 #include <stdexcept>
 
@@ -25,6 +26,7 @@ TEST(OutputFormat, IsParsedByItsName)
     EXPECT_EQ(ParseOutputFormat("text"), OutputFormat::Text);
     EXPECT_EQ(ParseOutputFormat("json"), OutputFormat::Json);
     EXPECT_EQ(ParseOutputFormat("trace"), OutputFormat::Trace);
+    EXPECT_EQ(ParseOutputFormat("html"), OutputFormat::Html);
 }
 
 TEST(OutputFormat, NamesAnUnknownFormatAndAllFormats)
@@ -33,7 +35,8 @@ TEST(OutputFormat, NamesAnUnknownFormatAndAllFormats)
         ParseOutputFormat("xml");
         FAIL() << "no error";
     } catch (const std::invalid_argument& error) {
-        EXPECT_STREQ(error.what(), "'xml' is not an output format; expected text, json or trace");
+        EXPECT_STREQ(error.what(),
+                     "'xml' is not an output format; expected text, json, trace or html");
     }
 }
 
@@ -47,6 +50,10 @@ TEST(OutputFormat, DeterminesTheOutput)
 
     options.format = OutputFormat::Trace;
     EXPECT_EQ(Written(options).front(), '[');
+
+    options.format = OutputFormat::Html;
+    options.page = std::make_shared<PageFrame>(PageFrame{"head", "tail", {}});
+    EXPECT_EQ(Written(options).substr(0, 4), "head");
 }
 
 TEST(OutputFormat, IsCombinedWithTheOtherOptions)
