@@ -8,6 +8,7 @@
 
 #include <chrono>
 #include <csignal>
+#include <cstdlib>
 #include <map>
 #include <string>
 #include <vector>
@@ -103,6 +104,30 @@ TEST_F(LogFolder, HasNamesWithTheExtensionOfTheFormat)
     }
     EXPECT_EQ(names,
               (std::vector<std::string>{"player.log.json", "player.log.jsonl", "player.log.txt"}));
+}
+
+TEST_F(LogFolder, HasWhatTheEndOfALogReveals)
+{
+    const std::string time = "2024-05-31 20:15:00.123456 ";
+    const std::string start = "00:00:00.000  (start) at 2024-05-31 20:15:00.123456\n";
+    const std::string pending =
+        WriteFile("pending", time + "BdmvNavigator Event: Sending SecondaryAudioUnavailable\n");
+    const std::string truncated = WriteFile("truncated", Paused + "x");
+
+    EXPECT_EQ(Convert({pending, truncated}).status, 0);
+    EXPECT_EQ(Outputs().at("pending.txt"), start + "00:00:00.000  SecondaryAudioUnavailable\n");
+    EXPECT_EQ(Outputs().at("truncated.txt"),
+              start + "00:00:00.000  Paused\n"
+                      "00:00:00.000  (gap)                       cause=truncated\n");
+}
+
+TEST_F(LogFolder, MayHaveLogsWithLinesOfAnotherKind)
+{
+    const std::string log = WriteFile("log", "[   90.5] player: BdmvNavigator/5: Sending Paused\n");
+
+    EXPECT_EQ(Convert({log}, {"--log-prefix", "[{time}] {any} {component}/{level}: {text}"}).status,
+              0);
+    EXPECT_EQ(Outputs().at("log.txt"), "00:00:00.000  Paused\n");
 }
 
 TEST_F(LogFolder, IsTheSameWhateverTheNumberOfJobs)
@@ -279,12 +304,41 @@ TEST_F(LogFolder, HasNothingIncompleteAfterAnInterruption)
     EXPECT_EQ(Outputs().size(), 0U);
 }
 
+TEST_F(LogFolder, IsCompletedIfTheSignalIsIgnored)
+{
+    const std::string pipe = folder / "pipe";
+    ASSERT_EQ(mkfifo(pipe.c_str(), 0600), 0);
+    const auto before = std::signal(SIGINT, SIG_IGN); // which the program inherits
+    TerminalProgram program({"--field-log", pipe, "--output-folder", out});
+    std::signal(SIGINT, before);
+    const int writer = open(pipe.c_str(), O_WRONLY | O_CLOEXEC);
+    ASSERT_GE(writer, 0);
+
+    program.Send(SIGINT);
+    EXPECT_EQ(write(writer, Paused.data(), Paused.size()), static_cast<ssize_t>(Paused.size()));
+    close(writer);
+
+    EXPECT_EQ(program.Finish().status, 0);
+    EXPECT_EQ(Outputs().count("pipe.txt"), 1U);
+}
+
+TEST_F(LogFolder, HasNoColours)
+{
+    setenv("TERM", "xterm", 1);
+    unsetenv("NO_COLOR");
+    const std::string log = WriteFile("log", Paused);
+
+    EXPECT_EQ(RunDeskPlayerOnTerminal({"--field-log", log, "--output-folder", out}).status, 0);
+    EXPECT_EQ(Outputs().at("log.txt").find('\x1B'), std::string::npos);
+}
+
 TEST_F(LogFolder, ShowsProgressOnATerminal)
 {
     const std::string pipe = folder / "pipe";
     ASSERT_EQ(mkfifo(pipe.c_str(), 0600), 0);
     const std::string first = WriteFile("first", Paused);
-    TerminalProgram program({"--field-log", first, pipe, "--output-folder", out, "--jobs", "1"});
+    TerminalProgram program(
+        {"--field-log", first, pipe, "--output-folder", out, "--jobs", "1", "--only", "Stopped"});
     const int writer = open(pipe.c_str(), O_WRONLY | O_CLOEXEC);
     ASSERT_GE(writer, 0);
     const auto end = std::chrono::steady_clock::now() + std::chrono::milliseconds(1200);
