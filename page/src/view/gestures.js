@@ -1,6 +1,6 @@
 /**
- * Wheel, mouse and touch in the picture. The library's own gestures do not know what is folded, and keep the page from
- * scrolling.
+ * Wheel, mouse and touch in the picture. The library's own gestures do not know what is folded. The vertical wheel
+ * is left to it.
  *
  * @typedef {import('./picture.js').Picture} Picture
  */
@@ -42,23 +42,10 @@ export class Gestures {
     } else if (event.shiftKey || Math.abs(sideways) > Math.abs(event.deltaY)) {
       this.picture.move(sideways / width);
     } else {
-      if (!this.canScroll(event.deltaY)) {
-        event.stopPropagation();
-      }
-      return;
+      return; // the library scrolls the tracks; if all are visible, the browser scrolls the page
     }
     event.preventDefault();
     event.stopPropagation();
-  }
-
-  /**
-   * Whether there are tracks above or below those that are visible. If not, the wheel scrolls the page.
-   * @param {number} direction below 0 for up
-   */
-  canScroll(direction) {
-    const panel = this.panel().getBoundingClientRect();
-    const content = /** @type {Element} */ (this.panel().querySelector('.vis-itemset')).getBoundingClientRect();
-    return direction < 0 ? content.top < panel.top - 1 : content.bottom > panel.bottom + 1;
   }
 
   /** @param {number} x in pixels of the window */
