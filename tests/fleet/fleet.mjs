@@ -33,6 +33,8 @@ fail play
 play
 after 5s play
 after 5s stop
+after 20s play
+after 1s stop
 `,
   recovery: `play
 at 00:10 standby
@@ -72,7 +74,7 @@ export const PlayLists = {
  * which skipping is forbidden. The first time ends when the film begins, if it is not the last.
  */
 const Forbidden = {
-  film: [7], failure: [6, 5], recovery: [6, 5], firstFailure: [5], standby: [6], trailer: [],
+  film: [7], failure: [6, 5, 1], recovery: [6, 5], firstFailure: [5], standby: [6], trailer: [],
   brokenTrailer: [],
 };
 
