@@ -17,7 +17,7 @@ namespace
 
 using nlohmann::json;
 
-const std::string SampleLogs = BDMVNAVIGATOR_SAMPLE_LOGS;
+const std::string ExampleLogs = BDMVNAVIGATOR_SAMPLE_LOGS;
 const std::string Document = BDMVNAVIGATOR_DOCS "/outputs.md";
 
 std::string Word(const json& value)
@@ -164,7 +164,7 @@ TEST_P(SummaryOfALog, EqualsThatOfItsRecordingExceptForWhatLinesShow)
 }
 
 INSTANTIATE_TEST_SUITE_P(OfTheExamples, SummaryOfALog,
-                         testing::Values(SampleLogs + "/field.log", SampleLogs + "/session.log",
+                         testing::Values(ExampleLogs + "/field.log", ExampleLogs + "/session.log",
                                          AllEvents, Evening));
 
 /** A log from which no lines were taken. */
@@ -203,7 +203,7 @@ std::string BlockAfter(const std::string& command)
 
 TEST_F(Summary, OfTheSampleLogIsThatOfTheDocumentation)
 {
-    const std::vector<std::string> input = {"--field-log", SampleLogs + "/field.log", "--summary"};
+    const std::vector<std::string> input = {"--field-log", ExampleLogs + "/field.log", "--summary"};
 
     EXPECT_EQ(RunDeskPlayer(input).output,
               BlockAfter("--field-log examples/logs/field.log --summary"));

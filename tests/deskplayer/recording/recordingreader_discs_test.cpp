@@ -32,6 +32,16 @@ std::uint64_t TicksOfTheDesk()
     return g_pClock->Now().count();
 }
 
+/** With colours if it is text. */
+OutputSettings SettingsOf(OutputFormat format, const OutputFilter& filter = {})
+{
+    OutputSettings settings;
+    settings.format = format;
+    settings.filter = filter;
+    settings.coloured = format == OutputFormat::Text;
+    return settings;
+}
+
 /** A listener that writes what a session gives, with these settings. */
 class Writer
 {
@@ -110,8 +120,7 @@ TEST_P(RecordingOf, ReplaysAsItWasInEveryFormatThroughEveryFilter)
     for (const OutputFormat format :
          {OutputFormat::Json, OutputFormat::Text, OutputFormat::Trace}) {
         for (const OutputFilter& filter : Filters()) {
-            writers.emplace_back(OutputSettings{format, filter, format == OutputFormat::Text},
-                                 m_Desk.Clock());
+            writers.emplace_back(SettingsOf(format, filter), m_Desk.Clock());
             m_Desk.Listeners().AddListener(&writers.back().Listener());
         }
     }
@@ -125,7 +134,7 @@ TEST_P(RecordingOf, ReplaysAsItWasInEveryFormatThroughEveryFilter)
         // Not EXPECT_EQ: it would print megabytes.
         EXPECT_TRUE(Replayed(recording, writer.Settings(), end) == written);
         if (writer.Settings().format == OutputFormat::Json) {
-            EXPECT_TRUE(Replayed(written, {OutputFormat::Json, {}, false}, end) == written);
+            EXPECT_TRUE(Replayed(written, SettingsOf(OutputFormat::Json), end) == written);
         }
     }
 }
