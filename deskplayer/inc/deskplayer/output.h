@@ -50,7 +50,8 @@ public:
      * @param stream outlives the output and does not throw; its state shows whether writing
      *               succeeded. It is written to inside callbacks, and never flushed.
      * @throw std::invalid_argument names the unknown word of the options, and a similar one or all
-     *        valid ones; or the malformed tag; or the format is "html", which only the program writes
+     *        valid ones; or the malformed tag; or the format is "html", which only the program
+     * writes
      */
     DeskOutput(Desk& desk, std::ostream& stream, const OutputOptions& options = {});
 
