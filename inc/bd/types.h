@@ -303,7 +303,7 @@ enum StillModeDef : KEVRO_Int32 {
  */
 struct AudioInfoType {
     AudioFormatType format;                   ///< coding of the stream
-    AudioSampleRateType sampleRate;           ///< samples per second
+    AudioSampleRateType sampleRate;           ///< sampling frequency
     AudioBitsPerSamplingType bitsPerSampling; ///< resolution of a sample
     AudioChannelType channels;                ///< arrangement of the channels
     Pid pid;                                  ///< packet identifier of the stream
@@ -322,10 +322,10 @@ struct AudioInfoType {
  * agree on them.
  */
 struct ZoomRectangleDef {
-    UInt16 X;      ///< left edge
-    UInt16 Y;      ///< top edge
-    UInt16 Width;  ///< extent to the right
-    UInt16 Height; ///< extent downwards
+    UInt16 X;      ///< horizontal position
+    UInt16 Y;      ///< vertical position
+    UInt16 Width;  ///< horizontal extent
+    UInt16 Height; ///< vertical extent
 };
 
 /** Zoom parameters. Passed to listeners by value. */

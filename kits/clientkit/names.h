@@ -27,7 +27,7 @@ namespace bdmv
 /** An enumerator and its name. */
 template <typename Enumeration> struct EnumeratorName {
     Enumeration code; ///< the enumerator
-    const char* name; ///< as a source writes it, without the prefix of its enumeration
+    const char* name; ///< as outputs write it
 };
 
 /** All named enumerators of an enumeration, in order of their values. */

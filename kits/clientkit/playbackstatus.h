@@ -95,9 +95,8 @@ struct PlaybackStatus {
      */
     PlaybackState resumesTo;
 
-    Reported<bd::PlayListIdDef> playList; ///< number of the play list
-    Reported<PlayItemStatus>
-        playItem; ///< names a play list too; may precede a new PlaybackStatus::playList
+    Reported<bd::PlayListIdDef> playList;   ///< number of the play list
+    Reported<PlayItemStatus> playItem;      ///< names a play list too; may precede a new #playList
     Reported<bd::ChapterNumberDef> chapter; ///< number of the chapter
     Reported<bd::TimePosition> position;    ///< by Stepped too
     Reported<bd::PlayMode> playMode;   ///< the current one; Continued reports the requested one
@@ -109,20 +108,20 @@ struct PlaybackStatus {
     Reported<bd::StreamNumberDef> audio;         ///< primary
     Reported<bd::AudioInfoType> audioInfo;       ///< of the primary audio
     Reported<bd::StreamNumberDef> subtitle;      ///< presentation graphics or text subtitles
-    Reported<bool> subtitleAvailable;            ///< whether that stream exists
+    Reported<bool> subtitleAvailable;            ///< by PresentationGraphicsInfo
     Reported<bool> subtitleShown;                ///< by PresentationGraphicsDisplay
     Reported<bd::UserStyleNumber> subtitleStyle; ///< user style of text subtitles
     Reported<bd::UInt8> subtitleStyles;          ///< number of user styles
 
-    Reported<bool> pipAvailable; ///< whether the play item has a picture-in-picture
-    Reported<bd::StreamNumberDef> secondaryVideo;   ///< by SecondaryVideoDisplay too
-    Reported<bool> secondaryVideoShown;             ///< by SecondaryVideoDisplay
-    Reported<bool> secondaryAudioAvailable;         ///< whether the play item has secondary audio
-    Reported<bd::StreamNumberDef> secondaryAudio;   ///< by SecondaryAudioDisplay too
-    Reported<bool> secondaryAudioShown;             ///< by SecondaryAudioDisplay
+    Reported<bool> pipAvailable;                  ///< by PictureInPictureAvailable and its opposite
+    Reported<bd::StreamNumberDef> secondaryVideo; ///< by SecondaryVideoDisplay too
+    Reported<bool> secondaryVideoShown;           ///< by SecondaryVideoDisplay
+    Reported<bool> secondaryAudioAvailable;       ///< by SecondaryAudioAvailable and its opposite
+    Reported<bd::StreamNumberDef> secondaryAudio; ///< by SecondaryAudioDisplay too
+    Reported<bool> secondaryAudioShown;           ///< by SecondaryAudioDisplay
     Reported<bd::AudioInfoType> secondaryAudioInfo; ///< attributes of the stream
     Reported<bd::StreamNumberDef> pipSubtitle;      ///< of the picture-in-picture window
-    Reported<bool> pipSubtitleAvailable;            ///< whether that stream exists
+    Reported<bool> pipSubtitleAvailable;            ///< by PipPgTextStInfo
     Reported<bool> pipSubtitleSelected;             ///< by PipPgTextSelect
 
     Reported<bd::StreamNumberDef> interactiveGraphics; ///< the stream of menus

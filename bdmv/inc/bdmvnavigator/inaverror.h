@@ -14,7 +14,7 @@ namespace bdmv
 class INavError
 {
 public:
-    /** What an operation returns. The first two, and ErrOkIgnored, are successes. */
+    /** The result of an operation: ErrOk if it succeeded. */
     enum ErrCode : KEVRO_Int32 {
         ErrOk = 0,
         ErrOkRace = 1,
