@@ -20,7 +20,7 @@ namespace bdmv
 class INavigatorEvent
 {
 public:
-    typedef bd::EventListenerList<INavigatorListener> Listeners;
+    typedef bd::EventListenerList<INavigatorListener> Listeners; ///< the navigator's listeners
 
     INavigatorEvent() = default;
     virtual ~INavigatorEvent() = default;

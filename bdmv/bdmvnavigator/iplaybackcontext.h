@@ -32,8 +32,8 @@ namespace bdmv
 class IPlaybackContext : public INavError
 {
 public:
-    typedef INavError::ErrCode ErrCode;
-    typedef IProgramData::RefPtr RefPtr;
+    typedef INavError::ErrCode ErrCode;  ///< what operations with output parameters return
+    typedef IProgramData::RefPtr RefPtr; ///< shares the program of a button
 
     IPlaybackContext() = default;
     ~IPlaybackContext() override = default;

@@ -46,7 +46,7 @@ public:
     NavigatorEvent& operator=(const NavigatorEvent&) = delete;
 
 protected:
-    IPlaybackContext& m_rPlaybackContext;
+    IPlaybackContext& m_rPlaybackContext; ///< read when the event is dispatched
 };
 
 /** Playback started. */

@@ -133,8 +133,9 @@ private:
 template <typename T> class EventInvokerParam0
 {
 public:
-    typedef void (T::*MethodPointer)();
+    typedef void (T::*MethodPointer)(); ///< the method
 
+    /** Stores the method. */
     explicit EventInvokerParam0(MethodPointer method) : m_pMethod(method) {}
 
     /** Calls the method on @p listener, once. */
@@ -148,10 +149,12 @@ private:
 template <typename T, typename P1> class EventInvokerParam1
 {
 public:
-    typedef void (T::*MethodPointer)(P1);
+    typedef void (T::*MethodPointer)(P1); ///< the method
 
+    /** Stores the method and its arguments. */
     EventInvokerParam1(MethodPointer method, const P1& param) : m_Param(param), m_pMethod(method) {}
 
+    /** Calls the method on @p listener, once. */
     void Fire(T& listener) { (listener.*m_pMethod)(m_Param); }
 
 private:
@@ -163,13 +166,15 @@ private:
 template <typename T, typename P1, typename P2> class EventInvokerParam2
 {
 public:
-    typedef void (T::*MethodPointer)(P1, P2);
+    typedef void (T::*MethodPointer)(P1, P2); ///< the method
 
+    /** Stores the method and its arguments. */
     EventInvokerParam2(MethodPointer method, const P1& param1, const P2& param2)
         : m_Param1(param1), m_Param2(param2), m_pMethod(method)
     {
     }
 
+    /** Calls the method on @p listener, once. */
     void Fire(T& listener) { (listener.*m_pMethod)(m_Param1, m_Param2); }
 
 private:
@@ -182,13 +187,15 @@ private:
 template <typename T, typename P1, typename P2, typename P3> class EventInvokerParam3
 {
 public:
-    typedef void (T::*MethodPointer)(P1, P2, P3);
+    typedef void (T::*MethodPointer)(P1, P2, P3); ///< the method
 
+    /** Stores the method and its arguments. */
     EventInvokerParam3(MethodPointer method, const P1& param1, const P2& param2, const P3& param3)
         : m_Param1(param1), m_Param2(param2), m_Param3(param3), m_pMethod(method)
     {
     }
 
+    /** Calls the method on @p listener, once. */
     void Fire(T& listener) { (listener.*m_pMethod)(m_Param1, m_Param2, m_Param3); }
 
 private:
@@ -202,14 +209,16 @@ private:
 template <typename T, typename P1, typename P2, typename P3, typename P4> class EventInvokerParam4
 {
 public:
-    typedef void (T::*MethodPointer)(P1, P2, P3, P4);
+    typedef void (T::*MethodPointer)(P1, P2, P3, P4); ///< the method
 
+    /** Stores the method and its arguments. */
     EventInvokerParam4(MethodPointer method, const P1& param1, const P2& param2, const P3& param3,
                        const P4& param4)
         : m_Param1(param1), m_Param2(param2), m_Param3(param3), m_Param4(param4), m_pMethod(method)
     {
     }
 
+    /** Calls the method on @p listener, once. */
     void Fire(T& listener) { (listener.*m_pMethod)(m_Param1, m_Param2, m_Param3, m_Param4); }
 
 private:
@@ -226,7 +235,7 @@ private:
  * a const reference, so that the value is not copied before it reaches the invoker.
  */
 template <typename P> struct FiredValue {
-    typedef const P& Type;
+    typedef const P& Type; ///< of the argument
 };
 
 /**

@@ -116,7 +116,10 @@ public:
         return *this;
     }
 
+    /** The object; not on an empty RefPtr. */
     T* operator->() const { return m_RawPtr; }
+
+    /** The object; not on an empty RefPtr. */
     T& operator*() const { return *m_RawPtr; }
 
     /** Whether there is an object. */
@@ -128,7 +131,10 @@ public:
     /** Whether this is the only RefPtr that shares the object; false when empty. */
     bool IsUnique() const { return GetCount() == 1; }
 
+    /** Whether there is no object. */
     bool Null() const { return m_RawPtr == nullptr; }
+
+    /** Whether there is an object. */
     bool IsValid() const { return !Null(); }
 
     /** How many RefPtr objects share the object; 0 when empty. Other threads may change it. */

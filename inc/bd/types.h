@@ -17,12 +17,12 @@
 namespace bd
 {
 
-typedef KEVRO_UInt8 UInt8;
-typedef KEVRO_UInt16 UInt16;
-typedef KEVRO_UInt32 UInt32;
-typedef KEVRO_UInt64 UInt64;
-typedef KEVRO_Int32 Int32;
-typedef KEVRO_Int64 Int64;
+typedef KEVRO_UInt8 UInt8;   ///< unsigned, 8 bits
+typedef KEVRO_UInt16 UInt16; ///< unsigned, 16 bits
+typedef KEVRO_UInt32 UInt32; ///< unsigned, 32 bits
+typedef KEVRO_UInt64 UInt64; ///< unsigned, 64 bits
+typedef KEVRO_Int32 Int32;   ///< signed, 32 bits
+typedef KEVRO_Int64 Int64;   ///< signed, 64 bits
 
 typedef UInt64 TimePosition;      ///< position on the presentation time line
 typedef UInt32 Pts;               ///< presentation time stamp
@@ -302,11 +302,11 @@ enum StillModeDef : KEVRO_Int32 {
  * default-constructed.
  */
 struct AudioInfoType {
-    AudioFormatType format;
-    AudioSampleRateType sampleRate;
-    AudioBitsPerSamplingType bitsPerSampling;
-    AudioChannelType channels;
-    Pid pid;
+    AudioFormatType format;                   ///< coding of the stream
+    AudioSampleRateType sampleRate;           ///< sampling frequency
+    AudioBitsPerSamplingType bitsPerSampling; ///< resolution of a sample
+    AudioChannelType channels;                ///< arrangement of the channels
+    Pid pid;                                  ///< packet identifier of the stream
     UInt32 u4AudChannelLayout; ///< the decoder's channel-layout word, passed through unchanged
 
     AudioInfoType()
@@ -322,10 +322,10 @@ struct AudioInfoType {
  * agree on them.
  */
 struct ZoomRectangleDef {
-    UInt16 X;
-    UInt16 Y;
-    UInt16 Width;
-    UInt16 Height;
+    UInt16 X;      ///< horizontal position
+    UInt16 Y;      ///< vertical position
+    UInt16 Width;  ///< horizontal extent
+    UInt16 Height; ///< vertical extent
 };
 
 /** Zoom parameters. Passed to listeners by value. */
@@ -337,13 +337,13 @@ struct ZOOM_PARAM_Def {
 
 /** The trigger that is set. */
 struct Trigger {
-    TriggerType triggerType;
+    TriggerType triggerType; ///< its kind
 };
 
 /** Where a chapter starts. */
 struct BDMarkDef {
-    TimePosition time;
-    UInt16 chpNo; ///< chapter number
+    TimePosition time; ///< start of the chapter
+    UInt16 chpNo;      ///< chapter number
 };
 
 /** A block of bytes owned elsewhere. */
@@ -359,12 +359,16 @@ public:
     /** Forward at normal speed. */
     PlayMode() : m_Direction(PlayDirectionForward), m_Speed(PlaySpeedNormal) {}
 
+    /** A direction and a speed. */
     PlayMode(PlayDirectionDef direction, PlaySpeedDef speed)
         : m_Direction(direction), m_Speed(speed)
     {
     }
 
+    /** The direction. */
     PlayDirectionDef Direction() const { return m_Direction; }
+
+    /** The speed. */
     PlaySpeedDef Speed() const { return m_Speed; }
 
 private:
@@ -372,16 +376,19 @@ private:
     PlaySpeedDef m_Speed;
 };
 
+/** Whether all members are equal. */
 inline bool operator==(const PlayMode& left, const PlayMode& right)
 {
     return left.Direction() == right.Direction() && left.Speed() == right.Speed();
 }
 
+/** Whether any member differs. */
 inline bool operator!=(const PlayMode& left, const PlayMode& right)
 {
     return !(left == right);
 }
 
+/** Whether all members are equal. */
 inline bool operator==(const AudioInfoType& left, const AudioInfoType& right)
 {
     return left.format == right.format && left.sampleRate == right.sampleRate &&
@@ -389,48 +396,57 @@ inline bool operator==(const AudioInfoType& left, const AudioInfoType& right)
            left.pid == right.pid && left.u4AudChannelLayout == right.u4AudChannelLayout;
 }
 
+/** Whether any member differs. */
 inline bool operator!=(const AudioInfoType& left, const AudioInfoType& right)
 {
     return !(left == right);
 }
 
+/** Whether all members are equal. */
 inline bool operator==(const ZoomRectangleDef& left, const ZoomRectangleDef& right)
 {
     return left.X == right.X && left.Y == right.Y && left.Width == right.Width &&
            left.Height == right.Height;
 }
 
+/** Whether any member differs. */
 inline bool operator!=(const ZoomRectangleDef& left, const ZoomRectangleDef& right)
 {
     return !(left == right);
 }
 
+/** Whether all members are equal. */
 inline bool operator==(const ZOOM_PARAM_Def& left, const ZOOM_PARAM_Def& right)
 {
     return left.rClipRectangle == right.rClipRectangle &&
            left.rDestRectangle == right.rDestRectangle && left.u4Delay == right.u4Delay;
 }
 
+/** Whether any member differs. */
 inline bool operator!=(const ZOOM_PARAM_Def& left, const ZOOM_PARAM_Def& right)
 {
     return !(left == right);
 }
 
+/** Whether all members are equal. */
 inline bool operator==(const Trigger& left, const Trigger& right)
 {
     return left.triggerType == right.triggerType;
 }
 
+/** Whether any member differs. */
 inline bool operator!=(const Trigger& left, const Trigger& right)
 {
     return !(left == right);
 }
 
+/** Whether all members are equal. */
 inline bool operator==(const BDMarkDef& left, const BDMarkDef& right)
 {
     return left.time == right.time && left.chpNo == right.chpNo;
 }
 
+/** Whether any member differs. */
 inline bool operator!=(const BDMarkDef& left, const BDMarkDef& right)
 {
     return !(left == right);

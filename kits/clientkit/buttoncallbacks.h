@@ -22,9 +22,9 @@ struct ExecuteButton {
     bd::ButtonId buttonId;
     IProgramData::RefPtr program;
 
-    /** Hands over a copy: what the listener does to the pointer does not change this value. */
     void CallOn(INavigatorListener& listener) const
     {
+        // A copy: what the listener does to the pointer does not change this value.
         IProgramData::RefPtr copy(program);
         listener.ExecuteButton(ticket, buttonId, copy);
     }

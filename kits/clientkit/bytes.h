@@ -15,6 +15,7 @@ struct Bytes {
     const void* data; ///< first byte; may be null, whatever the size
     bd::UInt32 size;  ///< in bytes
 
+    /** Refers to @p theSize bytes. */
     Bytes(const void* theData, bd::UInt32 theSize) : data(theData), size(theSize) {}
 };
 

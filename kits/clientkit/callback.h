@@ -63,10 +63,14 @@ public:
         new (m_Arguments) Arguments(arguments);
     }
 
+    /** The same callback with the same arguments; shares a program. */
     Callback(const Callback& other);
+
+    /** Becomes the same callback with the same arguments; shares a program. */
     Callback& operator=(const Callback& other);
     ~Callback();
 
+    /** Which callback it is. */
     CallbackId Id() const { return m_Id; }
 
     /**
@@ -132,6 +136,7 @@ private:
  */
 bool operator==(const Callback& left, const Callback& right);
 
+/** Whether they are different callbacks or have different arguments. */
 inline bool operator!=(const Callback& left, const Callback& right)
 {
     return !(left == right);
@@ -237,9 +242,11 @@ template <typename Visitor> void Callback::Visit(Visitor&& visitor) const
 {
     typedef typename std::remove_reference<Visitor>::type Target;
     static void (*const visits[])(const Callback&, Target&) = {
+/// @cond not for programs
 #define BDMV_CALLBACK_VISIT(interface, name) &Callback::VisitAs<callbacks::name, Target>,
         BDMV_CALLBACKS(BDMV_CALLBACK_VISIT)
 #undef BDMV_CALLBACK_VISIT
+        /// @endcond
     };
     visits[m_Id](*this, visitor);
 }

@@ -10,8 +10,12 @@
 namespace bdmv
 {
 
-// Every callback in slot order, with the interface that declares it: the one source of numbers,
-// names and interfaces.
+/**
+ * Every callback in slot order, with the interface that declares it: the one source of numbers,
+ * names and interfaces.
+ *
+ * @param ENTRY a macro of two names: interface and callback
+ */
 #define BDMV_CALLBACKS(ENTRY)                                                                      \
     ENTRY(Control, PlayStarted)                                                                    \
     ENTRY(Control, FirstPictureDelivered)                                                          \
@@ -72,6 +76,7 @@ namespace bdmv
 
 /** Identifies a callback: CallbackPlayStarted = 0 and so on, in slot order. */
 enum CallbackId : KEVRO_Int32 {
+/** Writes an enumerator; undefined below. */
 #define BDMV_CALLBACK_ENUMERATOR(interface, name) Callback##name,
     BDMV_CALLBACKS(BDMV_CALLBACK_ENUMERATOR)
 #undef BDMV_CALLBACK_ENUMERATOR

@@ -24,15 +24,15 @@ constexpr std::size_t TimePlaces = 24;
 class CallbackTimes
 {
 public:
-    typedef std::chrono::steady_clock::duration Duration;
-    typedef std::chrono::steady_clock::time_point Time;
+    typedef std::chrono::steady_clock::duration Duration; ///< of a callback
+    typedef std::chrono::steady_clock::time_point Time;   ///< when it began or ended
 
     /** The times of one callback. */
     struct Record {
-        bd::UInt64 count;
-        Duration longest;
-        Duration total;
-        bd::UInt64 histogram[TimePlaces];
+        bd::UInt64 count;                 ///< how often it was called
+        Duration longest;                 ///< the longest call
+        Duration total;                   ///< all calls together
+        bd::UInt64 histogram[TimePlaces]; ///< places as in CallbackWatch::Statistics
     };
 
     /** @param budget the longest time that is not reported; may be the largest value of its type */

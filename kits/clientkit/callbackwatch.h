@@ -53,9 +53,9 @@ class CallbackWatch : public CallbackListener
 public:
     /** How long a callback took so far. Fractions of microseconds are cut off. */
     struct Statistics {
-        std::uint64_t count;
-        std::chrono::microseconds longest;
-        std::chrono::microseconds total;
+        std::uint64_t count;               ///< how often it was called
+        std::chrono::microseconds longest; ///< the longest call
+        std::chrono::microseconds total;   ///< all calls together
         /**
          * How many took how long: place 0 is less than a microsecond, place n is 2^(n-1) or more
          * and less than 2^n microseconds, the last place is everything longer.

@@ -49,6 +49,7 @@ typedef void (*JsonSink)(void* user, const char* bytes, std::size_t size);
 class JsonLine
 {
 public:
+    /** Passes lines to @p sink, with @p user. */
     JsonLine(JsonSink sink, void* user);
 
     JsonLine(const JsonLine&) = delete;
@@ -71,7 +72,11 @@ public:
 
     /** Begins a block of bytes. AddBytes() any number of times follows, then EndBytes(). */
     void BeginBytes(const char* name);
+
+    /** Adds bytes to the block. */
     void AddBytes(const bd::UInt8* bytes, std::size_t size);
+
+    /** Ends the block. */
     void EndBytes();
 
     /** Ends the line of a callback. */

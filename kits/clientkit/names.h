@@ -26,21 +26,25 @@ namespace bdmv
 
 /** An enumerator and its name. */
 template <typename Enumeration> struct EnumeratorName {
-    Enumeration code;
-    const char* name;
+    Enumeration code; ///< the enumerator
+    const char* name; ///< as outputs write it
 };
 
 /** All named enumerators of an enumeration, in order of their values. */
 template <typename Enumeration> class EnumeratorNames
 {
 public:
+    /** The entries from @p first up to, but not including, @p last. */
     EnumeratorNames(const EnumeratorName<Enumeration>* first,
                     const EnumeratorName<Enumeration>* last)
         : m_pFirst(first), m_pLast(last)
     {
     }
 
+    /** The first entry. */
     const EnumeratorName<Enumeration>* begin() const { return m_pFirst; }
+
+    /** The end of the entries. */
     const EnumeratorName<Enumeration>* end() const { return m_pLast; }
 
 private:
@@ -51,6 +55,8 @@ private:
 /** The names of an enumeration: one of those below, the enumerations that callbacks carry. */
 template <typename Enumeration> EnumeratorNames<Enumeration> NamesOf();
 
+/** @{ */
+/** All that are named. */
 template <> EnumeratorNames<bd::PlayDirectionDef> NamesOf<bd::PlayDirectionDef>();
 template <> EnumeratorNames<bd::PlaySpeedDef> NamesOf<bd::PlaySpeedDef>();
 template <> EnumeratorNames<bd::TriggerType> NamesOf<bd::TriggerType>();
@@ -63,6 +69,7 @@ template <> EnumeratorNames<bd::AudioChannelType> NamesOf<bd::AudioChannelType>(
 template <> EnumeratorNames<bd::UserOperationMaskDef> NamesOf<bd::UserOperationMaskDef>();
 template <>
 EnumeratorNames<INavControlListener::FinishedReason> NamesOf<INavControlListener::FinishedReason>();
+/** @} */
 
 /**
  * The name of an enumerator; null for a value without one.

@@ -62,6 +62,7 @@ template <typename Value> bool operator==(const Reported<Value>& left, const Rep
     return left.known == right.known && (!left.known || left.value == right.value);
 }
 
+/** Whether one is known and the other is not, or the values differ. */
 template <typename Value> bool operator!=(const Reported<Value>& left, const Reported<Value>& right)
 {
     return !(left == right);
@@ -69,14 +70,16 @@ template <typename Value> bool operator!=(const Reported<Value>& left, const Rep
 
 /** A play item and its primary video; see INavSettingsListener::PlayItem(). */
 struct PlayItemStatus {
-    bd::PlayListIdDef playListId;
-    bd::PlayItemIdDef playItemId;
-    bd::VideoFormatType videoFormat;
-    bd::VideoAspectRatioType aspectRatio;
+    bd::PlayListIdDef playListId;         ///< number of the play list
+    bd::PlayItemIdDef playItemId;         ///< number of the play item
+    bd::VideoFormatType videoFormat;      ///< of the primary video
+    bd::VideoAspectRatioType aspectRatio; ///< of the primary video
 };
 
+/** Whether all members are equal. */
 bool operator==(const PlayItemStatus& left, const PlayItemStatus& right);
 
+/** Whether any member differs. */
 inline bool operator!=(const PlayItemStatus& left, const PlayItemStatus& right)
 {
     return !(left == right);
@@ -84,7 +87,7 @@ inline bool operator!=(const PlayItemStatus& left, const PlayItemStatus& right)
 
 /** Everything that the callbacks say lasts. A plain value: copying it allocates nothing. */
 struct PlaybackStatus {
-    Reported<PlaybackState> state;
+    Reported<PlaybackState> state; ///< playing, paused, stopped and the like
 
     /**
      * The state that Resumed returns to: during PlaybackSuspended the state before it;
@@ -92,39 +95,39 @@ struct PlaybackStatus {
      */
     PlaybackState resumesTo;
 
-    Reported<bd::PlayListIdDef> playList;
-    Reported<PlayItemStatus> playItem; ///< names a play list too; may precede a new #playList
-    Reported<bd::ChapterNumberDef> chapter;
-    Reported<bd::TimePosition> position; ///< by Stepped too
-    Reported<bd::PlayMode> playMode;     ///< the current one; Continued reports the requested one
-    Reported<bd::ZOOM_PARAM_Def> zoom;
-    Reported<UOMaskTable> mask; ///< compared as stored, whatever ::g_u1Bduopmask says
+    Reported<bd::PlayListIdDef> playList;   ///< number of the play list
+    Reported<PlayItemStatus> playItem;      ///< names a play list too; may precede a new #playList
+    Reported<bd::ChapterNumberDef> chapter; ///< number of the chapter
+    Reported<bd::TimePosition> position;    ///< by Stepped too
+    Reported<bd::PlayMode> playMode;   ///< the current one; Continued reports the requested one
+    Reported<bd::ZOOM_PARAM_Def> zoom; ///< by ZoomModeSet
+    Reported<UOMaskTable> mask;        ///< compared as stored, whatever ::g_u1Bduopmask says
 
-    Reported<bd::StreamNumberDef> video; ///< primary
-    Reported<bd::AngleNumberDef> angle;
-    Reported<bd::StreamNumberDef> audio;    ///< primary
-    Reported<bd::AudioInfoType> audioInfo;  ///< of the primary audio
-    Reported<bd::StreamNumberDef> subtitle; ///< presentation graphics or text subtitles
-    Reported<bool> subtitleAvailable;
-    Reported<bool> subtitleShown;
+    Reported<bd::StreamNumberDef> video;         ///< primary
+    Reported<bd::AngleNumberDef> angle;          ///< number of the angle
+    Reported<bd::StreamNumberDef> audio;         ///< primary
+    Reported<bd::AudioInfoType> audioInfo;       ///< of the primary audio
+    Reported<bd::StreamNumberDef> subtitle;      ///< presentation graphics or text subtitles
+    Reported<bool> subtitleAvailable;            ///< by PresentationGraphicsInfo
+    Reported<bool> subtitleShown;                ///< by PresentationGraphicsDisplay
     Reported<bd::UserStyleNumber> subtitleStyle; ///< user style of text subtitles
     Reported<bd::UInt8> subtitleStyles;          ///< number of user styles
 
-    Reported<bool> pipAvailable;
+    Reported<bool> pipAvailable;                  ///< by PictureInPictureAvailable and its opposite
     Reported<bd::StreamNumberDef> secondaryVideo; ///< by SecondaryVideoDisplay too
-    Reported<bool> secondaryVideoShown;
-    Reported<bool> secondaryAudioAvailable;
+    Reported<bool> secondaryVideoShown;           ///< by SecondaryVideoDisplay
+    Reported<bool> secondaryAudioAvailable;       ///< by SecondaryAudioAvailable and its opposite
     Reported<bd::StreamNumberDef> secondaryAudio; ///< by SecondaryAudioDisplay too
-    Reported<bool> secondaryAudioShown;
-    Reported<bd::AudioInfoType> secondaryAudioInfo;
-    Reported<bd::StreamNumberDef> pipSubtitle; ///< of the picture-in-picture window
-    Reported<bool> pipSubtitleAvailable;
-    Reported<bool> pipSubtitleSelected;
+    Reported<bool> secondaryAudioShown;           ///< by SecondaryAudioDisplay
+    Reported<bd::AudioInfoType> secondaryAudioInfo; ///< attributes of the stream
+    Reported<bd::StreamNumberDef> pipSubtitle;      ///< of the picture-in-picture window
+    Reported<bool> pipSubtitleAvailable;            ///< by PipPgTextStInfo
+    Reported<bool> pipSubtitleSelected;             ///< by PipPgTextSelect
 
-    Reported<bd::StreamNumberDef> interactiveGraphics;
-    Reported<bool> menuVisible;
-    Reported<bool> menuActive;
-    Reported<bool> popUpMenuAvailable;
+    Reported<bd::StreamNumberDef> interactiveGraphics; ///< the stream of menus
+    Reported<bool> menuVisible;                        ///< whether interactive graphics are visible
+    Reported<bool> menuActive;                         ///< whether interactive graphics are active
+    Reported<bool> popUpMenuAvailable;                 ///< whether a pop-up menu can be opened
     Reported<bool> buttonBusy; ///< whether the activation of a button is under way
 
     /** Nothing is known. */
@@ -133,8 +136,10 @@ struct PlaybackStatus {
 
 static_assert(std::is_trivially_copyable<PlaybackStatus>::value, "a plain value");
 
+/** Whether all parts are equal, as Reported compares them. */
 bool operator==(const PlaybackStatus& left, const PlaybackStatus& right);
 
+/** Whether any part differs. */
 inline bool operator!=(const PlaybackStatus& left, const PlaybackStatus& right)
 {
     return !(left == right);

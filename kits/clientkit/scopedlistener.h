@@ -59,6 +59,7 @@ public:
     {
     }
 
+    /** Takes over the registration of @p other, which is empty afterwards. */
     ScopedListener(ScopedListener&& other) noexcept
         : m_pList(other.m_pList), m_pListener(other.m_pListener)
     {

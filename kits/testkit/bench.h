@@ -98,10 +98,10 @@ public:
             });
     }
 
-    Journal journal;
-    FakePlatform platform{&journal};
-    ScriptablePlaybackContext context{journal};
-    bd::EventListenerList<bdmv::INavigatorListener> listeners;
+    Journal journal;                            ///< entries of context, platform and listeners
+    FakePlatform platform{&journal};            ///< the functions of the platform
+    ScriptablePlaybackContext context{journal}; ///< what events query
+    bd::EventListenerList<bdmv::INavigatorListener> listeners; ///< receive the events
 };
 
 } // namespace bdmvtest

@@ -58,6 +58,7 @@ inline std::string Describe(const bdmv::UOMaskTable& mask);
 inline std::string Describe(const bdmv::IProgramData::RefPtr& program);
 
 /** The bytes of a block and its size, in decimal. */
+/** The bytes and their number; "null" for a null pointer. */
 inline std::string DescribeBytes(const void* data, bd::UInt32 size);
 
 /** Appends to a list that is separated by commas. */
@@ -81,31 +82,37 @@ std::string DescribeCall(const std::string& name, const Arguments&... arguments)
     return name + "(" + DescribeAll(arguments...) + ")";
 }
 
+/** "true" or "false". */
 inline std::string Describe(bool value)
 {
     return value ? "true" : "false";
 }
 
+/** Direction and speed. */
 inline std::string Describe(const bd::PlayMode& mode)
 {
     return "(" + DescribeAll(mode.Direction(), mode.Speed()) + ")";
 }
 
+/** The kind of trigger. */
 inline std::string Describe(const bd::Trigger& trigger)
 {
     return "(" + DescribeAll(trigger.triggerType) + ")";
 }
 
+/** Left, top, width, height. */
 inline std::string Describe(const bd::ZoomRectangleDef& rectangle)
 {
     return "(" + DescribeAll(rectangle.X, rectangle.Y, rectangle.Width, rectangle.Height) + ")";
 }
 
+/** Both rectangles and the delay. */
 inline std::string Describe(const bd::ZOOM_PARAM_Def& zoom)
 {
     return "(" + DescribeAll(zoom.rClipRectangle, zoom.rDestRectangle, zoom.u4Delay) + ")";
 }
 
+/** All attributes. */
 inline std::string Describe(const bd::AudioInfoType& info)
 {
     return "(" +
@@ -114,11 +121,13 @@ inline std::string Describe(const bd::AudioInfoType& info)
            ")";
 }
 
+/** The mask as it is reported, as a number. */
 inline std::string Describe(const bdmv::UOMaskTable& mask)
 {
     return Describe(mask.GetUOMaskTable());
 }
 
+/** The bytes and their number; "null" for a null pointer. */
 inline std::string DescribeBytes(const void* data, bd::UInt32 size)
 {
     std::string text = data == nullptr ? "null" : "bytes";
@@ -128,11 +137,13 @@ inline std::string DescribeBytes(const void* data, bd::UInt32 size)
     return text + ", " + Describe(size);
 }
 
+/** The bytes and their number. */
 inline std::string Describe(const bd::DataBlockDef& block)
 {
     return "(" + DescribeBytes(block.pData, block.size) + ")";
 }
 
+/** How many pointers share the program. */
 inline std::string Describe(const bdmv::IProgramData::RefPtr& program)
 {
     return program ? "program shared by " + Describe(program.GetCount()) : "no program";
@@ -157,11 +168,13 @@ inline std::string DescribeOperations(const bdmv::UOMaskTable& mask)
 namespace bdmv
 {
 
+/** Prints with bdmvtest::Describe(); called by GoogleTest. */
 inline void PrintTo(INavControlListener::FinishedReason reason, std::ostream* stream)
 {
     *stream << bdmvtest::Describe(reason);
 }
 
+/** Prints with bdmvtest::Describe(); called by GoogleTest. */
 inline void PrintTo(const UOMaskTable& mask, std::ostream* stream)
 {
     *stream << bdmvtest::DescribeOperations(mask);
@@ -175,66 +188,79 @@ namespace bd
 // Enumerators as a source writes them. These are no templates, because those would compete with the
 // one of GoogleTest.
 
+/** Prints with bdmvtest::Describe(); called by GoogleTest. */
 inline void PrintTo(PlayDirectionDef direction, std::ostream* stream)
 {
     *stream << bdmvtest::Describe(direction);
 }
 
+/** Prints with bdmvtest::Describe(); called by GoogleTest. */
 inline void PrintTo(PlaySpeedDef speed, std::ostream* stream)
 {
     *stream << bdmvtest::Describe(speed);
 }
 
+/** Prints with bdmvtest::Describe(); called by GoogleTest. */
 inline void PrintTo(TriggerType type, std::ostream* stream)
 {
     *stream << bdmvtest::Describe(type);
 }
 
+/** Prints with bdmvtest::Describe(); called by GoogleTest. */
 inline void PrintTo(VideoFormatType format, std::ostream* stream)
 {
     *stream << bdmvtest::Describe(format);
 }
 
+/** Prints with bdmvtest::Describe(); called by GoogleTest. */
 inline void PrintTo(VideoAspectRatioType aspectRatio, std::ostream* stream)
 {
     *stream << bdmvtest::Describe(aspectRatio);
 }
 
+/** Prints with bdmvtest::Describe(); called by GoogleTest. */
 inline void PrintTo(AudioFormatType format, std::ostream* stream)
 {
     *stream << bdmvtest::Describe(format);
 }
 
+/** Prints with bdmvtest::Describe(); called by GoogleTest. */
 inline void PrintTo(AudioSampleRateType sampleRate, std::ostream* stream)
 {
     *stream << bdmvtest::Describe(sampleRate);
 }
 
+/** Prints with bdmvtest::Describe(); called by GoogleTest. */
 inline void PrintTo(AudioBitsPerSamplingType bitsPerSample, std::ostream* stream)
 {
     *stream << bdmvtest::Describe(bitsPerSample);
 }
 
+/** Prints with bdmvtest::Describe(); called by GoogleTest. */
 inline void PrintTo(AudioChannelType channels, std::ostream* stream)
 {
     *stream << bdmvtest::Describe(channels);
 }
 
+/** Prints with bdmvtest::Describe(); called by GoogleTest. */
 inline void PrintTo(UserOperationMaskDef operation, std::ostream* stream)
 {
     *stream << bdmvtest::Describe(operation);
 }
 
+/** Prints with bdmvtest::Describe(); called by GoogleTest. */
 inline void PrintTo(const AudioInfoType& info, std::ostream* stream)
 {
     *stream << bdmvtest::Describe(info);
 }
 
+/** Prints with bdmvtest::Describe(); called by GoogleTest. */
 inline void PrintTo(const PlayMode& mode, std::ostream* stream)
 {
     *stream << bdmvtest::Describe(mode);
 }
 
+/** Prints with bdmvtest::Describe(); called by GoogleTest. */
 inline void PrintTo(const ZOOM_PARAM_Def& zoom, std::ostream* stream)
 {
     *stream << bdmvtest::Describe(zoom);

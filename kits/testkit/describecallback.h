@@ -39,7 +39,7 @@ template <typename Enumeration> std::string ShortName(Enumeration value)
 
 /** An argument of a callback, for messages and comparisons. */
 struct Argument {
-    std::string name;
+    std::string name; ///< as outputs write it
     std::string text; ///< for people
     std::string
         value; ///< equal if and only if the arguments are; bytes are compared, not addresses
@@ -49,8 +49,9 @@ struct Argument {
 class ArgumentCollector
 {
 public:
-    std::vector<Argument> arguments;
+    std::vector<Argument> arguments; ///< those visited so far
 
+    /** Adds an argument. */
     template <typename Value> void operator()(const char* name, const Value& value)
     {
         if constexpr (std::is_enum_v<Value>) {
@@ -60,6 +61,7 @@ public:
         }
     }
 
+    /** Adds a mask, as stored. */
     void operator()(const char* name, const bdmv::UOMaskTable& mask)
     {
         // The stored mask: the reported one depends on a debug setting.
@@ -69,12 +71,14 @@ public:
         Add(name, DescribeOperations(mask), Describe(stored));
     }
 
+    /** Adds a block by its bytes. */
     void operator()(const char* name, const bdmv::Bytes& bytes)
     {
         const std::string text = DescribeBytes(bytes.data, bytes.size);
         Add(name, text.substr(0, text.rfind(',')), text);
     }
 
+    /** Adds a program by its address. */
     void operator()(const char* name, const bdmv::IProgramData::RefPtr& program)
     {
         const void* const address = program.Get();
@@ -115,11 +119,13 @@ inline std::string Describe(const bdmv::Callback& callback)
 namespace bdmv
 {
 
+/** Prints with Describe(); called by GoogleTest. */
 inline void PrintTo(const Callback& callback, std::ostream* stream)
 {
     *stream << bdmvtest::Describe(callback);
 }
 
+/** Prints with Describe(); called by GoogleTest. */
 inline void PrintTo(CallbackId id, std::ostream* stream)
 {
     *stream << NameOf(id);

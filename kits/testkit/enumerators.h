@@ -32,6 +32,7 @@ template <typename Enumeration, Enumeration... values> std::string_view SpellCon
     return signature.substr(signature.find(label) + label.size() + 1);
 }
 
+/** SpellConstants() of the numbers of a sequence. */
 template <typename Enumeration, std::size_t... values>
 std::string_view SpellConstantsFrom0(std::index_sequence<values...>)
 {

@@ -57,6 +57,7 @@ namespace bdmvtest
 class FakePlatform
 {
 public:
+    /** Takes the place of KEVRO_Log_IsEnabled(). */
     typedef std::function<KEVRO_Bool(KEVRO_UInt32 component, KEVRO_Int32 level, KEVRO_Bool hiFreq)>
         LogSwitch;
 
@@ -166,6 +167,7 @@ private:
 
 } // namespace bdmvtest
 
+/// @cond The platform interface documents its functions.
 __attribute__((weak)) int g_u1Bduopmask = 0;
 
 __attribute__((weak)) KEVRO_Bool KEVRO_Log_IsEnabled(KEVRO_UInt32 component, KEVRO_Int32 level,
@@ -203,5 +205,6 @@ __attribute__((weak)) void Assert(const char* expression, const char* file, int 
     }
     platform->Fail(expression, file, line);
 }
+/// @endcond
 
 #endif

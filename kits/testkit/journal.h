@@ -34,6 +34,7 @@ namespace bdmvtest
 class Journal
 {
 public:
+    /** Adds an entry, which has no line end. */
     void Add(const std::string& entry)
     {
         const std::lock_guard<std::mutex> lock(m_Mutex);

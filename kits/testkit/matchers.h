@@ -33,9 +33,11 @@
 namespace bdmvtest
 {
 
-typedef testing::Matcher<const bdmv::Callback&> CallbackMatcher;
+typedef testing::Matcher<const bdmv::Callback&> CallbackMatcher; ///< matches callbacks
 
-/** Matches equal callbacks. For the functions below, which describe what it does. */
+/// @cond The functions below create these and describe what they do.
+
+/** Matches equal callbacks. */
 class EqualCallbackMatcher : public testing::MatcherInterface<const bdmv::Callback&>
 {
 public:
@@ -182,6 +184,8 @@ private:
     ValueMatcher m_Matcher;
     std::string m_Name;
 };
+
+/// @endcond
 
 /**
  * Matches a callback that equals @p expected in all arguments. Blocks of bytes are equal if their

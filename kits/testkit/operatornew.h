@@ -21,9 +21,10 @@ namespace bdmvtest
 
 /** The allocations of the calling thread. */
 struct ThreadHeap {
-    static inline thread_local std::size_t allocations = 0;
-    static inline thread_local long liveBlocks = 0;
-    static inline thread_local long failureCountdown = -1;
+    static inline thread_local std::size_t allocations = 0; ///< so far, failed ones included
+    static inline thread_local long liveBlocks = 0;         ///< allocated less freed
+    static inline thread_local long failureCountdown =
+        -1; ///< allocations until one fails; negative for never
 
     /** A block for any type of fundamental alignment; null if the allocation fails. */
     static void* TryAllocate(std::size_t size)
@@ -52,6 +53,7 @@ struct ThreadHeap {
         return block;
     }
 
+    /** Frees what one of the above returned; null is ignored. */
     static void Free(void* block)
     {
         liveBlocks -= block != nullptr ? 1 : 0;
@@ -91,6 +93,7 @@ void FailAllocationAfter(long countdown)
 
 // Every form is replaced: a sanitizer's run-time library has all of them, and its memory must not
 // reach the operator delete of this file, nor the reverse.
+/// @cond described at the top of this file
 
 void* operator new(std::size_t size)
 {
@@ -195,5 +198,7 @@ void operator delete[](void* block, std::align_val_t /*alignment*/,
 {
     bdmvtest::ThreadHeap::Free(block);
 }
+
+/// @endcond
 
 #endif

@@ -38,8 +38,8 @@ class ScriptablePlaybackContext : public bdmv::IPlaybackContext
 public:
     /** The selected stream, and the number of streams of its kind. */
     struct Stream {
-        bd::StreamNumberDef number = 0;
-        bd::UInt8 count = 0;
+        bd::StreamNumberDef number = 0; ///< of the selected stream
+        bd::UInt8 count = 0;            ///< of streams of its kind
     };
 
     /** @param journal receives the entries; must outlive the context */
@@ -48,6 +48,8 @@ public:
     /** Without a journal, it answers without allocating, and to several threads at once. */
     ScriptablePlaybackContext() = default;
 
+    /** @{ */
+    /** Named for the operation that returns or writes it. */
     bd::DataBlockDef systemResumeData = {nullptr, 0};
     bool playingAfterSystemResume = false;
     bd::PlayListIdDef playListId = 0;
@@ -67,7 +69,7 @@ public:
     Stream video;
     Stream audio;
     Stream ig;
-    Stream rPgTextSt; ///< what rGetPgTextStInfo() writes
+    Stream rPgTextSt; // what rGetPgTextStInfo() writes
     ErrCode rPgTextStResult = ErrOk;
     Stream pgTextSt;
     Stream secondaryVideo;
@@ -93,6 +95,7 @@ public:
     bool async2ndAud = false;
     bool prev2ndVid = false;
     bool prev2ndAud = false;
+    /** @} */
 
     /** Operations that do not write their output parameters. */
     std::set<std::string> untouched;

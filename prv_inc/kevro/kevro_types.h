@@ -13,12 +13,12 @@
 /** A truth value in C: 0 is false, anything else is true. */
 typedef int32_t KEVRO_Bool;
 
-typedef uint8_t KEVRO_UInt8;
-typedef uint16_t KEVRO_UInt16;
-typedef uint32_t KEVRO_UInt32;
-typedef uint64_t KEVRO_UInt64;
-typedef int32_t KEVRO_Int32;
-typedef int64_t KEVRO_Int64;
+typedef uint8_t KEVRO_UInt8;   /**< unsigned, 8 bits */
+typedef uint16_t KEVRO_UInt16; /**< unsigned, 16 bits */
+typedef uint32_t KEVRO_UInt32; /**< unsigned, 32 bits */
+typedef uint64_t KEVRO_UInt64; /**< unsigned, 64 bits */
+typedef int32_t KEVRO_Int32;   /**< signed, 32 bits */
+typedef int64_t KEVRO_Int64;   /**< signed, 64 bits */
 
 /** A time of the platform's clock. */
 typedef KEVRO_Int64 KEVRO_TimeCode;

@@ -14,6 +14,7 @@ namespace bdmv
 class INavError
 {
 public:
+    /** The result of an operation: ErrOk if it succeeded. */
     enum ErrCode : KEVRO_Int32 {
         ErrOk = 0,
         ErrOkRace = 1,

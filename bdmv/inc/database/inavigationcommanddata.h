@@ -69,6 +69,7 @@ public:
     INavigationCommandData(const INavigationCommandData&) = default;
     INavigationCommandData& operator=(const INavigationCommandData&) = default;
 
+    /** The code of the command; may be a number without an enumerator. */
     virtual Command GetCommand() const = 0;
 
     /**

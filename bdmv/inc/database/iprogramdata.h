@@ -16,14 +16,15 @@ namespace bdmv
 class IProgramData
 {
 public:
-    typedef bd::RefPtr<IProgramData> RefPtr;
-    typedef bd::UInt16 CommandIdDef; ///< index of a command, from 0
+    typedef bd::RefPtr<IProgramData> RefPtr; ///< shares a program
+    typedef bd::UInt16 CommandIdDef;         ///< index of a command, from 0
 
     IProgramData() = default;
     virtual ~IProgramData() = default;
     IProgramData(const IProgramData&) = default;
     IProgramData& operator=(const IProgramData&) = default;
 
+    /** The number of commands. */
     virtual bd::UInt16 GetNumberOfNavigationCommands() const = 0;
 
     /**

@@ -64,8 +64,8 @@ struct ReplayReport {
     std::uint64_t delivered = 0; ///< callbacks, with those that were filled
     std::uint64_t filled = 0;    ///< callbacks that lacked arguments and were delivered
     std::uint64_t skipped = 0;   ///< callbacks that lacked arguments and were not delivered
-    std::uint64_t gaps = 0;
-    std::uint64_t starts = 0; ///< where a field log shows the wall clock; only counted
+    std::uint64_t gaps = 0;      ///< where callbacks are missing
+    std::uint64_t starts = 0;    ///< where a field log shows the wall clock; only counted
 };
 
 /**
