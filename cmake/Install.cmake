@@ -14,7 +14,8 @@ install(FILES ${bdmvnavigator_generated_headers}/bdmvnavigator/version.h
   DESTINATION ${header_dir}/bdmvnavigator)
 
 install(TARGETS bdmvnavigator EXPORT bdmvnavigator-targets
-  ARCHIVE DESTINATION ${CMAKE_INSTALL_LIBDIR})
+  ARCHIVE DESTINATION ${CMAKE_INSTALL_LIBDIR}
+  LIBRARY DESTINATION ${CMAKE_INSTALL_LIBDIR})
 install(EXPORT bdmvnavigator-targets NAMESPACE bdmvnavigator:: DESTINATION ${package_dir})
 
 if(BDMVNAVIGATOR_BUILD_PORT)

@@ -1,3 +1,8 @@
+include(CheckCXXCompilerFlag)
+
+# Before version 5 g++ does not have this option.
+check_cxx_compiler_flag(-fno-semantic-interposition BDMVNAVIGATOR_HAS_NO_SEMANTIC_INTERPOSITION)
+
 # The compiler options of every target of this project.
 #
 # bdmvnavigator_target_options(TARGET [CXX_STANDARD N])
@@ -14,6 +19,16 @@ function(bdmvnavigator_target_options target)
     CXX_EXTENSIONS OFF
     C_STANDARD 99
     C_EXTENSIONS OFF)
+  # An archive may become part of a client's shared library.
+  get_target_property(type ${target} TYPE)
+  if(type STREQUAL STATIC_LIBRARY AND NOT DEFINED CMAKE_POSITION_INDEPENDENT_CODE)
+    set_target_properties(${target} PROPERTIES POSITION_INDEPENDENT_CODE ON)
+  endif()
+  # Without it g++ inlines no function of a position-independent library that others can call.
+  if(BDMVNAVIGATOR_HAS_NO_SEMANTIC_INTERPOSITION)
+    target_compile_options(${target} PRIVATE
+      $<$<COMPILE_LANGUAGE:CXX>:-fno-semantic-interposition>)
+  endif()
   target_compile_options(${target} PRIVATE
     -Wall -Wextra -Wpedantic -Wconversion -Wshadow -Wformat=2
     $<$<COMPILE_LANGUAGE:CXX>:-Wnon-virtual-dtor>
