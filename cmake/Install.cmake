@@ -1,6 +1,6 @@
 # The installed package: find_package(bdmvnavigator) provides bdmvnavigator::bdmvnavigator and, if the
-# port was built and its dependency is found, bdmvnavigator::kevro. Each component provides one more
-# target.
+# port was built and its dependency is found, bdmvnavigator::kevro and bdmvnavigator::linux. Each
+# component provides one more target.
 include(CMakePackageConfigHelpers)
 
 set(package_dir ${CMAKE_INSTALL_LIBDIR}/cmake/bdmvnavigator)
@@ -20,7 +20,7 @@ install(EXPORT bdmvnavigator-targets NAMESPACE bdmvnavigator:: DESTINATION ${pac
 
 if(BDMVNAVIGATOR_BUILD_PORT)
   install(FILES ports/linux/kevro_linux.h DESTINATION ${header_dir})
-  install(TARGETS kevro EXPORT bdmvnavigator-kevro-targets
+  install(TARGETS kevro bdmvnavigator_linux EXPORT bdmvnavigator-kevro-targets
     ARCHIVE DESTINATION ${CMAKE_INSTALL_LIBDIR})
   install(EXPORT bdmvnavigator-kevro-targets NAMESPACE bdmvnavigator:: DESTINATION ${package_dir})
 endif()

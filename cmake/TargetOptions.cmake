@@ -1,7 +1,8 @@
 include(CheckCXXCompilerFlag)
 
-# Before version 5 g++ does not have this option.
+# Old compilers lack these options: g++ has the first since version 5, the second since version 8.
 check_cxx_compiler_flag(-fno-semantic-interposition BDMVNAVIGATOR_HAS_NO_SEMANTIC_INTERPOSITION)
+check_cxx_compiler_flag(-fmacro-prefix-map=from=to BDMVNAVIGATOR_HAS_MACRO_PREFIX_MAP)
 
 # The compiler options of every target of this project.
 #
@@ -32,12 +33,31 @@ function(bdmvnavigator_target_options target)
   target_compile_options(${target} PRIVATE
     -Wall -Wextra -Wpedantic -Wconversion -Wshadow -Wformat=2
     $<$<COMPILE_LANGUAGE:CXX>:-Wnon-virtual-dtor>
-    $<$<COMPILE_LANGUAGE:CXX>:-Woverloaded-virtual>
-    # Assertions name their file; the name must not depend on the source or build directory.
-    -fmacro-prefix-map=${PROJECT_SOURCE_DIR}/=)
+    $<$<COMPILE_LANGUAGE:CXX>:-Woverloaded-virtual>)
+  # Assertions name their file; the name must not depend on the source or build directory.
+  if(BDMVNAVIGATOR_HAS_MACRO_PREFIX_MAP)
+    target_compile_options(${target} PRIVATE
+      $<$<COMPILE_LANGUAGE:CXX>:-fmacro-prefix-map=${PROJECT_SOURCE_DIR}/=>)
+  else()
+    bdmvnavigator_name_files(${target})
+  endif()
   if(BDMVNAVIGATOR_WARNINGS_AS_ERRORS)
     target_compile_options(${target} PRIVATE -Werror)
   endif()
+endfunction()
+
+# bdmvnavigator_name_files(TARGET): defines __FILE__ for each C++ source of the target as its path in the
+# repository. No header of the library has an assertion of its own.
+function(bdmvnavigator_name_files target)
+  get_target_property(sources ${target} SOURCES)
+  foreach(source IN LISTS sources)
+    get_filename_component(path ${source} ABSOLUTE)
+    file(RELATIVE_PATH name ${PROJECT_SOURCE_DIR} ${path})
+    if(name MATCHES "\\.cpp$")
+      set_property(SOURCE ${source} APPEND PROPERTY COMPILE_OPTIONS
+        -Wno-builtin-macro-redefined "-D__FILE__=\"${name}\"")
+    endif()
+  endforeach()
 endfunction()
 
 # bdmvnavigator_sources_of(TARGET VARIABLE): the paths of its sources, to compile them with other
