@@ -24,6 +24,7 @@ endfunction()
 bdmvnavigator_documented(lines_installed "find_package[^`]*::linux")
 bdmvnavigator_documented(lines_subproject "add_subdirectory")
 bdmvnavigator_documented(lines_FetchContent "FetchContent")
+bdmvnavigator_documented(lines_pkg-config "pkg-config")
 
 # bdmvnavigator_client_compiler(NAME VARIABLE): the path of a compiler, or "" and the reason in
 # VARIABLE_missing. Only this build's own compiler can link what is instrumented or for another machine.
@@ -58,6 +59,31 @@ set(package_shared shared_package)
 set(prefix_archive ${prefix})
 set(prefix_shared ${shared_prefix})
 
+# bdmvnavigator_add_pkgconfig_test(): the test of a row with the way pkg-config.
+find_program(BDMVNAVIGATOR_PKG_CONFIG pkg-config)
+function(bdmvnavigator_add_pkgconfig_test)
+  if(NOT BDMVNAVIGATOR_PKG_CONFIG)
+    add_test(NAME ${test} COMMAND ${CMAKE_COMMAND} -E echo "skipped: pkg-config is not installed")
+    set_tests_properties(${test} PROPERTIES SKIP_REGULAR_EXPRESSION "^skipped: ")
+    return()
+  endif()
+  string(REGEX MATCH "[^\n]+ # ${library}\n" line "${documented}")
+  file(WRITE ${folder}/build.sh "${line}")
+  configure_file(client/player.cpp ${folder}/player.cpp COPYONLY)
+  list(JOIN standards "\;" joined_standards)
+  list(JOIN CMAKE_CROSSCOMPILING_EMULATOR "\;" emulator)
+  add_test(NAME ${test}
+    COMMAND ${CMAKE_COMMAND}
+      -DLIBRARIES=${prefix_${library}}/${CMAKE_INSTALL_LIBDIR}
+      -DCOMPILER=${client_compiler}
+      -DFLAGS=${CMAKE_CXX_FLAGS}
+      -DSTANDARDS=${joined_standards}
+      -DEMULATOR=${emulator}
+      -P ${CMAKE_CURRENT_SOURCE_DIR}/client/pkgconfig.cmake
+    WORKING_DIRECTORY ${folder})
+  set_tests_properties(${test} PROPERTIES FIXTURES_REQUIRED ${package_${library}})
+endfunction()
+
 file(STRINGS clients.txt rows REGEX "^[A-Za-z]")
 foreach(row IN LISTS rows)
   string(REGEX MATCHALL "[^ ]+" standards "${row}")
@@ -70,9 +96,14 @@ foreach(row IN LISTS rows)
     continue()
   endif()
 
-  # Where the lines expect the sources, there is a link to them.
   set(folder ${CMAKE_CURRENT_BINARY_DIR}/client/${way}_${library}_${compiler})
   set(documented "${lines_${way}}")
+  if(way STREQUAL pkg-config)
+    bdmvnavigator_add_pkgconfig_test()
+    continue()
+  endif()
+
+  # Where the lines expect the sources, there is a link to them.
   configure_file(client/CMakeLists.txt.in ${folder}/CMakeLists.txt @ONLY)
   file(CREATE_LINK ${PROJECT_SOURCE_DIR} ${folder}/bdmvnavigator SYMBOLIC)
 
