@@ -1,7 +1,8 @@
 # The installed package: find_package(bdmvnavigator) provides bdmvnavigator::bdmvnavigator and, if the
-# port was built and its dependency is found, bdmvnavigator::kevro. Each component provides one more
-# target.
+# port was built and its dependency is found, bdmvnavigator::kevro and bdmvnavigator::linux. Each
+# component provides one more target.
 include(CMakePackageConfigHelpers)
+include(cmake/PkgConfig.cmake)
 
 set(package_dir ${CMAKE_INSTALL_LIBDIR}/cmake/bdmvnavigator)
 set(header_dir ${CMAKE_INSTALL_INCLUDEDIR}/bdmvnavigator)
@@ -14,19 +15,25 @@ install(FILES ${bdmvnavigator_generated_headers}/bdmvnavigator/version.h
   DESTINATION ${header_dir}/bdmvnavigator)
 
 install(TARGETS bdmvnavigator EXPORT bdmvnavigator-targets
-  ARCHIVE DESTINATION ${CMAKE_INSTALL_LIBDIR})
+  ARCHIVE DESTINATION ${CMAKE_INSTALL_LIBDIR}
+  LIBRARY DESTINATION ${CMAKE_INSTALL_LIBDIR})
 install(EXPORT bdmvnavigator-targets NAMESPACE bdmvnavigator:: DESTINATION ${package_dir})
+bdmvnavigator_install_module(bdmvnavigator bdmvnavigator "${PROJECT_DESCRIPTION}")
 
 if(BDMVNAVIGATOR_BUILD_PORT)
   install(FILES ports/linux/kevro_linux.h DESTINATION ${header_dir})
-  install(TARGETS kevro EXPORT bdmvnavigator-kevro-targets
+  install(TARGETS kevro bdmvnavigator_linux EXPORT bdmvnavigator-kevro-targets
     ARCHIVE DESTINATION ${CMAKE_INSTALL_LIBDIR})
   install(EXPORT bdmvnavigator-kevro-targets NAMESPACE bdmvnavigator:: DESTINATION ${package_dir})
+  bdmvnavigator_install_module(kevro bdmvnavigator-kevro
+    "Platform interface of bdmvnavigator for Linux")
+  bdmvnavigator_install_module(bdmvnavigator_linux bdmvnavigator-linux
+    "bdmvnavigator with its platform interface for Linux")
 endif()
 
-# bdmvnavigator_install_component(NAME ROOT): a component of the package: its target and its headers,
-# which are in the folder ROOT/NAME, except the private ones.
-function(bdmvnavigator_install_component name root)
+# bdmvnavigator_install_component(NAME ROOT DESCRIPTION): a component of the package: its target and its
+# headers, which are in the folder ROOT/NAME, except the private ones.
+function(bdmvnavigator_install_component name root description)
   get_property(private_headers
     TARGET bdmvnavigator_${name} PROPERTY bdmvnavigator_private_headers)
   set(excluded)
@@ -39,15 +46,17 @@ function(bdmvnavigator_install_component name root)
     ARCHIVE DESTINATION ${CMAKE_INSTALL_LIBDIR})
   install(EXPORT bdmvnavigator-${name}-targets
     NAMESPACE bdmvnavigator:: DESTINATION ${package_dir})
+  bdmvnavigator_install_module(bdmvnavigator_${name} bdmvnavigator-${name} ${description})
 endfunction()
 
 get_property(kits GLOBAL PROPERTY bdmvnavigator_kits)
 foreach(kit IN LISTS kits)
-  bdmvnavigator_install_component(${kit} kits)
+  bdmvnavigator_install_component(${kit} kits "The ${kit} of bdmvnavigator")
 endforeach()
 
 if(BDMVNAVIGATOR_BUILD_DESKPLAYER)
-  bdmvnavigator_install_component(deskplayer deskplayer/inc)
+  bdmvnavigator_install_component(deskplayer deskplayer/inc
+    "Simulated navigator of bdmvnavigator that plays discs for tests")
   install(TARGETS bdmv-deskplayer RUNTIME DESTINATION ${CMAKE_INSTALL_BINDIR})
   install(FILES deskplayer/bdmv-deskplayer.1 DESTINATION ${CMAKE_INSTALL_MANDIR}/man1)
   install(FILES deskplayer/completion/bdmv-deskplayer

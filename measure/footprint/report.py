@@ -11,6 +11,7 @@ import re
 import subprocess
 import sys
 
+from elftools.elf.constants import SH_FLAGS
 from elftools.elf.elffile import ELFFile
 
 LIMIT = 200  # bytes of text per event on average, without strings and type names
@@ -29,6 +30,7 @@ class Footprint:
             symbols = {
                 symbol.name: symbol["st_size"]
                 for symbol in elf.get_section_by_name(".symtab").iter_symbols()
+                if not symbol.name.endswith(".localalias")  # a second name of the same code
             }
         self.code_of = by_event(EVENT, symbols)
         self.tables_of = by_event(TABLE, symbols)
@@ -45,6 +47,33 @@ class Footprint:
         self.beyond_strings = self.text - self.texts - self.names
         self.data = sections[".data.rel.ro"] + sections.get(".data", 0)
         self.bss = sections.get(".bss", 0)
+
+
+class Memory:
+    """What a linked file takes once loaded, in bytes."""
+
+    PARTS = (
+        ("code", r"\.text"),
+        ("strings and type names", r"\.rodata"),
+        ("tables for exceptions", r"\.ARM\.ex.*|\.eh_frame"),
+        ("virtual tables and type information", r"\.data\.rel\.ro"),
+        ("global offset table", r"\.got"),
+        ("symbols and their names", r"\.gnu\.(hash|version.*)|\.dyn(sym|str)"),
+        ("relocations", r"\.rel\..*"),
+        ("stubs for calls of other libraries", r"\.plt"),
+        ("everything else", r".*"),
+    )
+
+    def __init__(self, path):
+        self.parts = dict.fromkeys((title for title, _ in self.PARTS), 0)
+        with open(path, "rb") as file:
+            for section in ELFFile(file).iter_sections():
+                if section["sh_flags"] & SH_FLAGS.SHF_ALLOC:
+                    self.parts[self.part_of(section.name)] += section["sh_size"]
+        self.total = sum(self.parts.values())
+
+    def part_of(self, name):
+        return next(title for title, pattern in self.PARTS if re.fullmatch(pattern, name))
 
 
 def sum_of(symbols, part):
@@ -106,6 +135,14 @@ def print_program(builds, count):
         print_row(title, [round(getattr(build, attribute) / count) for build in builds])
 
 
+def print_memory(archive, shared):
+    print("\nAs an archive and as a shared library, in bytes of memory:\n")
+    print_heading("the library", ("archive, in a program", "`libbdmvnavigator.so.0`"))
+    for title in archive.parts:
+        print_row(title, (archive.parts[title], shared.parts[title]))
+    print_row("total", (archive.total, shared.total))
+
+
 def print_objects(directory):
     print("\nObject files before linking, in bytes:\n")
     print_heading("`arm-linux-gnueabihf-size`", ("text", "data", "bss"))
@@ -129,10 +166,12 @@ def print_events(full, quiet):
 
 def main():
     directory = sys.argv[1]
-    full = Footprint(f"{directory}/measure/footprint/footprint")
-    quiet = Footprint(f"{directory}/measure/footprint/footprint_without_log_lines")
+    programs = f"{directory}/measure/footprint"
+    full = Footprint(f"{programs}/footprint")
+    quiet = Footprint(f"{programs}/footprint_without_log_lines")
     count = len(full.code_of)
     print_program((full, quiet), count)
+    print_memory(Memory(f"{programs}/footprint"), Memory(f"{programs}/libbdmvnavigator.so"))
     print_objects(directory)
     print_events(full, quiet)
     if full.beyond_strings > LIMIT * count:

@@ -9,8 +9,7 @@
  * desk.Listeners().RemoveListener(&frontPanel);
  * @endcode
  *
- * Link bdmvnavigator::deskplayer, bdmvnavigator::bdmvnavigator, and the platform interface of your
- * choice: bdmvnavigator::kevro, or your own.
+ * Link bdmvnavigator::deskplayer and a platform interface: bdmvnavigator::linux, or your own.
  *
  * Threads: callbacks run on a thread of the desk, as they do in a player. The operation that causes
  * a callback returns after it, so a test may look at its listener between two operations without

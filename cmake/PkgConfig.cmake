@@ -1,0 +1,58 @@
+# The modules of the installation for pkg-config. The target bdmvnavigator::NAME is the module
+# bdmvnavigator-NAME, and the library itself is bdmvnavigator.
+set(module_dir ${CMAKE_INSTALL_LIBDIR}/pkgconfig)
+
+# bdmvnavigator_relative_to_modules(VARIABLE FOLDER): FOLDER of the installation as modules name it:
+# relative to themselves, so that the installation can be moved, unless a path is absolute.
+function(bdmvnavigator_relative_to_modules variable folder)
+  if(IS_ABSOLUTE ${folder})
+    set(${variable} ${folder} PARENT_SCOPE)
+  elseif(IS_ABSOLUTE ${module_dir})
+    set(${variable} ${CMAKE_INSTALL_PREFIX}/${folder} PARENT_SCOPE)
+  else()
+    file(RELATIVE_PATH relative /${module_dir} /${folder})
+    string(REGEX REPLACE "/$" "" relative ${relative})
+    set(${variable} "\${pcfiledir}/${relative}" PARENT_SCOPE)
+  endif()
+endfunction()
+
+# bdmvnavigator_install_module(TARGET NAME DESCRIPTION): the module NAME, which requires what the target
+# links.
+function(bdmvnavigator_install_module target name description)
+  set(requires)
+  set(libs)
+  get_target_property(type ${target} TYPE)
+  if(NOT type STREQUAL INTERFACE_LIBRARY)
+    set(libs "-L\${libdir} -l${target}")
+  endif()
+  get_target_property(options ${target} INTERFACE_LINK_OPTIONS)
+  foreach(option IN LISTS options)
+    if(option MATCHES "^LINKER:(.+)$")
+      list(APPEND libs -Wl,${CMAKE_MATCH_1})
+    endif()
+  endforeach()
+  get_target_property(linked ${target} INTERFACE_LINK_LIBRARIES)
+  foreach(library IN LISTS linked)
+    if(library MATCHES "bdmvnavigator::bdmvnavigator")
+      list(APPEND requires bdmvnavigator)
+    elseif(library MATCHES "bdmvnavigator::([a-z]+)")
+      list(APPEND requires bdmvnavigator-${CMAKE_MATCH_1})
+    elseif(library MATCHES "^\\$<LINK_ONLY:([a-z]+)>$")
+      list(APPEND libs -l${CMAKE_MATCH_1})
+    endif()
+  endforeach()
+  # An archive needs them in any program, whether or not --static is given.
+  get_target_property(modules ${target} bdmvnavigator_modules)
+  if(modules)
+    list(APPEND requires ${modules})
+  endif()
+  list(JOIN requires ", " requires)
+  list(JOIN libs " " libs)
+
+  bdmvnavigator_relative_to_modules(prefix "")
+  bdmvnavigator_relative_to_modules(libdir ${CMAKE_INSTALL_LIBDIR})
+  bdmvnavigator_relative_to_modules(includedir ${CMAKE_INSTALL_INCLUDEDIR})
+  set(file ${PROJECT_BINARY_DIR}/pkgconfig/${name}.pc)
+  configure_file(${PROJECT_SOURCE_DIR}/cmake/module.pc.in ${file} @ONLY)
+  install(FILES ${file} DESTINATION ${module_dir})
+endfunction()
