@@ -15,35 +15,24 @@
 #include "output/jsonoutput.h"
 #include "programtest.h"
 #include "recording/recordingreader.h"
+#include "unshownarguments.h"
 
 namespace
 {
 
+using bdmvtest::ArgumentNames;
+using bdmvtest::InNoLine;
 using deskplayer::Playback;
 using nlohmann::ordered_json;
 
-/** Arguments by callback. */
-using Arguments = std::map<std::string, std::vector<std::string>>;
-
-/** The arguments that no line shows. Everything else is in the log of the desk player. */
-const Arguments InNoLine = {
-    {"AudioInfoChanged",
-     {"isPrimary", "format", "sampleRate", "bitsPerSample", "channels", "pid", "channelLayout"}},
-    {"ExecuteButton", {"commands"}},
-    {"MarkInfo", {"playListId"}},
-    {"SystemSuspended", {"data"}},
-    {"TriggerSet", {"type", "result"}},
-    {"ZoomModeSet", {"clip", "destination", "delay"}},
-};
-
 /** The arguments that only the diagnostic line shows, which is at another level. */
-const Arguments InTheDiagnosticLine = {{"TriggerTimeReached", {"type", "time"}}};
+const ArgumentNames InTheDiagnosticLine = {{"TriggerTimeReached", {"type", "time"}}};
 
 /** The callback that is logged at high frequency only. */
 const std::string HighFrequency = "CurrentTimePosition";
 
 /** JSON lines of a session without these arguments. */
-std::string WithoutArguments(const Arguments& arguments, const std::string& output)
+std::string WithoutArguments(const ArgumentNames& arguments, const std::string& output)
 {
     std::string result;
     for (const std::string& line : LinesOf(output)) {

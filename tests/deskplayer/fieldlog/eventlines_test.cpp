@@ -14,6 +14,7 @@
 #include <vector>
 
 #include "bdmv/bdmvnavigator/allevents.h"
+#include "deskplayer/unshownarguments.h"
 #include "fieldlogkeeper.h"
 #include "kits/clientkit/randomcallbacks.h"
 #include "testkit/bench.h"
@@ -23,17 +24,6 @@ namespace deskplayer
 
 namespace
 {
-
-/** What no line carries, by callback. All other arguments are read back. */
-const std::map<std::string, std::vector<std::string>> Exceptions = {
-    {"AudioInfoChanged",
-     {"isPrimary", "format", "sampleRate", "bitsPerSample", "channels", "pid", "channelLayout"}},
-    {"ExecuteButton", {"commands"}},
-    {"MarkInfo", {"playListId"}},
-    {"SystemSuspended", {"data"}},
-    {"TriggerSet", {"type", "result"}},
-    {"ZoomModeSet", {"clip", "destination", "delay"}},
-};
 
 /** The names of the arguments that are absent. */
 std::vector<std::string> AbsentNames(const bdmv::Callback& callback, const ArgumentSet& absent)
@@ -50,8 +40,8 @@ std::vector<std::string> AbsentNames(const bdmv::Callback& callback, const Argum
 
 std::vector<std::string> ExceptionsOf(const std::string& callback)
 {
-    const auto found = Exceptions.find(callback);
-    return found == Exceptions.end() ? std::vector<std::string>() : found->second;
+    const auto found = bdmvtest::InNoLine.find(callback);
+    return found == bdmvtest::InNoLine.end() ? std::vector<std::string>() : found->second;
 }
 
 /** Random values, among which those at the ends of each type are frequent. */
