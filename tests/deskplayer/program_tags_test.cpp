@@ -12,7 +12,8 @@ namespace
 
 using DeskPlayerTags = ScratchFolder;
 
-const std::string PausedLine = "2024-05-31 20:15:00.123456 BdmvNavigator Event: Sending Paused\n";
+const std::string PausedLogLine =
+    "2024-05-31 20:15:00.123456 BdmvNavigator Event: Sending Paused\n";
 
 /** The lines of a JSON output with a member at their ends. */
 std::string WithLastMember(const std::string& member, const std::string& output)
@@ -38,7 +39,7 @@ TEST_F(DeskPlayerTags, AreTheLastMemberOfEachObjectOfASession)
 
 TEST_F(DeskPlayerTags, AreTheLastMemberOfEachObjectOfAFieldLog)
 {
-    const std::string log = WriteFile("log", PausedLine + "x");
+    const std::string log = WriteFile("log", PausedLogLine + "x");
     const std::string plain = RunDeskPlayer({"--field-log", log, "--format", "json"}).output;
     ASSERT_EQ(LinesOf(plain).size(), 3U) << "a start, a callback and a gap";
 
@@ -49,7 +50,7 @@ TEST_F(DeskPlayerTags, AreTheLastMemberOfEachObjectOfAFieldLog)
 TEST_F(DeskPlayerTags, AreKeptByAReplay)
 {
     const std::string tagged =
-        RunDeskPlayer({"--field-log", WriteFile("log", PausedLine + "x"), "--tag", "device=7",
+        RunDeskPlayer({"--field-log", WriteFile("log", PausedLogLine + "x"), "--tag", "device=7",
                        "--tag", "firmware=2.1", "--format", "json"})
             .output;
     const std::string recording = WriteFile("recording", tagged);
