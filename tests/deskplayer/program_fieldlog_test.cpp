@@ -14,12 +14,11 @@ namespace
 
 using FieldLog = ScratchFolder;
 
-const std::string Paused = "2024-05-31 20:15:00.123456 BdmvNavigator Event: Sending Paused\n";
 const std::string Stopped = "2024-05-31 20:15:01.123456 BdmvNavigator Event: Sending Stopped\n";
 
 TEST_F(FieldLog, OfSeveralFilesIsOneLog)
 {
-    const std::string first = WriteFile("player.1.log", Paused);
+    const std::string first = WriteFile("player.1.log", PausedLogLine);
     const std::string second = WriteFile("player.log", Stopped);
     const ProgramResult together = RunDeskPlayer({"--field-log", first, second});
 
@@ -32,7 +31,7 @@ TEST_F(FieldLog, OfSeveralFilesIsOneLog)
 
 TEST_F(FieldLog, IsWrittenInEveryFormatAndFiltered)
 {
-    const std::string log = WriteFile("log", Paused + Stopped);
+    const std::string log = WriteFile("log", PausedLogLine + Stopped);
 
     EXPECT_EQ(RunDeskPlayer({"--field-log", log, "--format", "json", "--only", "Paused"}).output,
               "{\"ticks\":0,\"start\":{\"wallClock\":\"2024-05-31 20:15:00.123456\"}}\n"
@@ -49,7 +48,7 @@ TEST_F(FieldLog, IsWrittenInEveryFormatAndFiltered)
 TEST_F(FieldLog, CountsTheLinesThatItSkips)
 {
     const std::string damaged =
-        std::regex_replace(Paused, std::regex("Paused"), "AngleInfo - angleNr: 256");
+        std::regex_replace(PausedLogLine, std::regex("Paused"), "AngleInfo - angleNr: 256");
     const ProgramResult result =
         RunDeskPlayer({"--field-log", WriteFile("log", "one\ntwo\n" + damaged)});
 
@@ -61,7 +60,7 @@ TEST_F(FieldLog, CountsTheLinesThatItSkips)
 TEST_F(FieldLog, FromStandardInputShowsEachCallbackAsItComes)
 {
     TerminalProgram program({"--field-log", "-", "--format", "json"});
-    program.Press(Paused);
+    program.Press(PausedLogLine);
     EXPECT_TRUE(program.WaitFor("\"callback\":\"Paused\""));
     program.Press(Stopped);
     EXPECT_TRUE(program.WaitFor("\"callback\":\"Stopped\""));
@@ -84,7 +83,7 @@ TEST_F(FieldLog, OfAnySizeIsReadInConstantMemory)
     if (bdmvtest::Sanitized) {
         GTEST_SKIP() << "sanitizers need more memory";
     }
-    const std::string log = WriteFile("log", Paused + "x");
+    const std::string log = WriteFile("log", PausedLogLine + "x");
     ResizeSparsely(log, std::uintmax_t{100} << 20);
 
     const ProgramResult result =
@@ -106,15 +105,15 @@ TEST_F(FieldLog, ThatCannotBeReadIsRefused)
 
 TEST_F(FieldLog, IsNotOverwritten)
 {
-    const std::string log = WriteFile("log", Paused);
+    const std::string log = WriteFile("log", PausedLogLine);
 
     ExpectUsageError({"--field-log", log, "--output", log}, "--output: " + log + " is being read");
-    EXPECT_EQ(ReadContents(log), Paused);
+    EXPECT_EQ(ReadContents(log), PausedLogLine);
 }
 
 TEST_F(FieldLog, ExcludesADiscAndNeedsAValidPattern)
 {
-    const std::string log = WriteFile("log", Paused);
+    const std::string log = WriteFile("log", PausedLogLine);
 
     ExpectUsageError({"--field-log", log, "--log-prefix", "{time}"},
                      "--log-prefix: '{text}' must be at the end");

@@ -18,8 +18,8 @@
 namespace
 {
 
-const std::string Paused = "00:00:01.000000 BdmvNavigator Event: Sending Paused\n";
-const std::string Stopped = "00:00:02.000000 BdmvNavigator Event: Sending Stopped\n";
+const std::string PausedAfterASecond = "00:00:01.000000 BdmvNavigator Event: Sending Paused\n";
+const std::string StoppedAfterTwo = "00:00:02.000000 BdmvNavigator Event: Sending Stopped\n";
 
 /** A named pipe. Neither end waits for the other to be opened. */
 class Pipe
@@ -93,10 +93,10 @@ TEST_F(FollowedLog, FromAPipeThatStaysOpenShowsEachCallbackAsItComes)
                 {"--field-log", "-", "--format", format, "--output", output.Name()}, log.Name());
         });
 
-        EXPECT_TRUE(log.Write(Paused));
+        EXPECT_TRUE(log.Write(PausedAfterASecond));
         EXPECT_TRUE(output.WaitFor("Paused")) << format;
-        EXPECT_TRUE(log.Write(Stopped.substr(0, 30)));
-        EXPECT_TRUE(log.Write(Stopped.substr(30)));
+        EXPECT_TRUE(log.Write(StoppedAfterTwo.substr(0, 30)));
+        EXPECT_TRUE(log.Write(StoppedAfterTwo.substr(30)));
         EXPECT_TRUE(output.WaitFor("Stopped")) << format;
 
         log.Close();
@@ -116,7 +116,7 @@ std::string ScreenDuringALongLog(const std::string& folder, const std::vector<st
     std::thread writer([&] {
         std::string part = "a foreign line\n";
         while (part.size() < 60000) {
-            part += Paused;
+            part += PausedAfterASecond;
         }
         while (!isShown && log.Write(part)) {
         }

@@ -19,8 +19,6 @@
 namespace
 {
 
-const std::string Paused = "2024-05-31 20:15:00.123456 BdmvNavigator Event: Sending Paused\n";
-
 std::string Chapter(int number)
 {
     return "2024-05-31 20:15:01.123456 BdmvNavigator Event: Sending Chapter - chapterNumber: " +
@@ -91,7 +89,7 @@ TEST_F(LogFolder, HasAFileForEachLogThatEqualsItsOutput)
 
 TEST_F(LogFolder, HasNamesWithTheExtensionOfTheFormat)
 {
-    const std::string log = WriteFile("player.log", Paused);
+    const std::string log = WriteFile("player.log", PausedLogLine);
 
     for (const std::string format : {"text", "json", "trace"}) {
         EXPECT_EQ(Convert({log}, {"--format", format}).status, 0);
@@ -112,7 +110,7 @@ TEST_F(LogFolder, HasWhatTheEndOfALogReveals)
     const std::string start = "00:00:00.000  (start) at 2024-05-31 20:15:00.123456\n";
     const std::string pending =
         WriteFile("pending", time + "BdmvNavigator Event: Sending SecondaryAudioUnavailable\n");
-    const std::string truncated = WriteFile("truncated", Paused + "x");
+    const std::string truncated = WriteFile("truncated", PausedLogLine + "x");
 
     EXPECT_EQ(Convert({pending, truncated}).status, 0);
     EXPECT_EQ(Outputs().at("pending.txt"), start + "00:00:00.000  SecondaryAudioUnavailable\n");
@@ -150,7 +148,7 @@ TEST_F(LogFolder, IsTheSameWhateverTheNumberOfJobs)
 
 TEST_F(LogFolder, HasTheOtherLogsIfOneCannotBeRead)
 {
-    const std::string first = WriteFile("first", Paused);
+    const std::string first = WriteFile("first", PausedLogLine);
     const std::string missing = folder / "missing";
     const std::string last = WriteFile("last", Chapter(1));
 
@@ -169,8 +167,8 @@ TEST_F(LogFolder, HasTheOtherLogsIfOneCannotBeRead)
 
 TEST_F(LogFolder, HasTheOtherLogsIfOneCannotBeWritten)
 {
-    const std::string first = WriteFile("first", Paused);
-    const std::string last = WriteFile("last", Paused);
+    const std::string first = WriteFile("first", PausedLogLine);
+    const std::string last = WriteFile("last", PausedLogLine);
     fs::create_directories(fs::path(out) / "first.txt");
 
     const ProgramResult result = Convert({first, (folder / "missing").string(), last});
@@ -184,7 +182,7 @@ TEST_F(LogFolder, HasTheOtherLogsIfOneCannotBeWritten)
 
 TEST_F(LogFolder, KeepsAnEarlierFileIfItsLogCannotBeReadAgain)
 {
-    const std::string log = WriteFile("log", Paused);
+    const std::string log = WriteFile("log", PausedLogLine);
     EXPECT_EQ(Convert({log}).status, 0);
     const std::map<std::string, std::string> before = Outputs();
     fs::remove(log);
@@ -195,8 +193,8 @@ TEST_F(LogFolder, KeepsAnEarlierFileIfItsLogCannotBeReadAgain)
 
 TEST_F(LogFolder, HasNewContentsIfALogIsConvertedAgain)
 {
-    EXPECT_EQ(Convert({WriteFile("log", Paused + Chapter(1))}).status, 0);
-    EXPECT_EQ(Convert({WriteFile("log", Paused)}).status, 0);
+    EXPECT_EQ(Convert({WriteFile("log", PausedLogLine + Chapter(1))}).status, 0);
+    EXPECT_EQ(Convert({WriteFile("log", PausedLogLine)}).status, 0);
 
     EXPECT_EQ(Outputs().at("log.txt"), "00:00:00.000  (start) at 2024-05-31 20:15:00.123456\n"
                                        "00:00:00.000  Paused\n");
@@ -204,7 +202,7 @@ TEST_F(LogFolder, HasNewContentsIfALogIsConvertedAgain)
 
 TEST_F(LogFolder, CountsTheSkippedLinesOfAllLogsAndNamesThoseWithoutCallbacks)
 {
-    const std::string one = WriteFile("one", "foreign\n" + Paused);
+    const std::string one = WriteFile("one", "foreign\n" + PausedLogLine);
     const std::string two = WriteFile("two", "foreign\n");
 
     const ProgramResult result = Convert({one, two});
@@ -218,8 +216,8 @@ TEST_F(LogFolder, CountsTheSkippedLinesOfAllLogsAndNamesThoseWithoutCallbacks)
 TEST_F(LogFolder, HasNoPlaceForTwoLogsOfTheSameName)
 {
     fs::create_directories(folder / "other");
-    const std::string one = WriteFile("log", Paused);
-    const std::string other = WriteFile("other/log", Paused);
+    const std::string one = WriteFile("log", PausedLogLine);
+    const std::string other = WriteFile("other/log", PausedLogLine);
 
     ExpectUsageError({"--field-log", one, other, "--output-folder", out},
                      "--output-folder: " + one + " and " + other + " would both become " + out +
@@ -229,22 +227,22 @@ TEST_F(LogFolder, HasNoPlaceForTwoLogsOfTheSameName)
 
 TEST_F(LogFolder, DoesNotOverwriteLogs)
 {
-    const std::string log = WriteFile("log", Paused);
-    const std::string other = WriteFile("log.txt", Paused);
+    const std::string log = WriteFile("log", PausedLogLine);
+    const std::string other = WriteFile("log.txt", PausedLogLine);
 
     ExpectUsageError({"--field-log", log, other, "--output-folder", folder},
                      "--output-folder: " + other + " is being read");
-    EXPECT_EQ(ReadContents(other), Paused);
+    EXPECT_EQ(ReadContents(other), PausedLogLine);
 
-    const std::string part = WriteFile("log.txt.part", Paused);
+    const std::string part = WriteFile("log.txt.part", PausedLogLine);
     ExpectUsageError({"--field-log", log, part, "--output-folder", folder},
                      "--output-folder: " + part + " is being read");
-    EXPECT_EQ(ReadContents(part), Paused);
+    EXPECT_EQ(ReadContents(part), PausedLogLine);
 }
 
 TEST_F(LogFolder, RefusesStandardInputAndWrongOptions)
 {
-    const std::string log = WriteFile("log", Paused);
+    const std::string log = WriteFile("log", PausedLogLine);
 
     ExpectUsageError({"--field-log", "-", "--output-folder", out},
                      "--output-folder: standard input has no name for its output");
@@ -262,7 +260,7 @@ TEST_F(LogFolder, RefusesStandardInputAndWrongOptions)
 
 TEST_F(LogFolder, IsReportedIfItCannotBeCreated)
 {
-    const std::string log = WriteFile("log", Paused);
+    const std::string log = WriteFile("log", PausedLogLine);
     const ProgramResult result = RunDeskPlayer({"--field-log", log, "--output-folder", log});
 
     EXPECT_EQ(result.status, 1);
@@ -297,7 +295,8 @@ TEST_F(LogFolder, HasNothingIncompleteAfterAnInterruption)
     ASSERT_GE(writer, 0);
 
     program.Send(SIGINT);
-    EXPECT_EQ(write(writer, Paused.data(), Paused.size()), static_cast<ssize_t>(Paused.size()));
+    EXPECT_EQ(write(writer, PausedLogLine.data(), PausedLogLine.size()),
+              static_cast<ssize_t>(PausedLogLine.size()));
     close(writer);
 
     EXPECT_EQ(program.Finish().status, -1) << "ended by the signal";
@@ -315,7 +314,8 @@ TEST_F(LogFolder, IsCompletedIfTheSignalIsIgnored)
     ASSERT_GE(writer, 0);
 
     program.Send(SIGINT);
-    EXPECT_EQ(write(writer, Paused.data(), Paused.size()), static_cast<ssize_t>(Paused.size()));
+    EXPECT_EQ(write(writer, PausedLogLine.data(), PausedLogLine.size()),
+              static_cast<ssize_t>(PausedLogLine.size()));
     close(writer);
 
     EXPECT_EQ(program.Finish().status, 0);
@@ -326,7 +326,7 @@ TEST_F(LogFolder, HasNoColours)
 {
     setenv("TERM", "xterm", 1);
     unsetenv("NO_COLOR");
-    const std::string log = WriteFile("log", Paused);
+    const std::string log = WriteFile("log", PausedLogLine);
 
     EXPECT_EQ(RunDeskPlayerOnTerminal({"--field-log", log, "--output-folder", out}).status, 0);
     EXPECT_EQ(Outputs().at("log.txt").find('\x1B'), std::string::npos);
@@ -336,14 +336,14 @@ TEST_F(LogFolder, ShowsProgressOnATerminal)
 {
     const std::string pipe = folder / "pipe";
     ASSERT_EQ(mkfifo(pipe.c_str(), 0600), 0);
-    const std::string first = WriteFile("first", Paused);
+    const std::string first = WriteFile("first", PausedLogLine);
     TerminalProgram program(
         {"--field-log", first, pipe, "--output-folder", out, "--jobs", "1", "--only", "Stopped"});
     const int writer = open(pipe.c_str(), O_WRONLY | O_CLOEXEC);
     ASSERT_GE(writer, 0);
     const auto end = std::chrono::steady_clock::now() + std::chrono::milliseconds(1200);
     while (std::chrono::steady_clock::now() < end) {
-        EXPECT_GT(write(writer, Paused.data(), Paused.size()), 0);
+        EXPECT_GT(write(writer, PausedLogLine.data(), PausedLogLine.size()), 0);
     }
 
     EXPECT_TRUE(program.WaitFor("1 of 2 logs"));

@@ -12,9 +12,6 @@ namespace
 
 using DeskPlayerTags = ScratchFolder;
 
-const std::string PausedLogLine =
-    "2024-05-31 20:15:00.123456 BdmvNavigator Event: Sending Paused\n";
-
 /** The lines of a JSON output with a member at their ends. */
 std::string WithLastMember(const std::string& member, const std::string& output)
 {

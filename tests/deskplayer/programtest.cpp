@@ -12,6 +12,8 @@
 const std::string SampleDisc = BDMVNAVIGATOR_SAMPLE_DISC;
 const std::string AllEvents = BDMVNAVIGATOR_SESSIONS "/all-events.session";
 const std::string Evening = BDMVNAVIGATOR_SESSIONS "/evening.session";
+const std::string PausedLogLine =
+    "2024-05-31 20:15:00.123456 BdmvNavigator Event: Sending Paused\n";
 
 std::vector<std::string> LinesOf(const std::string& text)
 {

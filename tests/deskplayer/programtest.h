@@ -22,6 +22,9 @@ extern const std::string SampleDisc;
 extern const std::string AllEvents;
 extern const std::string Evening;
 
+/** A line of a log, as the Linux port writes it. */
+extern const std::string PausedLogLine;
+
 std::vector<std::string> LinesOf(const std::string& text);
 
 /** The last line of @p text; empty if there is none. */
