@@ -22,7 +22,7 @@ protected:
     /** Runs @p action inside a callback of the list. */
     void InsideACallback(const std::function<void()>& action)
     {
-        struct Actor : bdmv::NavigatorListenerAdapter {
+        struct Caller : bdmv::NavigatorListenerAdapter {
             std::function<void()> action;
             void Paused() override { action(); }
         } actor;
