@@ -2,13 +2,7 @@
 # then with the bug that the project contains, which makes the test fail with an output that matches
 # CAUGHT.
 
-# run(WHAT COMMAND...): stops unless the command succeeds.
-function(run what)
-  execute_process(COMMAND ${ARGN} RESULT_VARIABLE status OUTPUT_VARIABLE output ERROR_VARIABLE output)
-  if(status)
-    message(FATAL_ERROR "${what} failed:\n${output}")
-  endif()
-endfunction()
+include(${CMAKE_CURRENT_LIST_DIR}/run.cmake)
 
 # build(BUG): BUG is ON or OFF.
 function(build bug)

@@ -1,19 +1,13 @@
 # Builds the project SOURCE in BUILD with BUILD_SHARED_LIBS, installs it in PREFIX and examines the
 # shared library.
 
-# run(COMMAND...): stops unless the command succeeds.
-function(run)
-  execute_process(COMMAND ${ARGN} RESULT_VARIABLE status OUTPUT_VARIABLE output ERROR_VARIABLE output)
-  if(status)
-    message(FATAL_ERROR "failed: ${ARGN}\n${output}")
-  endif()
-endfunction()
+include(${CMAKE_CURRENT_LIST_DIR}/run.cmake)
 
 # The runtime of a sanitizer is always undefined in a shared library.
 if(NOT INSTRUMENTED)
   list(APPEND OPTIONS -DCMAKE_SHARED_LINKER_FLAGS=-Wl,-z,defs)
 endif()
-run(${CMAKE_COMMAND} -S ${SOURCE} -B ${BUILD} -G "${GENERATOR}" ${OPTIONS}
+run("configuring" ${CMAKE_COMMAND} -S ${SOURCE} -B ${BUILD} -G "${GENERATOR}" ${OPTIONS}
   -DBUILD_SHARED_LIBS=ON
   -DCMAKE_UNITY_BUILD=ON
   -DBDMVNAVIGATOR_BUILD_PORT=${PORT}
@@ -22,9 +16,9 @@ run(${CMAKE_COMMAND} -S ${SOURCE} -B ${BUILD} -G "${GENERATOR}" ${OPTIONS}
   -DBDMVNAVIGATOR_BUILD_DESKPLAYER=OFF
   -DBDMVNAVIGATOR_BUILD_EXAMPLES=OFF
   -DBDMVNAVIGATOR_BUILD_TESTS=OFF)
-run(${CMAKE_COMMAND} --build ${BUILD})
+run("building" ${CMAKE_COMMAND} --build ${BUILD})
 file(REMOVE_RECURSE ${PREFIX})
-run(${CMAKE_COMMAND} --install ${BUILD} --prefix ${PREFIX})
+run("installing" ${CMAKE_COMMAND} --install ${BUILD} --prefix ${PREFIX})
 
 # A linker finds the library by the first name, a program by the second.
 set(library ${PREFIX}/${SHARED_LIBRARY})

@@ -5,13 +5,7 @@ set(ENV{PKG_CONFIG_PATH} ${LIBRARIES}/pkgconfig)
 set(ENV{LD_LIBRARY_PATH} ${LIBRARIES})
 set(ENV{CXX} ${COMPILER})
 
-# run(WHAT COMMAND...): stops unless the command succeeds.
-function(run what)
-  execute_process(COMMAND ${ARGN} RESULT_VARIABLE status OUTPUT_VARIABLE output ERROR_VARIABLE output)
-  if(status)
-    message(FATAL_ERROR "${what} failed: ${status}\n${output}")
-  endif()
-endfunction()
+include(${CMAKE_CURRENT_LIST_DIR}/../run.cmake)
 
 file(GLOB modules ${LIBRARIES}/pkgconfig/*.pc)
 if(NOT modules)
