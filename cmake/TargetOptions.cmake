@@ -34,6 +34,14 @@ function(bdmvnavigator_target_options target)
     -Wall -Wextra -Wpedantic -Wconversion -Wshadow -Wformat=2
     $<$<COMPILE_LANGUAGE:CXX>:-Wnon-virtual-dtor>
     $<$<COMPILE_LANGUAGE:CXX>:-Woverloaded-virtual>)
+  # A unity build includes sources, which clang-tidy reports elsewhere. g++ takes them for headers, in which an
+  # unnamed namespace would be a mistake.
+  set_target_properties(${target} PROPERTIES
+    UNITY_BUILD_CODE_BEFORE_INCLUDE "// NOLINTNEXTLINE(bugprone-suspicious-include)")
+  get_target_property(joined ${target} UNITY_BUILD)
+  if(joined AND CMAKE_CXX_COMPILER_ID STREQUAL "GNU")
+    target_compile_options(${target} PRIVATE $<$<COMPILE_LANGUAGE:CXX>:-Wno-subobject-linkage>)
+  endif()
   # Assertions name their file; the name must not depend on the source or build directory.
   if(BDMVNAVIGATOR_HAS_MACRO_PREFIX_MAP)
     target_compile_options(${target} PRIVATE

@@ -64,11 +64,11 @@ std::string Below(std::size_t count, const char* things)
                       : "below " + std::to_string(count) + ", the number of " + things;
 }
 
-class Check
+class PlayListCheck
 {
 public:
-    Check(const PlayList& playList, const std::string& file, const Clips& clips,
-          const FaultHandler& onFault)
+    PlayListCheck(const PlayList& playList, const std::string& file, const Clips& clips,
+                  const FaultHandler& onFault)
         : m_rPlayList(playList), m_rFile(file), m_rClips(clips), m_rOnFault(onFault)
     {
     }
@@ -266,7 +266,7 @@ private:
 void CheckPlayList(const PlayList& playList, const std::string& file, const Clips& clips,
                    const FaultHandler& onFault)
 {
-    Check(playList, file, clips, onFault).Run();
+    PlayListCheck(playList, file, clips, onFault).Run();
 }
 
 } // namespace deskplayer

@@ -14,7 +14,7 @@ namespace deskplayer
 namespace
 {
 
-const StreamTable NoStreams;
+const StreamTable StreamsOfNoItem;
 
 /** A search key for LoadedPlayList::marksByPosition. */
 std::pair<Ticks, std::size_t> MarkAt(Ticks position, std::size_t index)
@@ -35,7 +35,7 @@ const PlayItem* Playhead::CurrentItem() const
 const StreamTable& Playhead::CurrentStreams() const
 {
     const PlayItem* const item = CurrentItem();
-    return item == nullptr ? NoStreams : item->streams;
+    return item == nullptr ? StreamsOfNoItem : item->streams;
 }
 
 const Chapter* Playhead::CurrentChapter() const

@@ -13,7 +13,7 @@ namespace
 using nlohmann::json;
 
 /** @p value as a message shows it. */
-std::string Shortened(const json& value)
+std::string ShortenedValue(const json& value)
 {
     constexpr std::size_t longest = 40;
     if (value.is_object()) {
@@ -85,7 +85,7 @@ std::vector<std::string> Element::Texts() const
 
 void Element::Refuse(const std::string& expected) const
 {
-    Throw("unexpected " + Shortened(m_rValue) + "; expected " + expected);
+    Throw("unexpected " + ShortenedValue(m_rValue) + "; expected " + expected);
 }
 
 void Element::Throw(const std::string& message) const

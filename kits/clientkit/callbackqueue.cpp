@@ -14,7 +14,7 @@ constexpr std::size_t LargestBlocks = 4;
 /** What a place holds that is not in use: nothing to release. */
 const callbacks::PlayStarted Unused = {};
 
-std::size_t Checked(std::size_t places)
+std::size_t CheckedPlaces(std::size_t places)
 {
     if (places == 0) {
         throw std::invalid_argument("bdmv::QueuedListener: no places");
@@ -25,7 +25,7 @@ std::size_t Checked(std::size_t places)
 } // namespace
 
 CallbackQueue::CallbackQueue(const QueuedListener::Options& options)
-    : m_Places(Checked(options.places), Unused), m_First(0), m_Waiting(0), m_LostLater(0),
+    : m_Places(CheckedPlaces(options.places), Unused), m_First(0), m_Waiting(0), m_LostLater(0),
       m_Resync(false), m_AfterResync(0), m_Blocks(LargestBlocks, options.largestBlock),
       m_Taken(StepNone), m_TakenBlock(), m_Counters()
 {
