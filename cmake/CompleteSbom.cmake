@@ -1,6 +1,7 @@
 # Writes the file `document`, an SPDX document, from its template: adds the time, which is SOURCE_DATE_EPOCH
 # or else the time of the commit in the folder `source`, and a name that follows from the contents. Without
 # either the time is the beginning of 1970, so that the same sources always give the same document.
+cmake_policy(VERSION 3.16)
 set(given_time "$ENV{SOURCE_DATE_EPOCH}")
 if(given_time STREQUAL "")
   execute_process(COMMAND git --git-dir=${source}/.git log -1 --format=%ct

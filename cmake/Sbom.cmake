@@ -356,3 +356,8 @@ install(CODE "
   set(document \"${PROJECT_BINARY_DIR}/sbom/${sbom}\")")
 install(SCRIPT cmake/CompleteSbom.cmake)
 install(FILES ${PROJECT_BINARY_DIR}/sbom/${sbom} DESTINATION ${CMAKE_INSTALL_DATADIR}/bdmvnavigator)
+if(BDMVNAVIGATOR_BUILD_DESKPLAYER)
+  # Belongs to the page, which is installed if scripts/page has built it.
+  install(FILES page/dist/timeline.spdx.json
+    DESTINATION ${CMAKE_INSTALL_DATADIR}/bdmvnavigator COMPONENT DeskPlayer OPTIONAL)
+endif()
