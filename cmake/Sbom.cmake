@@ -152,8 +152,8 @@ libcxx _LIBCPP_VERSION
 endfunction()
 
 # bdmvnavigator_sbom_dependency(NAME_VARIABLE TYPE_VARIABLE LIBRARY): adds a library that a target links,
-# and what it links itself. LIBRARY is an imported target, PACKAGE::NAME, or the name of a library of the
-# compiler. Its type is that of a target.
+# and what it links itself. LIBRARY is an imported target, PACKAGE::NAME, or the name of a library such as
+# atomic, which is part of g++. Its type is that of a target.
 function(bdmvnavigator_sbom_dependency name_variable type_variable library)
   if(library MATCHES "^([A-Za-z0-9_]+)::")
     set(name ${CMAKE_MATCH_1})
@@ -168,7 +168,10 @@ function(bdmvnavigator_sbom_dependency name_variable type_variable library)
     get_target_property(linked ${library} INTERFACE_LINK_LIBRARIES)
   else()
     set(name lib${library})
-    set(version "${bdmvnavigator_sbom_gcc_version}")
+    set(version)
+    if(library STREQUAL atomic)
+      set(version "${bdmvnavigator_sbom_gcc_version}")
+    endif()
     set(type SHARED_LIBRARY)
     execute_process(COMMAND ${CMAKE_CXX_COMPILER} -print-file-name=lib${library}.so
       OUTPUT_VARIABLE file OUTPUT_STRIP_TRAILING_WHITESPACE)
