@@ -16,7 +16,8 @@ import jsonschema
 # Other names of a dependency: the packages of find_package, and the shared libraries.
 DEPENDENCY_OF_PACKAGE = {"Threads": "glibc"}
 DEPENDENCY_OF_LIBRARY = {"stdc++": "libstdc++", "c++": "libc++", "gcc_s": "libgcc", "atomic": "libatomic",
-                         "c": "glibc", "m": "glibc", "dl": "glibc", "pthread": "glibc", "rt": "glibc"}
+                         "c": "glibc", "m": "glibc", "dl": "glibc", "pthread": "glibc", "resolv": "glibc",
+                         "rt": "glibc"}
 LOADER = re.compile(r"ld(-linux.*|64|)\.so\.\d+$")
 SANITIZER = re.compile(r"lib[a-z]+san\.so\.\d+$")
 
