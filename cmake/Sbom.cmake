@@ -1,36 +1,8 @@
 # The SPDX document of the installation: what is installed, every dependency with its version, and how they
 # are related. The dependencies are those that the installed targets link, and the runtime of the
 # compiler; the page has a document of its own, which its build writes.
-find_program(BDMVNAVIGATOR_DPKG_QUERY dpkg-query)
-mark_as_advanced(BDMVNAVIGATOR_DPKG_QUERY)
-
-# bdmvnavigator_debian_package(VARIABLE FILE): the package URL of the Debian package that FILE is part of;
-# empty if there is none.
-function(bdmvnavigator_debian_package variable file)
-  set(${variable} "" PARENT_SCOPE)
-  if(NOT BDMVNAVIGATOR_DPKG_QUERY OR NOT IS_ABSOLUTE "${file}")
-    return()
-  endif()
-  # Packages list files of /usr/lib as part of /lib, too.
-  get_filename_component(real_file ${file} REALPATH)
-  string(REGEX REPLACE "^/usr/" "/" unmerged_file ${real_file})
-  execute_process(COMMAND ${BDMVNAVIGATOR_DPKG_QUERY} --search ${file} ${real_file} ${unmerged_file}
-    OUTPUT_VARIABLE owners ERROR_QUIET)
-  if(NOT owners MATCHES "(^|\n)([a-z0-9][a-z0-9+.-]+(:[a-z0-9-]+)?): /")
-    return()
-  endif()
-  execute_process(
-    COMMAND ${BDMVNAVIGATOR_DPKG_QUERY} --show
-      "--showformat=\${Package}@\${Version}?arch=\${Architecture}" ${CMAKE_MATCH_2}
-    OUTPUT_VARIABLE package)
-  string(REPLACE "+" "%2B" package ${package})
-  file(STRINGS /etc/os-release release REGEX "^(ID|VERSION_ID)=")
-  string(REGEX REPLACE "(VERSION_)?ID=\"?([^;\"]*)\"?" "\\2" release "${release}")
-  list(SORT release ORDER DESCENDING) # the name, then the number
-  list(GET release 0 distribution)
-  list(JOIN release "-" release)
-  set(${variable} "pkg:deb/${distribution}/${package}&distro=${release}" PARENT_SCOPE)
-endfunction()
+#
+# What takes time is done when the document is installed, by CompleteSbom.cmake.
 
 # bdmvnavigator_sbom_id(VARIABLE NAME): the identifier of a package in the document.
 function(bdmvnavigator_sbom_id variable name)
@@ -39,7 +11,7 @@ function(bdmvnavigator_sbom_id variable name)
 endfunction()
 
 # bdmvnavigator_sbom_package(NAME VERSION PURPOSE [INSTALLED_AS FILE] [FOUND_AS FILE] [COMMENT TEXT]): adds
-# a package, once. A file by which a dependency was found leads to its Debian package.
+# a package, once. A file of a dependency leads to its Debian package.
 function(bdmvnavigator_sbom_package name version purpose)
   cmake_parse_arguments(arg "" "INSTALLED_AS;FOUND_AS;COMMENT" "" ${ARGN})
   bdmvnavigator_sbom_id(id ${name})
@@ -56,16 +28,8 @@ function(bdmvnavigator_sbom_package name version purpose)
   if(arg_COMMENT)
     string(APPEND optional "\n      \"comment\": \"${arg_COMMENT}\",")
   endif()
-  bdmvnavigator_debian_package(url "${arg_FOUND_AS}")
-  if(url)
-    string(APPEND optional "
-      \"externalRefs\": [
-        {
-          \"referenceCategory\": \"PACKAGE-MANAGER\",
-          \"referenceType\": \"purl\",
-          \"referenceLocator\": \"${url}\"
-        }
-      ],")
+  if(IS_ABSOLUTE "${arg_FOUND_AS}")
+    string(APPEND optional "\n      @package of ${arg_FOUND_AS}@")
   endif()
   get_property(present GLOBAL PROPERTY bdmvnavigator_sbom_packages)
   if(present)
@@ -332,7 +296,6 @@ bdmvnavigator_sbom_relate(${compiler} BUILD_TOOL_OF bdmvnavigator)
 bdmvnavigator_sbom_package(CMake ${CMAKE_VERSION} APPLICATION FOUND_AS ${CMAKE_COMMAND})
 bdmvnavigator_sbom_relate(CMake BUILD_TOOL_OF bdmvnavigator)
 
-# The time and the name of the document are added when it is installed.
 set(sbom bdmvnavigator-${PROJECT_VERSION}.spdx.json)
 get_property(packages GLOBAL PROPERTY bdmvnavigator_sbom_packages)
 get_property(relationships GLOBAL PROPERTY bdmvnavigator_sbom_relationships)

@@ -83,7 +83,7 @@ def needed_by(readelf, file):
 def check_installed_files(document, prefix, version, readelf):
     packages = {package["packageFileName"]: name for name, package in document.packages.items()
                 if "packageFileName" in package}
-    patterns = ["bin/*", "lib*/*.a", "lib*/**/*.a", "lib*/*.so*"]
+    patterns = ["bin/*", "lib*/**/*.a", "lib*/**/*.so*"]
     files = {file for pattern in patterns for file in prefix.glob(pattern) if not file.is_symlink()}
     expect(files, f"nothing is installed in {prefix}")
     for file in sorted(files):
