@@ -6,6 +6,7 @@ usage: sbom.py --source FOLDER --prefix FOLDER --version VERSION --readelf PROGR
 import argparse
 import json
 import re
+import shutil
 import subprocess
 import sys
 from pathlib import Path
@@ -151,6 +152,8 @@ def main():
     document = find_document(folder, f"bdmvnavigator-{arguments.version}.spdx.json")
     if document:
         document.expect_versions_of_packages()
+        expect("externalRefs" in document.packages.get("glibc", {}) or not shutil.which("dpkg-query"),
+               f"{document.path.name}: glibc lacks its Debian package")
         check_installed_files(document, arguments.prefix, arguments.version, arguments.readelf)
         check_sources(document, arguments.source, arguments.prefix)
     if (folder / "timeline.html").exists():
