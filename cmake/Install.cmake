@@ -1,8 +1,13 @@
 # The installed package: find_package(bdmvnavigator) provides bdmvnavigator::bdmvnavigator and, if the
 # port was built and its dependency is found, bdmvnavigator::kevro and bdmvnavigator::linux. Each
 # component provides one more target.
+#
+# cmake --install BUILD --component NAME installs a part of it: Runtime, the shared library; DeskPlayer, the
+# desk player's program; Development, everything else, which is what builds with the library need.
 include(CMakePackageConfigHelpers)
 include(cmake/PkgConfig.cmake)
+
+set(CMAKE_INSTALL_DEFAULT_COMPONENT_NAME Development)
 
 set(package_dir ${CMAKE_INSTALL_LIBDIR}/cmake/bdmvnavigator)
 set(header_dir ${CMAKE_INSTALL_INCLUDEDIR}/bdmvnavigator)
@@ -14,10 +19,19 @@ install(DIRECTORY bdmv/bdmvnavigator DESTINATION ${header_dir} FILES_MATCHING PA
 install(FILES ${bdmvnavigator_generated_headers}/bdmvnavigator/version.h
   DESTINATION ${header_dir}/bdmvnavigator)
 
-install(TARGETS bdmvnavigator EXPORT bdmvnavigator-targets
+# An archive and a shared library can be installed in the same folder.
+get_target_property(type bdmvnavigator TYPE)
+if(type STREQUAL SHARED_LIBRARY)
+  set(library_export bdmvnavigator-shared-targets)
+else()
+  set(library_export bdmvnavigator-targets)
+endif()
+install(TARGETS bdmvnavigator EXPORT ${library_export}
   ARCHIVE DESTINATION ${CMAKE_INSTALL_LIBDIR}
-  LIBRARY DESTINATION ${CMAKE_INSTALL_LIBDIR})
-install(EXPORT bdmvnavigator-targets NAMESPACE bdmvnavigator:: DESTINATION ${package_dir})
+  LIBRARY DESTINATION ${CMAKE_INSTALL_LIBDIR}
+    COMPONENT Runtime
+    NAMELINK_COMPONENT Development)
+install(EXPORT ${library_export} NAMESPACE bdmvnavigator:: DESTINATION ${package_dir})
 bdmvnavigator_install_module(bdmvnavigator bdmvnavigator "${PROJECT_DESCRIPTION}")
 
 if(BDMVNAVIGATOR_BUILD_PORT)
@@ -57,12 +71,14 @@ endforeach()
 if(BDMVNAVIGATOR_BUILD_DESKPLAYER)
   bdmvnavigator_install_component(deskplayer deskplayer/inc
     "Simulated navigator of bdmvnavigator that plays discs for tests")
-  install(TARGETS bdmv-deskplayer RUNTIME DESTINATION ${CMAKE_INSTALL_BINDIR})
-  install(FILES deskplayer/bdmv-deskplayer.1 DESTINATION ${CMAKE_INSTALL_MANDIR}/man1)
+  install(TARGETS bdmv-deskplayer RUNTIME DESTINATION ${CMAKE_INSTALL_BINDIR} COMPONENT DeskPlayer)
+  install(FILES deskplayer/bdmv-deskplayer.1
+    DESTINATION ${CMAKE_INSTALL_MANDIR}/man1 COMPONENT DeskPlayer)
   install(FILES deskplayer/completion/bdmv-deskplayer
-    DESTINATION ${CMAKE_INSTALL_DATADIR}/bash-completion/completions)
+    DESTINATION ${CMAKE_INSTALL_DATADIR}/bash-completion/completions COMPONENT DeskPlayer)
   # Only if scripts/page has built it; the program looks for it in ../share relative to itself.
-  install(FILES page/dist/timeline.html DESTINATION ${CMAKE_INSTALL_DATADIR}/bdmvnavigator OPTIONAL)
+  install(FILES page/dist/timeline.html
+    DESTINATION ${CMAKE_INSTALL_DATADIR}/bdmvnavigator COMPONENT DeskPlayer OPTIONAL)
 endif()
 
 configure_package_config_file(cmake/bdmvnavigator-config.cmake.in

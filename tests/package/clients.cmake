@@ -1,9 +1,15 @@
 # Clients as README.md shows them: each row of clients.txt is a project with the lines of the README.
+#
+# For each kind of library, archive or shared: prefix_KIND is where it is installed, package_KIND the fixture
+# that installs it, and options_KIND the options of CMake that select it where both are installed.
+# build_options are those of all clients; instrumented is ON if the library was built with a sanitizer.
+get_filename_component(sources ${CMAKE_CURRENT_LIST_DIR}/../.. ABSOLUTE)
+set(clients ${CMAKE_CURRENT_LIST_DIR})
 set_property(DIRECTORY APPEND PROPERTY CMAKE_CONFIGURE_DEPENDS
-  ${PROJECT_SOURCE_DIR}/README.md ${CMAKE_CURRENT_SOURCE_DIR}/clients.txt)
+  ${sources}/README.md ${clients}/clients.txt)
 
 # The blocks of code in the README's section about this.
-file(READ ${PROJECT_SOURCE_DIR}/README.md readme)
+file(READ ${sources}/README.md readme)
 if(NOT readme MATCHES "\n## Add it to a project\n(([^#]|#[^#])*)\n## ")
   message(FATAL_ERROR "the README has no section 'Add it to a project'")
 endif()
@@ -54,11 +60,6 @@ function(bdmvnavigator_client_compiler name variable)
   set(${variable}_missing "${missing}" PARENT_SCOPE)
 endfunction()
 
-set(package_archive installed_package)
-set(package_shared shared_package)
-set(prefix_archive ${prefix})
-set(prefix_shared ${shared_prefix})
-
 # bdmvnavigator_add_pkgconfig_test(): the test of a row with the way pkg-config.
 find_program(BDMVNAVIGATOR_PKG_CONFIG pkg-config)
 function(bdmvnavigator_add_pkgconfig_test)
@@ -69,7 +70,7 @@ function(bdmvnavigator_add_pkgconfig_test)
   endif()
   string(REGEX MATCH "[^\n]+ # ${library}\n" line "${documented}")
   file(WRITE ${folder}/build.sh "${line}")
-  configure_file(client/player.cpp ${folder}/player.cpp COPYONLY)
+  configure_file(${clients}/client/player.cpp ${folder}/player.cpp COPYONLY)
   list(JOIN standards "\;" joined_standards)
   list(JOIN CMAKE_CROSSCOMPILING_EMULATOR "\;" emulator)
   add_test(NAME ${test}
@@ -79,12 +80,12 @@ function(bdmvnavigator_add_pkgconfig_test)
       -DFLAGS=${CMAKE_CXX_FLAGS}
       -DSTANDARDS=${joined_standards}
       -DEMULATOR=${emulator}
-      -P ${CMAKE_CURRENT_SOURCE_DIR}/client/pkgconfig.cmake
+      -P ${clients}/client/pkgconfig.cmake
     WORKING_DIRECTORY ${folder})
-  set_tests_properties(${test} PROPERTIES FIXTURES_REQUIRED ${package_${library}})
+  set_tests_properties(${test} PROPERTIES FIXTURES_REQUIRED "${package_${library}}")
 endfunction()
 
-file(STRINGS clients.txt rows REGEX "^[A-Za-z]")
+file(STRINGS ${clients}/clients.txt rows REGEX "^[A-Za-z]")
 foreach(row IN LISTS rows)
   string(REGEX MATCHALL "[^ ]+" standards "${row}")
   list(POP_FRONT standards way library compiler)
@@ -104,15 +105,15 @@ foreach(row IN LISTS rows)
   endif()
 
   # Where the lines expect the sources, there is a link to them.
-  configure_file(client/CMakeLists.txt.in ${folder}/CMakeLists.txt @ONLY)
-  file(CREATE_LINK ${PROJECT_SOURCE_DIR} ${folder}/bdmvnavigator SYMBOLIC)
+  configure_file(${clients}/client/CMakeLists.txt.in ${folder}/CMakeLists.txt @ONLY)
+  file(CREATE_LINK ${sources} ${folder}/bdmvnavigator SYMBOLIC)
 
   set(options ${build_options})
   list(TRANSFORM options REPLACE
     "^-DCMAKE_CXX_COMPILER=.*" "-DCMAKE_CXX_COMPILER=${client_compiler}")
-  list(APPEND options -DCLIENT=${CMAKE_CURRENT_SOURCE_DIR}/client)
+  list(APPEND options -DCLIENT=${clients}/client)
   if(way STREQUAL installed)
-    list(APPEND options -DCMAKE_PREFIX_PATH=${prefix_${library}})
+    list(APPEND options -DCMAKE_PREFIX_PATH=${prefix_${library}} ${options_${library}})
   else()
     list(APPEND options -DCMAKE_UNITY_BUILD=ON) # takes a third of the time
     if(library STREQUAL shared)
@@ -126,6 +127,6 @@ foreach(row IN LISTS rows)
       --build-options ${options}
       --test-command ${CMAKE_CTEST_COMMAND} --output-on-failure --no-tests=error)
   if(way STREQUAL installed)
-    set_tests_properties(${test} PROPERTIES FIXTURES_REQUIRED ${package_${library}})
+    set_tests_properties(${test} PROPERTIES FIXTURES_REQUIRED "${package_${library}}")
   endif()
 endforeach()
