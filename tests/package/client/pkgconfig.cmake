@@ -12,7 +12,7 @@ set(ENV{PATH} ${compiler}:$ENV{PATH})
 
 include(${CMAKE_CURRENT_LIST_DIR}/../run.cmake)
 
-file(GLOB modules ${LIBRARIES}/pkgconfig/*.pc)
+file(GLOB modules ${LIBRARIES}/pkgconfig/bdmvnavigator*.pc)
 if(NOT modules)
   message(FATAL_ERROR "no modules in ${LIBRARIES}/pkgconfig")
 endif()
