@@ -11,21 +11,15 @@ LogChannel::LogChannel(Destination destination)
 {
 }
 
-void LogChannel::Write(const LogLine& line) noexcept
+void LogChannel::Write(const LineHead& head, const char* format, va_list args) noexcept
 {
     {
         Output::Lock lock(m_Mutex);
-        m_Current->Write(lock, line);
+        m_Current->Write(lock, head, format, args);
     }
     if (m_Finishing) {
         Flush();
     }
-}
-
-void LogChannel::AddLost() noexcept
-{
-    const Output::Lock lock(m_Mutex);
-    m_Current->AddLost(lock);
 }
 
 void LogChannel::Exchange(Destination next)

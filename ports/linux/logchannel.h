@@ -6,12 +6,14 @@
 #define KEVRO_LOGCHANNEL_H
 
 #include <atomic>
+#include <cstdarg>
 #include <cstddef>
 #include <memory>
 #include <mutex>
 
 #include <spdlog/sinks/sink.h>
 
+#include "bd/macros.h"
 #include "logoutput.h"
 
 namespace kevro
@@ -32,10 +34,9 @@ public:
     LogChannel(const LogChannel&) = delete;
     LogChannel& operator=(const LogChannel&) = delete;
 
-    void Write(const LogLine& line) noexcept;
-
-    /** Counts a line that was lost before it reached the channel. */
-    void AddLost() noexcept;
+    /** Writes or queues a line of which @p format and @p args make the text. */
+    BD_PRINTF_FORMAT(3, 0)
+    void Write(const LineHead& head, const char* format, va_list args) noexcept;
 
     /** Sends later lines to @p next; returns after the previous output has written its lines. */
     void Exchange(Destination next);

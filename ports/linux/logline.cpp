@@ -31,13 +31,13 @@ template <typename Number> void AppendName(TextBuffer& buffer, const Names& name
 
 } // namespace
 
-void AppendLine(TextBuffer& buffer, const LogLine& line)
+void AppendLine(TextBuffer& buffer, const LineHead& head, std::string_view text)
 {
-    AppendName(buffer, Components, line.component);
+    AppendName(buffer, Components, head.component);
     buffer.push_back(' ');
-    AppendName(buffer, Levels, line.level);
+    AppendName(buffer, Levels, head.level);
     Append(buffer, ": ");
-    AppendPrintable(buffer, line.text);
+    AppendPrintable(buffer, text);
 }
 
 spdlog::level::level_enum Severity(KEVRO_Int32 level)

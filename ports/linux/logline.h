@@ -18,16 +18,15 @@ namespace kevro
 /** Characters, on the stack unless they are many. */
 using TextBuffer = spdlog::memory_buf_t;
 
-/** A line as its writer passed it; the text is borrowed. */
-struct LogLine {
+/** What a line has besides its text. */
+struct LineHead {
     LineTime time;
     KEVRO_UInt32 component;
     KEVRO_Int32 level;
-    std::string_view text;
 };
 
 /** Appends the part of a log line after the time: component, level, and the escaped text. */
-void AppendLine(TextBuffer& buffer, const LogLine& line);
+void AppendLine(TextBuffer& buffer, const LineHead& head, std::string_view text);
 
 /** The level of spdlog, and of the system's logger, that corresponds to a level. */
 spdlog::level::level_enum Severity(KEVRO_Int32 level);

@@ -2,12 +2,12 @@
 
 #include <cinttypes>
 #include <cstdio>
-#include <cstring>
 #include <utility>
 
 #include <spdlog/details/log_msg.h>
 
 #include "bd/logging.h"
+#include "logformat.h"
 #include "printable.h"
 
 namespace kevro
@@ -16,31 +16,16 @@ namespace kevro
 namespace
 {
 
-/**
- * The parts of a queued line besides its time point and its text.
- *
- * spdlog's messages have no field for them, but the queue copies the name of a message's logger
- * next to the text. That name is not used here, so these bytes are passed in its place.
- */
-struct Heading {
-    KEVRO_UInt64 number; ///< of the line, from 1
-    KEVRO_UInt32 component;
-    KEVRO_Int32 level;
-    KEVRO_UInt32 timeIsOfProgram;
-    KEVRO_UInt32 reserved; ///< fills the structure: no byte is passed uninitialised
-
-    spdlog::string_view_t AsName() const
-    {
-        return {reinterpret_cast<const char*>(this), sizeof(*this)};
+/** Returns false if the arguments cannot be formatted, or memory ran out. */
+BD_PRINTF_FORMAT(2, 0)
+bool Format(TextBuffer& text, const char* format, va_list args) noexcept
+{
+    try {
+        return AppendFormatted(text, format, args);
+    } catch (...) {
+        return false;
     }
-
-    static Heading FromName(spdlog::string_view_t name)
-    {
-        Heading heading;
-        std::memcpy(&heading, name.data(), sizeof(heading));
-        return heading;
-    }
-};
+}
 
 } // namespace
 
@@ -49,24 +34,31 @@ Output::Output(std::mutex& mutex, std::unique_ptr<spdlog::sinks::sink> destinati
     : m_Destination(std::move(destination)), m_rMutex(mutex)
 {
     if (queueLines != 0) {
-        // The logger is a member of this object, so its pointer to this object owns nothing.
-        const spdlog::sink_ptr self(spdlog::sink_ptr(), this);
-        m_Queue = std::make_shared<spdlog::details::thread_pool>(queueLines, 1);
-        m_Logger = std::make_shared<spdlog::async_logger>(
-            std::string(), self, m_Queue, spdlog::async_overflow_policy::overrun_oldest);
+        m_Queue = std::make_unique<LogQueue>(queueLines);
+        m_Thread = std::thread([this, pLine = std::make_unique<QueuedLine>()]() mutable {
+            WriteQueuedLines(std::move(pLine));
+        });
     }
 }
 
-void Output::Write(Lock& lock, const LogLine& line) noexcept
+Output::~Output()
 {
-    if (!m_Queue) {
-        WriteDirectly(lock, line);
-        return;
+    if (m_Queue) {
+        {
+            const Lock lock(m_rMutex);
+            m_IsClosing = true;
+            m_Arrived.notify_one();
+        }
+        m_Thread.join();
     }
-    try {
-        Queue(lock, line);
-    } catch (...) {
-        ++m_Refused;
+}
+
+void Output::Write(Lock& lock, const LineHead& head, const char* format, va_list args) noexcept
+{
+    if (m_Queue) {
+        Queue(lock, head, format, args);
+    } else {
+        WriteDirectly(lock, head, format, args);
     }
 }
 
@@ -74,7 +66,7 @@ void Output::Drain(Lock& lock) noexcept
 {
     const KEVRO_UInt64 accepted = m_Accepted;
     m_Progress.wait(lock, [&] { return m_Done >= accepted; });
-    const KEVRO_UInt64 lost = CountLost(lock);
+    const KEVRO_UInt64 lost = m_Lost;
     lock.unlock();
     {
         const std::lock_guard<std::mutex> writing(m_WriteMutex);
@@ -83,85 +75,70 @@ void Output::Drain(Lock& lock) noexcept
     lock.lock();
 }
 
-void Output::AddLost(const Lock& /*lock*/) noexcept
-{
-    ++m_Refused;
-}
-
-KEVRO_UInt64 Output::CountLost(const Lock& /*lock*/) const noexcept
-{
-    return m_Refused + (m_Queue ? m_Queue->overrun_counter() : 0);
-}
-
-void Output::log(const spdlog::details::log_msg& message)
-{
-    const Heading heading = Heading::FromName(message.logger_name);
-    const std::string_view text(message.payload.data(), message.payload.size());
-
-    Lock lock(m_rMutex);
-    // Not while lines are waiting: each report could displace one of them.
-    const KEVRO_UInt64 lost = m_Queue->queue_size() == 0 ? CountLost(lock) : 0;
-    lock.unlock();
-    const bool written = WriteToDestination(
-        {{message.time, heading.timeIsOfProgram}, heading.component, heading.level, text}, lost);
-    lock.lock();
-    // The queue keeps the order: every earlier line has been written or dropped.
-    MarkDone(lock, heading.number, written);
-}
-
-void Output::flush()
-{
-    m_Destination->flush();
-}
-
-void Output::set_pattern(const std::string& pattern)
-{
-    m_Destination->set_pattern(pattern);
-}
-
-void Output::set_formatter(std::unique_ptr<spdlog::formatter> formatter)
-{
-    m_Destination->set_formatter(std::move(formatter));
-}
-
-void Output::WriteDirectly(Lock& lock, const LogLine& line) noexcept
+void Output::WriteDirectly(Lock& lock, const LineHead& head, const char* format,
+                           va_list args) noexcept
 {
     ++m_Accepted;
-    const KEVRO_UInt64 lost = CountLost(lock);
+    const KEVRO_UInt64 lost = m_Lost;
     lock.unlock();
-    const bool written = WriteToDestination(line, lost);
+    TextBuffer text;
+    const bool written = Format(text, format, args) &&
+                         WriteToDestination(head, std::string_view(text.data(), text.size()), lost);
     lock.lock();
     MarkDone(lock, m_Done + 1, written);
 }
 
-void Output::Queue(const Lock& /*lock*/, const LogLine& line)
+void Output::Queue(const Lock& /*lock*/, const LineHead& head, const char* format,
+                   va_list args) noexcept
 {
-    const Heading heading = {m_Accepted + 1, line.component, line.level, line.time.isOfProgram, 0};
-    // Not through the logger: some of its versions hide that memory ran out.
-    m_Queue->post_log(
-        std::shared_ptr<spdlog::async_logger>(m_Logger),
-        spdlog::details::log_msg(line.time.point, spdlog::source_loc(), heading.AsName(),
-                                 Severity(line.level),
-                                 spdlog::string_view_t(line.text.data(), line.text.size())),
-        spdlog::async_overflow_policy::overrun_oldest);
+    QueuedLine& line = m_Queue->Next();
+    line.head = head;
+    if (!Format(line.text, format, args)) {
+        ++m_Lost;
+        return;
+    }
+    m_Lost += m_Queue->Append() ? 1 : 0;
     ++m_Accepted;
+    m_Arrived.notify_one();
 }
 
-bool Output::WriteToDestination(const LogLine& line, KEVRO_UInt64 lost) noexcept
+void Output::WriteQueuedLines(std::unique_ptr<QueuedLine> pLine) noexcept
+{
+    for (Lock lock(m_rMutex);;) {
+        m_Arrived.wait(lock, [this] { return m_Queue->Size() != 0 || m_IsClosing; });
+        if (m_Queue->Size() == 0) {
+            return;
+        }
+        m_Queue->Take(pLine);
+        // The queue keeps the order: every earlier line has been written or dropped.
+        const KEVRO_UInt64 number = m_Accepted - m_Queue->Size();
+        // Not while lines are waiting: each report could displace one of them.
+        const KEVRO_UInt64 lost = m_Queue->Size() == 0 ? m_Lost : 0;
+        lock.unlock();
+        const std::string_view text(pLine->text.data(), pLine->text.size());
+        const bool written = WriteToDestination(pLine->head, text, lost);
+        pLine->text = TextBuffer(); // releases what a long line needed
+        lock.lock();
+        MarkDone(lock, number, written);
+    }
+}
+
+bool Output::WriteToDestination(const LineHead& head, std::string_view text,
+                                KEVRO_UInt64 lost) noexcept
 {
     const std::lock_guard<std::mutex> writing(m_WriteMutex);
     ReportLost(lost);
-    return TryWrite(line);
+    return TryWrite(head, text);
 }
 
-bool Output::TryWrite(const LogLine& line) noexcept
+bool Output::TryWrite(const LineHead& head, std::string_view text) noexcept
 {
     try {
-        TextBuffer text;
-        AppendLine(text, line);
+        TextBuffer line;
+        AppendLine(line, head, text);
         m_Destination->log(spdlog::details::log_msg(
-            line.time.point, spdlog::source_loc(), NameForClock(line.time), Severity(line.level),
-            spdlog::string_view_t(text.data(), text.size())));
+            head.time.point, spdlog::source_loc(), NameForClock(head.time), Severity(head.level),
+            spdlog::string_view_t(line.data(), line.size())));
         return true;
     } catch (const spdlog::spdlog_ex& failure) {
         ReportFailure(failure.what());
@@ -196,8 +173,8 @@ void Output::ReportLost(KEVRO_UInt64 lost) noexcept
     char text[64];
     const int length =
         std::snprintf(text, sizeof(text), "lines lost: %" PRIu64, lost - m_ReportedLost);
-    if (TryWrite({CurrentTime(), bd::CompIdCommon, KEVRO_Log_LevelWarning,
-                  std::string_view(text, static_cast<std::size_t>(length))})) {
+    if (TryWrite({CurrentTime(), bd::CompIdCommon, KEVRO_Log_LevelWarning},
+                 std::string_view(text, static_cast<std::size_t>(length)))) {
         m_ReportedLost = lost;
     }
 }
@@ -205,7 +182,7 @@ void Output::ReportLost(KEVRO_UInt64 lost) noexcept
 void Output::MarkDone(const Lock& /*lock*/, KEVRO_UInt64 done, bool written) noexcept
 {
     m_Done = done;
-    m_Refused += written ? 0 : 1;
+    m_Lost += written ? 0 : 1;
     m_Progress.notify_all();
 }
 

@@ -6,32 +6,32 @@
 #define KEVRO_LOGOUTPUT_H
 
 #include <condition_variable>
+#include <cstdarg>
 #include <cstddef>
 #include <memory>
 #include <mutex>
-#include <string>
 #include <string_view>
+#include <thread>
 
-#include <spdlog/async_logger.h>
-#include <spdlog/details/thread_pool.h>
 #include <spdlog/sinks/sink.h>
 
+#include "bd/macros.h"
 #include "logline.h"
+#include "logqueue.h"
 
 namespace kevro
 {
 
 /**
- * Takes lines and passes them to a destination, directly or through spdlog's bounded queue.
+ * Takes lines and passes them to a destination, directly or through a bounded queue with a thread.
  *
- * It is itself the spdlog sink between the queue and the destination. There it counts lines, keeps
- * exceptions from spdlog, and reports lost lines. It also composes lines there, so that a writer
- * only copies the text.
+ * A writer only formats the text of a queued line, in its place in the queue. The queue's thread
+ * composes the line, writes it and reports lost lines.
  *
  * Shares its owner's mutex, so choosing an output and writing to it take one lock. All operations
  * may be called from several threads at once.
  */
-class Output final : private spdlog::sinks::sink
+class Output
 {
 public:
     /** Holds the mutex before and after a call; a slow operation releases it in between. */
@@ -45,33 +45,33 @@ public:
            std::size_t queueLines);
 
     /** Call Drain() first. No thread may write any more, and the mutex must be free. */
-    ~Output() override = default;
+    ~Output();
 
     Output(const Output&) = delete;
     Output& operator=(const Output&) = delete;
 
-    /** Writes or queues a line. With a queue it never waits for the destination. */
-    void Write(Lock& lock, const LogLine& line) noexcept;
+    /**
+     * Writes or queues a line of which @p format and @p args make the text. With a queue it never
+     * waits for the destination.
+     */
+    BD_PRINTF_FORMAT(4, 0)
+    void Write(Lock& lock, const LineHead& head, const char* format, va_list args) noexcept;
 
     /** Waits until every line passed to Write() so far is written or lost. */
     void Drain(Lock& lock) noexcept;
 
-    /** Counts a line that was lost before it reached the output. */
-    void AddLost(const Lock& lock) noexcept;
-
     /** The number of lost lines. */
-    KEVRO_UInt64 CountLost(const Lock& lock) const noexcept;
+    KEVRO_UInt64 CountLost(const Lock& /*lock*/) const noexcept { return m_Lost; }
 
 private:
-    void log(const spdlog::details::log_msg& message) override;
-    void flush() override;
-    void set_pattern(const std::string& pattern) override;
-    void set_formatter(std::unique_ptr<spdlog::formatter> formatter) override;
-
-    void WriteDirectly(Lock& lock, const LogLine& line) noexcept;
-    void Queue(const Lock& lock, const LogLine& line);
-    bool WriteToDestination(const LogLine& line, KEVRO_UInt64 lost) noexcept;
-    bool TryWrite(const LogLine& line) noexcept;
+    BD_PRINTF_FORMAT(4, 0)
+    void WriteDirectly(Lock& lock, const LineHead& head, const char* format, va_list args) noexcept;
+    BD_PRINTF_FORMAT(4, 0)
+    void Queue(const Lock& lock, const LineHead& head, const char* format, va_list args) noexcept;
+    void WriteQueuedLines(std::unique_ptr<QueuedLine> pLine) noexcept;
+    bool WriteToDestination(const LineHead& head, std::string_view text,
+                            KEVRO_UInt64 lost) noexcept;
+    bool TryWrite(const LineHead& head, std::string_view text) noexcept;
     void ReportFailure(std::string_view reason) noexcept;
     void ReportLost(KEVRO_UInt64 lost) noexcept;
     void MarkDone(const Lock& lock, KEVRO_UInt64 done, bool written) noexcept;
@@ -85,12 +85,12 @@ private:
     std::condition_variable m_Progress;
     KEVRO_UInt64 m_Accepted = 0; ///< lines queued, being written or done
     KEVRO_UInt64 m_Done = 0;     ///< lines written or lost; with a queue, the number of the last
-    KEVRO_UInt64 m_Refused = 0;  ///< lines lost, but not by the queue
+    KEVRO_UInt64 m_Lost = 0;
 
-    std::shared_ptr<spdlog::async_logger>
-        m_Logger; ///< writes queued lines here; null without a queue
-    // Last, so that the queue's thread ends before anything it uses is destroyed.
-    std::shared_ptr<spdlog::details::thread_pool> m_Queue; ///< null without a queue
+    std::unique_ptr<LogQueue> m_Queue; ///< null without a queue
+    bool m_IsClosing = false;          ///< ends the queue's thread once its lines are written
+    std::condition_variable m_Arrived; ///< a line in the queue, or its end
+    std::thread m_Thread;              ///< writes queued lines
 };
 
 } // namespace kevro

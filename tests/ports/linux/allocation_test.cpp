@@ -56,6 +56,18 @@ TEST_F(LogAllocation, DoesNotOccurWhenTheQueueDropsLines)
     EXPECT_EQ(bdmvtest::CountAllocations() - before, 0U);
 }
 
+TEST_F(LogAllocation, OccursForEveryLongLineWhoseMemoryTheQueueReleases)
+{
+    porttesting::ConfigureSink("file:" + m_LogFile + ",queue=1");
+    const std::string text(2000, 'x');
+    for (int i = 0; i < 10; ++i) {
+        const std::size_t before = bdmvtest::CountAllocations();
+        porttesting::EventLogger().Log("%s", text.c_str());
+        EXPECT_GT(bdmvtest::CountAllocations(), before);
+        KEVRO_Log_Flush();
+    }
+}
+
 TEST_F(LogAllocation, DoesNotOccurWhenTheSwitchIsChecked)
 {
     const std::size_t before = bdmvtest::CountAllocations();

@@ -1,5 +1,8 @@
 // The format of a line.
+#include <climits>
 #include <cstdarg>
+#include <cstdint>
+#include <cstdio>
 #include <cwchar>
 #include <regex>
 #include <string>
@@ -22,6 +25,13 @@ protected:
     {
         const auto lines = ReadLines(m_LogFile);
         return lines.size() == 1 ? WithoutTime(lines[0]) : std::to_string(lines.size()) + " lines";
+    }
+
+    /** The text of the last line of the file. */
+    std::string LastText() const
+    {
+        KEVRO_Log_Flush();
+        return porttesting::TextOf(ReadLines(m_LogFile).back());
     }
 };
 
@@ -123,6 +133,64 @@ TEST_F(LogLine, IsLostAndCountedWhenItsArgumentsCannotBePrinted)
     EventLogger().Log("%ls", unprintable);
     EXPECT_EQ(ReadFile(m_LogFile), "");
     EXPECT_EQ(KEVRO_Log_GetDroppedLines(), before + 1);
+}
+
+/** What vsnprintf() makes of the arguments. */
+BD_PRINTF_FORMAT(1, 2) std::string Printed(const char* format, ...)
+{
+    char text[200];
+    va_list args;
+    va_start(args, format);
+    std::vsnprintf(text, sizeof(text), format, args);
+    va_end(args);
+    return text;
+}
+
+/** One conversion or several, whose line must have the text that vsnprintf() makes. */
+#define EXPECT_LINE_OF(...)                                                                        \
+    EventLogger().Log(__VA_ARGS__);                                                                \
+    EXPECT_EQ(LastText(), Printed(__VA_ARGS__))
+
+TEST_F(LogLine, FormatsIntegersAsPrintfDoes)
+{
+    for (const char* queue : {"", ",queue=8"}) {
+        porttesting::ConfigureSink("file:" + m_LogFile + queue);
+        EXPECT_LINE_OF("%d, %d, %d", 0, INT_MIN, INT_MAX);
+        EXPECT_LINE_OF("%ld, %ld, %ld", 0L, LONG_MIN, LONG_MAX);
+        EXPECT_LINE_OF("%lld, %lld, %lld", 0LL, LLONG_MIN, LLONG_MAX);
+        EXPECT_LINE_OF("%u, %u", 0U, UINT_MAX);
+        EXPECT_LINE_OF("%lu, %lu", 0UL, ULONG_MAX);
+        EXPECT_LINE_OF("%llu, %llu", 0ULL, ULLONG_MAX);
+    }
+}
+
+TEST_F(LogLine, FormatsEachArgumentByItsOwnConversion)
+{
+    EXPECT_LINE_OF("%d%s%llu%u%lu%s%lld%ld.", -1, "two", 3ULL, 4U, 5UL, "", -7LL, -8L);
+}
+
+TEST_F(LogLine, FormatsAnyOtherConversionAsPrintfDoes)
+{
+    EXPECT_LINE_OF("%5d|%-5d|%+d|%05d|% d|%.3d", 1, 2, 3, 4, 5, 6);
+    EXPECT_LINE_OF("%x %X %#x %o %i %c", 0xABCU, 0xDEFU, 1U, 8U, -9, 'c');
+    EXPECT_LINE_OF("%hhd %hd %zu %jd", static_cast<signed char>(-1), static_cast<short>(-2),
+                   sizeof(int), std::intmax_t{-3});
+    EXPECT_LINE_OF("%.2f %e %g", 1.005, 2.5, 0.1);
+    EXPECT_LINE_OF("%10s|%-10s|%.2s|%.*s", "right", "left", "cut", 3, "length");
+    EXPECT_LINE_OF("100 %%");
+    EXPECT_LINE_OF("%ls", L"wide");
+}
+
+TEST_F(LogLine, ReadsItsArgumentsFromTheFirstAgainAfterAnotherConversion)
+{
+    EXPECT_LINE_OF("%d %s %llu %02u %s", 1, "two", 3ULL, 4U, "five");
+}
+
+TEST_F(LogLine, FormatsANullStringAsPrintfDoes)
+{
+    const char* volatile nothing = nullptr;
+    const char* const text = nothing;
+    EXPECT_LINE_OF("<%s>", text);
 }
 
 } // namespace
