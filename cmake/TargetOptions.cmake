@@ -1,8 +1,10 @@
 include(CheckCXXCompilerFlag)
 
-# Old compilers lack these options: g++ has the first since version 5, the second since version 8.
+# Old compilers lack these options: g++ has the first since version 5, the second since version 8;
+# clang++ has the third since version 3.8.
 check_cxx_compiler_flag(-fno-semantic-interposition BDMVNAVIGATOR_HAS_NO_SEMANTIC_INTERPOSITION)
 check_cxx_compiler_flag(-fmacro-prefix-map=from=to BDMVNAVIGATOR_HAS_MACRO_PREFIX_MAP)
+check_cxx_compiler_flag(-fdebug-prefix-map=from=to BDMVNAVIGATOR_HAS_DEBUG_PREFIX_MAP)
 
 # The compiler options of every target of this project.
 #
@@ -40,6 +42,12 @@ function(bdmvnavigator_target_options target)
       $<$<COMPILE_LANGUAGE:CXX>:-fmacro-prefix-map=${PROJECT_SOURCE_DIR}/=>)
   else()
     bdmvnavigator_name_files(${target})
+  endif()
+  # The same for debug information, so that two builds give the same bytes. Within another project, its
+  # developers step into this one, and their debuggers find the sources.
+  if(BDMVNAVIGATOR_HAS_DEBUG_PREFIX_MAP AND BDMVNAVIGATOR_IS_TOP_LEVEL)
+    target_compile_options(${target} PRIVATE
+      -fdebug-prefix-map=${PROJECT_SOURCE_DIR}/= -fdebug-prefix-map=${PROJECT_BINARY_DIR}=.)
   endif()
   if(BDMVNAVIGATOR_WARNINGS_AS_ERRORS)
     target_compile_options(${target} PRIVATE -Werror)

@@ -2,7 +2,8 @@
 include(FindPackageHandleStandardArgs)
 
 # bdmvnavigator_find_host_headers(PACKAGE TARGET FOLDERS...): an imported TARGET that sees only these
-# FOLDERS of /usr/include, because the rest includes the headers of the wrong C library.
+# FOLDERS of /usr/include, because the rest includes the headers of the wrong C library. The version is
+# in the package's configuration for the build machine.
 macro(bdmvnavigator_find_host_headers package target)
   set(${package}_HEADERS TRUE)
   foreach(folder ${ARGN})
@@ -12,6 +13,12 @@ macro(bdmvnavigator_find_host_headers package target)
     else()
       set(${package}_HEADERS ${package}_HEADERS-NOTFOUND)
     endif()
+  endforeach()
+  file(GLOB ${package}_version_files
+    /usr/share/cmake/${package}/*[Vv]ersion.cmake /usr/lib/*/cmake/${package}/*[Vv]ersion.cmake)
+  foreach(version_file IN LISTS ${package}_version_files)
+    include(${version_file})
+    string(REGEX REPLACE " .*" "" ${package}_VERSION ${PACKAGE_VERSION}) # without "(64bit)"
   endforeach()
   find_package_handle_standard_args(${package} REQUIRED_VARS ${package}_HEADERS)
   if(${package}_FOUND AND NOT TARGET ${target})

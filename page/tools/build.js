@@ -1,7 +1,7 @@
 /**
  * Writes dist/timeline.html: the page in one file, with its script and style inside, ready for recordings to be
  * inserted at the marker. The content security policy names the script and the style by their hashes and forbids
- * every request.
+ * every request. Writes dist/timeline.spdx.json, too, which lists the packages in the page.
  */
 
 import { createHash } from 'node:crypto';
@@ -10,6 +10,8 @@ import { fileURLToPath } from 'node:url';
 
 import { build } from 'esbuild';
 
+import { sbomOf } from './sbom.js';
+
 const Marker = '<!--recordings-->';
 
 const pathOf = (/** @type {string} */ path) => fileURLToPath(new URL(`../${path}`, import.meta.url));
@@ -17,7 +19,11 @@ const pathOf = (/** @type {string} */ path) => fileURLToPath(new URL(`../${path}
 /** @param {string} text */
 const hashOf = (text) => `'sha256-${createHash('sha256').update(text).digest('base64')}'`;
 
+/** @type {Set<string>} */
+const inputs = new Set();
+
 /**
+ * Adds the files of the bundle to the inputs.
  * @param {string} entry
  * @returns {Promise<string>} the bundle, in ASCII
  */
@@ -27,6 +33,8 @@ async function bundle(entry) {
     bundle: true,
     minify: true,
     write: false,
+    metafile: true,
+    absWorkingDir: pathOf(''),
     format: 'iife',
     tsconfigRaw: {}, // whatever lies in the folders above
     target: ['chrome111', 'firefox115', 'safari16.4'],
@@ -34,6 +42,7 @@ async function bundle(entry) {
     legalComments: 'inline',
     logLevel: 'warning',
   });
+  Object.keys(result.metafile.inputs).forEach((input) => inputs.add(input));
   return result.outputFiles[0].text;
 }
 
@@ -66,3 +75,4 @@ if (page.split(Marker).length !== 2 || !page.split('\n').includes(Marker)) {
 }
 await mkdir(pathOf('dist'), { recursive: true });
 await writeFile(pathOf('dist/timeline.html'), page);
+await writeFile(pathOf('dist/timeline.spdx.json'), await sbomOf(inputs));

@@ -5,7 +5,7 @@ set(wrapper ${BUILD}/compiler/c++)
 file(WRITE ${wrapper} "#!/bin/sh
 for argument; do
   case $argument in
-  -fmacro-prefix-map* | -fno-semantic-interposition)
+  -fmacro-prefix-map* | -fdebug-prefix-map* | -fno-semantic-interposition)
     echo \"c++: error: unrecognized command line option '$argument'\" >&2
     exit 1 ;;
   esac

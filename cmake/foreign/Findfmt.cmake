@@ -1,0 +1,5 @@
+include(${CMAKE_CURRENT_LIST_DIR}/HostHeaders.cmake)
+bdmvnavigator_find_host_headers(fmt fmt::fmt fmt)
+if(fmt_FOUND)
+  target_compile_definitions(fmt::fmt INTERFACE FMT_HEADER_ONLY)
+endif()
