@@ -3,11 +3,16 @@
 # with the modules of the kits and of the desk player.
 set(ENV{PKG_CONFIG_PATH} ${LIBRARIES}/pkgconfig)
 set(ENV{LD_LIBRARY_PATH} ${LIBRARIES})
-set(ENV{CXX} ${COMPILER})
+
+# The line calls c++: this compiler, with the options in CXXFLAGS.
+set(compiler ${CMAKE_CURRENT_BINARY_DIR}/compiler)
+file(CONFIGURE OUTPUT ${compiler}/c++ CONTENT "#!/bin/sh\nexec ${COMPILER} $CXXFLAGS \"$@\"\n" @ONLY)
+file(CHMOD ${compiler}/c++ PERMISSIONS OWNER_READ OWNER_WRITE OWNER_EXECUTE)
+set(ENV{PATH} ${compiler}:$ENV{PATH})
 
 include(${CMAKE_CURRENT_LIST_DIR}/../run.cmake)
 
-file(GLOB modules ${LIBRARIES}/pkgconfig/*.pc)
+file(GLOB modules ${LIBRARIES}/pkgconfig/bdmvnavigator*.pc)
 if(NOT modules)
   message(FATAL_ERROR "no modules in ${LIBRARIES}/pkgconfig")
 endif()
@@ -43,7 +48,7 @@ function(build_and_run source)
   set(ENV{CXXFLAGS} "${FLAGS} -std=c++17 -Wall -Wextra -Wpedantic -Werror")
   file(REMOVE player)
   run("building ${source}" sh -c
-    "$CXX $CXXFLAGS ${CMAKE_CURRENT_LIST_DIR}/${source} $(pkg-config --static --cflags --libs ${modules}) -o player")
+    "c++ ${CMAKE_CURRENT_LIST_DIR}/${source} $(pkg-config --static --cflags --libs ${modules}) -o player")
   run("${source}" ${EMULATOR} ./player)
 endfunction()
 
