@@ -71,15 +71,17 @@ bool AppendFormatted(TextBuffer& buffer, const char* format, va_list args)
     if (AppendCommon(buffer, format, Arguments(args))) {
         return true;
     }
-    buffer.resize(size);
     // The terminating null character needs room, but is not part of the text.
-    const int length = std::vsnprintf(nullptr, 0, format, Arguments(args).list);
+    const std::size_t room = buffer.capacity() - size;
+    const int length = std::vsnprintf(buffer.data() + size, room, format, Arguments(args).list);
     if (length < 0) {
         return false;
     }
     const std::size_t end = size + static_cast<std::size_t>(length);
-    buffer.resize(end + 1);
-    std::vsnprintf(buffer.data() + size, end + 1 - size, format, args);
+    if (end - size >= room) {
+        buffer.resize(end + 1);
+        std::vsnprintf(buffer.data() + size, end + 1 - size, format, args);
+    }
     buffer.resize(end);
     return true;
 }

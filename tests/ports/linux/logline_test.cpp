@@ -112,16 +112,17 @@ TEST_F(LogLine, IsNotFormattedAgain)
 TEST_F(LogLine, IsNeverTruncated)
 {
     for (const char* queue : {"", ",queue=8"}) {
-        for (const std::size_t length :
-             {100U, 222U, 223U, 224U, 250U, 251U, 252U, 253U, 300U, 5000U, 70000U}) {
+        for (const std::size_t length : {100U, 222U, 223U, 224U, 244U, 245U, 246U, 250U, 251U, 252U,
+                                         253U, 300U, 5000U, 70000U}) {
             porttesting::ConfigureSink("stderr");
             std::remove(m_LogFile.c_str());
             porttesting::ConfigureSink("file:" + m_LogFile + queue);
 
             const std::string text(length, 'x');
             EventLogger().Log("<%s %d>", text.c_str(), 7);
-            KEVRO_Log_Flush();
-            EXPECT_EQ(TheLine(), "BdmvNavigator Event: <" + text + " 7>");
+            EXPECT_EQ(LastText(), "<" + text + " 7>");
+            EventLogger().Log("<%s %2d>", text.c_str(), 7);
+            EXPECT_EQ(LastText(), "<" + text + "  7>");
         }
     }
 }
