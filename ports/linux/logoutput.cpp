@@ -1,5 +1,6 @@
 #include "logoutput.h"
 
+#include <chrono>
 #include <cinttypes>
 #include <cstdio>
 #include <utility>
@@ -99,7 +100,9 @@ void Output::Queue(const Lock& /*lock*/, const LineHead& head, const char* forma
     }
     m_Lost += m_Queue->Append() ? 1 : 0;
     ++m_Accepted;
-    m_Arrived.notify_one();
+    if (!m_IsResting || m_Queue->IsHalfFull()) {
+        m_Arrived.notify_one();
+    }
 }
 
 void Output::WriteQueuedLines(std::unique_ptr<QueuedLine> pLine) noexcept
@@ -120,7 +123,20 @@ void Output::WriteQueuedLines(std::unique_ptr<QueuedLine> pLine) noexcept
         pLine->text = TextBuffer(); // releases what a long line needed
         lock.lock();
         MarkDone(lock, number, written);
+        if (m_Queue->Size() == 0) {
+            Rest(lock);
+        }
     }
+}
+
+/** Lets lines gather for a moment, unless they are many: to wake this thread takes a writer longer
+ * than many lines do. */
+void Output::Rest(Lock& lock) noexcept
+{
+    m_IsResting = true;
+    m_Arrived.wait_for(lock, std::chrono::microseconds(100),
+                       [this] { return m_Queue->IsHalfFull() || m_IsClosing; });
+    m_IsResting = false;
 }
 
 bool Output::WriteToDestination(const LineHead& head, std::string_view text,

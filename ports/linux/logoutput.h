@@ -68,6 +68,7 @@ private:
     void WriteDirectly(Lock& lock, const LineHead& head, const char* format, va_list args) noexcept;
     BD_PRINTF_FORMAT(4, 0)
     void Queue(const Lock& lock, const LineHead& head, const char* format, va_list args) noexcept;
+    void Rest(Lock& lock) noexcept;
     void WriteQueuedLines(std::unique_ptr<QueuedLine> pLine) noexcept;
     bool WriteToDestination(const LineHead& head, std::string_view text,
                             KEVRO_UInt64 lost) noexcept;
@@ -89,6 +90,7 @@ private:
 
     std::unique_ptr<LogQueue> m_Queue; ///< null without a queue
     bool m_IsClosing = false;          ///< ends the queue's thread once its lines are written
+    bool m_IsResting = false;          ///< the queue's thread is in Rest()
     std::condition_variable m_Arrived; ///< a line in the queue, or its end
     std::thread m_Thread;              ///< writes queued lines
 };

@@ -40,6 +40,9 @@ public:
     /** The number of lines that wait. */
     std::size_t Size() const { return m_Size; }
 
+    /** Whether more than half of the lines wait that may. */
+    bool IsHalfFull() const { return m_Size * 2 >= m_Places.size(); }
+
     /** The place to compose the next line in, which becomes part of the queue by Append(). */
     QueuedLine& Next()
     {
